@@ -1,0 +1,56 @@
+#include "base/clock.h"
+
+#include <algorithm>
+#include <ctime>
+#include <thread>
+
+namespace kdx {
+
+namespace {
+
+std::tm localTime(std::time_t time) {
+    std::tm local{};
+#ifdef _WIN32
+    localtime_s(&local, &time);
+#else
+    localtime_r(&time, &local);
+#endif
+    return local;
+}
+
+}  // namespace
+
+double SystemClock::secondsSinceMidnight() const {
+    using namespace std::chrono;
+    const auto now = system_clock::now();
+    const auto wholeSeconds = floor<seconds>(now);
+    const std::tm local = localTime(system_clock::to_time_t(wholeSeconds));
+    // A leap second would give 60: the day never has more than 86400 seconds here.
+    const int second = local.tm_sec > 59 ? 59 : local.tm_sec;
+    return local.tm_hour * 3600.0 + local.tm_min * 60.0 + second + duration<double>(now - wholeSeconds).count();
+}
+
+Date SystemClock::today() const {
+    const std::tm local = localTime(std::chrono::system_clock::to_time_t(std::chrono::system_clock::now()));
+    return {local.tm_year + 1900, local.tm_mon + 1, local.tm_mday};
+}
+
+void SystemClock::sleep(std::chrono::nanoseconds duration) {
+    // To an absolute point of the steady clock: an interrupted or late sleep does not add up.
+    std::this_thread::sleep_until(std::chrono::steady_clock::now() + duration);
+}
+
+void WaitMs(Clock& clock, const std::int16_t& milliseconds) {
+    if (milliseconds == 0) return;
+    const auto start = static_cast<float>(clock.secondsSinceMidnight());
+    const float target = start + static_cast<float>(milliseconds) / 1000.0F;
+    for (;;) {
+        const double now = clock.secondsSinceMidnight();
+        if (static_cast<float>(now) >= target) return;
+        const std::chrono::duration<double> left{static_cast<double>(target) - now};
+        // At least a microsecond: rounding must not turn the rest into a busy loop.
+        clock.sleep(std::max(std::chrono::ceil<std::chrono::nanoseconds>(left), std::chrono::nanoseconds{1000}));
+    }
+}
+
+}  // namespace kdx

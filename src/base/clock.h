@@ -1,0 +1,41 @@
+#pragma once
+
+#include <chrono>
+#include <cstdint>
+
+namespace kdx {
+
+/// A calendar day, as the PC clock shows it.
+struct Date {
+    int year = 0;
+    int month = 0;  ///< 1 to 12
+    int day = 0;    ///< 1 to 31
+};
+
+/// The PC clock and the only way to wait: handed in wherever time matters, so that tests never sleep.
+class Clock {
+public:
+    virtual ~Clock() = default;
+    /// Local time of day in seconds since midnight, with fractions; 0 up to, but not including, 86400.
+    [[nodiscard]] virtual double secondsSinceMidnight() const = 0;
+    /// Today's local date.
+    [[nodiscard]] virtual Date today() const = 0;
+    /// Sleeps for the given time; takes no processor time and handles no events.
+    virtual void sleep(std::chrono::nanoseconds duration) = 0;
+};
+
+/// The machine's clock in its local time zone.
+class SystemClock final : public Clock {
+public:
+    [[nodiscard]] double secondsSinceMidnight() const override;
+    [[nodiscard]] Date today() const override;
+    void sleep(std::chrono::nanoseconds duration) override;
+};
+
+/// Waits until the clock's seconds since midnight, held in single precision, have reached start + milliseconds / 1000.
+/// The rounding is the one the instrument's timing was tried out with. A target past midnight is never reached, since
+/// the seconds start at 0 again: the wait then does not end. It is left so on purpose.
+/// @param milliseconds length of the wait; 0 returns at once.
+void WaitMs(Clock& clock, const std::int16_t& milliseconds);
+
+}  // namespace kdx

@@ -1,0 +1,57 @@
+#include "base/codepage.h"
+
+#include <algorithm>
+#include <array>
+
+namespace kdx {
+
+namespace {
+
+// Bytes 80 to 9F of Windows-1252; all others equal their Unicode code points.
+constexpr std::array<char16_t, 32> kHighControls = {0x20AC, 0x0081, 0x201A, 0x0192, 0x201E, 0x2026, 0x2020, 0x2021,
+                                                    0x02C6, 0x2030, 0x0160, 0x2039, 0x0152, 0x008D, 0x017D, 0x008F,
+                                                    0x0090, 0x2018, 0x2019, 0x201C, 0x201D, 0x2022, 0x2013, 0x2014,
+                                                    0x02DC, 0x2122, 0x0161, 0x203A, 0x0153, 0x009D, 0x017E, 0x0178};
+
+int byteOf(char16_t codePoint) {
+    if (codePoint < 0x80 || (codePoint >= 0xA0 && codePoint <= 0xFF)) return codePoint;
+    const auto* found = std::find(kHighControls.begin(), kHighControls.end(), codePoint);
+    return found == kHighControls.end() ? -1 : 0x80 + static_cast<int>(found - kHighControls.begin());
+}
+
+char upper(char c) {
+    const auto byte = static_cast<unsigned char>(c);
+    if (byte >= 'a' && byte <= 'z') return static_cast<char>(byte - 0x20);
+    if (byte >= 0xE0 && byte <= 0xFE && byte != 0xF7) return static_cast<char>(byte - 0x20);  // F7 is the division sign
+    if (byte == 0x9A || byte == 0x9C || byte == 0x9E) return static_cast<char>(byte - 0x10);
+    if (byte == 0xFF) return static_cast<char>(0x9F);
+    return c;
+}
+
+}  // namespace
+
+char16_t fromCodePage(unsigned char byte) {
+    return byte >= 0x80 && byte < 0xA0 ? kHighControls[byte - 0x80] : static_cast<char16_t>(byte);
+}
+
+char toCodePage(char16_t codePoint) {
+    const int byte = byteOf(codePoint);
+    return byte < 0 ? '?' : static_cast<char>(byte);
+}
+
+bool inCodePage(char16_t codePoint) {
+    return byteOf(codePoint) >= 0;
+}
+
+std::string upperCase(std::string_view text) {
+    std::string result(text);
+    std::transform(result.begin(), result.end(), result.begin(), upper);
+    return result;
+}
+
+bool equalNoCase(std::string_view left, std::string_view right) {
+    return left.size() == right.size() &&
+           std::equal(left.begin(), left.end(), right.begin(), [](char a, char b) { return upper(a) == upper(b); });
+}
+
+}  // namespace kdx

@@ -1,0 +1,24 @@
+#pragma once
+
+#include <string>
+#include <string_view>
+
+namespace kdx {
+
+/// The code point of a Windows-1252 byte. The five bytes the code page leaves open (81, 8D, 8F, 90, 9D) map to the
+/// control characters of the same number, so that every byte survives the way there and back.
+[[nodiscard]] char16_t fromCodePage(unsigned char byte);
+
+/// The Windows-1252 byte of a code point, or '?' where the code page has none.
+[[nodiscard]] char toCodePage(char16_t codePoint);
+
+/// True when the code page has a byte for the code point.
+[[nodiscard]] bool inCodePage(char16_t codePoint);
+
+/// Letters of the code page in upper case: A to Z and the accented letters; everything else unchanged.
+[[nodiscard]] std::string upperCase(std::string_view text);
+
+/// Compares 8-bit texts without regard to letter case, accented letters of the code page included.
+[[nodiscard]] bool equalNoCase(std::string_view left, std::string_view right);
+
+}  // namespace kdx

@@ -1,0 +1,107 @@
+#include "link/instrument.h"
+
+#include <array>
+#include <fstream>
+
+#include "base/clock.h"
+#include "base/numbers.h"
+#include "settings/datafolder.h"
+#include "settings/programstate.h"
+
+namespace kdx {
+
+namespace {
+
+constexpr std::size_t kLogKeyWidth = 15;
+
+std::string cutAtLineFeed(const std::string& answer) {
+    return answer.substr(0, answer.find('\n'));
+}
+
+}  // namespace
+
+Instrument::Instrument(Visa& visa, ProgramState& state, DataFolder& data, Clock& clock,
+                       std::function<void(const std::string&)> interfaceError)
+    : m_visa(visa), m_state(state), m_data(data), m_clock(clock), m_interfaceError(std::move(interfaceError)) {}
+
+void Instrument::Send2Gen(const std::string& command) {
+    if (!m_state.InstrumentOnline) return;
+    LastVisaStatus = m_visa.viWrite(InstrSession, command, LastRetCount);
+    notify(Traffic::Kind::Written, command, LastVisaStatus);
+    // Stricter than a read: whatever is not plain success may mean that the coder did not get the command.
+    if (LastVisaStatus != 0) m_interfaceError("Fehler: " + std::to_string(LastVisaStatus));
+}
+
+std::string Instrument::ReadFromGen() {
+    if (!m_state.InstrumentOnline) return kNoSessionAnswer;
+    std::string answer(kAnswerLength, ' ');
+    LastVisaStatus = m_visa.viRead(InstrSession, answer, LastRetCount);
+    notify(Traffic::Kind::Read, answer, LastVisaStatus);
+    // A completed read normally reports a positive completion code (count reached, terminator seen): no failure.
+    if (LastVisaStatus < 0) {
+        m_interfaceError("Fehler: " + std::to_string(LastVisaStatus));
+        return kReadError;
+    }
+    return answer;
+}
+
+void Instrument::WriteLog(std::string_view key, std::string_view value, std::string_view note) {
+    if (!m_state.LogEnabled && !m_observer) return;
+    std::string line = rightmost(std::string(20, ' ').append(key), kLogKeyWidth);
+    line.append("= ").append(value);
+    if (!note.empty()) line.append("\"").append(note).append("\"");
+    if (m_state.LogEnabled) {
+        // Opened and closed for every line, so that the log can be read or deleted while the program runs.
+        std::ofstream log(m_data.file(kCommandLog), std::ios::binary | std::ios::app);
+        log << line << "\r\n";
+    }
+    notify(Traffic::Kind::Logged, line);
+}
+
+void Instrument::emptyLog() {
+    const std::ofstream log(m_data.file(kCommandLog), std::ios::binary | std::ios::trunc);
+}
+
+std::string Instrument::X4_Abfrage(const std::string& label, const std::string& key) {
+    Send2Gen(":STEREO:DIRECT? \"" + key + "\"");
+    WriteLog(label, ":STEREO:DIRECT? ", key);
+    WaitMs(m_clock, kCommandPauseMs);
+    const std::string answer = ReadFromGen();
+    WriteLog(label, "Answer ", answer);
+    if (answer == kReadError) return {};
+    // The empty test comes before the cut here, and after it in VRN_Abfrage: a bare line feed shows as empty text.
+    std::string shown = answer.empty() ? key + " " + caption(143) : answer;
+    shown = cutAtLineFeed(shown);
+    if (shown.size() > 1) {
+        if (shown[1] == '"') {
+            shown = key + ": " + caption(144) + " | ";  // the coder answered with an empty quoted text
+        } else {
+            shown = shown.substr(1, shown.size() - 2);
+        }
+    }
+    WriteLog(caption(142), shown, "");
+    return shown;
+}
+
+std::string Instrument::VRN_Abfrage(const std::string& label, const std::string& command) {
+    Send2Gen(command + "?");
+    WriteLog(label, ":? ", command);
+    WaitMs(m_clock, kCommandPauseMs);
+    const std::string answer = ReadFromGen();
+    WriteLog(label, "Answer ", answer);
+    if (answer == kReadError) return {};
+    std::string shown = cutAtLineFeed(answer);
+    if (shown.empty()) shown = command + " " + caption(143);
+    WriteLog(caption(142), shown, "");
+    return shown;
+}
+
+void Instrument::notify(Traffic::Kind kind, std::string text, VisaStatus status) const {
+    if (m_observer) m_observer({kind, std::move(text), status});
+}
+
+std::string Instrument::caption(int number) const {
+    return m_caption ? m_caption(number) : std::string();
+}
+
+}  // namespace kdx

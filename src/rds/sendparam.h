@@ -1,0 +1,57 @@
+#pragma once
+
+#include <cstdint>
+#include <functional>
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace kdx {
+
+class Clock;
+class Instrument;
+struct ProgramState;
+
+/// What composing a command can see besides the key and the value.
+struct ParamContext {
+    std::string eonIdentifier;  ///< PI of the other network: leads every per-network EON command
+    std::string clockText;      ///< caption of `Uhr_Zeit`: the time that "UHR" sends
+    std::string time;           ///< PC clock, hh:mm:ss
+    std::string date;           ///< PC clock, DD.MM.YY
+};
+
+/// Composes the instrument command for a key and its value, exactly as it is sent.
+/// @param value rewritten for "PI" only: padded with blanks or cut to 4 characters.
+/// @returns nothing for a key that has no command (unknown keys, "NFShape Sinus", "DS"); an empty text for a listed
+/// key with a value that is not among its choices.
+/// @throws std::overflow_error when a deviation times 10 is too large for a number.
+[[nodiscard]] std::optional<std::string> composeCommand(std::string_view key, std::string& value,
+                                                        const ParamContext& context);
+
+/// The single place where a named parameter becomes text for the instrument.
+class ParamSender {
+public:
+    /// @param clockText gives the caption of `Uhr_Zeit`; @param endProgram ends the application at once (key "DS").
+    ParamSender(Instrument& instrument, ProgramState& state, Clock& clock, std::function<std::string()> clockText,
+                std::function<void()> endProgram);
+
+    /// Composes the command, logs it, waits 50 ms and writes it. Unknown keys and "NFShape Sinus" do nothing at all.
+    /// @param value see composeCommand; @param extra1 used by "DS" only; @param extra2 not used;
+    /// @param mode one program-wide setting, without effect on what is sent.
+    void SendParam(const std::string& key, std::string& value, const std::string& extra1, const std::string& extra2,
+                   std::int16_t& mode);
+
+    /// The same for the program's usual call: no extras, the program-wide mode. The value is rewritten for "PI" only.
+    void SendParam(const std::string& key, std::string& value);
+    /// The same for a value that nobody keeps.
+    void SendParam(const std::string& key, std::string&& value);
+
+private:
+    Instrument& m_instrument;
+    ProgramState& m_state;
+    Clock& m_clock;
+    std::function<std::string()> m_clockText;
+    std::function<void()> m_endProgram;
+};
+
+}  // namespace kdx

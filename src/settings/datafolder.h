@@ -1,0 +1,58 @@
+#pragma once
+
+#include <filesystem>
+#include <functional>
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace kdx {
+
+inline constexpr const char* kGeneralSettings = "RDS_Allg.INI";
+inline constexpr const char* kLanguageFile = "Sprachen.ini";
+inline constexpr const char* kCommandLog = "RDS_log.txt";
+inline constexpr const char* kEventList = "Event.txt";
+inline constexpr const char* kLocationList = "Location.txt";
+inline constexpr const char* kPictureOn = "Sch_On.ico";
+inline constexpr const char* kPictureOff = "Sch_Off.ico";
+
+/// "Datenset" + number + ".INI".
+[[nodiscard]] std::string dataSetFile(std::string_view number);
+
+/// The data folder ("Daten" in the program's folder): finds its files without regard to letter case on every system,
+/// and reads and writes settings in its profile files. Texts are 8-bit Windows-1252.
+class DataFolder {
+public:
+    /// @param appFolder the program's folder; the data are in its sub-folder "Daten" (any letter case).
+    explicit DataFolder(const std::filesystem::path& appFolder);
+
+    /// The data folder itself; it need not exist.
+    [[nodiscard]] const std::filesystem::path& path() const { return m_path; }
+
+    /// Where a file of the given name is: a file whose name differs in letter case only is found too; one spelled
+    /// exactly so wins. When there is none, the path it would be created at.
+    [[nodiscard]] std::filesystem::path file(std::string_view name) const;
+
+    /// One value; "" when the key, the section or the file is missing, unreadable or the value is empty. Values are
+    /// cut at 254 characters. Never creates a file, never throws.
+    [[nodiscard]] std::string ReadIni(std::string_view section, std::string_view key, std::string_view fileName) const;
+
+    /// Writes one key at once; creates the file and the section if needed. A failure changes nothing on disk, throws
+    /// nothing and opens no box: it is kept in unsavedFile() until a write to the same file succeeds.
+    void WriteIni(std::string_view section, std::string_view key, std::string_view value, std::string_view fileName);
+
+    /// Name of a file that could not be written and has not been written since; nothing when all is saved.
+    [[nodiscard]] const std::optional<std::string>& unsavedFile() const { return m_unsavedFile; }
+
+    /// Called whenever unsavedFile() changes.
+    void onUnsavedFileChanged(std::function<void()> callback) { m_unsavedFileChanged = std::move(callback); }
+
+private:
+    void setUnsavedFile(std::optional<std::string> name);
+
+    std::filesystem::path m_path;
+    std::optional<std::string> m_unsavedFile;
+    std::function<void()> m_unsavedFileChanged;
+};
+
+}  // namespace kdx

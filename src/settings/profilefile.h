@@ -1,0 +1,40 @@
+#pragma once
+
+#include <filesystem>
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace kdx {
+
+/// Longest value a read gives: a buffer of 255 characters with its end mark.
+inline constexpr std::size_t kLongestValue = 254;
+
+/// A profile file's bytes and the rules by which single values are found and replaced in them, the ones of the
+/// operating system's private-profile functions. All texts are 8-bit Windows-1252.
+class ProfileText {
+public:
+    explicit ProfileText(std::string bytes = {});
+
+    /// Value of the first key of that name in the first section of that name; "" when missing or empty. One outer
+    /// pair of equal quotes is taken off, then the value is cut at `longest` characters.
+    [[nodiscard]] std::string value(std::string_view section, std::string_view key,
+                                    std::size_t longest = kLongestValue) const;
+
+    /// Replaces or adds one key; every other byte stays as it is. The value is never cut.
+    void setValue(std::string_view section, std::string_view key, std::string_view value);
+
+    [[nodiscard]] const std::string& bytes() const { return m_bytes; }
+
+private:
+    std::string m_bytes;
+};
+
+/// The file's bytes, or nothing when it is missing or cannot be read.
+[[nodiscard]] std::optional<std::string> readFile(const std::filesystem::path& file);
+
+/// Replaces the file's content in one step: written beside it, flushed to disk, renamed over it; owner and mode are
+/// kept, a link is followed. False on any failure, and then the file is as it was.
+[[nodiscard]] bool replaceFile(const std::filesystem::path& file, std::string_view bytes);
+
+}  // namespace kdx

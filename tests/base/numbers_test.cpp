@@ -1,0 +1,71 @@
+#include "base/numbers.h"
+
+#include <gtest/gtest.h>
+
+#include <clocale>
+#include <cmath>
+#include <ostream>
+
+namespace kdx {
+namespace {
+
+struct NumberCase {
+    const char* text;
+    double value;
+    friend void PrintTo(const NumberCase& number, std::ostream* out) { *out << '"' << number.text << '"'; }
+};
+
+class LeadingNumber : public ::testing::TestWithParam<NumberCase> {};
+
+TEST_P(LeadingNumber, IsReadUpToTheFirstCharacterThatDoesNotFit) {
+    EXPECT_DOUBLE_EQ(leadingNumber(GetParam().text), GetParam().value);
+}
+
+INSTANTIATE_TEST_SUITE_P(Values, LeadingNumber,
+                         ::testing::Values(NumberCase{"67.5", 67.5}, NumberCase{"67.5 x", 67.5}, NumberCase{"", 0},
+                                           NumberCase{"abc", 0}, NumberCase{"  \t12", 12}, NumberCase{"-3", -3},
+                                           NumberCase{"+3", 3}, NumberCase{".5", 0.5}, NumberCase{"5.", 5},
+                                           NumberCase{".", 0}, NumberCase{"-", 0}, NumberCase{"87,6", 87},
+                                           NumberCase{"1e3", 1000}, NumberCase{"1e", 1}, NumberCase{"1e+", 1},
+                                           NumberCase{"00350", 350}, NumberCase{"1.2.3", 1.2}, NumberCase{"nan", 0},
+                                           NumberCase{"inf", 0}, NumberCase{"0x10", 0}, NumberCase{"1e-999", 0}));
+
+TEST(LeadingNumberTest, ANumberTooLargeIsInfinite) {
+    EXPECT_TRUE(std::isinf(leadingNumber("1e999")));
+    EXPECT_LT(leadingNumber("-1e999"), 0);
+}
+
+TEST(LeadingNumberTest, TheLocaleDoesNotMatter) {
+    std::setlocale(LC_ALL, "de_DE.UTF-8");
+    EXPECT_DOUBLE_EQ(leadingNumber("67.5"), 67.5);
+    EXPECT_EQ(shortestDecimal(67.5), "67.5");
+    std::setlocale(LC_ALL, "C");
+}
+
+TEST(ShortestDecimalTest, HasNoNoiseNoBlankAndNoExponent) {
+    EXPECT_EQ(shortestDecimal(675), "675");
+    EXPECT_EQ(shortestDecimal(2.5), "2.5");
+    EXPECT_EQ(shortestDecimal(-30), "-30");
+    EXPECT_EQ(shortestDecimal(0), "0");
+    EXPECT_EQ(shortestDecimal(-0.0), "0");
+    EXPECT_EQ(shortestDecimal(67.6 * 10), "676");
+    EXPECT_EQ(shortestDecimal(0.1 + 0.2), "0.3");
+    EXPECT_EQ(shortestDecimal(0.05), "0.05");
+    EXPECT_EQ(shortestDecimal(1234567890), "1234567890");
+}
+
+TEST(FixedDecimalTest, HasExactlyTheDecimalsAskedFor) {
+    EXPECT_EQ(fixedDecimal(0.05, 2), "0.05");
+    EXPECT_EQ(fixedDecimal(80, 1), "80.0");
+    EXPECT_EQ(fixedDecimal(-4, 0), "-4");
+}
+
+TEST(FieldTest, TextsAreCutAndPadded) {
+    EXPECT_EQ(rightmost("12345", 4), "2345");
+    EXPECT_EQ(rightmost("1", 4), "1");
+    EXPECT_EQ(padRight("ab", 4), "ab  ");
+    EXPECT_EQ(padRight("abcdef", 4), "abcd");
+}
+
+}  // namespace
+}  // namespace kdx

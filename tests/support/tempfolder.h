@@ -1,0 +1,51 @@
+#pragma once
+
+#include <atomic>
+#include <cstdlib>
+#include <filesystem>
+#include <fstream>
+#include <iterator>
+#include <string>
+
+#include <unistd.h>
+
+namespace kdx::test {
+
+/// A program folder with an empty "Daten" of its own, gone with the test.
+class TempFolder {
+public:
+    TempFolder() {
+        static std::atomic<int> count = 0;
+        m_path = std::filesystem::temp_directory_path() /
+                 ("kdx-test-" + std::to_string(getpid()) + "-" + std::to_string(count++));
+        std::filesystem::create_directories(data());
+    }
+    ~TempFolder() {
+        std::error_code ignored;
+        std::filesystem::permissions(data(), std::filesystem::perms::owner_all, ignored);
+        std::filesystem::remove_all(m_path, ignored);
+    }
+    TempFolder(const TempFolder&) = delete;
+    TempFolder& operator=(const TempFolder&) = delete;
+
+    [[nodiscard]] const std::filesystem::path& path() const { return m_path; }
+    [[nodiscard]] std::filesystem::path data() const { return m_path / "Daten"; }
+    void write(const std::string& name, const std::string& bytes) const {
+        std::ofstream(data() / name, std::ios::binary) << bytes;
+    }
+    [[nodiscard]] std::string read(const std::string& name) const {
+        std::ifstream file(data() / name, std::ios::binary);
+        return {std::istreambuf_iterator<char>(file), {}};
+    }
+    /// Copies the shipped data folder.
+    void copyShipped() const {
+        std::filesystem::copy(
+            std::filesystem::path(KDX_SOURCE_DIR) / "Daten", data(),
+            std::filesystem::copy_options::recursive | std::filesystem::copy_options::overwrite_existing);
+    }
+
+private:
+    std::filesystem::path m_path;
+};
+
+}  // namespace kdx::test
