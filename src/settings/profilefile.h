@@ -1,6 +1,7 @@
 #pragma once
 
 #include <filesystem>
+#include <map>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -23,6 +24,9 @@ public:
 
     /// Replaces or adds one key; every other byte stays as it is. The value is never cut.
     void setValue(std::string_view section, std::string_view key, std::string_view value);
+
+    /// All keys of the first section of that name with the values that value() gives; the first key of a name wins.
+    [[nodiscard]] std::map<std::string, std::string> section(std::string_view name) const;
 
     [[nodiscard]] const std::string& bytes() const { return m_bytes; }
 

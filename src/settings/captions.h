@@ -1,0 +1,36 @@
+#pragma once
+
+#include <array>
+#include <map>
+#include <string>
+#include <string_view>
+
+namespace kdx {
+
+class DataFolder;
+
+/// The caption table of the current language: every text by its number, as 8-bit Windows-1252 text.
+class Captions {
+public:
+    explicit Captions(const DataFolder& data);
+
+    /// Reads the language file anew. @param language section of that name ("deutsch", "english", "english US").
+    /// @param standard "RDS" or "RBDS": which programme type names go with a language other than "deutsch".
+    void load(const std::string& language, const std::string& standard);
+
+    /// The text of that number; "" where the file has none.
+    [[nodiscard]] std::string text(int number) const;
+
+    /// The text of one of the program's additional numbers (from 300 up); the design text where the file has none.
+    [[nodiscard]] std::string own(int number, std::string_view design) const;
+
+    /// Name of a programme type (0 to 31) in the current language and standard; "" where the file has none.
+    [[nodiscard]] const std::string& programmeType(std::size_t type) const { return m_programmeTypes.at(type); }
+
+private:
+    const DataFolder& m_data;
+    std::map<int, std::string> m_texts;
+    std::array<std::string, 32> m_programmeTypes;
+};
+
+}  // namespace kdx

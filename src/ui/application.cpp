@@ -1,0 +1,40 @@
+#include "ui/application.h"
+
+#include <QFont>
+#include <QStyleFactory>
+
+#include <exception>
+
+namespace kdx {
+
+Application::Application(int& argc, char** argv) : QApplication(argc, argv) {
+    setApplicationName(QStringLiteral("KDX-RDS"));
+    setApplicationVersion(QStringLiteral(KDX_VERSION));
+    // One look on every desktop: the pages are laid out for it, and platform themes cost twice the start time.
+    setStyle(QStyleFactory::create(QStringLiteral("Fusion")));
+    QFont font = QApplication::font();
+    font.setFamilies({QStringLiteral("Arial"), QStringLiteral("Liberation Sans"), QStringLiteral("DejaVu Sans")});
+    font.setPointSizeF(8.25);
+    setFont(font);
+}
+
+void Application::onFailure(std::function<void(const QString&, const QString&)> report) {
+    m_report = std::move(report);
+}
+
+bool Application::notify(QObject* receiver, QEvent* event) {
+    try {
+        return QApplication::notify(receiver, event);
+    } catch (const std::exception& error) {
+        report(receiver, QString::fromUtf8(error.what()));
+    } catch (...) {
+        report(receiver, QStringLiteral("?"));
+    }
+    return true;
+}
+
+void Application::report(const QObject* receiver, const QString& error) {
+    if (m_report) m_report(receiver->objectName(), error);
+}
+
+}  // namespace kdx

@@ -1,0 +1,65 @@
+#pragma once
+
+#include <QButtonGroup>
+#include <QLayout>
+#include <QRadioButton>
+#include <QScrollBar>
+#include <QSignalBlocker>
+
+#include <array>
+#include <cstddef>
+
+#include "ui/named.h"
+
+namespace kdx {
+
+/// Spacing of all pages, in pixels at 96 dpi: tight enough for 640 x 480, the same everywhere.
+inline constexpr int kGap = 4;
+inline constexpr int kPageMargin = 4;
+
+/// Gives a layout the margins and gaps of the pages.
+inline void tighten(QLayout* layout, int margin = kGap) {
+    layout->setContentsMargins(margin, margin, margin, margin);
+    layout->setSpacing(kGap);
+}
+
+/// A control array of option buttons: one of them at most is chosen.
+template <std::size_t Count>
+class OptionArray {
+public:
+    /// Makes the buttons in a group of their own; name and element number are their object names.
+    void create(const char* name, QWidget* parent) {
+        m_group = new QButtonGroup(parent);
+        for (std::size_t i = 0; i < Count; ++i) {
+            m_options[i] = element<QRadioButton>(name, i, parent);
+            m_group->addButton(m_options[i], static_cast<int>(i));
+        }
+    }
+    [[nodiscard]] QRadioButton* operator[](std::size_t i) const { return m_options.at(i); }
+    [[nodiscard]] auto begin() const { return m_options.begin(); }
+    [[nodiscard]] auto end() const { return m_options.end(); }
+    [[nodiscard]] static constexpr std::size_t size() { return Count; }
+    /// Index of the chosen option, -1 when none is.
+    [[nodiscard]] int chosen() const { return m_group->checkedId(); }
+    /// Chooses an option without running its handler; an index outside the array leaves none chosen.
+    void choose(int index) {
+        m_group->setExclusive(false);
+        for (std::size_t i = 0; i < Count; ++i) {
+            const QSignalBlocker quiet(m_options[i]);
+            m_options[i]->setChecked(static_cast<int>(i) == index);
+        }
+        m_group->setExclusive(true);
+    }
+
+private:
+    QButtonGroup* m_group = nullptr;
+    std::array<QRadioButton*, Count> m_options{};
+};
+
+/// Sets a scroll bar without running its change handler; the value is kept within its range.
+inline void setQuietly(QScrollBar* bar, int value) {
+    const QSignalBlocker quiet(bar);
+    bar->setValue(value);
+}
+
+}  // namespace kdx

@@ -1,0 +1,21 @@
+#pragma once
+
+#include <QString>
+
+namespace kdx {
+
+/// All boxes of the program: pages ask through this and open none themselves.
+class Dialogs {
+public:
+    enum class Icon { None, Information, Exclamation, Critical };
+
+    virtual ~Dialogs() = default;
+    /// Shows a text with an OK button and waits for it.
+    virtual void message(Icon icon, const QString& title, const QString& text) = 0;
+    /// Asks with Yes and No; true for Yes.
+    virtual bool confirm(const QString& title, const QString& text) = 0;
+    /// Asks for a text; an empty answer is given for Cancel too.
+    virtual QString input(const QString& prompt, const QString& title, const QString& preset) = 0;
+};
+
+}  // namespace kdx

@@ -1,0 +1,73 @@
+#include "ui/pictureswitch.h"
+
+#include <QImageReader>
+#include <QPainter>
+#include <QStyle>
+#include <QStyleOptionFocusRect>
+
+#include "settings/datafolder.h"
+
+namespace kdx {
+
+namespace {
+
+constexpr int kPictureWidth = 32;
+constexpr int kPictureHeight = 16;
+
+/// The picture of the file that is sharpest at the width; an empty one when none can be read.
+QPixmap loadPicture(const std::filesystem::path& file, int width) {
+    QImageReader reader(QString::fromStdU16String(file.u16string()));
+    QImage best;
+    do {
+        const QImage image = reader.read();
+        if (image.isNull()) break;
+        const bool enough = image.width() >= width;
+        if (best.isNull() || (enough && (best.width() < width || image.width() < best.width())) ||
+            (!enough && image.width() > best.width())) {
+            best = image;
+        }
+    } while (reader.jumpToNextImage());
+    return best.isNull() ? QPixmap() : QPixmap::fromImage(best);
+}
+
+}  // namespace
+
+PictureSwitch::PictureSwitch(const DataFolder& pictures, QWidget* parent) : QAbstractButton(parent), m_data(pictures) {
+    setCheckable(true);
+    setFocusPolicy(Qt::StrongFocus);
+    setSizePolicy(QSizePolicy::Fixed, QSizePolicy::Fixed);
+}
+
+void PictureSwitch::showState(bool on) {
+    setChecked(on);
+    m_pictureStale = true;
+    update();
+}
+
+void PictureSwitch::paintEvent(QPaintEvent* /*event*/) {
+    if (m_pictureStale) {
+        const auto file = m_data.file(isChecked() ? kPictureOn : kPictureOff);
+        m_picture = loadPicture(file, static_cast<int>(kPictureWidth * devicePixelRatioF()));
+        m_pictureStale = false;
+    }
+    QPainter painter(this);
+    painter.setRenderHints(QPainter::Antialiasing | QPainter::SmoothPixmapTransform);
+    if (!isEnabled()) painter.setOpacity(0.5);
+    const QRect place((width() - kPictureWidth) / 2, (height() - kPictureHeight) / 2, kPictureWidth, kPictureHeight);
+    if (m_picture.isNull()) {
+        painter.setPen(palette().color(QPalette::WindowText));
+        painter.drawRect(place.adjusted(0, 0, -1, -1));
+        const QRect half =
+            isChecked() ? place.adjusted(place.width() / 2, 2, -3, -3) : place.adjusted(2, 2, -place.width() / 2, -3);
+        painter.fillRect(half, palette().color(isChecked() ? QPalette::Highlight : QPalette::Mid));
+    } else {
+        painter.drawPixmap(place, m_picture);
+    }
+    if (hasFocus()) {
+        QStyleOptionFocusRect option;
+        option.initFrom(this);
+        style()->drawPrimitive(QStyle::PE_FrameFocusRect, &option, &painter, this);
+    }
+}
+
+}  // namespace kdx

@@ -1,0 +1,96 @@
+#include "ui/statusrow.h"
+
+#include <QGridLayout>
+
+#include "settings/captions.h"
+#include "ui/named.h"
+#include "ui/text.h"
+
+namespace kdx {
+
+namespace {
+
+struct Pair {
+    std::size_t heading;
+    const char* caption;
+    std::size_t value;
+    const char* design;
+    int widest;  ///< characters of the widest value: its share of the row
+};
+
+// From left to right on the screen; captions 8-bit.
+constexpr std::array kPairs = {
+    Pair{16, "RF [MHz]", 17, "--", 8}, Pair{12, "RF [dB\xB5V]", 13, "--", 6}, Pair{15, "AF [kHz]", 14, "--", 6},
+    Pair{7, "PI", 2, "Label1", 4},     Pair{6, "PS", 3, "Label1", 8},         Pair{11, "TP", 10, "Label1", 3},
+    Pair{9, "TA", 0, "TA", 3},         Pair{8, "M / S", 1, "Label1", 7},      Pair{5, "PTY", 4, "Label1", 16},
+};
+
+QFont arial(const QFont& base) {
+    QFont font = base;
+    font.setFamilies({QStringLiteral("Arial"), QStringLiteral("Liberation Sans")});
+    return font;
+}
+
+}  // namespace
+
+StatusRow::StatusRow(QWidget* parent) : QWidget(parent) {
+    auto* grid = new QGridLayout(this);
+    grid->setContentsMargins(0, 0, 0, 0);
+    grid->setHorizontalSpacing(3);
+    grid->setVerticalSpacing(1);
+    Gen1_Label = named<QLabel>("Gen1_Label", QStringLiteral("Status :"), this);
+    Gen1_Label->setTextFormat(Qt::PlainText);
+    grid->addWidget(Gen1_Label, 0, 0, 2, 1);
+    int column = 1;
+    for (const Pair& pair : kPairs) {
+        Status[pair.heading] = element<QLabel>("Status", pair.heading, toText(pair.caption), this);
+        Status[pair.value] = element<QLabel>("Status", pair.value, toText(pair.design), this);
+        for (QLabel* label : {Status[pair.heading], Status[pair.value]}) {
+            label->setFont(arial(font()));
+            label->setTextFormat(Qt::PlainText);
+            label->setAlignment(Qt::AlignCenter);
+        }
+        QLabel* value = Status[pair.value];
+        value->setFrameStyle(QFrame::Panel | QFrame::Sunken);
+        value->setAutoFillBackground(true);
+        value->setAccessibleName(toText(pair.caption));
+        const QString sample(pair.widest, pair.widest > 8 ? QLatin1Char('e') : QLatin1Char('0'));
+        value->setMinimumWidth(value->fontMetrics().horizontalAdvance(sample) + 6);
+        value->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Fixed);
+        grid->addWidget(Status[pair.heading], 0, column);
+        grid->addWidget(value, 1, column);
+        grid->setColumnStretch(column, pair.widest);
+        ++column;
+    }
+}
+
+void StatusRow::label(const Captions& captions) {
+    Gen1_Label->setText(toText(captions.own(307, "Status :")));
+    Status[16]->setText(toText(captions.text(220)));
+    Status[12]->setText(toText(captions.text(221)));
+    Status[15]->setText(toText(captions.text(222)));
+}
+
+void StatusRow::show(StatusSlot slot, const QString& text) {
+    at(slot)->setText(text);
+    at(slot)->setToolTip(text);
+}
+
+void StatusRow::show(StatusSlot slot, std::string_view bytes) {
+    show(slot, toText(bytes));
+}
+
+QString StatusRow::text(StatusSlot slot) const {
+    return at(slot)->text();
+}
+
+void StatusRow::setAnnouncing(bool announcing) {
+    QPalette palette = at(StatusSlot::Ta)->palette();
+    const QPalette window = QWidget::palette();
+    // Light green of the standard sixteen colours, with black text whatever the theme.
+    palette.setColor(QPalette::Window, announcing ? QColor(0, 255, 0) : window.color(QPalette::Button));
+    palette.setColor(QPalette::WindowText, announcing ? QColor(Qt::black) : window.color(QPalette::ButtonText));
+    at(StatusSlot::Ta)->setPalette(palette);
+}
+
+}  // namespace kdx

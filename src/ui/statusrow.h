@@ -1,0 +1,51 @@
+#pragma once
+
+#include <QLabel>
+#include <QWidget>
+
+#include <array>
+#include <string_view>
+
+namespace kdx {
+
+class Captions;
+
+/// Elements of the `Status` array that show a value.
+enum class StatusSlot : std::size_t {
+    Ta = 0,
+    MusicSpeech = 1,
+    Pi = 2,
+    Ps = 3,
+    Pty = 4,
+    Tp = 10,
+    RfLevel = 13,
+    AudioFrequency = 14,
+    RfFrequency = 17,
+};
+
+/// The row of status indicators: nine headings with a value under each, and `Gen1_Label` before them.
+class StatusRow : public QWidget {
+    Q_OBJECT
+public:
+    static constexpr std::size_t kSlots = 18;
+
+    explicit StatusRow(QWidget* parent);
+
+    /// Captions the headings in the current language; the values stay.
+    void label(const Captions& captions);
+
+    void show(StatusSlot slot, const QString& text);
+    void show(StatusSlot slot, std::string_view bytes);
+    /// What the indicator reads: other handlers decide by it.
+    [[nodiscard]] QString text(StatusSlot slot) const;
+    /// Light green while an announcement runs, else the look of a button face.
+    void setAnnouncing(bool announcing);
+
+private:
+    [[nodiscard]] QLabel* at(StatusSlot slot) const { return Status.at(static_cast<std::size_t>(slot)); }
+
+    QLabel* Gen1_Label = nullptr;
+    std::array<QLabel*, kSlots> Status{};
+};
+
+}  // namespace kdx

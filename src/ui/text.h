@@ -1,0 +1,31 @@
+#pragma once
+
+#include <QString>
+
+#include <string>
+#include <string_view>
+
+#include "base/codepage.h"
+
+namespace kdx {
+
+/// 8-bit Windows-1252 text as the window shows it.
+[[nodiscard]] inline QString toText(std::string_view bytes) {
+    QString text(static_cast<qsizetype>(bytes.size()), Qt::Uninitialized);
+    qsizetype at = 0;
+    for (const char byte : bytes) text[at++] = QChar(fromCodePage(static_cast<unsigned char>(byte)));
+    return text;
+}
+
+/// The window's text as 8-bit Windows-1252; a character the code page does not have becomes '?', one a character.
+[[nodiscard]] inline std::string toBytes(const QString& text) {
+    std::string bytes;
+    bytes.reserve(static_cast<std::size_t>(text.size()));
+    for (qsizetype at = 0; at < text.size(); ++at) {
+        bytes.push_back(toCodePage(text[at].unicode()));
+        if (text[at].isHighSurrogate() && at + 1 < text.size() && text[at + 1].isLowSurrogate()) ++at;
+    }
+    return bytes;
+}
+
+}  // namespace kdx

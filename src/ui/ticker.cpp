@@ -1,0 +1,32 @@
+#include "ui/ticker.h"
+
+#include <cmath>
+#include <stdexcept>
+
+namespace kdx {
+
+Ticker::Ticker(QObject* parent) : QTimer(parent) {
+    setTimerType(Qt::PreciseTimer);  // the default timer is up to 50 ms late
+}
+
+void Ticker::setEnabled(bool enabled) {
+    m_enabled = enabled;
+    apply();
+}
+
+void Ticker::setPeriod(double milliseconds) {
+    const double whole = std::nearbyint(milliseconds);
+    if (!(whole >= 0 && whole <= kLongestInterval)) throw std::out_of_range("timer interval");
+    m_period = static_cast<int>(whole);
+    apply();
+}
+
+void Ticker::apply() {
+    if (m_enabled && m_period > 0) {
+        start(m_period);
+    } else {
+        stop();
+    }
+}
+
+}  // namespace kdx

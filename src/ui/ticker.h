@@ -1,0 +1,31 @@
+#pragma once
+
+#include <QTimer>
+
+namespace kdx {
+
+/// A timer of the window: it ticks while it is enabled and its interval is above 0, as the window's timers are
+/// described; setting either starts the interval anew.
+class Ticker : public QTimer {
+    Q_OBJECT
+public:
+    /// Longest interval a timer takes, in milliseconds.
+    static constexpr int kLongestInterval = 65535;
+
+    explicit Ticker(QObject* parent);
+
+    void setEnabled(bool enabled);
+    [[nodiscard]] bool isEnabled() const { return m_enabled; }
+
+    /// @param milliseconds 0 to 65535; 0 stops the ticks. @throws std::out_of_range beyond, and nothing changes.
+    void setPeriod(double milliseconds);
+    [[nodiscard]] int period() const { return m_period; }
+
+private:
+    void apply();
+
+    bool m_enabled = false;
+    int m_period = 0;
+};
+
+}  // namespace kdx

@@ -1,0 +1,125 @@
+#pragma once
+
+#include <gtest/gtest.h>
+
+#include <QAbstractButton>
+#include <QApplication>
+#include <QComboBox>
+#include <QLabel>
+#include <QLineEdit>
+#include <QScrollBar>
+#include <QTimer>
+#include <QTimerEvent>
+
+#include <string>
+#include <vector>
+
+#include "link/instrument.h"
+#include "rds/sendparam.h"
+#include "settings/captions.h"
+#include "settings/datafolder.h"
+#include "settings/profilefile.h"
+#include "settings/programstate.h"
+#include "support/fakeclock.h"
+#include "support/fakevisa.h"
+#include "support/scripteddialogs.h"
+#include "support/tempfolder.h"
+#include "ui/pagecontext.h"
+#include "ui/statusrow.h"
+#include "ui/text.h"
+
+namespace kdx::test {
+
+using Lines = std::vector<std::string>;
+
+/// Looks for controls by the system's names and does with them what a user does.
+class ControlTest : public ::testing::Test {
+protected:
+    /// The window or page whose controls are meant.
+    virtual QWidget& root() = 0;
+
+    template <typename Control = QWidget>
+    Control* find(const char* name) {
+        auto* control = root().template findChild<Control*>(QString::fromLatin1(name));
+        if (control == nullptr) throw std::runtime_error(std::string("no control ") + name);
+        return control;
+    }
+    /// Presses a button, an option or a check box as a mouse does: nothing happens when it is disabled.
+    void click(const char* name) { find<QAbstractButton>(name)->click(); }
+    void type(const char* name, const char* utf8) { find<QLineEdit>(name)->setText(QString::fromUtf8(utf8)); }
+    void scroll(const char* name, int value) { find<QScrollBar>(name)->setValue(value); }
+    /// Chooses an entry of a drop-down list as a user does.
+    void select(const char* name, int index) {
+        auto* combo = find<QComboBox>(name);
+        combo->setCurrentIndex(index);
+        emit combo->activated(index);
+    }
+    /// What a label, a button or a text box reads, as UTF-8.
+    std::string text(const char* name) {
+        if (auto* label = root().findChild<QLabel*>(QString::fromLatin1(name))) return label->text().toStdString();
+        if (auto* box = root().findChild<QLineEdit*>(QString::fromLatin1(name))) return box->text().toStdString();
+        if (auto* combo = root().findChild<QComboBox*>(QString::fromLatin1(name))) {
+            return combo->currentText().toStdString();
+        }
+        return find<QAbstractButton>(name)->text().toStdString();
+    }
+    bool checked(const char* name) { return find<QAbstractButton>(name)->isChecked(); }
+    /// Whether the control itself may be used, a closed session left aside.
+    bool enabled(const char* name) {
+        auto* control = find(name);
+        return control->isEnabledTo(control->parentWidget());
+    }
+    /// Lets a timer that is running tick once; false when it is not running.
+    bool tick(const char* name) {
+        auto* timer = find<QTimer>(name);
+        if (!timer->isActive()) return false;
+        QTimerEvent event(timer->timerId());
+        QApplication::sendEvent(timer, &event);
+        return true;
+    }
+};
+
+/// A page on its own with everything it works with: scripted instrument and boxes, a clock that stands still, a data
+/// folder with the shipped texts and otherwise empty profile files. The session counts as open.
+class PageTest : public ControlTest {
+protected:
+    PageTest() {
+        const auto languages = std::filesystem::path(KDX_SOURCE_DIR) / "Daten" / kLanguageFile;
+        std::filesystem::copy_file(languages, folder.data() / kLanguageFile);
+        state.InstrumentOnline = true;
+        useLanguage("deutsch");
+    }
+
+    void useLanguage(const std::string& language, const std::string& standard = "RDS") {
+        state.language = language;
+        state.standard = standard;
+        captions.load(language, standard);
+    }
+    /// Every command sent since the last call, in order.
+    Lines sent() { return std::exchange(visa.written, {}); }
+    std::string profile(const std::string& file, const std::string& section, const std::string& key) const {
+        return data.ReadIni(section, key, file);
+    }
+    void setProfile(const std::string& file, const std::string& section, const std::string& key,
+                    const std::string& value) {
+        data.WriteIni(section, key, value, file);
+    }
+    std::string status(StatusSlot slot) const { return statusRow.text(slot).toStdString(); }
+
+    TempFolder folder;
+    DataFolder data{folder.path()};
+    FakeVisa visa;
+    FakeClock clock;
+    ProgramState state;
+    Captions captions{data};
+    StatusRow statusRow{nullptr};
+    ScriptedDialogs dialogs;
+    std::string clockText = "12:00:00";  ///< what `Uhr_Zeit` reads where no page shows it
+    Instrument instrument{visa, state, data, clock, [this](const std::string& text) {
+                              dialogs.message(Dialogs::Icon::Critical, QStringLiteral("Interface Error"), toText(text));
+                          }};
+    ParamSender params{instrument, state, clock, [this] { return clockText; }, [] {}};
+    PageContext context{params, instrument, state, statusRow, captions, dialogs, data, clock};
+};
+
+}  // namespace kdx::test

@@ -1,0 +1,66 @@
+#pragma once
+
+#include <gtest/gtest.h>
+
+#include <QString>
+
+#include <deque>
+#include <string>
+#include <vector>
+
+#include "ui/dialogs.h"
+
+namespace kdx::test {
+
+/// Boxes that answer in turn; a box nobody expected fails the test.
+class ScriptedDialogs final : public Dialogs {
+public:
+    struct Shown {
+        Icon icon = Icon::None;
+        QString title;
+        QString text;
+        QString preset;
+    };
+
+    void message(Icon icon, const QString& title, const QString& text) override {
+        shown.push_back({icon, title, text, {}});
+        if (expectedMessages > 0) {
+            --expectedMessages;
+        } else {
+            ADD_FAILURE() << "unexpected box: " << title.toStdString() << " | " << text.toStdString();
+        }
+    }
+    bool confirm(const QString& title, const QString& text) override {
+        shown.push_back({Icon::None, title, text, {}});
+        if (confirmations.empty()) {
+            ADD_FAILURE() << "unexpected question: " << text.toStdString();
+            return false;
+        }
+        const bool answer = confirmations.front();
+        confirmations.pop_front();
+        return answer;
+    }
+    QString input(const QString& prompt, const QString& title, const QString& preset) override {
+        shown.push_back({Icon::None, title, prompt, preset});
+        if (inputs.empty()) {
+            ADD_FAILURE() << "unexpected input box: " << prompt.toStdString();
+            return {};
+        }
+        const QString answer = inputs.front();
+        inputs.pop_front();
+        return answer;
+    }
+
+    ~ScriptedDialogs() override {
+        EXPECT_EQ(expectedMessages, 0) << "a box that was expected did not show";
+        EXPECT_TRUE(inputs.empty()) << "an input box that was expected did not show";
+        EXPECT_TRUE(confirmations.empty()) << "a question that was expected was not asked";
+    }
+
+    int expectedMessages = 0;        ///< how many message boxes may still come
+    std::deque<QString> inputs;      ///< answers of the input boxes, in turn; empty for Cancel
+    std::deque<bool> confirmations;  ///< answers of the Yes/No boxes, in turn
+    std::vector<Shown> shown;        ///< every box, in order
+};
+
+}  // namespace kdx::test
