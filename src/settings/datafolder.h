@@ -5,6 +5,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 namespace kdx {
 
@@ -41,17 +42,17 @@ public:
     /// nothing and opens no box: it is kept in unsavedFile() until a write to the same file succeeds.
     void WriteIni(std::string_view section, std::string_view key, std::string_view value, std::string_view fileName);
 
-    /// Name of a file that could not be written and has not been written since; nothing when all is saved.
-    [[nodiscard]] const std::optional<std::string>& unsavedFile() const { return m_unsavedFile; }
+    /// Name of the file that could not be written last and has not been written since; nothing when all is saved.
+    [[nodiscard]] std::optional<std::string> unsavedFile() const;
 
     /// Called whenever unsavedFile() changes.
     void onUnsavedFileChanged(std::function<void()> callback) { m_unsavedFileChanged = std::move(callback); }
 
 private:
-    void setUnsavedFile(std::optional<std::string> name);
+    void noteSaved(std::string_view fileName, bool saved);
 
     std::filesystem::path m_path;
-    std::optional<std::string> m_unsavedFile;
+    std::vector<std::string> m_unsavedFiles;  // the one that failed last at the end
     std::function<void()> m_unsavedFileChanged;
 };
 

@@ -1,0 +1,77 @@
+#include <fcntl.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <cerrno>
+
+#include "settings/durablefile.h"
+
+namespace kdx {
+
+namespace {
+
+/// An open file, closed with the scope.
+class Descriptor {
+public:
+    explicit Descriptor(int number) : m_number(number) {}
+    ~Descriptor() {
+        if (m_number >= 0) ::close(m_number);
+    }
+    Descriptor(const Descriptor&) = delete;
+    Descriptor& operator=(const Descriptor&) = delete;
+
+    [[nodiscard]] bool valid() const { return m_number >= 0; }
+    [[nodiscard]] int number() const { return m_number; }
+    /// Some file systems tell only here that the bytes did not fit.
+    [[nodiscard]] bool close() {
+        const int number = m_number;
+        m_number = -1;
+        return ::close(number) == 0;
+    }
+
+private:
+    int m_number;
+};
+
+bool writeAll(int file, std::string_view bytes) {
+    while (!bytes.empty()) {
+        const ssize_t written = ::write(file, bytes.data(), bytes.size());
+        if (written < 0 && errno == EINTR) continue;
+        if (written <= 0) return false;
+        bytes.remove_prefix(static_cast<std::size_t>(written));
+    }
+    return true;
+}
+
+bool takeOver(int file, const struct stat& model) {
+    if (::fchown(file, model.st_uid, model.st_gid) != 0) {
+        // Only the administrator may give files away. Whoever may write another user's settings saves them under his
+        // own name then, so that a shared data folder stays usable; the group is kept where he belongs to it.
+        [[maybe_unused]] const int kept = ::fchown(file, static_cast<uid_t>(-1), model.st_gid);
+    }
+    return ::fchmod(file, model.st_mode & 07777) == 0;  // after the owner: a new owner clears bits of the mode
+}
+
+}  // namespace
+
+bool userMayWrite(const std::filesystem::path& file) {
+    return ::faccessat(AT_FDCWD, file.c_str(), W_OK, AT_EACCESS) == 0;
+}
+
+bool writeNewFile(const std::filesystem::path& file, std::string_view bytes, const std::filesystem::path& model) {
+    struct stat modelStatus {};
+    const bool hasModel = ::stat(model.c_str(), &modelStatus) == 0;
+    const mode_t mode = hasModel ? 0600 : 0666;  // a model's mode is set below; without one the user's mask decides
+    Descriptor descriptor(::open(file.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, mode));
+    if (!descriptor.valid()) return false;
+    if (!writeAll(descriptor.number(), bytes)) return false;
+    if (hasModel && !takeOver(descriptor.number(), modelStatus)) return false;
+    return ::fsync(descriptor.number()) == 0 && descriptor.close();
+}
+
+void flushFolder(const std::filesystem::path& folder) {
+    const Descriptor descriptor(::open(folder.empty() ? "." : folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC));
+    if (descriptor.valid()) ::fsync(descriptor.number());
+}
+
+}  // namespace kdx

@@ -1,0 +1,129 @@
+// What replacing a file promises where owners, devices and limits are known.
+#include <gtest/gtest.h>
+#include <sys/resource.h>
+#include <sys/stat.h>
+#include <sys/wait.h>
+
+#include <csignal>
+
+#include "settings/profilefile.h"
+#include "support/tempfolder.h"
+#include "support/unprivileged.h"
+
+namespace kdx {
+namespace {
+
+namespace fs = std::filesystem;
+
+constexpr uid_t kSomeUser = 12345;
+constexpr gid_t kSomeGroup = 23456;
+
+class ReplaceFilePosixTest : public ::testing::Test {
+protected:
+    [[nodiscard]] fs::path path(const char* name) const { return m_folder.data() / name; }
+    [[nodiscard]] struct stat statusOf(const char* name) const {
+        struct stat status {};
+        EXPECT_EQ(::stat(path(name).c_str(), &status), 0);
+        return status;
+    }
+    [[nodiscard]] std::ptrdiff_t entries() const {
+        return std::distance(fs::directory_iterator(m_folder.data()), fs::directory_iterator());
+    }
+    test::TempFolder m_folder;
+};
+
+TEST_F(ReplaceFilePosixTest, KeepsTheOwnerAndEveryBitOfTheMode) {
+    if (geteuid() != 0) GTEST_SKIP() << "only the administrator can give a file away";
+    m_folder.write("a.ini", "old");
+    ASSERT_EQ(::chown(path("a.ini").c_str(), kSomeUser, kSomeGroup), 0);
+    ASSERT_EQ(::chmod(path("a.ini").c_str(), 02664), 0);
+    EXPECT_TRUE(replaceFile(path("a.ini"), "new"));
+    const struct stat status = statusOf("a.ini");
+    EXPECT_EQ(status.st_uid, kSomeUser);
+    EXPECT_EQ(status.st_gid, kSomeGroup);
+    EXPECT_EQ(status.st_mode & 07777, 02664U);
+    EXPECT_EQ(m_folder.read("a.ini"), "new");
+}
+
+TEST_F(ReplaceFilePosixTest, SavesAnotherUsersFileThatEverybodyMayWrite) {
+    if (geteuid() != 0) GTEST_SKIP() << "only the administrator can play two users";
+    m_folder.write("a.ini", "old");
+    ASSERT_EQ(::chmod(path("a.ini").c_str(), 0666), 0);
+    ASSERT_EQ(::chmod(m_folder.data().c_str(), 0777), 0);
+    {
+        const test::Unprivileged user;
+        EXPECT_TRUE(replaceFile(path("a.ini"), "new"));
+    }
+    EXPECT_EQ(m_folder.read("a.ini"), "new");
+    EXPECT_EQ(statusOf("a.ini").st_mode & 07777, 0666U);
+}
+
+TEST_F(ReplaceFilePosixTest, LeavesAFileThatTheUserMayNotWriteAsItIs) {
+    if (geteuid() != 0) GTEST_SKIP() << "only the administrator can play two users";
+    m_folder.write("a.ini", "old");
+    ASSERT_EQ(::chmod(path("a.ini").c_str(), 0644), 0);
+    ASSERT_EQ(::chmod(m_folder.data().c_str(), 0777), 0);
+    {
+        const test::Unprivileged user;
+        EXPECT_FALSE(replaceFile(path("a.ini"), "new"));
+    }
+    EXPECT_EQ(m_folder.read("a.ini"), "old");
+    EXPECT_EQ(entries(), 1);
+}
+
+TEST_F(ReplaceFilePosixTest, ANewFileGetsTheModeThatTheUsersMaskLeaves) {
+    const mode_t before = ::umask(027);
+    EXPECT_TRUE(replaceFile(path("a.ini"), "new"));
+    ::umask(before);
+    EXPECT_EQ(statusOf("a.ini").st_mode & 07777, 0640U);
+}
+
+TEST_F(ReplaceFilePosixTest, FailsInAReadOnlyFolder) {
+    m_folder.write("a.ini", "old");
+    ASSERT_EQ(::chmod(path("a.ini").c_str(), 0666), 0);
+    ASSERT_EQ(::chmod(m_folder.data().c_str(), 0555), 0);
+    {
+        const test::Unprivileged user;
+        EXPECT_FALSE(replaceFile(path("a.ini"), "new"));
+        EXPECT_FALSE(replaceFile(path("b.ini"), "new"));
+    }
+    EXPECT_EQ(m_folder.read("a.ini"), "old");
+    EXPECT_EQ(entries(), 1);
+}
+
+TEST_F(ReplaceFilePosixTest, NeverReplacesADevice) {
+    fs::create_symlink("/dev/full", path("a.ini"));
+    EXPECT_FALSE(replaceFile(path("a.ini"), "new"));
+    EXPECT_TRUE(fs::is_character_file("/dev/full"));
+}
+
+TEST_F(ReplaceFilePosixTest, AFullDiskLeavesTheOldFileAndNothingElse) {
+    m_folder.write("a.ini", "old");
+    const pid_t child = fork();
+    ASSERT_GE(child, 0);
+    if (child == 0) {
+        // The disk takes 4096 more bytes: the write beside the file gets stuck half-way.
+        std::signal(SIGXFSZ, SIG_IGN);
+        const rlimit limit{4096, 4096};
+        const bool limited = ::setrlimit(RLIMIT_FSIZE, &limit) == 0;
+        const bool replaced = replaceFile(path("a.ini"), std::string(10000, 'x'));
+        _exit(limited && !replaced ? 0 : 1);
+    }
+    int status = 0;
+    ASSERT_EQ(::waitpid(child, &status, 0), child);
+    EXPECT_TRUE(WIFEXITED(status));
+    EXPECT_EQ(WEXITSTATUS(status), 0);
+    EXPECT_EQ(m_folder.read("a.ini"), "old");
+    EXPECT_EQ(entries(), 1);
+}
+
+TEST_F(ReplaceFilePosixTest, ARelativeNameMeansTheCurrentFolder) {
+    const fs::path before = fs::current_path();
+    fs::current_path(m_folder.data());
+    EXPECT_TRUE(replaceFile("a.ini", "new"));
+    fs::current_path(before);
+    EXPECT_EQ(m_folder.read("a.ini"), "new");
+}
+
+}  // namespace
+}  // namespace kdx
