@@ -1,10 +1,6 @@
-// What replacing a file promises where owners, devices and limits are known.
+// What replacing a file promises where owners and devices are known.
 #include <gtest/gtest.h>
-#include <sys/resource.h>
 #include <sys/stat.h>
-#include <sys/wait.h>
-
-#include <csignal>
 
 #include "settings/profilefile.h"
 #include "support/tempfolder.h"
@@ -95,26 +91,6 @@ TEST_F(ReplaceFilePosixTest, NeverReplacesADevice) {
     fs::create_symlink("/dev/full", path("a.ini"));
     EXPECT_FALSE(replaceFile(path("a.ini"), "new"));
     EXPECT_TRUE(fs::is_character_file("/dev/full"));
-}
-
-TEST_F(ReplaceFilePosixTest, AFullDiskLeavesTheOldFileAndNothingElse) {
-    m_folder.write("a.ini", "old");
-    const pid_t child = fork();
-    ASSERT_GE(child, 0);
-    if (child == 0) {
-        // The disk takes 4096 more bytes: the write beside the file gets stuck half-way.
-        std::signal(SIGXFSZ, SIG_IGN);
-        const rlimit limit{4096, 4096};
-        const bool limited = ::setrlimit(RLIMIT_FSIZE, &limit) == 0;
-        const bool replaced = replaceFile(path("a.ini"), std::string(10000, 'x'));
-        _exit(limited && !replaced ? 0 : 1);
-    }
-    int status = 0;
-    ASSERT_EQ(::waitpid(child, &status, 0), child);
-    EXPECT_TRUE(WIFEXITED(status));
-    EXPECT_EQ(WEXITSTATUS(status), 0);
-    EXPECT_EQ(m_folder.read("a.ini"), "old");
-    EXPECT_EQ(entries(), 1);
 }
 
 TEST_F(ReplaceFilePosixTest, ARelativeNameMeansTheCurrentFolder) {
