@@ -68,6 +68,12 @@ std::string_view withoutQuotes(std::string_view value) {
     return quoted ? value.substr(1, value.size() - 2) : value;
 }
 
+std::string valueOf(std::string_view lineText, std::size_t longest) {
+    const std::size_t equals = lineText.find('=');
+    if (equals == std::string_view::npos) return {};
+    return std::string(withoutQuotes(trimmed(lineText.substr(equals + 1))).substr(0, longest));
+}
+
 Place find(std::string_view bytes, std::string_view section, std::string_view key) {
     Place place;
     Line line;
@@ -100,10 +106,25 @@ ProfileText::ProfileText(std::string bytes) : m_bytes(std::move(bytes)) {}
 std::string ProfileText::value(std::string_view section, std::string_view key, std::size_t longest) const {
     const Place place = find(m_bytes, trimmed(section), trimmed(key));
     if (!place.keyLine) return {};
-    const std::string_view text = textOf(m_bytes, *place.keyLine);
-    const std::size_t equals = text.find('=');
-    if (equals == std::string_view::npos) return {};
-    return std::string(withoutQuotes(trimmed(text.substr(equals + 1))).substr(0, longest));
+    return valueOf(textOf(m_bytes, *place.keyLine), longest);
+}
+
+std::map<std::string, std::string> ProfileText::section(std::string_view name) const {
+    std::map<std::string, std::string> values;
+    bool found = false;
+    Line line;
+    for (std::size_t at = 0; at < m_bytes.size(); at = line.next) {
+        line = lineAt(m_bytes, at);
+        const std::string_view text = textOf(m_bytes, line);
+        if (text.empty() || text.front() == ';') continue;
+        if (text.front() == '[') {
+            if (found) break;
+            found = equalNoCase(sectionOf(text), trimmed(name));
+        } else if (found) {
+            values.emplace(keyOf(text), valueOf(text, kLongestValue));
+        }
+    }
+    return values;
 }
 
 void ProfileText::setValue(std::string_view section, std::string_view key, std::string_view value) {

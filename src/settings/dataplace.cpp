@@ -1,0 +1,60 @@
+#include "settings/dataplace.h"
+
+#include <cstdlib>
+#include <fstream>
+
+#include "settings/datafolder.h"
+
+namespace kdx {
+
+namespace fs = std::filesystem;
+
+namespace {
+
+bool isWritableFolder(const fs::path& folder) {
+    std::error_code error;
+    if (!fs::is_directory(folder, error)) return false;
+    const fs::path probe = folder / ".kdx-rds-writable";
+    const bool written = std::ofstream(probe, std::ios::app).good();
+    fs::remove(probe, error);
+    return written;
+}
+
+void fillFrom(const fs::path& shipped, const DataFolder& target, std::string& problem) {
+    std::error_code error;
+    fs::create_directories(target.path(), error);
+    for (auto entry = fs::directory_iterator(shipped, error); !error && entry != fs::directory_iterator();
+         entry.increment(error)) {
+        const fs::path file = target.file(entry->path().filename().string());
+        // copy_options::skip_existing does not see a file whose name differs in letter case only; file() does.
+        if (fs::exists(file)) continue;
+        fs::copy_file(entry->path(), file, error);
+        if (error) break;
+    }
+    if (error) problem = target.path().string() + ": " + error.message();
+}
+
+}  // namespace
+
+fs::path chooseAppFolder(const DataPlaces& places, std::string& problem) {
+    if (places.asked) return *places.asked;
+    if (isWritableFolder(DataFolder(places.program).path())) return places.program;
+    fillFrom(DataFolder(places.shipped).path(), DataFolder(places.user), problem);
+    return places.user;
+}
+
+fs::path userFolder() {
+    const auto variable = [](const char* name) -> fs::path {
+        const char* value = std::getenv(name);
+        return value == nullptr ? fs::path() : fs::path(value);
+    };
+#ifdef _WIN32
+    return variable("APPDATA") / "KDX-RDS";
+#else
+    const fs::path data = variable("XDG_DATA_HOME");
+    // The XDG base directory standard: a relative path there is to be ignored.
+    return (data.is_absolute() ? data : variable("HOME") / ".local" / "share") / "kdx-rds";
+#endif
+}
+
+}  // namespace kdx

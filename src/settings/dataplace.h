@@ -1,0 +1,25 @@
+#pragma once
+
+#include <filesystem>
+#include <optional>
+#include <string>
+
+namespace kdx {
+
+/// Where the program looks for its folder, in this order of precedence.
+struct DataPlaces {
+    std::optional<std::filesystem::path> asked;  ///< given on the command line
+    std::filesystem::path program;               ///< the folder of the program file
+    std::filesystem::path user;                  ///< the user's own folder for this program
+    std::filesystem::path shipped;               ///< holds the "Daten" that came with the program
+};
+
+/// The program's folder whose "Daten" is used: the one asked for; else the program's own when it holds a writable
+/// "Daten"; else the user's, whose "Daten" gets every shipped file it does not have yet. Nothing is ever overwritten.
+/// @param problem gets a message when the user's folder could not be filled.
+[[nodiscard]] std::filesystem::path chooseAppFolder(const DataPlaces& places, std::string& problem);
+
+/// The user's folder for this program: XDG_DATA_HOME or ~/.local/share, %APPDATA% on Windows.
+[[nodiscard]] std::filesystem::path userFolder();
+
+}  // namespace kdx
