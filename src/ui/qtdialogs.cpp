@@ -30,9 +30,10 @@ QMessageBox::Icon boxIcon(Dialogs::Icon icon) {
 
 QtDialogs::QtDialogs(const Captions& captions) : m_captions(captions) {}
 
-void QtDialogs::message(Icon icon, const QString& title, const QString& text) {
+void QtDialogs::message(Icon icon, const QString& title, const QString& text, const QString& details) {
     QMessageBox box(boxIcon(icon), title, text, QMessageBox::NoButton, QApplication::activeWindow());
     box.setTextFormat(Qt::PlainText);
+    box.setInformativeText(details);
     box.addButton(toText(m_captions.own(317, "OK")), QMessageBox::AcceptRole);
     box.exec();
 }

@@ -13,7 +13,7 @@ class QtDialogs final : public Dialogs {
 public:
     explicit QtDialogs(const Captions& captions);
 
-    void message(Icon icon, const QString& title, const QString& text) override;
+    void message(Icon icon, const QString& title, const QString& text, const QString& details = {}) override;
     bool confirm(const QString& title, const QString& text) override;
     QString input(const QString& prompt, const QString& title, const QString& preset) override;
 

@@ -19,11 +19,11 @@ public:
         Icon icon = Icon::None;
         QString title;
         QString text;
-        QString preset;
+        QString preset;  ///< of an input box; of a message box the details
     };
 
-    void message(Icon icon, const QString& title, const QString& text) override {
-        shown.push_back({icon, title, text, {}});
+    void message(Icon icon, const QString& title, const QString& text, const QString& details = {}) override {
+        shown.push_back({icon, title, text, details});
         if (expectedMessages > 0) {
             --expectedMessages;
         } else {

@@ -1,0 +1,100 @@
+#include "rds/querypage.h"
+
+#include <QFrame>
+#include <QGridLayout>
+#include <QGroupBox>
+#include <QLabel>
+#include <QPushButton>
+
+#include <array>
+
+#include "link/instrument.h"
+#include "rds/readback.h"
+#include "settings/captions.h"
+#include "settings/programstate.h"
+#include "ui/controls.h"
+#include "ui/text.h"
+
+namespace kdx {
+
+namespace {
+
+constexpr int kColumns = 5;
+
+// The buttons by what they ask about, row by row, as indexes into readBacks(): programme, traffic and time, networks
+// and lists, multiplex, generator. A line separates the coder's data from the signal.
+constexpr int kCoderRows = 2;
+constexpr std::array kOrder = {2,  3,  4,  17, 18,   // PS, PI, PTY, M/S, DI
+                               5,  6,  1,  16, 14,   // RT, time, AF, EON, groups
+                               13, 0,  11, 12, 8,    // RDS, ARI, pilot, stereo mode, FM deviation
+                               9,  10, 15, 7,  19};  // source, pre-emphasis, impedance, frequency, level
+
+}  // namespace
+
+QueryPage::QueryPage(const PageContext& with, QWidget* parent) : QWidget(parent), m_with(with) {
+    for (const ReadBack& readBack : readBacks()) {
+        auto* button = named<QPushButton>(readBack.button, this);
+        connect(button, &QPushButton::clicked, this, [this, &readBack] { ask(readBack); });
+        m_buttons.push_back(button);
+    }
+    gelesen = named<QLabel>("gelesen", this);
+    gelesen->setTextFormat(Qt::PlainText);
+    gelesen->setFrameStyle(QFrame::Panel | QFrame::Sunken);
+    gelesen->setAlignment(Qt::AlignLeft | Qt::AlignTop);
+    gelesen->setWordWrap(true);
+    gelesen->setMargin(6);
+    gelesen->setTextInteractionFlags(Qt::TextSelectableByMouse | Qt::TextSelectableByKeyboard);
+    gelesen->setMinimumHeight(gelesen->fontMetrics().lineSpacing() * 7 + 16);
+
+    auto* grid = new QGridLayout;
+    grid->setSpacing(kGap);
+    int row = 0;
+    int column = 0;
+    QWidget* previous = nullptr;
+    for (const int index : kOrder) {
+        QPushButton* button = m_buttons[static_cast<std::size_t>(index)];
+        grid->addWidget(button, row, column);
+        if (previous != nullptr) setTabOrder(previous, button);
+        previous = button;
+        if (++column == kColumns) {
+            column = 0;
+            if (++row == kCoderRows) {
+                auto* line = new QFrame(this);
+                line->setFrameStyle(QFrame::HLine | QFrame::Sunken);
+                grid->addWidget(line, row++, 0, 1, kColumns);
+            }
+        }
+    }
+    auto* line = new QFrame(this);
+    line->setFrameStyle(QFrame::HLine | QFrame::Sunken);
+    auto* page = new QVBoxLayout(this);
+    tighten(page, 8);
+    page->addLayout(grid);
+    page->addWidget(line);
+    page->addWidget(gelesen, 1);
+}
+
+void QueryPage::label() {
+    for (std::size_t i = 0; i < m_buttons.size(); ++i) {
+        const ReadBack& readBack = readBacks()[i];
+        m_buttons[i]->setText(toText(readBack.caption < 300 ? m_with.captions.text(readBack.caption)
+                                                            : m_with.captions.own(readBack.caption, readBack.design)));
+    }
+    gelesen->setText(toText(m_with.captions.text(139)));
+}
+
+void QueryPage::Fragen_Schalter(bool on) {
+    for (QPushButton* button : m_buttons) button->setEnabled(on);
+}
+
+void QueryPage::ask(const ReadBack& readBack) {
+    if (!m_with.state.InstrumentOnline) return;
+    std::vector<std::string> answers;
+    for (const Query& query : readBack.queries(m_with.state.eonIdentifier)) {
+        answers.push_back(readBack.generator ? m_with.instrument.VRN_Abfrage(query.label, query.key)
+                                             : m_with.instrument.X4_Abfrage(query.label, query.key));
+    }
+    gelesen->setText(toText(readBack.words(answers, [this](int number) { return m_with.captions.text(number); })));
+}
+
+}  // namespace kdx

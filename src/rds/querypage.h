@@ -1,0 +1,35 @@
+#pragma once
+
+#include <QWidget>
+
+#include <vector>
+
+#include "ui/pagecontext.h"
+
+class QLabel;
+class QPushButton;
+
+namespace kdx {
+
+struct ReadBack;
+
+/// The page "Fragen": one button per parameter group asks the instrument; the answer is shown in words in `gelesen`.
+class QueryPage : public QWidget {
+    Q_OBJECT
+public:
+    QueryPage(const PageContext& with, QWidget* parent);
+    void label();
+
+    /// Switches the read-back buttons on or off.
+    void Fragen_Schalter(bool on);
+
+private:
+    /// What every button does: ask its questions in turn and show the answers; nothing while no session is open.
+    void ask(const ReadBack& readBack);
+
+    std::vector<QPushButton*> m_buttons;  // `Command1`, `Command4` to `Command22`, in that order
+    QLabel* gelesen = nullptr;            // the read-back label
+    PageContext m_with;
+};
+
+}  // namespace kdx

@@ -1,0 +1,229 @@
+#include "rds/readback.h"
+
+#include "base/numbers.h"
+
+namespace kdx {
+
+namespace readback {
+
+std::string decoderInfo(const std::string& answer, const Caption& caption) {
+    if (answer == "0") return "Mono";
+    if (answer == "1") return "Stereo";
+    if (answer == "2" || answer == "7") return "NN";
+    if (answer == "3") return "Stereo Kunstkopf";
+    if (answer == "4") return "Mono compressed";
+    if (answer == "5") return "Stereo compressed";
+    // The closing quote belongs to the text as it has always been shown.
+    if (answer == "6") return "Stereo compressed Kunstkopf\"";
+    return caption(143);
+}
+
+std::string musicSpeech(const std::string& answer, const Caption& caption) {
+    if (answer == "S") return caption(57);
+    if (answer == "M") return caption(56);
+    return answer.empty() ? caption(143) : answer;
+}
+
+std::string preemphasis(const std::string& answer, const Caption& caption) {
+    if (answer == "0") return caption(22);
+    if (answer == "1") return "50\xB5s";
+    if (answer == "2") return "75\xB5s";
+    return answer.empty() ? caption(143) : answer;
+}
+
+std::string impedance(const std::string& answer) {
+    if (answer == "2") return "Impedanz 100k ";
+    if (answer == "1") return "Impedanz 600 ";
+    return {};
+}
+
+std::string ariType(const std::string& answer, const Caption& caption) {
+    if (answer == "0") return caption(193);
+    if (answer == "1") return "DK";
+    if (answer == "2") return "BK";
+    if (answer == "3") return "BK + DK";
+    return answer.empty() ? caption(143) : answer;
+}
+
+std::string onOff(const std::string& answer, const Caption& caption) {
+    if (answer == "1") return caption(192);
+    if (answer == "0") return caption(193);
+    return answer.empty() ? caption(143) : answer;
+}
+
+std::string deviation(const std::string& answer, const Caption& caption) {
+    if (answer.empty()) return {};
+    return caption(21) + ": " + shortestDecimal(leadingNumber(answer) * 10) + " Hz";
+}
+
+}  // namespace readback
+
+namespace {
+
+using readback::Caption;
+using Answers = std::vector<std::string>;
+using Queries = std::vector<Query>;
+
+std::string asItStands(const Answers& answers, const Caption& /*caption*/) {
+    return answers[0];
+}
+
+std::string ari(const Answers& answers, const Caption& caption) {
+    return "ARI " + readback::onOff(answers[0], caption) + "\nARI " + readback::deviation(answers[1], caption) + "\n" +
+           readback::ariType(answers[2], caption) + "\n" + answers[3];
+}
+
+std::string afLists(const Answers& answers, const Caption& /*caption*/) {
+    std::string text;
+    for (std::size_t i = 0; i < answers.size(); ++i) {
+        if (i > 0) text += "\n";
+        text += "AF" + std::to_string(i + 1) + ": " + answers[i];
+    }
+    return text;
+}
+
+std::string fmDeviation(const Answers& answers, const Caption& caption) {
+    return answers[0].empty() ? std::string() : "FM " + readback::deviation(answers[0], caption);
+}
+
+std::string pilot(const Answers& answers, const Caption& caption) {
+    return "Pilot " + readback::onOff(answers[0], caption) + "\n" + readback::deviation(answers[1], caption) +
+           "\nPhase: " + answers[2] + "\xB0";
+}
+
+std::string rds(const Answers& answers, const Caption& caption) {
+    return "RDS " + readback::onOff(answers[0], caption) + "\n" + readback::deviation(answers[1], caption);
+}
+
+std::string eon(const Answers& answers, const Caption& /*caption*/) {
+    std::string text = "EON-PI:  " + answers[0] + " / EON-PS:  " + answers[1] + " / EON-TP:  " + answers[2] +
+                       " / EON-TA:  " + answers[3];
+    for (std::size_t list = 1; list <= 5; ++list) {
+        text += " / \nEON-AFB" + std::to_string(list) + ":  " + answers[3 + list];
+    }
+    return text;
+}
+
+Queries afQueries(const std::string& /*eonIdentifier*/) {
+    Queries queries;
+    for (int list = 1; list <= 5; ++list) {
+        queries.push_back({"AF_Liste" + std::to_string(list) + "?", "AF" + std::to_string(list)});
+    }
+    return queries;
+}
+
+Queries eonQueries(const std::string& eonIdentifier) {
+    Queries queries = {{"EON PI?", "EON-PI"},
+                       {"EON PS?", "EON-PS," + eonIdentifier},
+                       {"EON TP?", "EON-TP," + eonIdentifier},
+                       {"EON TA?", "EON-TA," + eonIdentifier}};
+    for (int list = 1; list <= 5; ++list) {
+        queries.push_back({"EON AFB?", "EON-AFB," + eonIdentifier + "," + std::to_string(list)});
+    }
+    return queries;
+}
+
+using Ask = const std::string&;
+
+}  // namespace
+
+const std::vector<ReadBack>& readBacks() {
+    static const std::vector<ReadBack> all = {
+        // "Stereo Mode??" bears two question marks; it reaches the log only.
+        {"Command1", "A R I ?", 134, false,
+         [](Ask) -> Queries {
+             return {{"Ari ein/aus?", "ARI"}, {"Ari Hub?", "ARI-DEV"}, {"ARI mode?", "ARI-ID"}, {"BK?", "BK"}};
+         },
+         ari},
+        {"Command4", "AF ?", 126, false, afQueries, afLists},
+        {"Command5", "PS ?", 123, false,
+         [](Ask) -> Queries {
+             return {{"PS?", "PS"}};
+         },
+         asItStands},
+        {"Command6", "PI ?", 127, false,
+         [](Ask) -> Queries {
+             return {{"PI?", "PI"}};
+         },
+         asItStands},
+        {"Command7", "PTY ?", 124, false,
+         [](Ask) -> Queries {
+             return {{"PTY?", "PTY"}};
+         },
+         asItStands},
+        {"Command8", "RT ?", 125, false,
+         [](Ask) -> Queries {
+             return {{"RT?", "RT"}};
+         },
+         asItStands},
+        {"Command9", "Zeit ?", 130, false,
+         [](Ask) -> Queries {
+             return {{"CT?", "CT"}};
+         },
+         asItStands},
+        {"Command10", "Freq ?", 520, true,
+         [](Ask) -> Queries {
+             return {{"Freq?", "FREQ"}};
+         },
+         [](const Answers& answers, const Caption&) { return answers[0] + " MHz"; }},
+        {"Command11", "FM Hub ?", 135, false,
+         [](Ask) -> Queries {
+             return {{"MPX Hub?", "MPX-DEV"}};
+         },
+         fmDeviation},
+        {"Command12", "FM Source ?", 136, false,
+         [](Ask) -> Queries {
+             return {{"Mod Eingang?", "SRC"}};
+         },
+         [](const Answers& answers, const Caption&) { return "Mod Quelle: " + answers[0]; }},
+        {"Command13", "Pre.phase ?", 137, false,
+         [](Ask) -> Queries {
+             return {{"Preemphasis?", "PRE"}};
+         },
+         [](const Answers& answers, const Caption& caption) { return readback::preemphasis(answers[0], caption); }},
+        {"Command14", "Pilot-Ton ?", 132, false,
+         [](Ask) -> Queries {
+             return {{"Pilot?", "PIL"}, {"Pilot Hub?", "PIL-DEV"}, {"Pilot Phase?", "PIL-PH"}};
+         },
+         pilot},
+        {"Command15", "Ster.-Mode ?", 133, false,
+         [](Ask) -> Queries {
+             return {{"Stereo Mode??", "MODE"}};
+         },
+         asItStands},
+        {"Command16", "R D S ?", 131, false,
+         [](Ask) -> Queries {
+             return {{"RDS?", "RDS"}, {"RDS-Hub?", "RDS-DEV"}};
+         },
+         rds},
+        {"Command17", "Gruppen ?", 122, false,
+         [](Ask) -> Queries {
+             return {{"Gruppenfolge?", "GS"}};
+         },
+         asItStands},
+        {"Command18", "Impedanz ?", 138, false,
+         [](Ask) -> Queries {
+             return {{"Impedanz?", "IMP"}};
+         },
+         [](const Answers& answers, const Caption&) { return readback::impedance(answers[0]); }},
+        {"Command19", "EON  ?", 121, false, eonQueries, eon},
+        {"Command20", "M / S ?", 129, false,
+         [](Ask) -> Queries {
+             return {{"M/S ?", "MS"}};
+         },
+         [](const Answers& answers, const Caption& caption) { return readback::musicSpeech(answers[0], caption); }},
+        {"Command21", "D I ?", 128, false,
+         [](Ask) -> Queries {
+             return {{"Decoder?", "DI"}};
+         },
+         [](const Answers& answers, const Caption& caption) { return readback::decoderInfo(answers[0], caption); }},
+        {"Command22", "Pegel ?", 521, true,
+         [](Ask) -> Queries {
+             return {{"Pegel?", "POW"}};
+         },
+         [](const Answers& answers, const Caption&) { return answers[0] + " dBm"; }},
+    };
+    return all;
+}
+
+}  // namespace kdx

@@ -1,0 +1,46 @@
+#pragma once
+
+#include <functional>
+#include <string>
+#include <vector>
+
+namespace kdx {
+
+/// How an answer becomes the text that is shown. Texts are 8-bit Windows-1252; "" stands for a failed read.
+namespace readback {
+
+/// Looks up a caption by its number.
+using Caption = std::function<std::string(int)>;
+
+[[nodiscard]] std::string decoderInfo(const std::string& answer, const Caption& caption);
+[[nodiscard]] std::string musicSpeech(const std::string& answer, const Caption& caption);
+[[nodiscard]] std::string preemphasis(const std::string& answer, const Caption& caption);
+[[nodiscard]] std::string impedance(const std::string& answer);
+[[nodiscard]] std::string ariType(const std::string& answer, const Caption& caption);
+/// "1" is on, "0" off; an empty answer caption 143, any other answer itself.
+[[nodiscard]] std::string onOff(const std::string& answer, const Caption& caption);
+/// Caption 21, ": ", the answer times 10 and " Hz"; "" for an empty answer.
+[[nodiscard]] std::string deviation(const std::string& answer, const Caption& caption);
+
+}  // namespace readback
+
+/// One question of a read-back button: the name it is logged under and what is asked.
+struct Query {
+    std::string label;
+    std::string key;
+};
+
+/// A read-back button: what it asks, and how the answers become the text that is shown.
+struct ReadBack {
+    const char* button;
+    const char* design;  ///< caption where the language file has none
+    int caption;         ///< its caption number
+    bool generator;      ///< asks the generator itself, not the coder
+    std::vector<Query> (*queries)(const std::string& eonIdentifier);
+    std::string (*words)(const std::vector<std::string>& answers, const readback::Caption& caption);
+};
+
+/// All twenty buttons, in the order of their names.
+[[nodiscard]] const std::vector<ReadBack>& readBacks();
+
+}  // namespace kdx
