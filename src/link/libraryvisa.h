@@ -1,0 +1,30 @@
+#pragma once
+
+#include "link/visa.h"
+
+#include <memory>
+#include <span>
+#include <string>
+#include <vector>
+
+namespace kdx {
+
+/// What came of the search for an installed VISA library.
+struct VisaLibrary {
+    std::unique_ptr<Visa> visa;  ///< null when there is none
+    std::string file;            ///< the file that was loaded; empty when there is none
+    /// Why the libraries tried before (all of them when there is none) cannot be used: a line for each, "name: cause".
+    std::string reason;
+};
+
+/// The file names under which VISA libraries are installed on this system, in the order in which they are tried.
+std::vector<std::string> usualVisaLibraryNames();
+
+/// Loads the first of these libraries that can be loaded and has all six operations.
+VisaLibrary loadFirstVisaLibrary(std::span<const std::string> names);
+
+/// Loads that library and no other; with an empty text, the first of the usual names that will do.
+/// @param path a file, or a bare name that the system finds where it keeps its libraries
+VisaLibrary loadVisaLibrary(const std::string& path);
+
+}  // namespace kdx

@@ -1,0 +1,63 @@
+#include "link/sharedlibrary.h"
+
+#ifdef _WIN32
+#include <windows.h>
+#else
+#include <dlfcn.h>
+#include <link.h>
+#endif
+
+#include <system_error>
+
+namespace kdx {
+
+#ifdef _WIN32
+
+std::unique_ptr<SharedLibrary> SharedLibrary::load(const std::filesystem::path& file, std::string& reason) {
+    if (HMODULE handle = LoadLibraryW(file.c_str())) return std::unique_ptr<SharedLibrary>(new SharedLibrary(handle));
+    reason = std::system_category().message(static_cast<int>(GetLastError()));
+    return nullptr;
+}
+
+SharedLibrary::~SharedLibrary() {
+    FreeLibrary(static_cast<HMODULE>(m_handle));
+}
+
+void* SharedLibrary::address(const char* name) const {
+    return reinterpret_cast<void*>(GetProcAddress(static_cast<HMODULE>(m_handle), name));
+}
+
+std::string SharedLibrary::file() const {
+    wchar_t name[MAX_PATH] = {};
+    GetModuleFileNameW(static_cast<HMODULE>(m_handle), name, MAX_PATH);
+    return std::filesystem::path(name).string();
+}
+
+#else
+
+std::unique_ptr<SharedLibrary> SharedLibrary::load(const std::filesystem::path& file, std::string& reason) {
+    // All at once: a library that lacks something itself must fail here and not in the middle of a measurement.
+    if (void* const handle = dlopen(file.c_str(), RTLD_NOW | RTLD_LOCAL)) {
+        return std::unique_ptr<SharedLibrary>(new SharedLibrary(handle));
+    }
+    const char* const why = dlerror();
+    reason = why != nullptr ? why : "unknown reason";
+    return nullptr;
+}
+
+SharedLibrary::~SharedLibrary() {
+    dlclose(m_handle);
+}
+
+void* SharedLibrary::address(const char* name) const {
+    return dlsym(m_handle, name);
+}
+
+std::string SharedLibrary::file() const {
+    link_map* map = nullptr;
+    return dlinfo(m_handle, RTLD_DI_LINKMAP, &map) == 0 ? map->l_name : std::string();
+}
+
+#endif
+
+}  // namespace kdx

@@ -1,0 +1,175 @@
+#include "link/libraryvisa.h"
+
+#include "support/tempfolder.h"
+
+#include <gmock/gmock.h>
+
+#include <filesystem>
+#include <string>
+#include <vector>
+
+namespace kdx {
+namespace {
+
+using ::testing::AllOf;
+using ::testing::ElementsAre;
+using ::testing::HasSubstr;
+using ::testing::Not;
+using ::testing::StartsWith;
+
+const std::string kComplete = KDX_FAKE_VISA;
+const std::string kIncomplete = KDX_FAKE_VISA_INCOMPLETE;
+
+/// A session to the library's instrument.
+class LibraryVisaTest : public ::testing::Test {
+protected:
+    void SetUp() override {
+        ASSERT_NE(library.visa, nullptr) << library.reason;
+        ASSERT_EQ(library.visa->viOpenDefaultRM(manager), 0);
+        ASSERT_EQ(library.visa->viOpen(manager, "GPIB0::28::INSTR", 0, 0, session), 0);
+    }
+    std::string read(std::size_t size = 60) {
+        std::string buffer(size, ' ');
+        status = library.visa->viRead(session, buffer, count);
+        return buffer;
+    }
+
+    VisaLibrary library = loadVisaLibrary(kComplete);
+    VisaHandle manager = 0;
+    VisaHandle session = 0;
+    VisaStatus status = 0;
+    std::int32_t count = -1;
+};
+
+TEST_F(LibraryVisaTest, TellsWhichFileWasLoaded) {
+    EXPECT_TRUE(std::filesystem::equivalent(library.file, kComplete));
+    EXPECT_EQ(library.reason, "");
+}
+
+TEST_F(LibraryVisaTest, OpensWithTheArgumentsAsTheyStand) {
+    ASSERT_EQ(library.visa->viOpen(manager, "TCPIP:: x ::INSTR", 1, 2500, session), 0);
+    EXPECT_THAT(read(), StartsWith("TCPIP:: x ::INSTR 1 2500"));
+}
+
+TEST_F(LibraryVisaTest, StatusesOfAllKindsComeThrough) {
+    EXPECT_EQ(library.visa->viOpen(manager, "STATUS -1073807343", 0, 0, session), -1073807343);
+    EXPECT_EQ(library.visa->viOpen(manager, "STATUS 1073676413", 0, 0, session), 1073676413);
+    const std::string failing = "STATUS -1073807339";
+    EXPECT_EQ(library.visa->viWrite(session, failing, count), -1073807339);
+    EXPECT_EQ(count, 0);
+    const std::string warning = "STATUS 1073676294";
+    EXPECT_EQ(library.visa->viWrite(session, warning, count), 1073676294);
+    EXPECT_EQ(count, 17);
+    std::string text;
+    EXPECT_EQ(library.visa->viStatusDesc(manager, 7, text), 1073676420);
+}
+
+TEST_F(LibraryVisaTest, BytesAreWrittenAndReadAsTheyStand) {
+    std::string all;
+    for (int c = 0; c < 256; ++c) all += static_cast<char>(c);
+    EXPECT_EQ(library.visa->viWrite(session, all, count), 0);
+    EXPECT_EQ(count, 256);
+    EXPECT_EQ(read(256), all);
+    EXPECT_EQ(status, 0);
+    EXPECT_EQ(count, 256);
+}
+
+TEST_F(LibraryVisaTest, AReadFillsNoMoreThanTheBuffer) {
+    const std::string answer(61, 'x');
+    library.visa->viWrite(session, answer, count);
+    EXPECT_EQ(read(), std::string(60, 'x'));
+    EXPECT_EQ(status, 1073676294);
+    EXPECT_EQ(count, 60);
+    EXPECT_EQ(read(), "x" + std::string(59, ' '));
+    EXPECT_EQ(status, 0);
+    EXPECT_EQ(count, 1);
+}
+
+TEST_F(LibraryVisaTest, DescribesStatusesInTheLibrarysWords) {
+    std::string text;
+    EXPECT_EQ(library.visa->viStatusDesc(manager, -1073807339, text), 0);
+    EXPECT_EQ(text, "status -1073807339 of 2147483649");
+}
+
+TEST_F(LibraryVisaTest, ClosesWhatItIsTold) {
+    EXPECT_EQ(library.visa->viClose(session), 0);
+    EXPECT_EQ(library.visa->viClose(manager), 0);
+    EXPECT_EQ(library.visa->viClose(5), -1073807346);
+}
+
+TEST_F(LibraryVisaTest, AWrongSessionIsTheLibrarysAffair) {
+    session = 5;
+    read();
+    EXPECT_EQ(status, -1073807346);
+    EXPECT_EQ(count, 0);
+}
+
+TEST(VisaLibrarySearch, AMissingFileIsNamed) {
+    const VisaLibrary library = loadVisaLibrary("/nowhere/libnone.so");
+    EXPECT_EQ(library.visa, nullptr);
+    EXPECT_EQ(library.file, "");
+    EXPECT_THAT(library.reason, StartsWith("/nowhere/libnone.so: "));
+}
+
+TEST(VisaLibrarySearch, AFileThatIsNoLibraryIsNamed) {
+    const test::TempFolder folder;
+    folder.write("libvisa.so", "[BUS]\r\nINTERFACE=TCPIP\r\n");
+    const std::string path = folder.data() / "libvisa.so";
+    const VisaLibrary library = loadVisaLibrary(path);
+    EXPECT_EQ(library.visa, nullptr);
+    EXPECT_THAT(library.reason, StartsWith(path + ": "));
+}
+
+TEST(VisaLibrarySearch, AnEmptyFileAndAFolderAreNoLibraries) {
+    const test::TempFolder folder;
+    folder.write("libvisa.so", "");
+    EXPECT_EQ(loadVisaLibrary(folder.data() / "libvisa.so").visa, nullptr);
+    const VisaLibrary library = loadVisaLibrary(folder.data());
+    EXPECT_EQ(library.visa, nullptr);
+    EXPECT_NE(library.reason, "");
+}
+
+TEST(VisaLibrarySearch, ALibraryThatLacksOperationsIsRefusedAndTheyAreNamed) {
+    const VisaLibrary library = loadVisaLibrary(kIncomplete);
+    EXPECT_EQ(library.visa, nullptr);
+    EXPECT_EQ(library.file, "");
+    EXPECT_THAT(library.reason, AllOf(StartsWith(kIncomplete + ": "), HasSubstr("viClose, viRead")));
+    EXPECT_THAT(library.reason, Not(HasSubstr("viWrite")));
+}
+
+TEST(VisaLibrarySearch, ABareNameOfAFileThatIsThereMeansThatFile) {
+    const std::filesystem::path before = std::filesystem::current_path();
+    std::filesystem::current_path(std::filesystem::path(kComplete).parent_path());
+    const VisaLibrary library = loadVisaLibrary(std::filesystem::path(kComplete).filename());
+    std::filesystem::current_path(before);
+    EXPECT_NE(library.visa, nullptr) << library.reason;
+}
+
+TEST(VisaLibrarySearch, NamesAreTriedInTurnAndTheFirstThatWillDoIsTaken) {
+    const std::vector<std::string> names = {"/nowhere/a.so", kIncomplete, kComplete, "/nowhere/b.so"};
+    const VisaLibrary library = loadFirstVisaLibrary(names);
+    ASSERT_NE(library.visa, nullptr);
+    EXPECT_TRUE(std::filesystem::equivalent(library.file, kComplete));
+    EXPECT_THAT(library.reason, AllOf(HasSubstr("/nowhere/a.so: "), HasSubstr("\n" + kIncomplete + ": "),
+                                      Not(HasSubstr("/nowhere/b.so"))));
+}
+
+TEST(VisaLibrarySearch, WithoutAnyLibraryEveryNameHasItsCause) {
+    const std::vector<std::string> names = {"libkdx-none.so", "libkdx-none.so.0"};
+    const VisaLibrary library = loadFirstVisaLibrary(names);
+    EXPECT_EQ(library.visa, nullptr);
+    EXPECT_THAT(library.reason, AllOf(StartsWith("libkdx-none.so: "), HasSubstr("\nlibkdx-none.so.0: ")));
+}
+
+TEST(VisaLibrarySearch, WithoutAPathTheUsualNamesAreTried) {
+    EXPECT_THAT(usualVisaLibraryNames(), ElementsAre("libvisa.so", "libvisa.so.0", "libktvisa32.so", "libiovisa.so"));
+    const VisaLibrary usual = loadVisaLibrary("");
+    if (usual.visa) {
+        EXPECT_NE(usual.file, "");  // this computer has one
+    } else {
+        for (const std::string& name : usualVisaLibraryNames()) EXPECT_THAT(usual.reason, HasSubstr(name + ": "));
+    }
+}
+
+}  // namespace
+}  // namespace kdx
