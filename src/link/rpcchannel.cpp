@@ -1,0 +1,212 @@
+#include "link/rpcchannel.h"
+
+#include <arpa/inet.h>
+#include <netdb.h>
+#include <netinet/in.h>
+#include <netinet/tcp.h>
+#include <poll.h>
+#include <sys/socket.h>
+#include <unistd.h>
+
+#include <array>
+#include <cerrno>
+#include <cstring>
+#include <memory>
+#include <utility>
+
+namespace kdx {
+
+namespace {
+
+constexpr std::uint32_t kLastFragment = 0x80000000U;
+constexpr std::size_t kMarkBytes = 4;
+constexpr std::size_t kFixedCallBytes = 256;          // call header and all fields of fixed length, with room to spare
+constexpr std::size_t kLargestReply = 128 * 1024;     // twice the most that is ever asked for
+constexpr std::uint32_t kLargestVerifier = 400;       // of the RPC standard
+constexpr std::uint32_t kIsCall = 0, kIsReply = 1;    // message types
+constexpr std::uint32_t kAccepted = 0, kSuccess = 0;  // reply and accept states
+constexpr std::uint32_t kProgramUnavailable = 1, kProgramMismatch = 2;
+
+/// False at the deadline, at the latest.
+bool waitFor(int descriptor, short event, Deadline deadline) {
+    for (;;) {
+        const auto left = std::chrono::ceil<std::chrono::milliseconds>(deadline - std::chrono::steady_clock::now());
+        if (left.count() <= 0) return false;  // also when a peer that never stops sending always has something
+        pollfd waiting{descriptor, event, 0};
+        const int ready = poll(&waiting, 1, static_cast<int>(left.count()));
+        if (ready > 0) return true;
+        if (ready == 0 || errno != EINTR) return false;
+    }
+}
+
+bool wouldBlock() {
+    return errno == EAGAIN || errno == EWOULDBLOCK || errno == EINTR;
+}
+
+std::uint32_t bigEndian(const char* bytes) {
+    std::uint32_t value = 0;
+    std::memcpy(&value, bytes, sizeof value);
+    return ntohl(value);
+}
+
+}  // namespace
+
+Socket::Socket(Socket&& other) noexcept : m_descriptor(std::exchange(other.m_descriptor, -1)) {}
+
+Socket& Socket::operator=(Socket&& other) noexcept {
+    if (this != &other) {
+        close();
+        m_descriptor = std::exchange(other.m_descriptor, -1);
+    }
+    return *this;
+}
+
+void Socket::close() {
+    if (m_descriptor >= 0) ::close(m_descriptor);
+    m_descriptor = -1;
+}
+
+bool RpcChannel::connect(const sockaddr_in& address, std::uint16_t port, Deadline deadline) {
+    Socket fresh(::socket(AF_INET, SOCK_STREAM | SOCK_NONBLOCK | SOCK_CLOEXEC, IPPROTO_TCP));
+    if (!fresh.isOpen()) return false;
+    sockaddr_in peer = address;
+    peer.sin_port = htons(port);
+    if (::connect(fresh.descriptor(), reinterpret_cast<const sockaddr*>(&peer), sizeof peer) != 0) {
+        if (errno != EINPROGRESS && errno != EINTR) return false;
+        if (!waitFor(fresh.descriptor(), POLLOUT, deadline)) return false;
+        int failure = 0;
+        socklen_t size = sizeof failure;
+        if (getsockopt(fresh.descriptor(), SOL_SOCKET, SO_ERROR, &failure, &size) != 0 || failure != 0) return false;
+    }
+    const int on = 1;  // a short question must not wait for the acknowledgement of the command before it
+    setsockopt(fresh.descriptor(), IPPROTO_TCP, TCP_NODELAY, &on, sizeof on);
+    m_socket = std::move(fresh);
+    m_received.clear();
+    return true;
+}
+
+RpcOutcome RpcChannel::call(std::uint32_t procedure, std::size_t variableBytes, const Coder& arguments,
+                            const Coder& results, Deadline deadline) {
+    if (!m_socket.isOpen()) return RpcOutcome::Lost;
+    ++m_lastCall;
+    if (!encodeCall(procedure, variableBytes, arguments)) return RpcOutcome::Failed;
+    RpcOutcome outcome = send(deadline);
+    if (outcome == RpcOutcome::Done) outcome = receiveReply(deadline);
+    if (outcome == RpcOutcome::Done) outcome = decodeReply(results);
+    return outcome;
+}
+
+bool RpcChannel::encodeCall(std::uint32_t procedure, std::size_t variableBytes, const Coder& arguments) {
+    m_request.resize(kMarkBytes + kFixedCallBytes + variableBytes);
+    XDR xdr;
+    xdrmem_create(&xdr, m_request.data(), static_cast<u_int>(m_request.size()), XDR_ENCODE);
+    // Room for the record mark, the header with RPC version 2, and neither credentials nor verifier.
+    std::array<std::uint32_t, 11> header = {0, m_lastCall, kIsCall, 2, m_program, m_version, procedure, 0, 0, 0, 0};
+    for (std::uint32_t& field : header) xdr_uint32_t(&xdr, &field);
+    if (!arguments(&xdr)) return false;
+    m_request.resize(xdr_getpos(&xdr));
+    const std::uint32_t mark = htonl(kLastFragment | static_cast<std::uint32_t>(m_request.size() - kMarkBytes));
+    std::memcpy(m_request.data(), &mark, sizeof mark);
+    return true;
+}
+
+RpcOutcome RpcChannel::send(Deadline deadline) {
+    std::size_t sent = 0;
+    while (sent < m_request.size()) {
+        const ssize_t taken =
+            ::send(m_socket.descriptor(), m_request.data() + sent, m_request.size() - sent, MSG_NOSIGNAL);
+        if (taken > 0) {
+            sent += static_cast<std::size_t>(taken);
+        } else if (taken < 0 && !wouldBlock()) {
+            return close(RpcOutcome::Lost);
+        } else if (!waitFor(m_socket.descriptor(), POLLOUT, deadline)) {
+            // The rest of a request begun could not be told from the next one.
+            return sent == 0 ? RpcOutcome::TimedOut : close(RpcOutcome::TimedOut);
+        }
+    }
+    return RpcOutcome::Done;
+}
+
+/// Leaves the answer to the call under way in m_reply.
+RpcOutcome RpcChannel::receiveReply(Deadline deadline) {
+    std::array<char, 8192> piece;
+    for (;;) {
+        const RpcOutcome message = takeMessage();
+        if (message == RpcOutcome::Done) {
+            // Calls are numbered from 1: a smaller number is the late answer to a call that was given up.
+            const std::uint32_t number = m_reply.size() >= 4 ? bigEndian(m_reply.data()) : 0;
+            if (number == m_lastCall) return RpcOutcome::Done;
+            if (number == 0 || number > m_lastCall) return close(RpcOutcome::Failed);
+            continue;
+        }
+        if (message == RpcOutcome::Failed) return close(message);
+        if (!waitFor(m_socket.descriptor(), POLLIN, deadline)) return RpcOutcome::TimedOut;
+        const ssize_t got = recv(m_socket.descriptor(), piece.data(), piece.size(), 0);
+        if (got > 0) {
+            m_received.insert(m_received.end(), piece.data(), piece.data() + got);
+        } else if (got == 0 || !wouldBlock()) {
+            return close(RpcOutcome::Lost);
+        }
+    }
+}
+
+/// Moves the first whole message from m_received to m_reply: Done; TimedOut while there is none yet; Failed when what
+/// has arrived is none.
+RpcOutcome RpcChannel::takeMessage() {
+    m_reply.clear();
+    std::size_t at = 0;
+    while (m_received.size() - at >= kMarkBytes) {
+        const std::uint32_t mark = bigEndian(m_received.data() + at);
+        const std::size_t length = mark & ~kLastFragment;
+        at += kMarkBytes;
+        if (at + length > kLargestReply) return RpcOutcome::Failed;
+        if (m_received.size() - at < length) break;
+        const auto begin = m_received.begin() + static_cast<std::ptrdiff_t>(at);
+        m_reply.insert(m_reply.end(), begin, begin + static_cast<std::ptrdiff_t>(length));
+        at += length;
+        if ((mark & kLastFragment) != 0) {
+            m_received.erase(m_received.begin(), m_received.begin() + static_cast<std::ptrdiff_t>(at));
+            return RpcOutcome::Done;
+        }
+    }
+    return RpcOutcome::TimedOut;
+}
+
+RpcOutcome RpcChannel::decodeReply(const Coder& results) {
+    XDR xdr;
+    xdrmem_create(&xdr, m_reply.data(), static_cast<u_int>(m_reply.size()), XDR_DECODE);
+    std::uint32_t number = 0, type = 0, state = 0, flavour = 0, verifierLength = 0, accepted = 0;
+    std::array<char, kLargestVerifier> verifier;
+    if (!xdr_uint32_t(&xdr, &number) || !xdr_uint32_t(&xdr, &type) || type != kIsReply || !xdr_uint32_t(&xdr, &state) ||
+        state != kAccepted || !xdr_uint32_t(&xdr, &flavour) || !xdr_uint32_t(&xdr, &verifierLength) ||
+        verifierLength > kLargestVerifier || !xdr_opaque(&xdr, verifier.data(), verifierLength) ||
+        !xdr_uint32_t(&xdr, &accepted)) {
+        return close(RpcOutcome::Failed);
+    }
+    if (accepted == kProgramUnavailable || accepted == kProgramMismatch) return close(RpcOutcome::Unavailable);
+    if (accepted != kSuccess || !results(&xdr)) return close(RpcOutcome::Failed);
+    return RpcOutcome::Done;
+}
+
+RpcOutcome RpcChannel::close(RpcOutcome because) {
+    m_socket.close();
+    return because;
+}
+
+std::vector<sockaddr_in> resolveHost(const std::string& host) {
+    addrinfo hints{};
+    hints.ai_family = AF_INET;  // VXI-11 knows no other
+    hints.ai_socktype = SOCK_STREAM;
+    addrinfo* first = nullptr;
+    if (getaddrinfo(host.c_str(), nullptr, &hints, &first) != 0) return {};
+    const std::unique_ptr<addrinfo, decltype(&freeaddrinfo)> list(first, &freeaddrinfo);
+    std::vector<sockaddr_in> addresses;
+    for (const addrinfo* entry = first; entry != nullptr; entry = entry->ai_next) {
+        sockaddr_in address{};
+        std::memcpy(&address, entry->ai_addr, sizeof address);
+        addresses.push_back(address);
+    }
+    return addresses;
+}
+
+}  // namespace kdx

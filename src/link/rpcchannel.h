@@ -1,0 +1,84 @@
+#pragma once
+
+#include <rpc/types.h>
+#include <rpc/xdr.h>
+
+#include <chrono>
+#include <cstdint>
+#include <functional>
+#include <string>
+#include <vector>
+
+struct sockaddr_in;
+
+namespace kdx {
+
+/// A point in time at which waiting ends.
+using Deadline = std::chrono::steady_clock::time_point;
+
+/// How a remote call ended.
+enum class RpcOutcome {
+    Done,
+    TimedOut,     ///< no answer in time
+    Lost,         ///< the peer closed the connection, or nobody is there any more
+    Unavailable,  ///< the peer does not serve the program
+    Failed,       ///< the peer refused the call or answered something that is no answer
+};
+
+/// An open socket, closed with its owner.
+class Socket {
+public:
+    explicit Socket(int descriptor = -1) : m_descriptor(descriptor) {}
+    ~Socket() { close(); }
+    Socket(Socket&& other) noexcept;
+    Socket& operator=(Socket&& other) noexcept;
+    void close();
+    [[nodiscard]] int descriptor() const { return m_descriptor; }
+    [[nodiscard]] bool isOpen() const { return m_descriptor >= 0; }
+
+private:
+    int m_descriptor;
+};
+
+/// Remote procedure calls (ONC RPC version 2) over one TCP connection: one program, one call at a time.
+/// The messages are put together with libtirpc's XDR; the connection is kept here, because a client of libtirpc starts
+/// its time-out anew with every piece that arrives, takes garbage for silence, and a connection that breaks while it
+/// writes ends the process with SIGPIPE. Here a call ends at its deadline, whatever the peer does.
+class RpcChannel {
+public:
+    RpcChannel(std::uint32_t program, std::uint32_t version) : m_program(program), m_version(version) {}
+
+    /// Connects to the port of that address. False when nobody takes the connection until the deadline.
+    bool connect(const sockaddr_in& address, std::uint16_t port, Deadline deadline);
+
+    /// Writes (or reads) the fields of a message; false when they do not fit.
+    using Coder = std::function<bool(XDR*)>;
+
+    /// Calls one procedure.
+    /// @param variableBytes how many bytes of texts and data are among the arguments
+    /// After Lost, Failed, or a request that could not be sent whole, the connection is closed and every later call is
+    /// Lost; after any other TimedOut it goes on, and the late answer is passed over.
+    RpcOutcome call(std::uint32_t procedure, std::size_t variableBytes, const Coder& arguments, const Coder& results,
+                    Deadline deadline);
+
+private:
+    bool encodeCall(std::uint32_t procedure, std::size_t variableBytes, const Coder& arguments);
+    RpcOutcome send(Deadline deadline);
+    RpcOutcome receiveReply(Deadline deadline);
+    RpcOutcome takeMessage();
+    RpcOutcome decodeReply(const Coder& results);
+    RpcOutcome close(RpcOutcome because);
+
+    std::uint32_t m_program;
+    std::uint32_t m_version;
+    Socket m_socket;
+    std::uint32_t m_lastCall = 0;  ///< number of the call under way; answers bear it
+    std::vector<char> m_request;   ///< with its record mark
+    std::vector<char> m_received;  ///< what has arrived and was not taken yet
+    std::vector<char> m_reply;     ///< one whole message, without record marks
+};
+
+/// The IPv4 addresses of a host, empty when it is unknown. Blocks while the system's name service looks it up.
+std::vector<sockaddr_in> resolveHost(const std::string& host);
+
+}  // namespace kdx
