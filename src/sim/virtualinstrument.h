@@ -1,21 +1,66 @@
 #pragma once
 
+#include <optional>
 #include <string>
 #include <string_view>
 
+#include "sim/coder.h"
+#include "sim/errorqueue.h"
+#include "sim/setup.h"
+
 namespace kdx {
 
+class Clock;
+struct CommandUnit;
+
+inline constexpr const char* kDefaultIdentification = "KDX,KDX-X4,100001,1.00";
+
 /// The virtual generator with its stereo/RDS coder: reads program messages as the instrument does, keeps its state,
-/// answers its queries. Used inside the program and, over VXI-11, by the kdx-sim program.
+/// answers its queries. Used inside the program and, over VXI-11, by the kdx-sim program. One call at a time: threads
+/// that share it take turns.
 class VirtualInstrument {
 public:
-    VirtualInstrument();
+    /// @param clock what the coder's clock time runs by; must outlive the instrument.
     /// @param identification the answer to "*IDN?", without its line end.
-    explicit VirtualInstrument(std::string identification);
+    explicit VirtualInstrument(const Clock& clock, std::string identification = kDefaultIdentification);
+    VirtualInstrument(const VirtualInstrument&) = delete;
+    VirtualInstrument& operator=(const VirtualInstrument&) = delete;
 
     /// Carries out one program message (several commands may be joined by ";"), its line end left off or not.
     /// @returns the answer with its line feed, or "" when the message asked nothing. Errors go to the error queue.
+    /// Several answers of one line are joined by ";". A message of several lines is several messages.
     std::string execute(std::string_view message);
+
+    /// A device clear: ends whatever the instrument is still doing for its clients, and by IEEE 488.2 leaves settings,
+    /// memories, errors and event bits alone. Every command is complete when execute returns, so nothing is left to
+    /// end here; unread answers and half-received messages are the transport's to drop.
+    void deviceClear() {}
+
+    /// To be called when a client reads though nothing was asked: queues -420.
+    void reportUnansweredRead() { report(ScpiError::QueryUnterminated); }
+
+    /// IEEE 488.2 status byte: 4 errors are queued, 32 an error event
+    /// has not been asked for. The transport knows of unread answers (16).
+    [[nodiscard]] unsigned char statusByte() const;
+
+private:
+    struct SystemRow;
+    static const SystemRow* systemRow(std::string_view header, bool query);
+
+    std::string executeLine(std::string_view line);
+    Reply executeUnit(const CommandUnit& unit, std::string& path);
+    std::optional<Reply> tryHeader(std::string_view header, const CommandUnit& unit);
+    Reply direct(const CommandUnit& unit);
+    void report(ScpiError error);
+    void reset();
+    void clearStatus();
+    std::string takeEvents();
+
+    std::string m_identification;
+    InstrumentSettings m_settings;
+    Coder m_coder;
+    ErrorQueue m_errors;
+    unsigned char m_events = 0;
 };
 
 }  // namespace kdx

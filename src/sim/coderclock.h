@@ -1,0 +1,33 @@
+#pragma once
+
+#include <chrono>
+#include <optional>
+#include <string>
+#include <string_view>
+
+#include "sim/errorqueue.h"
+
+namespace kdx {
+
+class Clock;
+
+/// The clock time that the coder transmits: once set it runs on by itself, in step with the clock handed in.
+class CoderClock {
+public:
+    explicit CoderClock(const Clock& clock) : m_clock(clock) {}
+
+    /// Takes "hh:mm:ss,DD.MM.YY" (years 2000 to 2099), or "off" in any letter case to send none.
+    ScpiError set(std::string_view value);
+    void stop() { m_lead.reset(); }
+    /// The running time in the same form, or "off".
+    [[nodiscard]] std::string text() const;
+
+private:
+    using Time = std::chrono::sys_time<std::chrono::milliseconds>;
+    [[nodiscard]] Time now() const;
+
+    const Clock& m_clock;
+    std::optional<std::chrono::milliseconds> m_lead;  ///< how far it runs ahead of the clock handed in
+};
+
+}  // namespace kdx

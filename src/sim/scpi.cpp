@@ -1,0 +1,138 @@
+#include "sim/scpi.h"
+
+#include <algorithm>
+#include <charconv>
+#include <limits>
+
+#include "base/codepage.h"
+
+namespace kdx {
+
+namespace {
+
+// IEEE 488.2 counts the blank and every control character as white space (the line feed is gone before).
+bool isWhite(char c) {
+    return static_cast<unsigned char>(c) <= 0x20;
+}
+
+bool isDigit(char c) {
+    return c >= '0' && c <= '9';
+}
+
+bool wordMatches(std::string_view pattern, std::string_view word) {
+    const auto shortEnd = std::find_if(pattern.begin(), pattern.end(), [](char c) { return c >= 'a' && c <= 'z'; });
+    const auto shortLength = static_cast<std::size_t>(shortEnd - pattern.begin());
+    return equalNoCase(word, pattern) || equalNoCase(word, pattern.substr(0, shortLength));
+}
+
+}  // namespace
+
+std::vector<std::string_view> splitOutsideQuotes(std::string_view text, char separator) {
+    std::vector<std::string_view> pieces;
+    std::size_t start = 0;
+    bool inQuotes = false;
+    for (std::size_t i = 0; i < text.size(); ++i) {
+        if (text[i] == '"') inQuotes = !inQuotes;
+        if (text[i] != separator || inQuotes) continue;
+        pieces.push_back(text.substr(start, i - start));
+        start = i + 1;
+    }
+    pieces.push_back(text.substr(start));
+    return pieces;
+}
+
+HeadAndTail cutAt(std::string_view text, char separator) {
+    const std::size_t position = text.find(separator);
+    if (position == std::string_view::npos) return {text, std::nullopt};
+    return {text.substr(0, position), text.substr(position + 1)};
+}
+
+std::string_view trimmed(std::string_view text) {
+    while (!text.empty() && isWhite(text.front())) text.remove_prefix(1);
+    while (!text.empty() && isWhite(text.back())) text.remove_suffix(1);
+    return text;
+}
+
+CommandUnit readUnit(std::string_view unit) {
+    unit = trimmed(unit);
+    const auto end = std::find_if(unit.begin(), unit.end(), [](char c) { return c == '?' || isWhite(c); });
+    const auto length = static_cast<std::size_t>(end - unit.begin());
+    const bool query = end != unit.end() && *end == '?';
+    return {unit.substr(0, length), query, trimmed(unit.substr(length + (query ? 1 : 0)))};
+}
+
+bool headerMatches(std::string_view pattern, std::string_view header) {
+    if (!header.empty() && header.front() == ':') header.remove_prefix(1);
+    for (;;) {
+        const auto [patternWord, patternRest] = cutAt(pattern, ':');
+        const auto [headerWord, headerRest] = cutAt(header, ':');
+        if (!wordMatches(patternWord, headerWord)) return false;
+        if (!patternRest || !headerRest) return !patternRest && !headerRest;
+        pattern = *patternRest;
+        header = *headerRest;
+    }
+}
+
+std::optional<std::string> unquoted(std::string_view parameter) {
+    if (parameter.size() < 2 || parameter.front() != '"' || parameter.back() != '"') return std::nullopt;
+    const std::string_view inner = parameter.substr(1, parameter.size() - 2);
+    std::string text;
+    for (std::size_t i = 0; i < inner.size(); ++i) {
+        if (inner[i] == '"') {
+            ++i;  // the second of a doubled quote
+            if (i == inner.size() || inner[i] != '"') return std::nullopt;
+        }
+        text += inner[i];
+    }
+    return text;
+}
+
+std::string quoted(std::string_view text) {
+    std::string result = "\"";
+    for (const char c : text) {
+        if (c == '"') result += '"';
+        result += c;
+    }
+    return result + '"';
+}
+
+std::optional<NumberWithSuffix> readNumber(std::string_view text) {
+    text = trimmed(text);
+    if (!text.empty() && text.front() == '+') text.remove_prefix(1);
+    const bool negative = !text.empty() && text.front() == '-';
+    const std::string_view digits = text.substr(negative ? 1 : 0);
+    // from_chars would take "inf" and "nan" too.
+    if (digits.empty() || (!isDigit(digits.front()) && digits.front() != '.')) return std::nullopt;
+    NumberWithSuffix number;
+    const auto result = std::from_chars(digits.data(), digits.data() + digits.size(), number.value);
+    if (result.ec == std::errc::invalid_argument) return std::nullopt;
+    // Too small for a number comes here as well: it is outside every range that does not reach down to 0 anyway.
+    if (result.ec == std::errc::result_out_of_range) number.value = std::numeric_limits<double>::infinity();
+    if (negative) number.value = -number.value;
+    number.suffix = trimmed(digits.substr(static_cast<std::size_t>(result.ptr - digits.data())));
+    return number;
+}
+
+std::optional<int> readWhole(std::string_view text) {
+    text = trimmed(text);
+    int value = 0;
+    const auto result = std::from_chars(text.data(), text.data() + text.size(), value);
+    if (result.ptr != text.data() + text.size() || result.ec == std::errc::invalid_argument) return std::nullopt;
+    // All digits, yet too many of them: a number, and outside every range.
+    if (result.ec == std::errc::result_out_of_range) return std::numeric_limits<int>::max();
+    return value;
+}
+
+bool isDecimal(std::string_view text) {
+    return !text.empty() && std::all_of(text.begin(), text.end(), isDigit);
+}
+
+bool isHex(std::string_view text) {
+    return !text.empty() && text.find_first_not_of("0123456789abcdefABCDEF") == std::string_view::npos;
+}
+
+bool hasControlCharacter(std::string_view text) {
+    return std::any_of(text.begin(), text.end(), [](char c) { return static_cast<unsigned char>(c) < 0x20; });
+}
+
+}  // namespace kdx

@@ -1,0 +1,65 @@
+#pragma once
+
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace kdx {
+
+/// One command of a program message, cut into its pieces; the views point into the message.
+struct CommandUnit {
+    std::string_view header;     ///< without question mark; a leading colon is still there
+    bool query = false;          ///< a question mark followed the header
+    std::string_view parameter;  ///< without the blanks around it
+};
+
+/// Cuts a text at the separator, except inside double quotes. An unclosed quote takes in the rest of the text.
+[[nodiscard]] std::vector<std::string_view> splitOutsideQuotes(std::string_view text, char separator);
+
+/// Cuts a text at the first separator: what stands before it, and what stands after it (nothing without one).
+struct HeadAndTail {
+    std::string_view head;
+    std::optional<std::string_view> tail;
+};
+[[nodiscard]] HeadAndTail cutAt(std::string_view text, char separator);
+
+/// The text without white space at both ends: blanks and every control character.
+[[nodiscard]] std::string_view trimmed(std::string_view text);
+
+/// Cuts one command at its question mark or its first white space.
+[[nodiscard]] CommandUnit readUnit(std::string_view unit);
+
+/// True when the header fits the pattern in any letter case, each of its words in the long form or in the short one.
+/// @param pattern words joined by colons, their short form in capitals: "STEReo:PILot:STATe".
+/// @param header with or without a leading colon.
+[[nodiscard]] bool headerMatches(std::string_view pattern, std::string_view header);
+
+/// The text inside a parameter in double quotes; a doubled quote stands for one. Nothing when the quotes are missing
+/// or do not close at the end of the parameter.
+[[nodiscard]] std::optional<std::string> unquoted(std::string_view parameter);
+
+/// The text in double quotes, its own quotes doubled.
+[[nodiscard]] std::string quoted(std::string_view text);
+
+/// A decimal number and what follows it, blanks between them left out.
+struct NumberWithSuffix {
+    double value = 0;  ///< finite, or infinite when it is too large to be held
+    std::string_view suffix;
+};
+/// Nothing when the text does not begin with a number. The decimal separator is the point whatever the locale.
+[[nodiscard]] std::optional<NumberWithSuffix> readNumber(std::string_view text);
+
+/// A whole number that fills the text but for blanks around it; nothing when it is anything else.
+[[nodiscard]] std::optional<int> readWhole(std::string_view text);
+
+/// True for a text of decimal digits only (not empty).
+[[nodiscard]] bool isDecimal(std::string_view text);
+
+/// True for a text of hexadecimal digits only (not empty), in any letter case.
+[[nodiscard]] bool isHex(std::string_view text);
+
+/// True when the text has a control character in it, which neither the air nor an answer could carry.
+[[nodiscard]] bool hasControlCharacter(std::string_view text);
+
+}  // namespace kdx
