@@ -1,0 +1,73 @@
+#include "af/aflist.h"
+
+#include <algorithm>
+
+#include "base/numbers.h"
+
+namespace kdx {
+
+std::string afListKey(std::string_view kind, int number) {
+    return (kind == kEonAfKind ? "EON_AFB" : "AF_LISTE") + std::to_string(number);
+}
+
+std::size_t afCount(std::string_view list) {
+    return static_cast<std::size_t>(std::count(list.begin(), list.end(), ','));
+}
+
+std::string rewrittenForMethodB(std::string_view list) {
+    const auto parts = splitForDisplay(list);
+    if (!parts) return std::string(list);
+    std::string pairs = parts->tuned;
+    for (const std::string& frequency : parts->frequencies) pairs += "," + parts->tuned + "," + frequency;
+    return pairs;
+}
+
+std::optional<std::string> afValue(std::string_view list, int number, AfMethod method) {
+    if (method == AfMethod::B && afCount(list) > kMostAfsOfMethodB) return std::nullopt;
+    return (number == 1 ? "N," : "+,") + (method == AfMethod::B ? rewrittenForMethodB(list) : std::string(list));
+}
+
+std::optional<AfList> splitForDisplay(std::string_view list) {
+    std::size_t comma = list.find(',');
+    if (comma == std::string_view::npos) return std::nullopt;
+    AfList parts{std::string(list.substr(0, comma)), {}};
+    while (comma != std::string_view::npos) {
+        list.remove_prefix(comma + 1);
+        comma = list.find(',');
+        parts.frequencies.emplace_back(list.substr(0, comma));
+    }
+    return parts;
+}
+
+std::string joined(const AfList& list) {
+    std::string text = list.tuned;
+    for (const std::string& frequency : list.frequencies) text += "," + frequency;
+    return text;
+}
+
+bool isTunedFrequency(std::string_view text) {
+    const double megahertz = leadingNumber(text);
+    return megahertz >= 86 && megahertz <= 108;
+}
+
+bool isAlternativeFrequency(std::string_view text) {
+    // The lower bound is not the tuned frequency's: lists are kept and sent with these bounds, both on purpose.
+    const double megahertz = leadingNumber(text);
+    return megahertz >= 87.5 && megahertz <= 108.0;
+}
+
+std::string withOneDecimal(std::string_view tuned) {
+    const std::string text(tuned);
+    switch (tuned.find('.')) {
+        case std::string_view::npos:
+            return (text + ".00").substr(0, leadingNumber(tuned) < 100 ? 4 : 5);
+        case 2:
+            return (text + "00").substr(0, 4);
+        case 3:
+            return (text + "00").substr(0, 5);
+        default:
+            return text;
+    }
+}
+
+}  // namespace kdx
