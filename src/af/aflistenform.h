@@ -1,0 +1,68 @@
+#pragma once
+
+#include "ui/controls.h"
+#include "ui/pagecontext.h"
+
+#include <QDialog>
+
+#include <string>
+
+class QGroupBox;
+class QLabel;
+class QLineEdit;
+class QListWidget;
+class QPushButton;
+
+namespace kdx {
+
+class ClickableLabel;
+
+/// The editor of the five AF lists of the current data set: the own programme's or, when ProgramState::afEditorKind is
+/// "EON AF", the other network's. It edits and stores only. It opens on list 1, in the current language.
+class AF_Listenform : public QDialog {
+    Q_OBJECT
+public:
+    AF_Listenform(const PageContext& with, QWidget* parent);
+
+private:
+    void create();
+    void arrange();
+    void label();
+    void Form_Load();
+    void AFList_Opt_Click(int index);
+    void AF_TN_Click();
+    void Command1_Click();
+    void AF_OF_add_Click();
+    void Rem_Freq_Click();
+    void Uebernahme_Knopf_Click();
+    void Ende_Knopf_Click();
+
+    /// Key of the list with that option in the data set.
+    [[nodiscard]] std::string key(int index) const;
+    /// Number of the selected row, -1 when none is selected.
+    [[nodiscard]] int selectedRow() const;
+    /// What `Text2` reads when it is an allowed AF; else says so and gives an empty text.
+    [[nodiscard]] QString checkedEntry();
+    void refuse(int caption);
+
+    PageContext m_with;
+
+    OptionArray<5> AFList_Opt;
+    ClickableLabel* AF_TN = nullptr;  // tuned frequency; a click asks for a new one
+    QListWidget* AF_List1 = nullptr;
+    QLineEdit* Text2 = nullptr;        // AF to be added, MHz
+    QPushButton* Command1 = nullptr;   // appends it
+    QPushButton* AF_OF_add = nullptr;  // inserts it before the selected row
+    QPushButton* Rem_Freq = nullptr;
+    QPushButton* Uebernahme_Knopf = nullptr;
+    QPushButton* Ende_Knopf = nullptr;
+
+    QGroupBox* m_choice = nullptr;
+    QGroupBox* m_content = nullptr;
+    QGroupBox* m_change = nullptr;
+    QLabel* m_tunedHeading = nullptr;
+    QLabel* m_listHeading = nullptr;
+    QLabel* m_entryHeading = nullptr;
+};
+
+}  // namespace kdx

@@ -1,0 +1,345 @@
+#include "af/aflistenform.h"
+
+#include <gtest/gtest.h>
+
+#include "support/layoutcheck.h"
+#include "support/listrows.h"
+#include "support/pagetest.h"
+
+#include <QKeyEvent>
+#include <QListWidget>
+#include <QMouseEvent>
+
+#include <optional>
+
+namespace kdx {
+namespace {
+
+using test::Lines;
+
+constexpr const char* kSet1 = "Datenset1.INI";
+
+class EditorTest : public test::PageTest {
+protected:
+    EditorTest() {
+        state.afEditorKind = "AF";
+        setList("AF_LISTE1", "87.6,90.1,94.3");
+    }
+    QWidget& root() override { return *editor; }
+
+    void setList(const char* key, const std::string& list) { setProfile(kSet1, "RDS", key, list); }
+    void open() {
+        editor.emplace(context, nullptr);
+        editor->show();
+    }
+    void selectRow(int row) { find<QListWidget>("AF_List1")->setCurrentRow(row); }
+    Lines rows() { return test::rowsOf(*find<QListWidget>("AF_List1")); }
+    void clickTuned() {
+        auto* label = find<QLabel>("AF_TN");
+        QMouseEvent release(QEvent::MouseButtonRelease, QPointF(1, 1), label->mapToGlobal(QPointF(1, 1)),
+                            Qt::LeftButton, Qt::NoButton, Qt::NoModifier);
+        QApplication::sendEvent(label, &release);
+    }
+    void pressEnter(const char* name) {
+        QKeyEvent press(QEvent::KeyPress, Qt::Key_Return, Qt::NoModifier);
+        QApplication::sendEvent(find(name), &press);
+    }
+    void expectRefusal(std::size_t box, int caption) {
+        ASSERT_GT(dialogs.shown.size(), box);
+        EXPECT_EQ(dialogs.shown[box].icon, Dialogs::Icon::Exclamation);
+        EXPECT_EQ(dialogs.shown[box].title, toText(captions.text(161)));
+        EXPECT_EQ(dialogs.shown[box].text, toText(captions.text(caption)));
+    }
+
+    std::optional<AF_Listenform> editor;
+};
+
+TEST_F(EditorTest, OpensOnListOne) {
+    setProfile(kSet1, "RDS", "AF_LISTE", "3");
+    setList("AF_LISTE3", "100.1,88.0");
+    open();
+    EXPECT_EQ(editor->objectName(), QStringLiteral("AF_Listenform"));
+    EXPECT_TRUE(editor->isModal());
+    EXPECT_TRUE(checked("AFList_Opt_0"));
+    EXPECT_EQ(text("AF_TN"), "87.6");
+    EXPECT_EQ(rows(), Lines({"90.1", "94.3"}));
+}
+
+TEST_F(EditorTest, TheTitleNamesTheKindOfTheLists) {
+    open();
+    EXPECT_EQ(editor->windowTitle(), QStringLiteral("AF Listen bearbeiten"));
+    state.afEditorKind = "EON AF";
+    useLanguage("english");
+    open();
+    EXPECT_EQ(editor->windowTitle(), QStringLiteral("Edit EON AF lists"));
+}
+
+TEST_F(EditorTest, ChoosingAListShowsItAndStoresNothing) {
+    setList("AF_LISTE4", "100.1,88.0");
+    const std::string before = folder.read(kSet1);
+    open();
+    click("AFList_Opt_3");
+    EXPECT_EQ(text("AF_TN"), "100.1");
+    EXPECT_EQ(rows(), Lines{"88.0"});
+    EXPECT_EQ(folder.read(kSet1), before);
+}
+
+TEST_F(EditorTest, AListWithoutAfsLeavesTheFormerOneInView) {
+    setList("AF_LISTE2", "100.1");
+    open();
+    click("AFList_Opt_1");
+    EXPECT_EQ(text("AF_TN"), "87.6");
+    EXPECT_EQ(rows(), Lines({"90.1", "94.3"}));
+    click("Uebernahme_Knopf");
+    EXPECT_EQ(profile(kSet1, "RDS", "AF_LISTE2"), "87.6,90.1,94.3");
+}
+
+TEST_F(EditorTest, ChoosingAnotherListDropsWhatWasNotAccepted) {
+    setList("AF_LISTE2", "100.1,88.0");
+    open();
+    type("Text2", "99.9");
+    click("Command1");
+    click("AFList_Opt_1");
+    click("AFList_Opt_0");
+    EXPECT_EQ(rows(), Lines({"90.1", "94.3"}));
+}
+
+TEST_F(EditorTest, EonListsAreReadAndStoredUnderTheirOwnKeys) {
+    state.afEditorKind = "EON AF";
+    setList("EON_AFB1", "91.7,104.2");
+    setList("EON_AFB5", "98.5,106.5");
+    open();
+    EXPECT_EQ(text("AF_TN"), "91.7");
+    click("AFList_Opt_4");
+    type("Text2", "88.0");
+    click("Command1");
+    click("Uebernahme_Knopf");
+    EXPECT_EQ(profile(kSet1, "RDS", "EON_AFB5"), "98.5,106.5,88.0");
+    EXPECT_EQ(profile(kSet1, "RDS", "AF_LISTE5"), "");
+}
+
+TEST_F(EditorTest, ListsBelongToTheCurrentDataSet) {
+    state.CurrentDataSet = "3";
+    setProfile("Datenset3.INI", "RDS", "AF_LISTE1", "100.1,88.0");
+    open();
+    EXPECT_EQ(text("AF_TN"), "100.1");
+    type("Text2", "90.0");
+    click("Command1");
+    click("Uebernahme_Knopf");
+    EXPECT_EQ(profile("Datenset3.INI", "RDS", "AF_LISTE1"), "100.1,88.0,90.0");
+    EXPECT_EQ(profile(kSet1, "RDS", "AF_LISTE1"), "87.6,90.1,94.3");
+}
+
+TEST_F(EditorTest, AcceptingStoresTheListAndCloses) {
+    open();
+    type("Text2", "107.1");
+    click("Command1");
+    click("Uebernahme_Knopf");
+    EXPECT_EQ(profile(kSet1, "RDS", "AF_LISTE1"), "87.6,90.1,94.3,107.1");
+    EXPECT_FALSE(editor->isVisible());
+    EXPECT_EQ(sent(), Lines{});
+}
+
+TEST_F(EditorTest, ClosingStoresNothing) {
+    open();
+    type("Text2", "107.1");
+    click("Command1");
+    click("Ende_Knopf");
+    EXPECT_EQ(profile(kSet1, "RDS", "AF_LISTE1"), "87.6,90.1,94.3");
+    EXPECT_FALSE(editor->isVisible());
+}
+
+TEST_F(EditorTest, AListWithoutAfsIsStoredAsItsTunedFrequencyAlone) {
+    setList("AF_LISTE1", "87.6,90.1");
+    dialogs.confirmations = {true};
+    open();
+    selectRow(0);
+    click("Rem_Freq");
+    click("Uebernahme_Knopf");
+    EXPECT_EQ(profile(kSet1, "RDS", "AF_LISTE1"), "87.6");
+}
+
+TEST_F(EditorTest, AListWithoutATunedFrequencyIsStoredWithALeadingComma) {
+    setList("AF_LISTE1", "");
+    open();
+    type("Text2", "90.1");
+    click("Command1");
+    click("Uebernahme_Knopf");
+    EXPECT_EQ(profile(kSet1, "RDS", "AF_LISTE1"), ",90.1");
+}
+
+TEST_F(EditorTest, AppendingTakesTheTextAsTyped) {
+    open();
+    for (const char* typed : {"87.5", "108.0", "99", "88.123"}) {
+        type("Text2", typed);
+        click("Command1");
+    }
+    EXPECT_EQ(rows(), Lines({"90.1", "94.3", "87.5", "108.0", "99", "88.123"}));
+}
+
+TEST_F(EditorTest, TheEnterKeyAppends) {
+    open();
+    type("Text2", "99.9");
+    pressEnter("Text2");
+    EXPECT_EQ(rows(), Lines({"90.1", "94.3", "99.9"}));
+    EXPECT_TRUE(editor->isVisible());
+}
+
+TEST_F(EditorTest, AnAfOutsideItsRangeIsRefused) {
+    open();
+    selectRow(0);
+    std::size_t box = 0;
+    for (const char* typed : {"87.4", "86", "108.1", "", "abc"}) {
+        type("Text2", typed);
+        dialogs.expectedMessages = 2;
+        click("Command1");
+        click("AF_OF_add");
+        expectRefusal(box++, 164);
+        expectRefusal(box++, 164);
+    }
+    EXPECT_EQ(rows(), Lines({"90.1", "94.3"}));
+}
+
+TEST_F(EditorTest, ADecimalCommaIsRefusedOnlyWhenItsWholeNumberIsOutOfRange) {
+    open();
+    dialogs.expectedMessages = 1;
+    type("Text2", "87,6");
+    click("Command1");
+    expectRefusal(0, 164);
+    type("Text2", "90,1");
+    click("Command1");
+    EXPECT_EQ(rows(), Lines({"90.1", "94.3", "90,1"}));
+    click("Uebernahme_Knopf");
+    EXPECT_EQ(profile(kSet1, "RDS", "AF_LISTE1"), "87.6,90.1,94.3,90,1");
+    open();
+    EXPECT_EQ(rows(), Lines({"90.1", "94.3", "90", "1"}));
+}
+
+TEST_F(EditorTest, InsertingPutsTheAfBeforeTheSelectedRow) {
+    open();
+    selectRow(1);
+    type("Text2", "92.0");
+    click("AF_OF_add");
+    EXPECT_EQ(rows(), Lines({"90.1", "92.0", "94.3"}));
+    EXPECT_EQ(find<QListWidget>("AF_List1")->currentItem()->text(), QStringLiteral("94.3"));
+}
+
+TEST_F(EditorTest, InsertingWithoutASelectedRowDoesNothing) {
+    open();
+    type("Text2", "92.0");
+    click("AF_OF_add");
+    type("Text2", "12");
+    click("AF_OF_add");
+    EXPECT_EQ(rows(), Lines({"90.1", "94.3"}));
+}
+
+TEST_F(EditorTest, RemovingAsksInOneSentenceAndRemovesOnYes) {
+    dialogs.confirmations = {true};
+    open();
+    selectRow(0);
+    click("Rem_Freq");
+    EXPECT_EQ(rows(), Lines{"94.3"});
+    ASSERT_EQ(dialogs.shown.size(), 1U);
+    EXPECT_EQ(dialogs.shown[0].title, QStringLiteral("Change List?"));
+    EXPECT_EQ(dialogs.shown[0].text, QStringLiteral("Do you want to erase this 90.1 MHz frequency from the list?"));
+}
+
+TEST_F(EditorTest, RemovingKeepsTheAfOnNo) {
+    dialogs.confirmations = {false};
+    open();
+    selectRow(0);
+    click("Rem_Freq");
+    EXPECT_EQ(rows(), Lines({"90.1", "94.3"}));
+}
+
+TEST_F(EditorTest, RemovingAsksInGermanOnlyForTheLanguageWithACapitalLetter) {
+    state.language = "Deutsch";
+    dialogs.confirmations = {true};
+    open();
+    selectRow(1);
+    click("Rem_Freq");
+    EXPECT_EQ(dialogs.shown[0].title, QStringLiteral("Liste ändern?"));
+    EXPECT_EQ(dialogs.shown[0].text, QStringLiteral("Möchten Sie diese Frequenz 94.3 MHz aus der Liste löschen?"));
+    EXPECT_EQ(rows(), Lines{"90.1"});
+}
+
+TEST_F(EditorTest, RemovingNeedsASelectedRowThatIsNotEmpty) {
+    setList("AF_LISTE1", "87.6,,90.1");
+    open();
+    click("Rem_Freq");
+    selectRow(0);
+    click("Rem_Freq");
+    EXPECT_EQ(rows(), Lines({"", "90.1"}));
+    EXPECT_TRUE(dialogs.shown.empty());
+}
+
+TEST_F(EditorTest, TheTunedFrequencyIsAskedForAndCutToOneDecimal) {
+    dialogs.inputs = {QStringLiteral("101.25")};
+    open();
+    clickTuned();
+    EXPECT_EQ(text("AF_TN"), "101.2");
+    ASSERT_EQ(dialogs.shown.size(), 1U);
+    EXPECT_EQ(dialogs.shown[0].text, toText(captions.text(162)));
+    EXPECT_EQ(dialogs.shown[0].preset, QStringLiteral("87.6"));
+    click("Uebernahme_Knopf");
+    EXPECT_EQ(profile(kSet1, "RDS", "AF_LISTE1"), "101.2,90.1,94.3");
+}
+
+TEST_F(EditorTest, TheTunedFrequencyIsReachedByTheKeyboard) {
+    dialogs.inputs = {QStringLiteral("90")};
+    open();
+    pressEnter("AF_TN");
+    EXPECT_EQ(text("AF_TN"), "90.0");
+    EXPECT_EQ(rows(), Lines({"90.1", "94.3"}));
+}
+
+TEST_F(EditorTest, AnEmptyAnswerLeavesTheTunedFrequency) {
+    dialogs.inputs = {QString()};
+    open();
+    clickTuned();
+    EXPECT_EQ(text("AF_TN"), "87.6");
+}
+
+TEST_F(EditorTest, ARefusedTunedFrequencyIsAskedForAgainWithWhatWasTyped) {
+    dialogs.inputs = {QStringLiteral("85.9"), QStringLiteral("108.1"), QStringLiteral("abc"), QStringLiteral("86")};
+    dialogs.expectedMessages = 3;
+    open();
+    clickTuned();
+    EXPECT_EQ(text("AF_TN"), "86.0");
+    ASSERT_EQ(dialogs.shown.size(), 7U);
+    expectRefusal(1, 164);
+    EXPECT_EQ(dialogs.shown[2].preset, QStringLiteral("85.9"));
+    expectRefusal(3, 164);
+    EXPECT_EQ(dialogs.shown[4].preset, QStringLiteral("108.1"));
+    expectRefusal(5, 164);
+    EXPECT_EQ(dialogs.shown[6].preset, QStringLiteral("abc"));
+}
+
+TEST_F(EditorTest, ATunedFrequencyWithACommaGetsTheCommaMessageWhateverItsValue) {
+    dialogs.inputs = {QStringLiteral("98,5"), QStringLiteral("12,5"), QString()};
+    dialogs.expectedMessages = 2;
+    open();
+    clickTuned();
+    expectRefusal(1, 166);
+    expectRefusal(3, 166);
+    EXPECT_EQ(dialogs.shown[4].preset, QStringLiteral("12,5"));
+    EXPECT_EQ(text("AF_TN"), "87.6");
+}
+
+TEST_F(EditorTest, EveryCaptionFitsInEveryLanguage) {
+    for (const char* language : {"deutsch", "english", "english US"}) {
+        useLanguage(language);
+        open();
+        EXPECT_LE(editor->width(), 640) << language;
+        EXPECT_LE(editor->height(), 480) << language;
+        editor->resize(editor->minimumSizeHint());
+        QApplication::processEvents();
+        test::expectNothingCutOff(*editor, language);
+        for (const char* name : {"AF_TN", "AF_List1", "Text2"}) {
+            EXPECT_FALSE(find(name)->accessibleName().isEmpty()) << name;
+        }
+    }
+}
+
+}  // namespace
+}  // namespace kdx
