@@ -1,0 +1,132 @@
+"""The program kdx-sim as its user sees it: options, messages, signals, and what it says about the port mapper.
+
+Usage: kdxsim_test.py PATH-OF-KDX-SIM; exit code 77 when port 111 cannot be used here.
+"""
+
+import signal
+import socket
+import struct
+import subprocess
+import sys
+import threading
+import unittest
+
+import pyvisa
+from kdxsim import KdxSim, portIsFree, requirePrograms
+
+PROGRAM = ""
+WITHOUT_PORT_RIGHT = ("setpriv", "--bounding-set=-net_bind_service", "--inh-caps=-net_bind_service")
+
+
+def run(*options):
+    return subprocess.run([PROGRAM, *options], capture_output=True, text=True, timeout=30)
+
+
+def hangUpOnEverybody(listener):
+    try:
+        while True:
+            client, _ = listener.accept()
+            client.setsockopt(socket.SOL_SOCKET, socket.SO_LINGER, struct.pack("ii", 1, 0))
+            client.close()
+    except OSError:
+        pass  # the test is over
+
+
+class Options(unittest.TestCase):
+    def testHelpNamesEveryOption(self):
+        result = run("--help")
+        self.assertEqual((result.returncode, result.stderr), (0, ""))
+        for option in ("--port", "--bind", "--idn", "--trace", "--help", "--version"):
+            self.assertIn(option, result.stdout)
+
+    def testVersion(self):
+        result = run("--version")
+        self.assertEqual((result.returncode, result.stderr), (0, ""))
+        self.assertRegex(result.stdout, r"^kdx-sim \d+\.\d+\.\d+\n$")
+
+    def testWrongUsageIsSaidOnStderrAndExitsWith2(self):
+        for options in (["--nonsense"], ["inst0"], ["-h"], ["--port"], ["--port", ""], ["--port", "70000"],
+                        ["--port", "-1"], ["--port", "12x"], ["--idn"], ["--bind"]):
+            with self.subTest(options=options):
+                result = run(*options)
+                self.assertEqual((result.returncode, result.stdout), (2, ""))
+                self.assertRegex(result.stderr, r"^kdx-sim: .+\n$")
+
+    def testAnAddressThatCannotBeHadIsSaidOnStderrAndExitsWith1(self):
+        for address in ("nonsense", "192.0.2.1"):
+            result = run("--bind", address)
+            self.assertEqual((result.returncode, result.stdout), (1, ""))
+            self.assertIn(address, result.stderr)
+
+    def testAPortThatIsTakenIsSaidOnStderrAndExitsWith1(self):
+        with KdxSim(PROGRAM) as first:
+            result = run("--port", str(first.port))
+            self.assertEqual((result.returncode, result.stdout), (1, ""))
+            self.assertIn(str(first.port), result.stderr)
+
+    def testPortAndAddressAreTaken(self):
+        with socket.socket() as probe:
+            probe.bind(("127.0.0.2", 0))
+            port = probe.getsockname()[1]
+        with KdxSim(PROGRAM, "--bind", "127.0.0.2", "--port", str(port)) as sim:
+            self.assertEqual((sim.address, sim.port), ("127.0.0.2", port))
+            socket.create_connection(("127.0.0.2", port)).close()
+
+    def testOnlyTheLoopbackAddressIsListenedAt(self):
+        with KdxSim(PROGRAM) as sim:
+            self.assertEqual(sim.address, "127.0.0.1")
+            self.assertRaises(ConnectionRefusedError, socket.create_connection, ("127.0.0.2", sim.port))
+
+
+class Run(unittest.TestCase):
+    def testSignalsEndItCleanly(self):
+        for end in (signal.SIGTERM, signal.SIGINT):
+            with KdxSim(PROGRAM) as sim:
+                self.assertEqual(sim.end(end), 0)
+                self.assertEqual((sim.output, sim.errors), ("", ""))
+
+    def testItEndsWhileAClientIsConnected(self):
+        with KdxSim(PROGRAM) as sim, socket.create_connection((sim.address, sim.port)):
+            self.assertEqual(sim.end(), 0)
+
+    def testTheTraceIsPrinted(self):
+        with KdxSim(PROGRAM, "--trace", "--idn", "ME") as sim:
+            device = pyvisa.ResourceManager("@py").open_resource("TCPIP::127.0.0.1::gpib0,28::INSTR")
+            device.query("*IDN?")
+            device.close()
+            self.assertEqual(sim.end(), 0)
+            self.assertEqual(sim.output.splitlines(), ["link 1 opened: gpib0,28", r"link 1 < *IDN?\r\n",
+                                                       r"link 1 > ME\n", "link 1 closed"])
+
+    def testASecondOneSaysThatClientsWillFindTheFirst(self):
+        with KdxSim(PROGRAM) as first, KdxSim(PROGRAM) as second:
+            self.assertIn("unknown to any port mapper", second.ready)
+            self.assertNotEqual(first.port, second.port)
+            socket.create_connection((second.address, second.port)).close()
+            self.assertEqual(second.end(), 0)
+            self.assertIn("did not take the registration", second.errors)
+
+    def testAPortMapperThatHangsUpDoesNoHarm(self):
+        with socket.create_server(("127.0.0.1", 111)) as other:
+            threading.Thread(target=hangUpOnEverybody, args=(other,), daemon=True).start()
+            with KdxSim(PROGRAM) as sim:
+                self.assertIn("unknown to any port mapper", sim.ready)
+                self.assertEqual(sim.end(), 0)
+            other.shutdown(socket.SHUT_RDWR)
+
+    def testWithoutTheRightToPort111ItSaysWhatToDoAndServesAllTheSame(self):
+        with KdxSim(PROGRAM, wrapper=WITHOUT_PORT_RIGHT) as sim:
+            self.assertIn("unknown to any port mapper", sim.ready)
+            socket.create_connection((sim.address, sim.port)).close()
+            self.assertEqual(sim.end(), 0)
+            for word in ("root", "setcap", "net.ipv4.ip_unprivileged_port_start"):
+                self.assertIn(word, sim.errors)
+
+
+if __name__ == "__main__":
+    PROGRAM = sys.argv.pop(1)
+    requirePrograms("setpriv")
+    if not portIsFree(111):
+        print("port 111 cannot be used, and this system permits no network of our own")
+        sys.exit(77)
+    unittest.main(verbosity=2)
