@@ -20,33 +20,33 @@ std::string cutAtLineFeed(const std::string& answer) {
 
 }  // namespace
 
-Instrument::Instrument(Visa& visa, ProgramState& state, DataFolder& data, Clock& clock,
-                       std::function<void(const std::string&)> interfaceError)
+Instrument::Instrument(Visa& visa, ProgramState& state, DataFolder& data, Clock& clock, InterfaceError interfaceError)
     : m_visa(visa), m_state(state), m_data(data), m_clock(clock), m_interfaceError(std::move(interfaceError)) {}
 
 void Instrument::Send2Gen(const std::string& command) {
-    if (!m_state.InstrumentOnline) return;
+    if (!m_state.InstrumentOnline || m_sequenceStopped) return;
     LastVisaStatus = m_visa.viWrite(InstrSession, command, LastRetCount);
     notify(Traffic::Kind::Written, command, LastVisaStatus);
     // Stricter than a read: whatever is not plain success may mean that the coder did not get the command.
-    if (LastVisaStatus != 0) m_interfaceError("Fehler: " + std::to_string(LastVisaStatus));
+    if (LastVisaStatus != 0) fail();
 }
 
 std::string Instrument::ReadFromGen() {
     if (!m_state.InstrumentOnline) return kNoSessionAnswer;
+    if (m_sequenceStopped) return kReadError;
     std::string answer(kAnswerLength, ' ');
     LastVisaStatus = m_visa.viRead(InstrSession, answer, LastRetCount);
     notify(Traffic::Kind::Read, answer, LastVisaStatus);
     // A completed read normally reports a positive completion code (count reached, terminator seen): no failure.
     if (LastVisaStatus < 0) {
-        m_interfaceError("Fehler: " + std::to_string(LastVisaStatus));
+        fail();
         return kReadError;
     }
     return answer;
 }
 
 void Instrument::WriteLog(std::string_view key, std::string_view value, std::string_view note) {
-    if (!m_state.LogEnabled && !m_observer) return;
+    if (m_sequenceStopped || (!m_state.LogEnabled && !m_observer)) return;
     std::string line = rightmost(std::string(20, ' ').append(key), kLogKeyWidth);
     line.append("= ").append(value);
     if (!note.empty()) line.append("\"").append(note).append("\"");
@@ -63,6 +63,7 @@ void Instrument::emptyLog() {
 }
 
 std::string Instrument::X4_Abfrage(const std::string& label, const std::string& key) {
+    if (m_sequenceStopped) return {};
     Send2Gen(":STEREO:DIRECT? \"" + key + "\"");
     WriteLog(label, ":STEREO:DIRECT? ", key);
     WaitMs(m_clock, kCommandPauseMs);
@@ -84,6 +85,7 @@ std::string Instrument::X4_Abfrage(const std::string& label, const std::string& 
 }
 
 std::string Instrument::VRN_Abfrage(const std::string& label, const std::string& command) {
+    if (m_sequenceStopped) return {};
     Send2Gen(command + "?");
     WriteLog(label, ":? ", command);
     WaitMs(m_clock, kCommandPauseMs);
@@ -96,12 +98,26 @@ std::string Instrument::VRN_Abfrage(const std::string& label, const std::string&
     return shown;
 }
 
+void Instrument::fail() {
+    const bool sequenceRuns = m_sequences > 0;
+    const bool stop = m_interfaceError("Fehler: " + std::to_string(LastVisaStatus), sequenceRuns);
+    m_sequenceStopped = stop && sequenceRuns;
+}
+
 void Instrument::notify(Traffic::Kind kind, std::string text, VisaStatus status) const {
     if (m_observer) m_observer({kind, std::move(text), status});
 }
 
 std::string Instrument::caption(int number) const {
     return m_caption ? m_caption(number) : std::string();
+}
+
+CommandSequence::CommandSequence(Instrument& instrument) : m_instrument(instrument) {
+    ++m_instrument.m_sequences;
+}
+
+CommandSequence::~CommandSequence() {
+    if (--m_instrument.m_sequences == 0) m_instrument.m_sequenceStopped = false;
 }
 
 }  // namespace kdx

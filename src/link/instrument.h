@@ -29,10 +29,11 @@ struct Traffic {
 /// The command transport: every byte to and from the instrument and every log line passes here.
 class Instrument {
 public:
-    /// @param interfaceError shows one failure: the text ("Fehler: " and the status) for a box titled "Interface
-    /// Error".
-    Instrument(Visa& visa, ProgramState& state, DataFolder& data, Clock& clock,
-               std::function<void(const std::string& text)> interfaceError);
+    /// Shows one failure: the text ("Fehler: " and the status) for a box titled "Interface Error". While a sequence
+    /// runs the user may want to stop it: true then.
+    using InterfaceError = std::function<bool(const std::string& text, bool sequenceRuns)>;
+
+    Instrument(Visa& visa, ProgramState& state, DataFolder& data, Clock& clock, InterfaceError interfaceError);
 
     /// Writes the command byte for byte. Does nothing while no session has been opened. Any non-zero status is
     /// reported once; there is no retry.
@@ -63,12 +64,18 @@ public:
 
     [[nodiscard]] Visa& visa() { return m_visa; }
 
+    /// True when the user stopped the running sequence: until it ends nothing is written, read or logged.
+    [[nodiscard]] bool isSequenceStopped() const { return m_sequenceStopped; }
+
     VisaHandle DefaultRm = 0;
     VisaHandle InstrSession = 0;  ///< 0 until opened; closing keeps the old value
     VisaStatus LastVisaStatus = 0;
     std::int32_t LastRetCount = 0;
 
 private:
+    friend class CommandSequence;
+
+    void fail();
     void notify(Traffic::Kind kind, std::string text, VisaStatus status = 0) const;
     [[nodiscard]] std::string caption(int number) const;
 
@@ -76,9 +83,24 @@ private:
     ProgramState& m_state;
     DataFolder& m_data;
     Clock& m_clock;
-    std::function<void(const std::string&)> m_interfaceError;
+    InterfaceError m_interfaceError;
     std::function<void(const Traffic&)> m_observer;
     std::function<std::string(int)> m_caption;
+    int m_sequences = 0;
+    bool m_sequenceStopped = false;
+};
+
+/// While one of these lives, the commands sent and the values asked belong together: a whole data set, or the questions
+/// of one button. When the instrument has gone away in the middle, the user can stop the rest at the first box.
+class CommandSequence {
+public:
+    explicit CommandSequence(Instrument& instrument);
+    ~CommandSequence();
+    CommandSequence(const CommandSequence&) = delete;
+    CommandSequence& operator=(const CommandSequence&) = delete;
+
+private:
+    Instrument& m_instrument;
 };
 
 /// What ReadFromGen gives while no session has been opened.

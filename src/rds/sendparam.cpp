@@ -272,7 +272,7 @@ void ParamSender::SendParam(const std::string& key, std::string& value, const st
     const ParamContext context{m_state.eonIdentifier, m_clockText(), timeText(m_clock.secondsSinceMidnight()),
                                dateText(m_clock.today())};
     const std::optional<std::string> command = composeCommand(key, value, context);
-    if (!command) return;
+    if (!command || m_instrument.isSequenceStopped()) return;
     m_instrument.WriteLog(key, "", *command);
     // Gives the coder time to take one command before the next; without a session nothing is sent to it.
     if (m_state.InstrumentOnline) WaitMs(m_clock, kCommandPauseMs);

@@ -12,6 +12,9 @@ public:
     virtual ~Dialogs() = default;
     /// Shows a text with an OK button, details in smaller print under it, and waits for it.
     virtual void message(Icon icon, const QString& title, const QString& text, const QString& details = {}) = 0;
+    /// Shows a failure as a critical box with an OK button and one that stops the running sequence; true for the
+    /// latter.
+    virtual bool messageOrStop(const QString& title, const QString& text) = 0;
     /// Asks with Yes and No; true for Yes.
     virtual bool confirm(const QString& title, const QString& text) = 0;
     /// Asks for a text; an empty answer is given for Cancel too.

@@ -38,6 +38,18 @@ void QtDialogs::message(Icon icon, const QString& title, const QString& text, co
     box.exec();
 }
 
+bool QtDialogs::messageOrStop(const QString& title, const QString& text) {
+    QMessageBox box(QMessageBox::Critical, title, text, QMessageBox::NoButton, QApplication::activeWindow());
+    box.setTextFormat(Qt::PlainText);
+    QPushButton* ok = box.addButton(toText(m_captions.own(317, "OK")), QMessageBox::AcceptRole);
+    box.setDefaultButton(ok);
+    box.setEscapeButton(ok);
+    const QPushButton* stop =
+        box.addButton(toText(m_captions.own(323, "&Rest abbrechen")), QMessageBox::DestructiveRole);
+    box.exec();
+    return static_cast<const QAbstractButton*>(box.clickedButton()) == static_cast<const QAbstractButton*>(stop);
+}
+
 bool QtDialogs::confirm(const QString& title, const QString& text) {
     QMessageBox box(QMessageBox::Question, title, text, QMessageBox::NoButton, QApplication::activeWindow());
     box.setTextFormat(Qt::PlainText);

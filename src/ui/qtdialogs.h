@@ -14,6 +14,7 @@ public:
     explicit QtDialogs(const Captions& captions);
 
     void message(Icon icon, const QString& title, const QString& text, const QString& details = {}) override;
+    bool messageOrStop(const QString& title, const QString& text) override;
     bool confirm(const QString& title, const QString& text) override;
     QString input(const QString& prompt, const QString& title, const QString& preset) override;
 

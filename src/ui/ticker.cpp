@@ -1,5 +1,7 @@
 #include "ui/ticker.h"
 
+#include <QScopedValueRollback>
+
 #include <cmath>
 #include <stdexcept>
 
@@ -21,8 +23,19 @@ void Ticker::setPeriod(double milliseconds) {
     apply();
 }
 
+void Ticker::setHeld(bool held) {
+    m_held = held;
+    apply();
+}
+
+void Ticker::timerEvent(QTimerEvent* event) {
+    if (m_ticking) return;
+    const QScopedValueRollback ticking(m_ticking, true);
+    QTimer::timerEvent(event);
+}
+
 void Ticker::apply() {
-    if (m_enabled && m_period > 0) {
+    if (m_enabled && !m_held && m_period > 0) {
         start(m_period);
     } else {
         stop();

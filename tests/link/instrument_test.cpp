@@ -50,7 +50,11 @@ protected:
     ProgramState m_state;
     DataFolder m_data{m_folder.path()};
     Lines m_errors;
-    Instrument m_instrument{m_visa, m_state, m_data, m_clock, [this](const auto& text) { m_errors.push_back(text); }};
+    bool m_stopAtFailure = false;  // press the button that stops the running sequence
+    Instrument m_instrument{m_visa, m_state, m_data, m_clock, [this](const auto& text, bool sequence) {
+                                m_errors.push_back(text);
+                                return sequence && m_stopAtFailure;
+                            }};
 };
 
 TEST_F(InstrumentTest, AWriteSendsTheCommandByteForByte) {
@@ -67,6 +71,46 @@ TEST_F(InstrumentTest, AnEmptyCommandIsWrittenToo) {
     m_instrument.Send2Gen("");
     EXPECT_EQ(m_visa.written, Lines{""});
     EXPECT_EQ(m_instrument.LastRetCount, 0);
+}
+
+TEST_F(InstrumentTest, AStoppedSequenceSendsAsksAndLogsNothingMore) {
+    m_visa.writeStatus = visa::kConnectionLost;
+    m_stopAtFailure = true;
+    {
+        const CommandSequence sequence(m_instrument);
+        m_instrument.Send2Gen("one");
+        EXPECT_TRUE(m_instrument.isSequenceStopped());
+        m_instrument.Send2Gen("two");
+        EXPECT_EQ(m_instrument.X4_Abfrage("PS?", "PS"), "");
+        EXPECT_EQ(m_instrument.VRN_Abfrage("Freq?", "FREQ"), "");
+        EXPECT_EQ(m_instrument.ReadFromGen(), "Error");
+    }
+    EXPECT_EQ(m_visa.written, std::vector<std::string>{"one"});
+    EXPECT_EQ(m_visa.reads, 0);
+    EXPECT_EQ(m_errors.size(), 1U);
+    EXPECT_FALSE(m_instrument.isSequenceStopped());
+    m_instrument.Send2Gen("three");
+    EXPECT_EQ(m_visa.written.back(), "three");
+}
+
+TEST_F(InstrumentTest, OutsideASequenceNothingCanBeStopped) {
+    m_visa.writeStatus = visa::kConnectionLost;
+    m_stopAtFailure = true;
+    m_instrument.Send2Gen("one");
+    m_instrument.Send2Gen("two");
+    EXPECT_EQ(m_errors.size(), 2U);
+}
+
+TEST_F(InstrumentTest, AnInnerSequenceDoesNotEndTheStopOfTheOuterOne) {
+    m_visa.writeStatus = visa::kConnectionLost;
+    m_stopAtFailure = true;
+    const CommandSequence outer(m_instrument);
+    {
+        const CommandSequence inner(m_instrument);
+        m_instrument.Send2Gen("one");
+    }
+    m_instrument.Send2Gen("two");
+    EXPECT_EQ(m_visa.written, std::vector<std::string>{"one"});
 }
 
 TEST_F(InstrumentTest, WithoutASessionNothingIsWrittenOrReported) {

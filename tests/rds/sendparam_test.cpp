@@ -230,7 +230,10 @@ protected:
     ProgramState m_state;
     DataFolder m_data{m_folder.path()};
     Lines m_errors;
-    Instrument m_instrument{m_visa, m_state, m_data, m_clock, [this](const auto& text) { m_errors.push_back(text); }};
+    Instrument m_instrument{m_visa, m_state, m_data, m_clock, [this](const auto& text, bool) {
+                                m_errors.push_back(text);
+                                return false;
+                            }};
     int m_ended = 0;
     ParamSender m_params{m_instrument, m_state, m_clock, [] { return "08:15:30"s; }, [this] { ++m_ended; }};
 };

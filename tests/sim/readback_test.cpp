@@ -29,7 +29,10 @@ protected:
     ProgramState state;
     SimVisa library{instrument};
     std::vector<std::string> failures;
-    Instrument link{library, state, data, clock, [this](const std::string& text) { failures.push_back(text); }};
+    Instrument link{library, state, data, clock, [this](const std::string& text, bool) {
+                        failures.push_back(text);
+                        return false;
+                    }};
 };
 
 // Cuts the answer at its commas, as sending a data set does to remove what the coder holds.

@@ -115,8 +115,11 @@ protected:
     StatusRow statusRow{nullptr};
     ScriptedDialogs dialogs;
     std::string clockText = "12:00:00";  ///< what `Uhr_Zeit` reads where no page shows it
-    Instrument instrument{visa, state, data, clock, [this](const std::string& text) {
-                              dialogs.message(Dialogs::Icon::Critical, QStringLiteral("Interface Error"), toText(text));
+    Instrument instrument{visa, state, data, clock, [this](const std::string& text, bool sequenceRuns) {
+                              const QString title = QStringLiteral("Interface Error");
+                              if (sequenceRuns) return dialogs.messageOrStop(title, toText(text));
+                              dialogs.message(Dialogs::Icon::Critical, title, toText(text));
+                              return false;
                           }};
     ParamSender params{instrument, state, clock, [this] { return clockText; }, [] {}};
     PageContext context{params, instrument, state, statusRow, captions, dialogs, data, clock};

@@ -30,6 +30,10 @@ public:
             ADD_FAILURE() << "unexpected box: " << title.toStdString() << " | " << text.toStdString();
         }
     }
+    bool messageOrStop(const QString& title, const QString& text) override {
+        message(Icon::Critical, title, text);
+        return stopAtFailure;
+    }
     bool confirm(const QString& title, const QString& text) override {
         shown.push_back({Icon::None, title, text, {}});
         if (confirmations.empty()) {
@@ -58,6 +62,7 @@ public:
     }
 
     int expectedMessages = 0;        ///< how many message boxes may still come
+    bool stopAtFailure = false;      ///< press the button that stops the running sequence
     std::deque<QString> inputs;      ///< answers of the input boxes, in turn; empty for Cancel
     std::deque<bool> confirmations;  ///< answers of the Yes/No boxes, in turn
     std::vector<Shown> shown;        ///< every box, in order
