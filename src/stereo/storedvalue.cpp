@@ -1,0 +1,42 @@
+#include "stereo/storedvalue.h"
+
+#include <algorithm>
+#include <cmath>
+#include <limits>
+#include <string>
+
+#include "base/numbers.h"
+
+namespace kdx {
+
+namespace {
+
+/// The leading number in single precision; infinite where that cannot hold it.
+float singleNumber(std::string_view text) {
+    const double number = leadingNumber(text);
+    if (std::abs(number) > std::numeric_limits<float>::max()) {
+        return std::copysign(std::numeric_limits<float>::infinity(), static_cast<float>(std::copysign(1.0, number)));
+    }
+    return static_cast<float>(number);
+}
+
+}  // namespace
+
+int storedOption(std::string_view text, int first, int last) {
+    for (int option = first; option <= last; ++option) {
+        if (text == std::to_string(option)) return option - first;
+    }
+    return -1;
+}
+
+int storedPosition(std::string_view text, int lowest, int highest) {
+    const double within = std::clamp(leadingNumber(text), static_cast<double>(lowest), static_cast<double>(highest));
+    return static_cast<int>(std::lround(within));
+}
+
+bool liesBetween(std::string_view entered, std::string_view lower, std::string_view upper) {
+    const float number = singleNumber(entered);
+    return number > singleNumber(lower) && number < singleNumber(upper);
+}
+
+}  // namespace kdx

@@ -1,0 +1,19 @@
+#pragma once
+
+#include <string_view>
+
+namespace kdx {
+
+/// The option that a stored text names: 0 for the text of `first`, 1 for the one after it, up to `last`; -1 (none) for
+/// every other text, an empty one included.
+[[nodiscard]] int storedOption(std::string_view text, int first, int last);
+
+/// The position of a scroll bar for a stored text: the number it begins with (0 when none), rounded to a whole one and
+/// kept within the range.
+[[nodiscard]] int storedPosition(std::string_view text, int lowest, int highest);
+
+/// Whether an entered number lies strictly between the limits; both limits themselves are refused. All three are the
+/// leading numbers of the texts, compared in single precision.
+[[nodiscard]] bool liesBetween(std::string_view entered, std::string_view lower, std::string_view upper);
+
+}  // namespace kdx
