@@ -1,0 +1,238 @@
+#include "stereo/rfpage.h"
+
+#include <gtest/gtest.h>
+
+#include <QGroupBox>
+#include <QMouseEvent>
+
+#include "support/layoutcheck.h"
+#include "support/pagetest.h"
+
+namespace kdx::test {
+namespace {
+
+class RfPageTest : public PageTest {
+protected:
+    RfPageTest() {
+        setProfile(kSet1, "VRN", "HF_Frequenz", "98.5");
+        setProfile(kSet1, "VRN", "HF_Pegel", "80");
+        setProfile(kSet1, "VRN", "NF_Frequenz", "1");
+        setProfile(kSet1, "VRN", "FM_Ulim", "65");
+        setProfile(kSet1, "VRN", "FM_Olim", "110");
+        setProfile(kSet1, "VRN", "NF_Ulim", "0.01");
+        setProfile(kSet1, "VRN", "NF_Olim", "15.1");
+    }
+    QWidget& root() override { return page; }
+
+    /// Clicks a label as a mouse does.
+    void clickLabel(const char* name) {
+        auto* shown = find<QLabel>(name);
+        const QPointF inside(3, 3);
+        for (const auto type : {QEvent::MouseButtonPress, QEvent::MouseButtonRelease}) {
+            QMouseEvent event(type, inside, shown->mapToGlobal(inside), Qt::LeftButton, Qt::LeftButton, {});
+            QApplication::sendEvent(shown, &event);
+        }
+    }
+    void answer(std::initializer_list<const char*> answers) {
+        for (const char* text : answers) dialogs.inputs.push_back(QString::fromUtf8(text));
+    }
+
+    static constexpr const char* kSet1 = "Datenset1.INI";
+    RfPage page{context, nullptr};
+};
+
+TEST_F(RfPageTest, ShowsDashesAndTheOutputOffAtFirst) {
+    EXPECT_EQ(text("Input_HF_Freq_Label"), "-");
+    EXPECT_EQ(text("Input_HF_Pegel_Label"), "-");
+    EXPECT_EQ(text("Input_AF_Freq_Label"), "-");
+    EXPECT_FALSE(checked("HfOnOffState"));
+    EXPECT_EQ(find<QGroupBox>("RF_Freq_Frame")->title(), toText(captions.text(212)));
+    EXPECT_EQ(find<QGroupBox>("AF_Freq_Frame")->title(), toText(captions.text(215)));
+    EXPECT_EQ(find<QGroupBox>("RF_Level_Frame")->title(), toText(captions.text(218)));
+}
+
+TEST_F(RfPageTest, AFrequencyIsAskedForShownAndSent) {
+    answer({"101.2"});
+    clickLabel("Input_HF_Freq_Label");
+    ASSERT_EQ(dialogs.shown.size(), 1U);
+    EXPECT_EQ(dialogs.shown[0].text, toText(captions.text(210)));
+    EXPECT_EQ(dialogs.shown[0].title, toText(captions.text(211)));
+    EXPECT_EQ(dialogs.shown[0].preset, QStringLiteral("98.5"));
+    EXPECT_EQ(text("Input_HF_Freq_Label"), "101.2");
+    EXPECT_EQ(status(StatusSlot::RfFrequency), "101.2");
+    EXPECT_EQ(sent(), Lines{"FREQ 101.2MHZ"});
+}
+
+TEST_F(RfPageTest, ALevelIsAskedForShownAndSent) {
+    answer({"66.5"});
+    clickLabel("Input_HF_Pegel_Label");
+    ASSERT_EQ(dialogs.shown.size(), 1U);
+    EXPECT_EQ(dialogs.shown[0].text, toText(captions.text(216)));
+    EXPECT_EQ(dialogs.shown[0].title, toText(captions.text(217)));
+    EXPECT_EQ(dialogs.shown[0].preset, QStringLiteral("80"));
+    EXPECT_EQ(text("Input_HF_Pegel_Label"), "66.5");
+    EXPECT_EQ(status(StatusSlot::RfLevel), "66.5");
+    EXPECT_EQ(sent(), Lines{":POW 66.5DBUV"});
+}
+
+TEST_F(RfPageTest, AnAudioFrequencyIsAskedForShownAndSent) {
+    answer({"0.4"});
+    clickLabel("Input_AF_Freq_Label");
+    ASSERT_EQ(dialogs.shown.size(), 1U);
+    EXPECT_EQ(dialogs.shown[0].text, toText(captions.text(213)));
+    EXPECT_EQ(dialogs.shown[0].title, toText(captions.text(214)));
+    EXPECT_EQ(dialogs.shown[0].preset, QStringLiteral("1"));
+    EXPECT_EQ(text("Input_AF_Freq_Label"), "0.4");
+    EXPECT_EQ(status(StatusSlot::AudioFrequency), "0.4");
+    EXPECT_EQ(sent(), Lines{":STEREO:AUDIO:FREQ 0.4KHZ"});
+}
+
+TEST_F(RfPageTest, TheLimitsOfTheLevelAreRefusedThemselves) {
+    answer({"0", "120", "-3", "121", "abc", "0.1"});
+    clickLabel("Input_HF_Pegel_Label");
+    EXPECT_EQ(sent(), Lines{":POW 0.1DBUV"});
+    answer({"119.9"});
+    clickLabel("Input_HF_Pegel_Label");
+    EXPECT_EQ(sent(), Lines{":POW 119.9DBUV"});
+}
+
+TEST_F(RfPageTest, TheLimitsOfTheFrequenciesAreRefusedThemselves) {
+    answer({"110", "65", "110.0", "109.9"});
+    clickLabel("Input_HF_Freq_Label");
+    EXPECT_EQ(sent(), Lines{"FREQ 109.9MHZ"});
+    answer({"15.1", "0.01", "0.011"});
+    clickLabel("Input_AF_Freq_Label");
+    EXPECT_EQ(sent(), Lines{":STEREO:AUDIO:FREQ 0.011KHZ"});
+}
+
+TEST_F(RfPageTest, ARefusedTextStaysInTheBox) {
+    answer({"120", "abc", ""});
+    clickLabel("Input_HF_Pegel_Label");
+    ASSERT_EQ(dialogs.shown.size(), 3U);
+    EXPECT_EQ(dialogs.shown[0].preset, QStringLiteral("80"));
+    EXPECT_EQ(dialogs.shown[1].preset, QStringLiteral("120"));
+    EXPECT_EQ(dialogs.shown[2].preset, QStringLiteral("abc"));
+}
+
+TEST_F(RfPageTest, CancellingSendsNothingAndKeepsTheLabel) {
+    answer({"", "200", ""});
+    clickLabel("Input_HF_Freq_Label");
+    clickLabel("Input_HF_Freq_Label");
+    EXPECT_TRUE(sent().empty());
+    EXPECT_EQ(text("Input_HF_Freq_Label"), "-");
+    EXPECT_EQ(status(StatusSlot::RfFrequency), "--");
+}
+
+TEST_F(RfPageTest, TheAnswerIsShownAndSentAsItWasTyped) {
+    answer({" 098.50 x"});
+    clickLabel("Input_HF_Freq_Label");
+    EXPECT_EQ(text("Input_HF_Freq_Label"), " 098.50 x");
+    EXPECT_EQ(sent(), Lines{"FREQ  098.50 xMHZ"});
+}
+
+TEST_F(RfPageTest, NothingEnteredIsStoredAndTheNextBoxOffersTheStoredValueAgain) {
+    answer({"101.2", ""});
+    clickLabel("Input_HF_Freq_Label");
+    clickLabel("Input_HF_Freq_Label");
+    EXPECT_EQ(profile(kSet1, "VRN", "HF_Frequenz"), "98.5");
+    EXPECT_EQ(dialogs.shown[1].preset, QStringLiteral("98.5"));
+}
+
+TEST_F(RfPageTest, LimitsAndValuesComeFromDataSetOneWhateverSetIsCurrent) {
+    state.CurrentDataSet = "3";
+    setProfile("Datenset3.INI", "VRN", "HF_Frequenz", "70");
+    setProfile("Datenset3.INI", "VRN", "FM_Olim", "80");
+    answer({"101.2"});
+    clickLabel("Input_HF_Freq_Label");
+    EXPECT_EQ(dialogs.shown[0].preset, QStringLiteral("98.5"));
+    page.sendFrequency();
+    EXPECT_EQ(sent(), (Lines{"FREQ 101.2MHZ", "FREQ 98.5MHZ"}));
+}
+
+TEST_F(RfPageTest, WithoutStoredLimitsNoFrequencyFits) {
+    setProfile(kSet1, "VRN", "FM_Ulim", "");
+    setProfile(kSet1, "VRN", "FM_Olim", "");
+    answer({"98.5", "-1", "0", ""});
+    clickLabel("Input_HF_Freq_Label");
+    EXPECT_TRUE(sent().empty());
+}
+
+TEST_F(RfPageTest, TheFirstClickSwitchesTheOutputOnTheSecondOff) {
+    click("HfOnOffState");
+    EXPECT_TRUE(checked("HfOnOffState"));
+    click("HfOnOffState");
+    EXPECT_FALSE(checked("HfOnOffState"));
+    EXPECT_EQ(sent(), (Lines{":OUTPUT:STAT ON", ":OUTPUT:STAT OFF"}));
+}
+
+TEST_F(RfPageTest, OpeningTheSessionRunsTheOutputsHandler) {
+    page.HfOnOffState_Click();
+    EXPECT_TRUE(checked("HfOnOffState"));
+    EXPECT_EQ(sent(), Lines{":OUTPUT:STAT ON"});
+    page.HfOnOffState_Click();
+    EXPECT_FALSE(checked("HfOnOffState"));
+    EXPECT_EQ(sent(), Lines{":OUTPUT:STAT OFF"});
+}
+
+TEST_F(RfPageTest, TheStoredValuesAreSentAndShown) {
+    page.sendFrequency();
+    page.sendLevel();
+    page.sendAudioFrequency();
+    EXPECT_EQ(sent(), (Lines{"FREQ 98.5MHZ", ":POW 80DBUV", ":STEREO:AUDIO:FREQ 1KHZ"}));
+    EXPECT_EQ(text("Input_HF_Freq_Label"), "98.5");
+    EXPECT_EQ(text("Input_HF_Pegel_Label"), "80");
+    EXPECT_EQ(text("Input_AF_Freq_Label"), "1");
+    EXPECT_EQ(status(StatusSlot::RfFrequency), "98.5");
+    EXPECT_EQ(status(StatusSlot::RfLevel), "80");
+    EXPECT_EQ(status(StatusSlot::AudioFrequency), "1");
+}
+
+TEST_F(RfPageTest, ChoosingTheSineLeavesNoTrace) {
+    state.LogEnabled = true;
+    page.sendAudioFrequency();
+    EXPECT_EQ(sent(), Lines{":STEREO:AUDIO:FREQ 1KHZ"});
+    EXPECT_EQ(folder.read("RDS_log.txt").find("NFShape"), std::string::npos);
+}
+
+// The instrument refuses the empty value, so what is shown stays true.
+TEST_F(RfPageTest, AMissingValueIsSentButNotShown) {
+    setProfile(kSet1, "VRN", "HF_Frequenz", "");
+    page.sendFrequency();
+    EXPECT_EQ(sent(), Lines{"FREQ MHZ"});
+    EXPECT_EQ(text("Input_HF_Freq_Label"), "-");
+    EXPECT_EQ(status(StatusSlot::RfFrequency), "--");
+}
+
+TEST_F(RfPageTest, RelabellingKeepsTheValues) {
+    page.sendFrequency();
+    sent();
+    useLanguage("english");
+    page.label();
+    EXPECT_EQ(text("Input_HF_Freq_Label"), "98.5");
+    EXPECT_EQ(find<QGroupBox>("RF_Level_Frame")->title(), toText(captions.text(218)));
+    EXPECT_TRUE(sent().empty());
+}
+
+TEST_F(RfPageTest, EveryControlHasAnAccessibleName) {
+    page.sendFrequency();
+    EXPECT_EQ(find("Input_HF_Freq_Label")->accessibleName(), toText(captions.text(212)) + QStringLiteral(": 98.5"));
+    EXPECT_FALSE(find("Input_HF_Pegel_Label")->accessibleName().isEmpty());
+    EXPECT_FALSE(find("Input_AF_Freq_Label")->accessibleName().isEmpty());
+    EXPECT_FALSE(find("HfOnOffState")->accessibleName().isEmpty());
+}
+
+TEST_F(RfPageTest, NothingIsCutOffInAnyLanguage) {
+    page.resize(620, 322);
+    page.show();
+    for (const char* language : {"deutsch", "english", "english US"}) {
+        useLanguage(language);
+        page.label();
+        QApplication::processEvents();
+        EXPECT_LE(page.minimumSizeHint().width(), 620) << language;
+        EXPECT_LE(page.minimumSizeHint().height(), 322) << language;
+        expectNothingCutOff(page, language);
+    }
+}
+
+}  // namespace
+}  // namespace kdx::test
