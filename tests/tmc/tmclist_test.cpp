@@ -1,0 +1,131 @@
+#include "tmc/tmclist.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <filesystem>
+#include <string>
+
+#include "support/tempfolder.h"
+#include "support/unprivileged.h"
+
+namespace kdx {
+namespace {
+
+using ::testing::ElementsAre;
+using ::testing::IsEmpty;
+using ::testing::Optional;
+
+namespace fs = std::filesystem;
+
+class TmcListTest : public ::testing::Test {
+protected:
+    [[nodiscard]] fs::path file() const { return m_folder.data() / "Event.txt"; }
+    void write(const std::string& bytes) const { m_folder.write("Event.txt", bytes); }
+    [[nodiscard]] std::string content() const { return m_folder.read("Event.txt"); }
+    [[nodiscard]] std::ptrdiff_t filesInFolder() const {
+        return std::distance(fs::directory_iterator(m_folder.data()), fs::directory_iterator());
+    }
+    test::TempFolder m_folder;
+};
+
+TEST(ShownEntryTest, PadsTheTextToFortyTwoCharacters) {
+    EXPECT_EQ(shownEntry("Stau;00101"), "Stau" + std::string(38, ' ') + "00101");
+}
+
+TEST(ShownEntryTest, CutsALongerTextToFortyTwoCharacters) {
+    EXPECT_EQ(shownEntry(std::string(43, 'x') + ";00101"), std::string(42, 'x') + "00101");
+}
+
+TEST(ShownEntryTest, SeparatesAtTheFirstSemicolonOnly) {
+    EXPECT_EQ(shownEntry("a;b;c"), "a" + std::string(41, ' ') + "b;c");
+}
+
+TEST(ShownEntryTest, MayHaveAnEmptyTextOrCode) {
+    EXPECT_EQ(shownEntry(";7"), std::string(42, ' ') + "7");
+    EXPECT_EQ(shownEntry("a;"), "a" + std::string(41, ' '));
+}
+
+TEST(ShownEntryTest, IsNothingWithoutASemicolon) {
+    EXPECT_EQ(shownEntry("Stau 00101"), std::nullopt);
+    EXPECT_EQ(shownEntry(""), std::nullopt);
+}
+
+TEST_F(TmcListTest, LoadsEveryLineThatHasASemicolon) {
+    write("; a remark\r\nno entry\r\n\r\nStau;00101\r\nUnfall;00201\r\n");
+    EXPECT_THAT(loadTmcList(file()),
+                Optional(ElementsAre(std::string(42, ' ') + " a remark", "Stau" + std::string(38, ' ') + "00101",
+                                     "Unfall" + std::string(36, ' ') + "00201")));
+}
+
+TEST_F(TmcListTest, LoadsTheLastLineWithoutItsEndAndBareLineFeeds) {
+    write("a;1\nb;2");
+    EXPECT_THAT(loadTmcList(file()),
+                Optional(ElementsAre("a" + std::string(41, ' ') + "1", "b" + std::string(41, ' ') + "2")));
+}
+
+TEST_F(TmcListTest, LoadsAnEmptyFileAsAnEmptyList) {
+    write("");
+    EXPECT_THAT(loadTmcList(file()), Optional(IsEmpty()));
+}
+
+TEST_F(TmcListTest, LoadsGarbageWithoutLosingTheEntriesBesideIt) {
+    write(std::string("\0\x01\xff\r\n", 5) + std::string(1'000'000, 'x') + "\r\nStau;00101\r\n");
+    EXPECT_THAT(loadTmcList(file()), Optional(ElementsAre("Stau" + std::string(38, ' ') + "00101")));
+}
+
+TEST_F(TmcListTest, LoadingAMissingFileFails) {
+    EXPECT_EQ(loadTmcList(file()), std::nullopt);
+}
+
+TEST_F(TmcListTest, AppendsALineAsItWasTyped) {
+    write("Stau;00101\r\n");
+    EXPECT_TRUE(appendToTmcList(file(), std::string(50, 'x'), "7;8"));
+    EXPECT_EQ(content(), "Stau;00101\r\n" + std::string(50, 'x') + ";7;8\r\n");
+}
+
+TEST_F(TmcListTest, AppendingCreatesAMissingFile) {
+    EXPECT_TRUE(appendToTmcList(file(), "Stau", "00101"));
+    EXPECT_EQ(content(), "Stau;00101\r\n");
+}
+
+TEST_F(TmcListTest, AppendingEndsALastLineThatHadNoEnd) {
+    write("Stau;00101");
+    EXPECT_TRUE(appendToTmcList(file(), "Unfall", "00201"));
+    EXPECT_EQ(content(), "Stau;00101\r\nUnfall;00201\r\n");
+}
+
+TEST_F(TmcListTest, AFileThatCannotBeReplacedKeepsItsContent) {
+    write("Stau;00101\r\n");
+    fs::permissions(m_folder.data(),
+                    fs::perms::owner_read | fs::perms::owner_exec | fs::perms::others_read | fs::perms::others_exec);
+    {
+        const test::Unprivileged user;
+        EXPECT_FALSE(appendToTmcList(file(), "Unfall", "00201"));
+    }
+    fs::permissions(m_folder.data(), fs::perms::owner_all);
+    EXPECT_EQ(content(), "Stau;00101\r\n");
+    EXPECT_EQ(filesInFolder(), 1);
+}
+
+TEST_F(TmcListTest, AFileThatCannotBeReadIsNotReplaced) {
+    write("Stau;00101\r\n");
+    fs::permissions(m_folder.data(), fs::perms::all);
+    fs::permissions(file(), fs::perms::owner_write | fs::perms::others_write);
+    {
+        const test::Unprivileged user;
+        EXPECT_EQ(loadTmcList(file()), std::nullopt);
+        EXPECT_FALSE(appendToTmcList(file(), "Unfall", "00201"));
+    }
+    fs::permissions(file(), fs::perms::owner_all);
+    EXPECT_EQ(content(), "Stau;00101\r\n");
+}
+
+TEST_F(TmcListTest, AppendingFailsWhereTheNameIsAFolder) {
+    fs::create_directory(file());
+    EXPECT_FALSE(appendToTmcList(file(), "Unfall", "00201"));
+    EXPECT_TRUE(fs::is_directory(file()));
+}
+
+}  // namespace
+}  // namespace kdx
