@@ -1,0 +1,200 @@
+#include "tmc/tmclistedit.h"
+
+#include "base/numbers.h"
+#include "settings/captions.h"
+#include "settings/datafolder.h"
+#include "tmc/shownlist.h"
+#include "tmc/tmclist.h"
+#include "ui/controls.h"
+#include "ui/dialogs.h"
+#include "ui/text.h"
+
+#include <QHBoxLayout>
+#include <QScrollBar>
+#include <QShowEvent>
+#include <QStyle>
+#include <QVBoxLayout>
+
+namespace kdx {
+
+namespace {
+
+constexpr int kCodeLength = 5;
+
+}  // namespace
+
+TMC_Listedit::TMC_Listedit(const PageContext& with, QWidget* parent) : QDialog(parent), m_with(with) {
+    setObjectName(QStringLiteral("TMC_Listedit"));
+    Label1 = named<QLabel>("Label1", this);
+    List1 = named<QListWidget>("List1", this);
+    Event_Input_TXT = named<ClickableLabel>("Event_Input_TXT", this);
+    Event_Input_Nr = named<ClickableLabel>("Event_Input_Nr", this);
+    Event_Hinzu = named<QPushButton>("Event_Hinzu", this);
+    Label2 = named<QLabel>("Label2", this);
+    List2 = named<QListWidget>("List2", this);
+    Loc_INput_TXT1 = named<ClickableLabel>("Loc_INput_TXT1", this);
+    Loc_Input_Nr = named<ClickableLabel>("Loc_Input_Nr", this);
+    Loc_Hinzu = named<QPushButton>("Loc_Hinzu", this);
+    Zuruek_Knopf = named<QPushButton>("Zuruek_Knopf", this);
+
+    auto* lists = new QHBoxLayout;
+    tighten(lists, 0);
+    lists->setSpacing(3 * kGap);
+    lists->addLayout(placeEntry(Label1, List1, Event_Input_TXT, Event_Input_Nr, Event_Hinzu));
+    lists->addLayout(placeEntry(Label2, List2, Loc_INput_TXT1, Loc_Input_Nr, Loc_Hinzu));
+    auto* layout = new QVBoxLayout(this);
+    tighten(layout, 2 * kGap);
+    layout->setSpacing(2 * kGap);
+    layout->addLayout(lists, 1);
+    layout->addWidget(Zuruek_Knopf, 0, Qt::AlignRight);
+    for (QPushButton* button : {Event_Hinzu, Loc_Hinzu, Zuruek_Knopf}) button->setAutoDefault(false);
+    wire();
+    label();
+    resize(minimumSizeHint().width(), 24 * List1->fontMetrics().height());
+}
+
+QLayout* TMC_Listedit::placeEntry(QLabel* heading, QListWidget* list, QLabel* text, QLabel* code, QPushButton* add) {
+    heading->setFont(fixedPitch(QStringLiteral("Courier")));
+    list->setFont(fixedPitch(QStringLiteral("Courier New")));
+    // The heading's columns stand over the list's: its frame and its entries' own margin come before the text.
+    heading->setIndent(list->frameWidth() + style()->pixelMetric(QStyle::PM_FocusFrameHMargin, nullptr, list) + 1);
+    const QString widest(static_cast<int>(kListTextLength) + kCodeLength + 2, QLatin1Char('0'));
+    list->setMinimumWidth(list->fontMetrics().horizontalAdvance(widest) + 2 * list->frameWidth() +
+                          list->verticalScrollBar()->sizeHint().width());
+    list->setMinimumHeight(12 * list->fontMetrics().height());
+    for (QLabel* input : {text, code}) {
+        input->setFont(list->font());
+        input->setMinimumHeight(add->sizeHint().height());
+    }
+    text->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Preferred);  // a long text does not widen the window
+    code->setFixedWidth(list->fontMetrics().horizontalAdvance(QStringLiteral("0000000")) + 8);
+
+    auto* entry = new QHBoxLayout;
+    tighten(entry, 0);
+    entry->addWidget(text, 1);
+    entry->addWidget(code);
+    entry->addWidget(add);
+    auto* column = new QVBoxLayout;
+    tighten(column, 0);
+    column->addWidget(heading);
+    column->addWidget(list, 1);
+    column->addLayout(entry);
+    return column;
+}
+
+void TMC_Listedit::wire() {
+    connect(Event_Input_TXT, &ClickableLabel::clicked, this, &TMC_Listedit::Event_Input_TXT_Click);
+    connect(Event_Input_Nr, &ClickableLabel::clicked, this, &TMC_Listedit::Event_Input_Nr_Click);
+    connect(Event_Hinzu, &QPushButton::clicked, this, &TMC_Listedit::Event_Hinzu_Click);
+    connect(Loc_INput_TXT1, &ClickableLabel::clicked, this, &TMC_Listedit::Loc_INput_TXT1_Click);
+    connect(Loc_Input_Nr, &ClickableLabel::clicked, this, &TMC_Listedit::Loc_Input_Nr_Click);
+    connect(Loc_Hinzu, &QPushButton::clicked, this, &TMC_Listedit::Loc_Hinzu_Click);
+    connect(Zuruek_Knopf, &QPushButton::clicked, this, &TMC_Listedit::Zuruek_Knopf_Click);
+}
+
+void TMC_Listedit::label() {
+    const Captions& captions = m_with.captions;
+    const auto own = [&captions](int number, std::string_view design) { return toText(captions.own(number, design)); };
+    const auto heading = [&captions](int text, std::string_view design, int code, std::string_view codeDesign) {
+        return toText(padRight(captions.own(text, design), kListTextLength) + captions.own(code, codeDesign));
+    };
+    setWindowTitle(own(610, "Edit TMC List"));
+    Label1->setText(heading(611, "E v e n t", 612, "C o d e"));
+    Label2->setText(heading(613, "L o c a t i o n", 614, "C o d e "));
+    Event_Hinzu->setText(own(615, "Add to list"));
+    Loc_Hinzu->setText(own(615, "Add to list"));
+    Zuruek_Knopf->setText(own(616, "Exit"));
+    List1->setAccessibleName(own(622, "Events"));
+    List2->setAccessibleName(own(623, "Locations"));
+    Event_Input_Nr->setAccessibleName(own(618, "Event Nr"));
+    Event_Input_TXT->setAccessibleName(own(619, "Event Text"));
+    Loc_Input_Nr->setAccessibleName(own(620, "Location Nr"));
+    Loc_INput_TXT1->setAccessibleName(own(621, "Location Text"));
+    for (QLabel* input : {Event_Input_Nr, Event_Input_TXT, Loc_Input_Nr, Loc_INput_TXT1}) {
+        input->setToolTip(input->accessibleName());
+    }
+}
+
+void TMC_Listedit::showEvent(QShowEvent* event) {
+    QDialog::showEvent(event);
+    if (!event->spontaneous()) Form_Load();
+}
+
+void TMC_Listedit::Form_Load() {
+    takeAllSteps({[this] { Event_Laden(); }, [this] { Location_Laden(); }});
+}
+
+void TMC_Listedit::Event_Laden() {
+    load(List1, kEventList);
+}
+
+void TMC_Listedit::Location_Laden() {
+    load(List2, kLocationList);
+}
+
+void TMC_Listedit::load(QListWidget* list, const char* fileName) {
+    list->clear();
+    list->addItems(loadShownList(m_with, fileName));
+}
+
+bool TMC_Listedit::Event_anhaengen() {
+    if (!append(Event_Input_TXT, Event_Input_Nr, kEventList)) return false;
+    Event_Laden();
+    List1->scrollToBottom();
+    return true;
+}
+
+bool TMC_Listedit::Location_Anhaengen() {
+    if (!append(Loc_INput_TXT1, Loc_Input_Nr, kLocationList)) return false;
+    Location_Laden();
+    List2->scrollToBottom();
+    return true;
+}
+
+bool TMC_Listedit::append(const QLabel* text, const QLabel* code, const char* fileName) {
+    if (appendToTmcList(m_with.data.file(fileName), toBytes(text->text()), toBytes(code->text()))) return true;
+    const QString failure = toText(m_with.captions.own(624, "%1 kann nicht gespeichert werden."));
+    m_with.dialogs.message(Dialogs::Icon::Exclamation, windowTitle(), failure.arg(QLatin1String(fileName)));
+    return false;
+}
+
+void TMC_Listedit::Event_Input_Nr_Click() {
+    ask(Event_Input_Nr, toText(m_with.captions.own(618, "Event Nr")));
+}
+
+void TMC_Listedit::Event_Input_TXT_Click() {
+    ask(Event_Input_TXT, toText(m_with.captions.own(619, "Event Text")));
+}
+
+void TMC_Listedit::Loc_Input_Nr_Click() {
+    ask(Loc_Input_Nr, toText(m_with.captions.own(620, "Location Nr")));
+}
+
+void TMC_Listedit::Loc_INput_TXT1_Click() {
+    ask(Loc_INput_TXT1, toText(m_with.captions.own(621, "Location Text")));
+}
+
+void TMC_Listedit::ask(QLabel* label, const QString& prompt) {
+    const QString answer = m_with.dialogs.input(prompt, toText(m_with.captions.own(617, "Eingabe")), label->text());
+    if (!answer.isEmpty()) label->setText(answer);
+}
+
+void TMC_Listedit::Event_Hinzu_Click() {
+    if (Event_Input_TXT->text().isEmpty() || Event_Input_Nr->text().isEmpty()) return;
+    if (!Event_anhaengen()) return;  // the entry stays to be tried again
+    Event_Input_TXT->clear();
+    Event_Input_Nr->clear();
+}
+
+void TMC_Listedit::Loc_Hinzu_Click() {
+    if (Loc_INput_TXT1->text().isEmpty() || Loc_Input_Nr->text().isEmpty()) return;
+    if (!Location_Anhaengen()) return;
+    Loc_INput_TXT1->clear();
+    Loc_Input_Nr->clear();
+}
+
+void TMC_Listedit::Zuruek_Knopf_Click() {
+    close();
+}
+
+}  // namespace kdx

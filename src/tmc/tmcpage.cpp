@@ -1,0 +1,36 @@
+#include "tmc/tmcpage.h"
+
+#include "tmc/tmcbuilder.h"
+#include "tmc/tmctransmission.h"
+#include "ui/controls.h"
+
+#include <QPushButton>
+#include <QVBoxLayout>
+
+namespace kdx {
+
+TmcPage::TmcPage(const PageContext& with, QWidget* parent) : QWidget(parent) {
+    m_builder = new TmcBuilder(with, this);
+    m_transmission = new TmcTransmission(with, *m_builder, this);
+    auto* layout = new QVBoxLayout(this);
+    tighten(layout, kPageMargin);
+    layout->addWidget(m_builder);
+    layout->addWidget(m_transmission, 1);           // room to spare goes to the message list
+    named<QPushButton>("Command23", this)->hide();  // belongs to the page, does nothing
+}
+
+void TmcPage::label() {
+    m_builder->label();
+    m_transmission->label();
+}
+
+void TmcPage::setUp() {
+    m_builder->setUp();
+    reloadLists();
+}
+
+void TmcPage::reloadLists() {
+    m_builder->reloadLists();
+}
+
+}  // namespace kdx

@@ -1,0 +1,31 @@
+#pragma once
+
+#include "ui/pagecontext.h"
+
+#include <QWidget>
+
+namespace kdx {
+
+class TmcBuilder;
+class TmcTransmission;
+
+/// The page "T M C": composes traffic messages, lists them and sends them.
+class TmcPage : public QWidget {
+    Q_OBJECT
+public:
+    TmcPage(const PageContext& with, QWidget* parent);
+
+    /// Captions every control in the current language; what is composed, listed or being sent stays.
+    void label();
+    /// The page's start-up step. @throws std::runtime_error as reloadLists does, after everything else is set up.
+    void setUp();
+    /// Fills the event and location boxes from the files of the data folder.
+    /// @throws std::runtime_error when one is missing; the page goes on with an empty box.
+    void reloadLists();
+
+private:
+    TmcBuilder* m_builder = nullptr;
+    TmcTransmission* m_transmission = nullptr;
+};
+
+}  // namespace kdx

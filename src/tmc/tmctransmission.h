@@ -1,0 +1,64 @@
+#pragma once
+
+#include "ui/pagecontext.h"
+#include "ui/ticker.h"
+
+#include <QLabel>
+#include <QLineEdit>
+#include <QListWidget>
+#include <QPushButton>
+#include <QRadioButton>
+#include <QWidget>
+
+#include <string>
+
+namespace kdx {
+
+class TmcBuilder;
+
+/// Lower part of the TMC page: the list of messages and its transmission, one at a tick of `TMC_Sende_Timer`, each with
+/// the announcement that tells receivers about TMC.
+class TmcTransmission : public QWidget {
+    Q_OBJECT
+public:
+    /// @param builder composes the message that is added to the list.
+    TmcTransmission(const PageContext& with, const TmcBuilder& builder, QWidget* parent);
+
+    /// Captions every control in the current language; list and transmission go on.
+    void label();
+
+private:
+    void place();
+    void wire();
+
+    void TMC_Gr8_apply_Click();
+    void TMC_Gr8_Remove_Click();
+    void TMC_Senden_Taste_Click();
+    void TMC_Sende_Timer_Timer();
+    void Stop_Timer_Click();
+    void optMultiMessage_Click();
+    void optSingleMessage_Click();
+
+    [[nodiscard]] bool setInterval();
+    void allowChanges(bool allowed);
+    void sendAndStore(const char* key, const std::string& value);
+
+    PageContext m_with;
+    const TmcBuilder& m_builder;
+    int m_sendPosition = 0;
+    bool m_otherVariant = false;  ///< which announcement comes next
+    bool m_ticking = false;
+
+    QListWidget* TMC_List = nullptr;
+    QPushButton* TMC_Gr8_apply = nullptr;
+    QPushButton* TMC_Gr8_Remove = nullptr;
+    QRadioButton* optSingleMessage = nullptr;
+    QRadioButton* optMultiMessage = nullptr;
+    QLabel* lblCycleTime = nullptr;
+    QLineEdit* txtCycleTime = nullptr;
+    QPushButton* TMC_Senden_Taste = nullptr;
+    QPushButton* Stop_Timer = nullptr;
+    Ticker* TMC_Sende_Timer = nullptr;
+};
+
+}  // namespace kdx

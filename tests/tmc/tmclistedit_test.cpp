@@ -1,0 +1,204 @@
+#include "tmc/tmclistedit.h"
+
+#include "support/layoutcheck.h"
+#include "support/pagetest.h"
+#include "support/unprivileged.h"
+#include "ui/application.h"
+
+#include <QListWidget>
+#include <QMouseEvent>
+
+namespace kdx::test {
+namespace {
+
+class TmcListeditTest : public PageTest {
+protected:
+    TmcListeditTest() {
+        folder.write("Event.txt", "Stau;00101\r\nUnfall;00201\r\n");
+        folder.write("Location.txt", "Musterstadt;12345\r\n");
+        open();
+    }
+    void open() {
+        editor = std::make_unique<TMC_Listedit>(context, nullptr);
+        editor->show();
+    }
+    QWidget& root() override { return *editor; }
+
+    Lines entries(const char* name) {
+        Lines lines;
+        const auto* list = find<QListWidget>(name);
+        for (int i = 0; i < list->count(); ++i) lines.push_back(list->item(i)->text().toStdString());
+        return lines;
+    }
+    /// Clicks an input label and answers the box that it opens.
+    void enter(const char* name, const char* answer) {
+        dialogs.inputs.push_back(QString::fromUtf8(answer));
+        auto* label = find(name);
+        const QPointF at(2, 2);
+        QMouseEvent release(QEvent::MouseButtonRelease, at, label->mapToGlobal(at), Qt::LeftButton, Qt::NoButton,
+                            Qt::NoModifier);
+        QApplication::sendEvent(label, &release);
+    }
+    static std::string entry(const std::string& text, const std::string& code) {
+        return text + std::string(42 - text.size(), ' ') + code;
+    }
+
+    std::unique_ptr<TMC_Listedit> editor;
+};
+
+TEST_F(TmcListeditTest, OpeningShowsBothLists) {
+    EXPECT_EQ(entries("List1"), (Lines{entry("Stau", "00101"), entry("Unfall", "00201")}));
+    EXPECT_EQ(entries("List2"), Lines{entry("Musterstadt", "12345")});
+    EXPECT_EQ(editor->objectName().toStdString(), "TMC_Listedit");
+    EXPECT_EQ(editor->windowTitle().toStdString(), "Edit TMC List");
+}
+
+TEST_F(TmcListeditTest, TheListsAreInAFixedPitchFontWithTheHeadingsOverTheirColumns) {
+    for (const auto& [list, heading] : {std::pair{"List1", "Label1"}, std::pair{"List2", "Label2"}}) {
+        const QFontMetrics metrics = find(list)->fontMetrics();
+        EXPECT_EQ(find(list)->font().families().first().toStdString(), "Courier New");
+        EXPECT_EQ(metrics.horizontalAdvance(QStringLiteral("iiii")), metrics.horizontalAdvance(QStringLiteral("WWWW")));
+        EXPECT_EQ(find(heading)->fontMetrics().horizontalAdvance(QString(42, QLatin1Char('0'))),
+                  metrics.horizontalAdvance(QString(42, QLatin1Char('0'))));
+    }
+    EXPECT_EQ(text("Label1"), entry("E v e n t", "C o d e"));
+    EXPECT_EQ(text("Label2"), entry("L o c a t i o n", "C o d e"));
+}
+
+TEST_F(TmcListeditTest, TheInputLabelsAskForTextAndCode) {
+    enter("Event_Input_TXT", "Nebel");
+    enter("Event_Input_Nr", "01332");
+    enter("Loc_INput_TXT1", "Beispielheim");
+    enter("Loc_Input_Nr", "00007");
+    EXPECT_EQ(text("Event_Input_TXT"), "Nebel");
+    EXPECT_EQ(text("Event_Input_Nr"), "01332");
+    EXPECT_EQ(text("Loc_INput_TXT1"), "Beispielheim");
+    EXPECT_EQ(text("Loc_Input_Nr"), "00007");
+    Lines prompts;
+    for (const auto& box : dialogs.shown) {
+        prompts.push_back(box.text.toStdString());
+        EXPECT_EQ(box.title.toStdString(), "Eingabe");
+    }
+    EXPECT_EQ(prompts, (Lines{"Event Text", "Event Nr", "Location Text", "Location Nr"}));
+}
+
+TEST_F(TmcListeditTest, AnEmptyAnswerLeavesTheLabel) {
+    enter("Event_Input_TXT", "Nebel");
+    enter("Event_Input_TXT", "");
+    EXPECT_EQ(text("Event_Input_TXT"), "Nebel");
+}
+
+TEST_F(TmcListeditTest, AddingAnEventAppendsItAndShowsIt) {
+    enter("Event_Input_TXT", "Nebel");
+    enter("Event_Input_Nr", "01332");
+    click("Event_Hinzu");
+    EXPECT_EQ(folder.read("Event.txt"), "Stau;00101\r\nUnfall;00201\r\nNebel;01332\r\n");
+    EXPECT_EQ(entries("List1").back(), entry("Nebel", "01332"));
+    EXPECT_EQ(text("Event_Input_TXT"), "");
+    EXPECT_EQ(text("Event_Input_Nr"), "");
+}
+
+TEST_F(TmcListeditTest, AddingALocationAppendsItAndShowsIt) {
+    enter("Loc_INput_TXT1", "München");
+    enter("Loc_Input_Nr", "00007");
+    click("Loc_Hinzu");
+    EXPECT_EQ(folder.read("Location.txt"), "Musterstadt;12345\r\nM\xfcnchen;00007\r\n");
+    EXPECT_EQ(find<QListWidget>("List2")->item(1)->text(),
+              QString::fromUtf8("München").leftJustified(42) + QStringLiteral("00007"));
+    EXPECT_EQ(folder.read("Event.txt"), "Stau;00101\r\nUnfall;00201\r\n");
+}
+
+TEST_F(TmcListeditTest, AddingWithoutACodeOrWithoutATextWritesNothing) {
+    enter("Event_Input_TXT", "Nebel");
+    click("Event_Hinzu");
+    enter("Loc_Input_Nr", "00007");
+    click("Loc_Hinzu");
+    EXPECT_EQ(folder.read("Event.txt"), "Stau;00101\r\nUnfall;00201\r\n");
+    EXPECT_EQ(folder.read("Location.txt"), "Musterstadt;12345\r\n");
+    EXPECT_EQ(text("Event_Input_TXT"), "Nebel");
+    EXPECT_EQ(text("Loc_Input_Nr"), "00007");
+}
+
+TEST_F(TmcListeditTest, ALongTextIsCutInTheListAndWholeInTheFile) {
+    const std::string longText(50, 'x');
+    enter("Event_Input_TXT", longText.c_str());
+    enter("Event_Input_Nr", "00007");
+    click("Event_Hinzu");
+    EXPECT_EQ(entries("List1").back(), std::string(42, 'x') + "00007");
+    EXPECT_TRUE(folder.read("Event.txt").ends_with(longText + ";00007\r\n"));
+}
+
+TEST_F(TmcListeditTest, NeitherDuplicatesNorCodesAreChecked) {
+    enter("Event_Input_TXT", "Stau");
+    enter("Event_Input_Nr", "a;b");
+    click("Event_Hinzu");
+    EXPECT_EQ(entries("List1").back(), entry("Stau", "a;b"));
+}
+
+TEST_F(TmcListeditTest, TheExitButtonClosesTheWindow) {
+    click("Zuruek_Knopf");
+    EXPECT_FALSE(editor->isVisible());
+}
+
+TEST_F(TmcListeditTest, AMissingFileIsToldAndLeavesItsListEmpty) {
+    auto& application = dynamic_cast<Application&>(*QApplication::instance());
+    Lines told;
+    application.onFailure([&told](const QString&, const QString& error) { told.push_back(error.toStdString()); });
+    std::filesystem::remove(folder.data() / "Event.txt");
+    open();
+    application.onFailure({});
+    EXPECT_EQ(told, Lines{"Event.txt kann nicht gelesen werden."});
+    EXPECT_TRUE(editor->isVisible());
+    EXPECT_TRUE(entries("List1").empty());
+    EXPECT_EQ(entries("List2"), Lines{entry("Musterstadt", "12345")});
+}
+
+TEST_F(TmcListeditTest, AddingToAMissingFileCreatesIt) {
+    std::filesystem::remove(folder.data() / "Event.txt");
+    enter("Event_Input_TXT", "Nebel");
+    enter("Event_Input_Nr", "01332");
+    click("Event_Hinzu");
+    EXPECT_EQ(folder.read("Event.txt"), "Nebel;01332\r\n");
+    EXPECT_EQ(entries("List1"), Lines{entry("Nebel", "01332")});
+}
+
+TEST_F(TmcListeditTest, AnEntryThatCannotBeSavedIsToldAndStaysInItsLabels) {
+    enter("Event_Input_TXT", "Nebel");
+    enter("Event_Input_Nr", "01332");
+    const auto readable = std::filesystem::perms::owner_read | std::filesystem::perms::owner_exec |
+                          std::filesystem::perms::others_read | std::filesystem::perms::others_exec;
+    std::filesystem::permissions(folder.data(), readable);
+    dialogs.expectedMessages = 1;
+    {
+        const Unprivileged user;
+        click("Event_Hinzu");
+    }
+    EXPECT_EQ(dialogs.shown.back().text.toStdString(), "Event.txt kann nicht gespeichert werden.");
+    EXPECT_EQ(text("Event_Input_TXT"), "Nebel");
+    EXPECT_EQ(text("Event_Input_Nr"), "01332");
+    EXPECT_EQ(folder.read("Event.txt"), "Stau;00101\r\nUnfall;00201\r\n");
+}
+
+TEST_F(TmcListeditTest, NothingIsCutOffInAnyLanguage) {
+    for (const char* language : {"deutsch", "english", "english US"}) {
+        useLanguage(language);
+        editor->label();
+        editor->resize(editor->minimumSizeHint());
+        QApplication::processEvents();
+        expectNothingCutOff(*editor, language);
+    }
+}
+
+TEST_F(TmcListeditTest, AnEntryOfAMegabyteIsShownCutAndStaysWholeInTheFile) {
+    const std::string line = "Stau;" + std::string(1'000'000, '0') + "\r\n";
+    folder.write("Event.txt", line);
+    open();
+    EXPECT_EQ(entries("List1"), Lines{entry("Stau", std::string(1000 - 42, '0'))});
+    enter("Event_Input_TXT", "Nebel");
+    enter("Event_Input_Nr", "01332");
+    click("Event_Hinzu");
+    EXPECT_EQ(folder.read("Event.txt"), line + "Nebel;01332\r\n");
+}
+
+}  // namespace
+}  // namespace kdx::test
