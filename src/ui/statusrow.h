@@ -34,6 +34,7 @@ public:
     /// Captions the headings in the current language; the values stay.
     void label(const Captions& captions);
 
+    using QWidget::show;
     void show(StatusSlot slot, const QString& text);
     void show(StatusSlot slot, std::string_view bytes);
     /// What the indicator reads: other handlers decide by it.

@@ -368,6 +368,7 @@ public:
         if (open < 5) whileOpen();
         --open;
     }
+    bool messageOrStop(const QString&, const QString&) override { return false; }
     bool confirm(const QString&, const QString&) override { return false; }
     QString input(const QString&, const QString&, const QString&) override { return {}; }
 

@@ -276,6 +276,7 @@ TEST_F(TmcTransmissionTest, TicksWaitWhileTheBoxOfAFailedWriteIsOpen) {
             ++boxes;
             m_whileOpen();
         }
+        bool messageOrStop(const QString&, const QString&) override { return false; }
         bool confirm(const QString&, const QString&) override { return false; }
         QString input(const QString&, const QString&, const QString&) override { return {}; }
         int boxes = 0;
@@ -285,8 +286,10 @@ TEST_F(TmcTransmissionTest, TicksWaitWhileTheBoxOfAFailedWriteIsOpen) {
     };
     startCycling(2);
     TickingDialogs box([this] { tick("TMC_Sende_Timer"); });
-    Instrument failing{visa, state, data, clock,
-                       [&box](const std::string& text) { box.message(Dialogs::Icon::Critical, {}, toText(text), {}); }};
+    Instrument failing{visa, state, data, clock, [&box](const std::string& text, bool) {
+                           box.message(Dialogs::Icon::Critical, {}, toText(text), {});
+                           return false;
+                       }};
     ParamSender sender{failing, state, clock, [] { return std::string(); }, [] {}};
     const PageContext failingContext{sender, failing, state, statusRow, captions, dialogs, data, clock};
     page = std::make_unique<TmcPage>(failingContext, nullptr);

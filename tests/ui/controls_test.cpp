@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 
+#include <QCoreApplication>
+
 #include "ui/clickablelabel.h"
 
 namespace kdx {

@@ -1,0 +1,106 @@
+// Options and wiring of the program; what there is to test stands elsewhere.
+#include <cstdio>
+#include <cstdlib>
+#include <filesystem>
+#include <string>
+#include <vector>
+
+#include "base/clock.h"
+#include "settings/captions.h"
+#include "settings/datafolder.h"
+#include "settings/dataplace.h"
+#include "settings/programstate.h"
+#include "sim/virtualinstrument.h"
+#include "ui/application.h"
+#include "ui/choosevisa.h"
+#include "ui/hmenue.h"
+#include "ui/options.h"
+#include "ui/qtdialogs.h"
+#include "ui/text.h"
+#include "ui/tour.h"
+
+namespace {
+
+constexpr int kUsageError = 2;
+
+void print(const std::string& line) {
+    std::puts(line.c_str());
+}
+
+bool hasDisplay() {
+#ifdef __unix__
+    return std::getenv("DISPLAY") != nullptr || std::getenv("WAYLAND_DISPLAY") != nullptr ||
+           std::getenv("QT_QPA_PLATFORM") != nullptr;
+#else
+    return true;
+#endif
+}
+
+std::filesystem::path programFolder(const char* program) {
+    std::error_code error;
+    const auto self = std::filesystem::canonical("/proc/self/exe", error);
+    return (error ? std::filesystem::absolute(program, error) : self).parent_path();
+}
+
+std::filesystem::path appFolder(const kdx::Options& options, const char* program, std::string& problem) {
+    kdx::DataPlaces places;
+    if (options.appFolder) places.asked = *options.appFolder;
+    places.program = programFolder(program);
+    places.user = kdx::userFolder();
+    places.shipped = places.program / ".." / "share" / "kdx-rds";
+    if (!std::filesystem::exists(places.shipped / "Daten")) places.shipped = KDX_SHIPPED_DATA;
+    return kdx::chooseAppFolder(places, problem);
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+    const kdx::Options options = kdx::parseOptions({argv + 1, argv + argc});
+    if (!options.error.empty()) {
+        std::fprintf(stderr, "kdx-rds: %s\nTry kdx-rds --help.\n", options.error.c_str());
+        return kUsageError;
+    }
+    if (options.help) {
+        std::fputs(kdx::helpText().c_str(), stdout);
+        return EXIT_SUCCESS;
+    }
+    kdx::SystemClock clock;
+    const kdx::ChosenVisa link = kdx::chooseVisa(options, clock);
+    if (options.version) {
+        print("KDX-RDS " KDX_VERSION "\n" + link.description);
+        return EXIT_SUCCESS;
+    }
+    if (!link.visa) {
+        std::fprintf(stderr, "kdx-rds: %s\n", link.description.c_str());
+        return EXIT_FAILURE;
+    }
+    if (!hasDisplay()) {
+        if (!options.tourFolder) {
+            std::fputs("kdx-rds: there is no display; --tour DIR works without one.\n", stderr);
+            return EXIT_FAILURE;
+        }
+        qputenv("QT_QPA_PLATFORM", "offscreen");
+    }
+
+    kdx::Application application(argc, argv);
+    std::string problem;
+    kdx::DataFolder data(appFolder(options, argv[0], problem));
+    if (!problem.empty()) std::fprintf(stderr, "kdx-rds: %s\n", problem.c_str());
+    kdx::ProgramState state;
+    kdx::Captions captions(data);
+    kdx::QtDialogs boxes(captions);
+    kdx::TourDialogs tourBoxes(print);
+    kdx::Dialogs& dialogs = options.tourFolder ? static_cast<kdx::Dialogs&>(tourBoxes) : boxes;
+    application.onFailure([&](const QString& doing, const QString& error) {
+        dialogs.message(kdx::Dialogs::Icon::Critical, kdx::toText(captions.own(313, "Fehler")),
+                        kdx::toText(captions.own(314, "Bei \"%1\": %2")).arg(doing, error));
+    });
+    kdx::HMenue window({*link.visa, state, data, captions, clock, dialogs, QString::fromStdString(link.description),
+                        [] { QCoreApplication::quit(); }});
+    window.startUp();
+    if (options.tourFolder) {
+        return kdx::makeTour(window, tourBoxes, QString::fromStdString(*options.tourFolder), print);
+    }
+    window.show();
+    return kdx::Application::exec();
+}

@@ -1,0 +1,39 @@
+#include "ui/choosevisa.h"
+
+#include "link/lanvisa.h"
+#include "link/libraryvisa.h"
+#include "sim/simvisa.h"
+#include "sim/virtualinstrument.h"
+#include "ui/options.h"
+
+namespace kdx {
+
+ChosenVisa::ChosenVisa() = default;
+ChosenVisa::~ChosenVisa() = default;
+ChosenVisa::ChosenVisa(ChosenVisa&& other) noexcept = default;
+ChosenVisa& ChosenVisa::operator=(ChosenVisa&& other) noexcept = default;
+
+ChosenVisa chooseVisa(const Options& options, const Clock& clock) {
+    ChosenVisa chosen;
+    if (options.simulate) {
+        chosen.simulated = std::make_unique<VirtualInstrument>(clock);
+        chosen.visa = std::make_unique<SimVisa>(*chosen.simulated);
+        chosen.description = "Virtual instrument inside the program";
+        return chosen;
+    }
+    VisaLibrary library = loadVisaLibrary(options.visaLibrary.value_or(std::string()));
+    if (library.visa) {
+        chosen.visa = std::move(library.visa);
+        chosen.description = "VISA library " + library.file;
+        return chosen;
+    }
+    if (options.visaLibrary) {
+        chosen.description = "The VISA library cannot be used: " + library.reason;
+        return chosen;
+    }
+    chosen.visa = std::make_unique<LanVisa>();
+    chosen.description = "Built-in LAN client (VXI-11); no VISA library found:\n" + library.reason;
+    return chosen;
+}
+
+}  // namespace kdx

@@ -1,0 +1,29 @@
+#pragma once
+
+#include <memory>
+#include <string>
+
+#include "link/visa.h"
+
+namespace kdx {
+
+class Clock;
+class VirtualInstrument;
+struct Options;
+
+/// The instrument link that was chosen, and why, in words for the user.
+struct ChosenVisa {
+    std::unique_ptr<VirtualInstrument> simulated;  ///< the virtual instrument, when it is the one
+    std::unique_ptr<Visa> visa;                    ///< null when a library that was asked for cannot be used
+    std::string description;                       ///< what is used, and why not something else
+    ChosenVisa();
+    ~ChosenVisa();
+    ChosenVisa(ChosenVisa&& other) noexcept;
+    ChosenVisa& operator=(ChosenVisa&& other) noexcept;
+};
+
+/// The virtual instrument when it is asked for; else the VISA library asked for; else an installed one; else the
+/// built-in LAN client.
+[[nodiscard]] ChosenVisa chooseVisa(const Options& options, const Clock& clock);
+
+}  // namespace kdx

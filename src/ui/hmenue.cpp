@@ -1,0 +1,344 @@
+#include "ui/hmenue.h"
+
+#include <QGroupBox>
+#include <QHBoxLayout>
+#include <QIcon>
+#include <QMenu>
+#include <QMenuBar>
+#include <QMouseEvent>
+#include <QPushButton>
+#include <QScrollBar>
+#include <QShortcut>
+#include <QTabBar>
+#include <QTabWidget>
+
+#include "af/afpage.h"
+#include "af/eonpage.h"
+#include "groups/grouppage.h"
+#include "rds/querypage.h"
+#include "rds/rdspage.h"
+#include "rds/storepage.h"
+#include "rds/testmode.h"
+#include "settings/captions.h"
+#include "settings/datafolder.h"
+#include "settings/programstate.h"
+#include "stereo/rfpage.h"
+#include "stereo/stereopage.h"
+#include "tmc/tmclistedit.h"
+#include "tmc/tmcpage.h"
+#include "ui/clickablelabel.h"
+#include "ui/controls.h"
+#include "ui/dialogs.h"
+#include "ui/statusrow.h"
+#include "ui/text.h"
+#include "ui/ticker.h"
+
+namespace kdx {
+
+namespace {
+
+constexpr int kGroupPage = 3;
+constexpr int kQueryPage = 5;
+
+// Captions of the pages as designed, in index order; some begin with a line feed to sit in the tab's second row.
+constexpr std::array kPageCaptions = {"FM / Stereo", "\nR D S",   "AF Liste", "Gruppen", "\nE O N",
+                                      "Fragen",      "Speichern", "\nT M C",  "\n* * *"};
+
+}  // namespace
+
+HMenue::HMenue(const Surroundings& surroundings)
+    : m_s(surroundings),
+      m_status(new StatusRow(this)),
+      m_instrument(
+          m_s.visa, m_s.state, m_s.data, m_s.clock,
+          [this](const std::string& text, bool sequenceRuns) { return showInterfaceError(text, sequenceRuns); }),
+      m_params(
+          m_instrument, m_s.state, m_s.clock, [this] { return m_rds->clockText(); }, m_s.endProgram),
+      m_context(new PageContext{m_params, m_instrument, m_s.state, *m_status, m_s.captions, m_s.dialogs, m_s.data,
+                                m_s.clock}) {
+    setObjectName(QStringLiteral("HMenue"));
+    setWindowIcon(QIcon(QStringLiteral(":/kdx-rds.png")));
+    m_instrument.setCaptionSource([this](int number) { return m_s.captions.text(number); });
+    createConnection();
+    createPages();
+    createMenu();
+    arrange();
+    m_s.data.onUnsavedFileChanged([this] { showQuietLine(); });
+}
+
+HMenue::~HMenue() {
+    m_s.data.onUnsavedFileChanged(nullptr);
+}
+
+void HMenue::createConnection() {
+    Frame8 = named<QGroupBox>("Frame8", this);
+    INIT_Taste = named<QPushButton>("INIT_Taste", QStringLiteral("IEC &Bus INIT"), Frame8);
+    connect(INIT_Taste, &QPushButton::clicked, this, &HMenue::INIT_Taste_Click);
+    Label6 = named<QLabel>("Label6", QStringLiteral("Addr."), Frame8);
+    Adr1_Label = named<ClickableLabel>("Adr1_Label", Frame8);
+    Adr1_Label->setText(QStringLiteral("123.456.789.012"));
+    Adr1_Label->setAlignment(Qt::AlignCenter);
+    Adr1_Label->setMinimumWidth(Adr1_Label->fontMetrics().horizontalAdvance(QStringLiteral("000.000.000.000")) + 8);
+    connect(Adr1_Label, &ClickableLabel::clicked, this, &HMenue::Adr1_Label_Click);
+    Label6->setBuddy(Adr1_Label);
+    Adr1_VScroll = named<QScrollBar>("Adr1_VScroll", Qt::Vertical, Frame8);
+    Adr1_VScroll->hide();  // present without behaviour: the address is typed
+
+    Ende_Taste = named<QPushButton>("Ende_Taste", QStringLiteral("&Ende"), this);
+    connect(Ende_Taste, &QPushButton::clicked, this, &HMenue::Ende_Taste_Click);
+    Image2 = named<QLabel>("Image2", this);
+    Image2->setPixmap(QIcon(QStringLiteral(":/banner.png")).pixmap(QSize(300, 40), devicePixelRatioF()));
+    Image2->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
+}
+
+void HMenue::createPages() {
+    Frame7 = named<QGroupBox>("Frame7", this);
+    SSTab1 = named<QTabWidget>("SSTab1", Frame7);
+    GTL_Taste = named<QPushButton>("GTL_Taste", QStringLiteral("Local"), SSTab1);
+    connect(GTL_Taste, &QPushButton::clicked, this, &HMenue::GTL_Taste_Click);
+    GTL_Taste->setFixedWidth(GTL_Taste->fontMetrics().horizontalAdvance(QStringLiteral("Local")) + 28);
+    SSTab1->setCornerWidget(GTL_Taste);
+    SSTab1->tabBar()->setUsesScrollButtons(false);
+    SSTab1->tabBar()->setExpanding(true);
+
+    m_testMode = new TestMode(*m_context, nullptr);
+    m_stereo = new StereoPage(*m_context, m_testMode, this);
+    m_rds = new RdsPage(*m_context, this);
+    m_af = new AfPage(*m_context, this);
+    m_groups = new GroupPage(*m_context, this);
+    m_eon = new EonPage(*m_context, this);
+    m_queries = new QueryPage(*m_context, this);
+    m_store = new StorePage(*m_context, this);
+    m_tmc = new TmcPage(*m_context, this);
+    m_rf = new RfPage(*m_context, this);
+    const std::array<QWidget*, kPageCaptions.size()> pages = {m_stereo,  m_rds,   m_af,  m_groups, m_eon,
+                                                              m_queries, m_store, m_tmc, m_rf};
+    for (std::size_t i = 0; i < pages.size(); ++i) SSTab1->addTab(pages[i], QString::fromLatin1(kPageCaptions[i]));
+    connect(SSTab1, &QTabWidget::currentChanged, this, &HMenue::SSTab1_Click);
+    // While no session is open the pages can be looked at, though not used.
+    SSTab1->tabBar()->installEventFilter(this);
+    for (const int step : {1, -1}) {
+        auto* shortcut = new QShortcut(step > 0 ? Qt::CTRL | Qt::Key_PageDown : Qt::CTRL | Qt::Key_PageUp, this);
+        connect(shortcut, &QShortcut::activated, this, [this, step] {
+            SSTab1->setCurrentIndex((SSTab1->currentIndex() + step + SSTab1->count()) % SSTab1->count());
+        });
+    }
+
+    connect(m_stereo, &StereoPage::setRdsStereoRequested, this, &HMenue::SetRdsStereo);
+}
+
+void HMenue::createMenu() {
+    const auto entry = [this](const char* name, const char* caption, QMenu* menu, void (HMenue::*handler)()) {
+        auto* action = named<QAction>(name, toText(caption), this);
+        if (handler != nullptr) connect(action, &QAction::triggered, this, handler);
+        menu->addAction(action);
+        return action;
+    };
+    const auto subMenu = [this](const char* name, const char* caption) {
+        auto* menu = named<QMenu>(name, toText(caption), this);
+        Mnu_Info->addMenu(menu);
+        return menu;
+    };
+    Mnu_Info = named<QMenu>("Mnu_Info", QStringLiteral("Info"), this);
+    menuBar()->addMenu(Mnu_Info);
+    Mnu_Info_Interface = subMenu("Mnu_Info_Interface", "Interface");
+    Mnu_Info_Interface_COM =
+        entry("Mnu_Info_Interface_COM", "TCPIP", Mnu_Info_Interface, &HMenue::Mnu_Info_Interface_COM_Click);
+    Mnu_Info_Interface_IEC =
+        entry("Mnu_Info_Interface_IEC", "IEEE488", Mnu_Info_Interface, &HMenue::Mnu_Info_Interface_IEC_Click);
+    Mnu_Info_Ueber = entry("Mnu_Info_Ueber",
+                           "\xDC"
+                           "ber",
+                           Mnu_Info, &HMenue::Mnu_Info_Ueber_Click);
+    Mnu_Info_Hinweis = entry("Mnu_Info_Hinweis", "Hinweis", Mnu_Info, &HMenue::Mnu_Info_Hinweis_Click);
+    Mnu_Info_Sprache = subMenu("Mnu_Info_Sprache", "Sprache");
+    Mnu_Info_Sprache_D = entry("Mnu_Info_Sprache_D", "deutsch", Mnu_Info_Sprache, &HMenue::Mnu_Info_Sprache_D_Click);
+    Mnu_Info_Sprache_E = entry("Mnu_Info_Sprache_E", "english", Mnu_Info_Sprache, &HMenue::Mnu_Info_Sprache_E_Click);
+    Mnu_Info_Sprache_US =
+        entry("Mnu_Info_Sprache_US", "english US", Mnu_Info_Sprache, &HMenue::Mnu_Info_Sprache_US_Click);
+    Mnu_Info_RDS_RBDS = entry("Mnu_Info_RDS_RBDS", "RDS /RBDS", Mnu_Info, &HMenue::Mnu_Info_RDS_RBDS_Click);
+    Mnu_Info_RS232 = entry("Mnu_Info_RS232", "RS232_Set", Mnu_Info, nullptr);
+    Mnu_TMC_Edit = entry("Mnu_TMC_Edit", "TMC Edit", Mnu_Info, &HMenue::Mnu_TMC_Edit_Click);
+    for (QAction* choice : {Mnu_Info_Sprache_D, Mnu_Info_Sprache_E, Mnu_Info_Sprache_US, Mnu_Info_RDS_RBDS}) {
+        choice->setCheckable(true);
+    }
+}
+
+void HMenue::arrange() {
+    auto* connection = new QHBoxLayout(Frame8);
+    tighten(connection);
+    connection->addWidget(INIT_Taste);
+    connection->addWidget(Label6);
+    connection->addWidget(Adr1_Label);
+    connection->addWidget(Adr1_VScroll);
+    auto* top = new QHBoxLayout;
+    top->setSpacing(8);
+    top->addWidget(Frame8);
+    top->addWidget(Ende_Taste);
+    top->addStretch();
+    top->addWidget(Image2);
+
+    auto* parameters = new QVBoxLayout(Frame7);
+    parameters->setContentsMargins(0, 0, 0, 0);
+    parameters->addWidget(SSTab1);
+
+    m_quietLine = named<QLabel>("QuietLine", this);
+    m_quietLine->setTextFormat(Qt::PlainText);
+    m_quietLine->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Fixed);
+    m_quietLine->setFixedHeight(m_quietLine->fontMetrics().height());
+
+    auto* middle = new QWidget(this);
+    auto* column = new QVBoxLayout(middle);
+    column->setContentsMargins(6, 2, 6, 2);
+    column->setSpacing(3);
+    column->addLayout(top);
+    column->addWidget(Frame7, 1);
+    column->addWidget(m_status);
+    column->addWidget(m_quietLine);
+    setCentralWidget(middle);
+}
+
+bool HMenue::eventFilter(QObject* watched, QEvent* event) {
+    if (event->type() == QEvent::MouseButtonPress && watched == SSTab1->tabBar() && !SSTab1->isEnabled()) {
+        const int page = SSTab1->tabBar()->tabAt(static_cast<QMouseEvent*>(event)->pos());
+        if (page >= 0) SSTab1->setCurrentIndex(page);
+        return true;
+    }
+    return QMainWindow::eventFilter(watched, event);
+}
+
+void HMenue::Beschrifter() {
+    m_s.state.language = generalSetting("Sprache", "Sprache");
+    // Before a language was ever chosen the window speaks the one it was designed in.
+    if (m_s.state.language.empty()) m_s.state.language = "deutsch";
+    m_s.state.standard = generalSetting("Sprache", "RDS_RBDS");
+    m_s.captions.load(m_s.state.language, m_s.state.standard);
+    const Captions& captions = m_s.captions;
+
+    labelMenu();
+    Ende_Taste->setText(toText(captions.text(6)));
+    GTL_Taste->setText(toText(captions.own(300, "Local")));
+    Label6->setText(toText(captions.own(308, "Addr.")));
+    Adr1_Label->setAccessibleName(toText(captions.own(319, "Adresse des Ger\xE4ts")));
+    for (int i = 0; i < SSTab1->count(); ++i) SSTab1->setTabText(i, toText(captions.text(10 + i)));
+    SSTab1->setCurrentIndex(0);
+    m_status->label(captions);
+    m_stereo->label();
+    m_testMode->label();
+    m_rds->label();
+    m_af->label();
+    m_groups->label();
+    m_eon->label();
+    m_queries->label();
+    m_store->label();
+    m_tmc->label();
+    m_rf->label();
+    showQuietLine();
+}
+
+void HMenue::labelMenu() {
+    const Captions& captions = m_s.captions;
+    Mnu_Info->setTitle(toText(captions.text(0)));
+    Mnu_Info_Ueber->setText(toText(captions.text(1)));
+    Mnu_Info_Sprache->setTitle(toText(captions.text(2)));
+    Mnu_Info_Sprache_D->setText(toText(captions.text(3)));
+    Mnu_Info_Sprache_E->setText(toText(captions.text(4)));
+    Mnu_Info_Sprache_US->setText(toText(captions.own(306, "english US")));
+    Mnu_Info_Interface->setTitle(toText(captions.own(301, "Interface")));
+    Mnu_Info_Interface_COM->setText(toText(captions.own(320, "TCPIP")));
+    Mnu_Info_Interface_IEC->setText(toText(captions.own(321, "IEEE488")));
+    Mnu_Info_Hinweis->setText(toText(captions.own(302, "Hinweis")));
+    Mnu_Info_RDS_RBDS->setText(toText(captions.own(305, "RDS /RBDS")));
+    Mnu_Info_RS232->setText(toText(captions.own(303, "RS232_Set")));
+    Mnu_TMC_Edit->setText(toText(captions.own(304, "TMC Edit")));
+    Mnu_Info_Sprache_D->setChecked(m_s.state.language == "deutsch");
+    Mnu_Info_Sprache_E->setChecked(m_s.state.language == "english");
+    Mnu_Info_Sprache_US->setChecked(m_s.state.language == "english US");
+    Mnu_Info_RDS_RBDS->setChecked(m_s.state.standard == "RBDS");
+    Mnu_Info_RDS_RBDS->setEnabled(m_s.state.language != "deutsch");
+}
+
+void HMenue::SSTab1_Click(int page) {
+    if (page == kGroupPage) {
+        m_groups->pageOpened();
+        // Not the pages the editor is opened from: its buttons set the kind themselves.
+        m_s.state.afEditorKind = "AF";
+    } else if (page == kQueryPage) {
+        m_s.state.afEditorKind = "EON AF";
+    }
+}
+
+void HMenue::Ende_Taste_Click() {
+    m_s.endProgram();  // every setting was stored when it changed
+}
+
+void HMenue::Mnu_Info_Ueber_Click() {
+    m_s.dialogs.message(Dialogs::Icon::Exclamation, QString(),
+                        QStringLiteral("\nRDS/Stereo Remote Software for KDX-X4\n\n"
+                                       "Supported IEEE-Interface: National Instruments\n\n"
+                                       "VISA I/O standard\n\n"),
+                        m_s.linkDescription);
+}
+
+void HMenue::Mnu_Info_Hinweis_Click() {
+    const Captions& captions = m_s.captions;
+    m_s.dialogs.message(Dialogs::Icon::Exclamation, toText(captions.own(309, "Hinweis")),
+                        toText(captions.own(310, "Programm soll RDS Parameter einstellen") + "\n" +
+                               captions.own(311, "Gedacht f\xFCr VRN mit Opt. X4") + "\n"));
+}
+
+void HMenue::Mnu_Info_Sprache_D_Click() {
+    chooseLanguage("deutsch");
+}
+
+void HMenue::Mnu_Info_Sprache_E_Click() {
+    chooseLanguage("english");
+}
+
+void HMenue::Mnu_Info_Sprache_US_Click() {
+    chooseLanguage("english US");
+}
+
+void HMenue::chooseLanguage(const char* language) {
+    m_s.data.WriteIni("Sprache", "Sprache", language, kGeneralSettings);
+    Beschrifter();
+}
+
+void HMenue::Mnu_Info_RDS_RBDS_Click() {
+    const char* standard = m_s.state.standard == "RBDS" ? "RDS" : "RBDS";
+    m_s.data.WriteIni("Sprache", "RDS_RBDS", standard, kGeneralSettings);
+    Beschrifter();
+}
+
+void HMenue::Mnu_TMC_Edit_Click() {
+    TMC_Listedit editor(*m_context, this);
+    editor.exec();
+    m_tmc->reloadLists();
+}
+
+void HMenue::showQuietLine() {
+    const auto unsaved = m_s.data.unsavedFile();
+    m_quietLine->setText(unsaved ? toText(m_s.captions.own(312, "Nicht gespeichert: %1")).arg(toText(*unsaved))
+                                 : m_startNotice);
+}
+
+bool HMenue::showInterfaceError(const std::string& text, bool sequenceRuns) {
+    // While the box waits, timers would send more to the same broken link and pile up more boxes.
+    const QList<Ticker*> tickers = findChildren<Ticker*>();
+    for (Ticker* ticker : tickers) ticker->setHeld(true);
+    const QString title = QStringLiteral("Interface Error");
+    bool stop = false;
+    if (sequenceRuns) {
+        stop = m_s.dialogs.messageOrStop(title, toText(text));
+    } else {
+        m_s.dialogs.message(Dialogs::Icon::Critical, title, toText(text));
+    }
+    for (Ticker* ticker : tickers) ticker->setHeld(false);
+    return stop;
+}
+
+std::string HMenue::generalSetting(const char* section, const char* key) const {
+    return m_s.data.ReadIni(section, key, kGeneralSettings);
+}
+
+}  // namespace kdx

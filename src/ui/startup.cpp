@@ -1,0 +1,87 @@
+// What the main window does once at the start, and the sending of the whole data set.
+#include <QGuiApplication>
+#include <QTabWidget>
+
+#include "af/afpage.h"
+#include "af/eonpage.h"
+#include "base/codepage.h"
+#include "base/numbers.h"
+#include "groups/grouppage.h"
+#include "rds/rdspage.h"
+#include "rds/testmode.h"
+#include "settings/captions.h"
+#include "settings/datafolder.h"
+#include "settings/programstate.h"
+#include "stereo/rfpage.h"
+#include "stereo/stereopage.h"
+#include "tmc/tmcpage.h"
+#include "ui/hmenue.h"
+#include "ui/text.h"
+
+#include <filesystem>
+
+namespace kdx {
+
+namespace {
+
+constexpr QSize kDesignSize{640, 480};  // pixels at 96 dpi
+
+}  // namespace
+
+void HMenue::startUp() {
+    // The two blanks before the slash and at the end belong to the title.
+    m_s.state.ProgramTitle = "KDX-RDS V 1.0  / Mar. 2009  ";
+    setWindowTitle(toText(m_s.state.ProgramTitle));
+    resize(kDesignSize);
+    m_s.state.InterfaceKind = generalSetting("BUS", "INTERFACE");
+    Schnittstellen_Toggle();
+    m_s.state.InstrumentOnline = false;
+    m_s.state.LogEnabled = leadingNumber(generalSetting("ADRESSEN", "Log_Key")) == 1;
+    showSessionOpen(false);
+    m_stereo->hideRdsPhase();
+    Beschrifter();
+    setUpTmc();
+    m_s.state.CurrentDataSet = "1";
+    m_stereo->loadSettings();
+    m_rds->loadTaSettings();
+    m_rds->loadDataSet();
+    m_groups->loadDataSet();
+    m_eon->loadDataSet();
+    m_af->loadDataSet();
+    m_rds->loadProgrammeType();
+    m_instrument.emptyLog();
+    m_testMode->selectFirstPattern();
+    m_rds->Zeit_Taste_Click();
+    if (upperCase(generalSetting("BUS", "IECBUS")) == "AUTO") INIT_Taste_Click();
+}
+
+void HMenue::setUpTmc() {
+    try {
+        m_tmc->setUp();
+    } catch (const std::exception& error) {
+        m_startNotice = QString::fromUtf8(error.what());  // the page goes on with empty boxes
+    }
+    if (!std::filesystem::exists(m_s.data.file(kLanguageFile))) {
+        m_startNotice = toText(m_s.captions.own(322, "Nicht gefunden: %1")).arg(QLatin1String(kLanguageFile));
+    }
+    showQuietLine();
+}
+
+void HMenue::SetRdsStereo() {
+    m_stereo->sendSettings();
+    m_rds->sendPi();
+    m_rds->sendTrafficFlags();
+    m_rds->sendPs();
+    m_testMode->toRdsMode();
+    m_rds->sendMusicSpeech();
+    m_rds->sendRadiotext();
+    m_af->Taste_AF_Senden_Click();
+    m_rds->sendProgrammeType();
+    m_eon->removeNetworks();
+    m_eon->sendNetwork();
+    m_groups->Gruppenfolge();
+    m_rf->sendFrequency();
+    m_rf->sendLevel();
+}
+
+}  // namespace kdx

@@ -1,0 +1,39 @@
+#pragma once
+
+#include <QString>
+
+#include <functional>
+#include <string>
+
+#include "ui/dialogs.h"
+
+namespace kdx {
+
+class HMenue;
+
+/// Boxes during the tour: nobody is there to close them, so each one is printed and counts as a failure.
+class TourDialogs final : public Dialogs {
+public:
+    explicit TourDialogs(std::function<void(const std::string& line)> print);
+
+    void message(Icon icon, const QString& title, const QString& text, const QString& details = {}) override;
+    bool messageOrStop(const QString& title, const QString& text) override;
+    bool confirm(const QString& title, const QString& text) override;
+    QString input(const QString& prompt, const QString& title, const QString& preset) override;
+
+    [[nodiscard]] int count() const { return m_count; }
+
+private:
+    void note(const QString& title, const QString& text);
+
+    std::function<void(const std::string&)> m_print;
+    int m_count = 0;
+};
+
+/// Walks through the whole window as a user does: opens the session (which sends the data set), shows each page and
+/// saves a picture of it, presses every read-back button, and prints everything that passed.
+/// @returns 0 when the session opened, every picture was saved, every question was answered and no box showed.
+[[nodiscard]] int makeTour(HMenue& window, const TourDialogs& dialogs, const QString& folder,
+                           const std::function<void(const std::string& line)>& print);
+
+}  // namespace kdx

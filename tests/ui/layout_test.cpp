@@ -1,0 +1,124 @@
+#include "support/layoutcheck.h"
+
+#include <gtest/gtest.h>
+
+#include <QGroupBox>
+#include <QTabBar>
+
+#include "support/windowtest.h"
+
+namespace kdx::test {
+namespace {
+
+class LayoutTest : public WindowTest {
+protected:
+    void walk(const char* language, const std::function<void(int page)>& look) {
+        folder.copyShipped();
+        setGeneral("Sprache", "Sprache", language);
+        start();
+        openSession();
+        for (int page = 0; page < 9; ++page) {
+            showPage(page);
+            QCoreApplication::processEvents();
+            look(page);
+        }
+    }
+};
+
+constexpr const char* kLanguages[] = {"deutsch", "english", "english US"};
+
+TEST_F(LayoutTest, NothingIsCutOffInAnyLanguageAtTheDesignSize) {
+    for (const char* language : kLanguages) {
+        walk(language, [&](int page) {
+            EXPECT_EQ(window->size(), QSize(640, 480));
+            expectNothingCutOff(*window, std::string(language) + " page " + std::to_string(page));
+        });
+    }
+}
+
+TEST_F(LayoutTest, TheWindowNeverNeedsMoreThanItsDesignSize) {
+    for (const char* language : kLanguages) {
+        walk(language, [&](int) {
+            const QSize least = window->minimumSizeHint();
+            EXPECT_LE(least.width(), 640) << language;
+            EXPECT_LE(least.height(), 480) << language;
+        });
+    }
+}
+
+TEST_F(LayoutTest, EveryTabShowsItsWholeCaption) {
+    for (const char* language : kLanguages) {
+        walk(language, [&](int page) {
+            const auto* bar = find<QTabWidget>("SSTab1")->tabBar();
+            const int needed = bar->fontMetrics().horizontalAdvance(bar->tabText(page)) + 8;
+            EXPECT_GE(bar->tabRect(page).width(), needed) << language << " page " << page;
+            EXPECT_FALSE(bar->tabText(page).isEmpty());
+        });
+    }
+}
+
+TEST_F(LayoutTest, EveryControlThatCanBeUsedHasANameForThoseWhoCannotSeeIt) {
+    for (const char* language : kLanguages) {
+        walk(language, [&](int page) {
+            for (const QWidget* control : find<QTabWidget>("SSTab1")->widget(page)->findChildren<QWidget*>()) {
+                if (control->focusPolicy() == Qt::NoFocus || control->objectName().isEmpty() ||
+                    control->objectName().startsWith(QStringLiteral("qt_")) || !control->isVisible()) {
+                    continue;
+                }
+                const auto* button = qobject_cast<const QAbstractButton*>(control);
+                const bool ownText = button != nullptr && !button->text().isEmpty();
+                bool buddy = false;
+                for (const QLabel* label : window->findChildren<QLabel*>()) buddy = buddy || label->buddy() == control;
+                EXPECT_TRUE(ownText || buddy || !control->accessibleName().isEmpty())
+                    << language << " " << control->objectName().toStdString();
+            }
+        });
+    }
+}
+
+TEST_F(LayoutTest, NoMnemonicIsGivenTwiceOnAPage) {
+    for (const char* language : kLanguages) {
+        walk(language, [&](int page) {
+            std::map<QString, std::string> taken;
+            for (const QAbstractButton* button : window->findChildren<QAbstractButton*>()) {
+                const QKeySequence key = QKeySequence::mnemonic(button->text());
+                if (key.isEmpty() || !button->isVisible()) continue;
+                const std::string name = button->objectName().toStdString();
+                const auto [at, fresh] = taken.emplace(key.toString(), name);
+                EXPECT_TRUE(fresh) << language << " page " << page << ": " << name << " and " << at->second;
+            }
+        });
+    }
+}
+
+TEST_F(LayoutTest, TheControlsOfAllPagesBearTheSystemsNames) {
+    startShipped();
+    for (const char* name :
+         {"Frame11",      "RDS_Frame",        "FM_Frame",        "Ari_Frame",      "Frame_stereo",
+          "PS_Label",     "Label1",           "PI_Label",        "Taste_PS_Auto",  "PS_A_Label",
+          "Image1",       "MS_Frame",         "Time_Frame",      "RT_Frame",       "DI_Frame",
+          "PS_T",         "Frame1",           "PTY_Combo1",      "PI_T",           "Command3",
+          "PS_Taste",     "PS_dyn_Check",     "Frame2",          "newList",        "Gruppe0",
+          "Gruppe15",     "GS_Senden",        "Label10",         "Frame3",         "EON_PTY_LAbel",
+          "EON_PS_LABEL", "gelesen",          "Command1",        "Command22",      "Store_Taste_4",
+          "TMCBL3_Event", "optSingleMessage", "optMultiMessage", "txtCycleTime",   "Stop_Timer",
+          "Frame5",       "Command23",        "RF_Freq_Frame",   "RF_Level_Frame", "AF_Freq_Frame",
+          "HfOnOffState", "Frame8",           "Frame7",          "Image2",         "Gen1_Label",
+          "Status_17",    "Adr1_VScroll",     "Label6",          "FM_Sorce_Frame", "HScroll1_Label"}) {
+        EXPECT_NE(window->findChild<QWidget*>(QString::fromLatin1(name)), nullptr) << name;
+    }
+    for (const char* timer : {"Timer1", "PS_Timer", "TA_Timer", "TA_Rep_Timer", "EON_TA_Zeit", "TMC_Sende_Timer"}) {
+        EXPECT_NE(window->findChild<QTimer*>(QString::fromLatin1(timer)), nullptr) << timer;
+    }
+}
+
+TEST_F(LayoutTest, TheWindowMayBeEnlarged) {
+    startShipped();
+    window->resize(1280, 960);
+    QCoreApplication::processEvents();
+    EXPECT_EQ(window->size(), QSize(1280, 960));
+    EXPECT_GT(find("SSTab1")->width(), 1200);
+}
+
+}  // namespace
+}  // namespace kdx::test

@@ -1,0 +1,72 @@
+#include "ui/options.h"
+
+#include <gtest/gtest.h>
+
+#include "base/clock.h"
+#include "sim/virtualinstrument.h"
+#include "ui/choosevisa.h"
+
+namespace kdx {
+namespace {
+
+TEST(OptionsTest, AreReadInBothForms) {
+    const Options options = parseOptions({"--app-folder", "/a", "--tour=/b", "--simulate"});
+    EXPECT_EQ(options.error, "");
+    EXPECT_EQ(options.appFolder, "/a");
+    EXPECT_EQ(options.tourFolder, "/b");
+    EXPECT_TRUE(options.simulate);
+    EXPECT_FALSE(options.visaLibrary);
+}
+
+TEST(OptionsTest, AnUnknownOptionIsNamed) {
+    EXPECT_EQ(parseOptions({"--colour"}).error, "unknown option --colour");
+    EXPECT_EQ(parseOptions({"file"}).error, "unknown option file");
+}
+
+TEST(OptionsTest, AMissingOrSuperfluousValueIsNamed) {
+    EXPECT_EQ(parseOptions({"--tour"}).error, "--tour needs a value");
+    EXPECT_EQ(parseOptions({"--app-folder="}).error, "--app-folder needs a value");
+    EXPECT_EQ(parseOptions({"--simulate=yes"}).error, "--simulate takes no value");
+}
+
+TEST(OptionsTest, TwoInstrumentsExcludeEachOther) {
+    EXPECT_NE(parseOptions({"--simulate", "--visa-library", "x.so"}).error, "");
+}
+
+TEST(OptionsTest, TheHelpNamesEveryOption) {
+    for (const char* option : {"--app-folder", "--visa-library", "--simulate", "--tour", "--version", "--help"}) {
+        EXPECT_NE(helpText().find(option), std::string::npos) << option;
+        EXPECT_EQ(parseOptions({std::string(option), "x"}).error.find("unknown option --"), std::string::npos)
+            << option;
+    }
+}
+
+TEST(ChooseVisaTest, TheVirtualInstrumentAnswersWithoutAnything) {
+    SystemClock clock;
+    Options options;
+    options.simulate = true;
+    const ChosenVisa chosen = chooseVisa(options, clock);
+    VisaHandle manager = 0;
+    VisaHandle session = 0;
+    EXPECT_EQ(chosen.visa->viOpenDefaultRM(manager), 0);
+    EXPECT_EQ(chosen.visa->viOpen(manager, "TCPIP::127.0.0.1::INSTR", 0, 0, session), 0);
+}
+
+TEST(ChooseVisaTest, ALibraryThatWasAskedForIsNotReplacedSilently) {
+    const SystemClock clock;
+    Options options;
+    options.visaLibrary = "/nowhere/libvisa.so";
+    const ChosenVisa chosen = chooseVisa(options, clock);
+    EXPECT_EQ(chosen.visa, nullptr);
+    EXPECT_NE(chosen.description.find("/nowhere/libvisa.so"), std::string::npos);
+}
+
+TEST(ChooseVisaTest, SaysHowInstrumentsAreReached) {
+    const SystemClock clock;
+    const ChosenVisa chosen = chooseVisa({}, clock);
+    ASSERT_NE(chosen.visa, nullptr);
+    EXPECT_NE(chosen.description, "");
+}
+
+}  // namespace
+}  // namespace kdx

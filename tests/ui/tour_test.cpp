@@ -1,0 +1,78 @@
+#include "ui/tour.h"
+
+#include <gtest/gtest.h>
+
+#include <QImage>
+
+#include "settings/captions.h"
+#include "sim/simvisa.h"
+#include "sim/virtualinstrument.h"
+#include "support/windowtest.h"
+
+namespace kdx::test {
+namespace {
+
+class TourTest : public ::testing::Test {
+protected:
+    TourTest() { folder.copyShipped(); }
+
+    int tour(Visa& visa) {
+        HMenue window({visa, state, data, captions, clock, dialogs, QString(), [] {}});
+        window.startUp();
+        return makeTour(window, dialogs, QString::fromStdString(pictures.string()), print);
+    }
+
+    TempFolder folder;
+    std::filesystem::path pictures = folder.path() / "pictures";
+    DataFolder data{folder.path()};
+    FakeClock clock;
+    ProgramState state;
+    Captions captions{data};
+    Lines printed;
+    std::function<void(const std::string&)> print = [this](const std::string& line) { printed.push_back(line); };
+    TourDialogs dialogs{print};
+};
+
+TEST_F(TourTest, LeavesNinePicturesAndEveryQuestionAnswered) {
+    VirtualInstrument instrument(clock);
+    SimVisa visa(instrument);
+    EXPECT_EQ(tour(visa), 0) << ::testing::PrintToString(printed);
+    for (int page = 0; page < 9; ++page) {
+        const auto file = pictures / ("page_" + std::to_string(page) + ".png");
+        const QImage picture(QString::fromStdString(file.string()));
+        EXPECT_EQ(picture.size(), QSize(640, 480)) << file;
+    }
+    EXPECT_EQ(printed.back(), "9 pictures, 40 answers, 0 failures");
+}
+
+TEST_F(TourTest, PrintsWhatIsSentAndAnswered) {
+    VirtualInstrument instrument(clock);
+    SimVisa visa(instrument);
+    tour(visa);
+    EXPECT_EQ(printed.front(), "-> *IDN?");
+    EXPECT_NE(std::find(printed.begin(), printed.end(), "-> :STEREO:DIRECT \"PS=MESSTURM\""), printed.end());
+    EXPECT_NE(std::find(printed.begin(), printed.end(), "<- \"MESSTURM\""), printed.end());
+}
+
+TEST_F(TourTest, AnInstrumentThatDoesNotAnswerIsAFailure) {
+    FakeVisa visa;
+    EXPECT_EQ(tour(visa), 1);
+}
+
+TEST_F(TourTest, AnInstrumentThatIsNotThereIsAFailure) {
+    FakeVisa visa;
+    visa.openStatus = visa::kResourceNotFound;
+    EXPECT_EQ(tour(visa), 1);
+    EXPECT_EQ(printed.front(), "!! Interface Error: Please Check Device! -1073807343");
+}
+
+TEST_F(TourTest, AFolderThatCannotBeMadeIsAFailure) {
+    std::ofstream(folder.path() / "file") << "x";
+    pictures = folder.path() / "file" / "pictures";
+    VirtualInstrument instrument(clock);
+    SimVisa visa(instrument);
+    EXPECT_EQ(tour(visa), 1);
+}
+
+}  // namespace
+}  // namespace kdx::test
