@@ -4,6 +4,8 @@
 #include "settings/datafolder.h"
 #include "settings/profilefile.h"
 
+#include <charconv>
+
 namespace kdx {
 
 Captions::Captions(const DataFolder& data) : m_data(data) {}
@@ -14,8 +16,10 @@ void Captions::load(const std::string& language, const std::string& standard) {
     // One look at the file instead of one per caption: a relabelling asks for some three hundred.
     const ProfileText file(readFile(m_data.file(kLanguageFile)).value_or(std::string()));
     for (const auto& [key, value] : file.section(language)) {
-        const auto number = static_cast<int>(leadingNumber(key));
-        if (key == std::to_string(number)) m_texts.emplace(number, value);
+        int number = 0;
+        const auto read = std::from_chars(key.data(), key.data() + key.size(), number);
+        // Numbers stand without leading zeros: "01" is no caption.
+        if (read.ec == std::errc() && key == std::to_string(number)) m_texts.emplace(number, value);
     }
     const char* list = "PTY-Liste_D";
     if (language != "deutsch") list = standard == "RBDS" ? "PTY-Liste_US" : "PTY-Liste_E";

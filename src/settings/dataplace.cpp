@@ -4,6 +4,7 @@
 #include <fstream>
 
 #include "settings/datafolder.h"
+#include "settings/profilefile.h"
 
 namespace kdx {
 
@@ -23,15 +24,24 @@ bool isWritableFolder(const fs::path& folder) {
 void fillFrom(const fs::path& shipped, const DataFolder& target, std::string& problem) {
     std::error_code error;
     fs::create_directories(target.path(), error);
+    if (error) {
+        problem = target.path().string() + ": " + error.message();
+        return;
+    }
     for (auto entry = fs::directory_iterator(shipped, error); !error && entry != fs::directory_iterator();
          entry.increment(error)) {
+        // A file whose name differs in letter case only is the same file.
         const fs::path file = target.file(entry->path().filename().string());
-        // copy_options::skip_existing does not see a file whose name differs in letter case only; file() does.
-        if (fs::exists(file)) continue;
-        fs::copy_file(entry->path(), file, error);
-        if (error) break;
+        std::error_code ignored;
+        if (fs::exists(file, ignored) || !entry->is_regular_file(ignored)) continue;
+        // Whole or not at all: half a file would count as the user's own from the next start on.
+        const auto bytes = readFile(entry->path());
+        if (!bytes || !replaceFile(file, *bytes)) {
+            problem = (bytes ? file : entry->path()).string();
+            return;
+        }
     }
-    if (error) problem = target.path().string() + ": " + error.message();
+    if (error) problem = shipped.string() + ": " + error.message();
 }
 
 }  // namespace

@@ -1,0 +1,186 @@
+#include "settings/dataplace.h"
+
+#include <gtest/gtest.h>
+#include <sys/resource.h>
+#include <sys/wait.h>
+
+#include <csignal>
+#include <cstdlib>
+#include <fstream>
+
+#include "settings/profilefile.h"
+#include "support/tempfolder.h"
+#include "support/unprivileged.h"
+
+namespace kdx::test {
+namespace {
+
+namespace fs = std::filesystem;
+
+/// The program's folder, the user's and the shipped one; the first two have no "Daten" at first.
+class DataPlaceTest : public ::testing::Test {
+protected:
+    DataPlaceTest() {
+        fs::permissions(base.path(), fs::perms::all);
+        fs::remove(base.data());
+        put(shipped / "Daten" / "RDS_Allg.INI", "[BUS]\r\nINTERFACE=IEC\r\n");
+        put(shipped / "Daten" / "Datenset1.INI", "[RDS]\r\nPS=SHIPPED\r\n");
+        fs::create_directories(program);
+    }
+    static void put(const fs::path& file, const std::string& bytes) {
+        fs::create_directories(file.parent_path());
+        std::ofstream(file, std::ios::binary) << bytes;
+    }
+    static std::string get(const fs::path& file) { return readFile(file).value_or("(none)"); }
+    fs::path choose() { return chooseAppFolder(places, problem); }
+
+    TempFolder base;
+    fs::path program = base.path() / "program";
+    fs::path user = base.path() / "home" / "kdx-rds";
+    fs::path shipped = base.path() / "share";
+    DataPlaces places{std::nullopt, program, user, shipped};
+    std::string problem;
+};
+
+TEST_F(DataPlaceTest, TheFolderAskedForWinsAsItIs) {
+    fs::create_directories(program / "Daten");
+    places.asked = base.path() / "elsewhere";
+    EXPECT_EQ(choose(), base.path() / "elsewhere");
+    EXPECT_FALSE(fs::exists(base.path() / "elsewhere"));
+    EXPECT_FALSE(fs::exists(user));
+    EXPECT_EQ(problem, "");
+}
+
+TEST_F(DataPlaceTest, TheProgramsOwnWritableDataAreUsed) {
+    fs::create_directories(program / "DATEN");  // letter case does not count
+    EXPECT_EQ(choose(), program);
+    EXPECT_FALSE(fs::exists(user));
+    EXPECT_TRUE(fs::is_empty(program / "DATEN"));
+}
+
+TEST_F(DataPlaceTest, WithoutDataBesideTheProgramTheUsersFolderIsFilled) {
+    EXPECT_EQ(choose(), user);
+    EXPECT_EQ(get(user / "Daten" / "RDS_Allg.INI"), "[BUS]\r\nINTERFACE=IEC\r\n");
+    EXPECT_EQ(get(user / "Daten" / "Datenset1.INI"), "[RDS]\r\nPS=SHIPPED\r\n");
+    EXPECT_EQ(problem, "");
+}
+
+TEST_F(DataPlaceTest, DataThatCannotBeWrittenBesideTheProgramAreNotUsed) {
+    fs::create_directories(program / "Daten");
+    fs::permissions(program / "Daten",
+                    fs::perms::owner_read | fs::perms::owner_exec | fs::perms::others_read | fs::perms::others_exec);
+    {
+        const Unprivileged ordinary;
+        EXPECT_EQ(choose(), user);
+    }
+    fs::permissions(program / "Daten", fs::perms::all);
+    EXPECT_TRUE(fs::is_empty(program / "Daten"));
+    EXPECT_EQ(get(user / "Daten" / "Datenset1.INI"), "[RDS]\r\nPS=SHIPPED\r\n");
+}
+
+TEST_F(DataPlaceTest, NothingTheUserHasIsOverwritten) {
+    put(user / "Daten" / "DATENSET1.ini", "[RDS]\r\nPS=MINE\r\n");  // the same file in other letters
+    EXPECT_EQ(choose(), user);
+    EXPECT_EQ(get(user / "Daten" / "DATENSET1.ini"), "[RDS]\r\nPS=MINE\r\n");
+    EXPECT_FALSE(fs::exists(user / "Daten" / "Datenset1.INI"));
+    EXPECT_TRUE(fs::exists(user / "Daten" / "RDS_Allg.INI"));
+}
+
+TEST_F(DataPlaceTest, AFileThatIsShippedLaterIsAddedAtTheNextStart) {
+    choose();
+    put(shipped / "Daten" / "Event.txt", "Stau;1\r\n");
+    choose();
+    EXPECT_EQ(get(user / "Daten" / "Event.txt"), "Stau;1\r\n");
+}
+
+TEST_F(DataPlaceTest, FoldersAmongTheShippedDataAreLeftOut) {
+    fs::create_directories(shipped / "Daten" / "AAA");
+    EXPECT_EQ(choose(), user);
+    EXPECT_EQ(problem, "");
+    EXPECT_FALSE(fs::exists(user / "Daten" / "AAA"));
+    EXPECT_TRUE(fs::exists(user / "Daten" / "RDS_Allg.INI"));
+}
+
+TEST_F(DataPlaceTest, MissingShippedDataAreReported) {
+    fs::remove_all(shipped);
+    EXPECT_EQ(choose(), user);
+    EXPECT_NE(problem.find((shipped / "Daten").string()), std::string::npos) << problem;
+    EXPECT_TRUE(fs::is_directory(user / "Daten"));
+}
+
+TEST_F(DataPlaceTest, AUsersFolderThatCannotBeMadeIsReported) {
+    put(base.path() / "home", "a file is in the way");
+    EXPECT_EQ(choose(), user);
+    EXPECT_NE(problem.find(user.string()), std::string::npos) << problem;
+}
+
+TEST_F(DataPlaceTest, AShippedFileThatCannotBeReadIsNamed) {
+    fs::permissions(shipped / "Daten" / "RDS_Allg.INI", fs::perms::none);
+    const Unprivileged ordinary;
+    EXPECT_EQ(choose(), user);
+    EXPECT_NE(problem.find("RDS_Allg.INI"), std::string::npos) << problem;
+    EXPECT_FALSE(fs::exists(user / "Daten" / "RDS_Allg.INI"));
+}
+
+TEST_F(DataPlaceTest, OnAFullDiskNoHalfFileStaysBehind) {
+    put(shipped / "Daten" / "Datenset1.INI", std::string(10000, 'x'));
+    const pid_t child = fork();
+    ASSERT_GE(child, 0);
+    if (child == 0) {
+        // A file takes 4096 bytes at most: copying gets stuck half-way.
+        std::signal(SIGXFSZ, SIG_IGN);
+        const rlimit limit{4096, 4096};
+        const bool limited = ::setrlimit(RLIMIT_FSIZE, &limit) == 0;
+        choose();
+        const bool told = problem.find("Datenset1.INI") != std::string::npos;
+        _exit(limited && told ? 0 : 1);
+    }
+    int status = 0;
+    ASSERT_EQ(::waitpid(child, &status, 0), child);
+    EXPECT_EQ(status, 0);
+    EXPECT_FALSE(fs::exists(user / "Daten" / "Datenset1.INI"));
+    choose();  // with room again
+    EXPECT_EQ(get(user / "Daten" / "Datenset1.INI"), std::string(10000, 'x'));
+}
+
+TEST_F(DataPlaceTest, ShippedFilesThatAreMarkedReadOnlyCanBeWrittenInTheUsersFolder) {
+    fs::permissions(shipped / "Daten" / "Datenset1.INI", fs::perms::owner_read);
+    choose();
+    EXPECT_TRUE(replaceFile(user / "Daten" / "Datenset1.INI", "mine"));
+}
+
+class UserFolder : public ::testing::Test {
+protected:
+    ~UserFolder() override {
+        for (const auto& [name, value] : m_before) {
+            if (value) {
+                setenv(name, value->c_str(), 1);
+            } else {
+                unsetenv(name);
+            }
+        }
+    }
+
+private:
+    static std::optional<std::string> now(const char* name) {
+        const char* value = std::getenv(name);
+        return value == nullptr ? std::nullopt : std::optional<std::string>(value);
+    }
+    std::vector<std::pair<const char*, std::optional<std::string>>> m_before = {{"XDG_DATA_HOME", now("XDG_DATA_HOME")},
+                                                                                {"HOME", now("HOME")}};
+};
+
+TEST_F(UserFolder, FollowsTheXdgStandard) {
+    setenv("HOME", "/home/someone", 1);
+    setenv("XDG_DATA_HOME", "/data", 1);
+    EXPECT_EQ(userFolder(), fs::path("/data/kdx-rds"));
+    unsetenv("XDG_DATA_HOME");
+    EXPECT_EQ(userFolder(), fs::path("/home/someone/.local/share/kdx-rds"));
+    setenv("XDG_DATA_HOME", "", 1);
+    EXPECT_EQ(userFolder(), fs::path("/home/someone/.local/share/kdx-rds"));
+    setenv("XDG_DATA_HOME", "relative", 1);
+    EXPECT_EQ(userFolder(), fs::path("/home/someone/.local/share/kdx-rds"));
+}
+
+}  // namespace
+}  // namespace kdx::test
