@@ -46,7 +46,11 @@ public:
         m_group->setExclusive(false);
         for (std::size_t i = 0; i < Count; ++i) {
             const QSignalBlocker quiet(m_options[i]);
-            m_options[i]->setChecked(static_cast<int>(i) == index);
+            const bool chosen = static_cast<int>(i) == index;
+            m_options[i]->setChecked(chosen);
+            // The tab key goes to the chosen option, or to the first one where none is chosen.
+            const bool first = i == 0 && (index < 0 || index >= static_cast<int>(Count));
+            m_options[i]->setFocusPolicy(chosen || first ? Qt::StrongFocus : Qt::ClickFocus);
         }
         m_group->setExclusive(true);
     }

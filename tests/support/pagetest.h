@@ -5,13 +5,16 @@
 #include <QAbstractButton>
 #include <QApplication>
 #include <QComboBox>
+#include <QKeyEvent>
 #include <QLabel>
 #include <QLineEdit>
 #include <QScrollBar>
 #include <QTimer>
 #include <QTimerEvent>
 
+#include <functional>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "link/instrument.h"
@@ -63,6 +66,13 @@ protected:
         }
         return find<QAbstractButton>(name)->text().toStdString();
     }
+    /// Presses and releases a key in a control.
+    void press(const char* name, Qt::Key key) {
+        for (const auto type : {QEvent::KeyPress, QEvent::KeyRelease}) {
+            QKeyEvent event(type, key, Qt::NoModifier);
+            QApplication::sendEvent(find(name), &event);
+        }
+    }
     bool checked(const char* name) { return find<QAbstractButton>(name)->isChecked(); }
     /// Whether the control itself may be used, a closed session left aside.
     bool enabled(const char* name) {
@@ -86,6 +96,7 @@ protected:
     PageTest() {
         const auto languages = std::filesystem::path(KDX_SOURCE_DIR) / "Daten" / kLanguageFile;
         std::filesystem::copy_file(languages, folder.data() / kLanguageFile);
+        instrument.setCaptionSource([this](int number) { return captions.text(number); });
         state.InstrumentOnline = true;
         useLanguage("deutsch");
     }
@@ -114,14 +125,15 @@ protected:
     Captions captions{data};
     StatusRow statusRow{nullptr};
     ScriptedDialogs dialogs;
-    std::string clockText = "12:00:00";  ///< what `Uhr_Zeit` reads where no page shows it
+    /// What `Uhr_Zeit` reads; the page that shows it is asked where there is one.
+    std::function<std::string()> clockText = [] { return "12:00:00"; };
     Instrument instrument{visa, state, data, clock, [this](const std::string& text, bool sequenceRuns) {
                               const QString title = QStringLiteral("Interface Error");
                               if (sequenceRuns) return dialogs.messageOrStop(title, toText(text));
                               dialogs.message(Dialogs::Icon::Critical, title, toText(text));
                               return false;
                           }};
-    ParamSender params{instrument, state, clock, [this] { return clockText; }, [] {}};
+    ParamSender params{instrument, state, clock, [this] { return clockText(); }, [] {}};
     PageContext context{params, instrument, state, statusRow, captions, dialogs, data, clock};
 };
 
