@@ -26,6 +26,25 @@ constexpr std::size_t kPsLength = 8;
 constexpr int kMostPages = 9;
 constexpr std::int16_t kStopPauseMs = 1000;
 
+/// Toggle, scroll, page mode in this order: the first click ticks the box as its tool tip says, the third, greyed
+/// state is the page mode.
+class ModeBox final : public QCheckBox {
+public:
+    using QCheckBox::QCheckBox;
+
+protected:
+    void nextCheckState() override {
+        switch (checkState()) {
+            case Qt::Unchecked:
+                return setCheckState(Qt::Checked);
+            case Qt::Checked:
+                return setCheckState(Qt::PartiallyChecked);
+            case Qt::PartiallyChecked:
+                return setCheckState(Qt::Unchecked);
+        }
+    }
+};
+
 }  // namespace
 
 std::string nextScrollPs(DynamicPsRecord& record, const std::string& radiotext) {
@@ -45,7 +64,9 @@ std::string nextTogglePs(DynamicPsRecord& record, const std::string& typedPs) {
 std::string nextPagePs(DynamicPsRecord& record, const std::string& radiotext) {
     record.length = static_cast<int>(radiotext.size() / kPsLength);
     // Pages 0 to that number would be cut out: a tenth has no place.
-    if (record.length >= kMostPages) throw std::out_of_range("page " + std::to_string(kMostPages) + " of 0 to 8");
+    if (record.length >= kMostPages) {
+        throw std::out_of_range("Subscript out of range: the pages of a radiotext of 72 characters or more");
+    }
     // The pages are not used any further: this mode blanks the PS on every step and is left exactly so.
     return {};
 }
@@ -57,8 +78,7 @@ DynamicPs::DynamicPs(const PageContext& with, std::function<std::string()> typed
     Taste_PS_Auto = named<PictureSwitch>("Taste_PS_Auto", with.data, page);
     connect(Taste_PS_Auto, &PictureSwitch::clicked, this, &DynamicPs::Taste_PS_Auto_Click);
     PS_A_Label->setBuddy(Taste_PS_Auto);
-    PS_dyn_Check = named<QCheckBox>("PS_dyn_Check", page);
-    PS_dyn_Check->setTristate(true);  // the third, greyed state is the page mode
+    PS_dyn_Check = named<ModeBox>("PS_dyn_Check", page);
 
     PS_Timer = named<Ticker>("PS_Timer", this);
     PS_Timer->setPeriod(2500);
@@ -94,7 +114,14 @@ void DynamicPs::Taste_PS_Auto_Click() {
 void DynamicPs::PS_Timer_Timer() {
     if (m_stepping || (!m_running && m_restored)) return;
     const QScopedValueRollback stepping(m_stepping, true);
-    m_with.params.SendParam("PS", nextStep());
+    std::string ps;
+    try {
+        ps = nextStep();
+    } catch (const std::out_of_range&) {
+        PS_Timer->setPeriod(0);  // the next steps would fail alike: one box, not one after the other
+        throw;
+    }
+    m_with.params.SendParam("PS", ps);
     // A click that came in meanwhile may stop the steps: it is heard before the typed PS is looked at. The timer's
     // own next tick is not let in, however short its interval is.
     QCoreApplication::processEvents();

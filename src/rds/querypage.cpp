@@ -44,7 +44,10 @@ QueryPage::QueryPage(const PageContext& with, QWidget* parent) : QWidget(parent)
     gelesen->setWordWrap(true);
     gelesen->setMargin(6);
     gelesen->setTextInteractionFlags(Qt::TextSelectableByMouse | Qt::TextSelectableByKeyboard);
-    gelesen->setMinimumHeight(gelesen->fontMetrics().lineSpacing() * 7 + 16);
+    QFont larger = font();
+    larger.setPointSizeF(1.2 * larger.pointSizeF());  // read from a distance, with the hands at the instrument
+    gelesen->setFont(larger);
+    gelesen->setMinimumHeight(gelesen->fontMetrics().lineSpacing() * 10 + 16);
 
     auto* grid = new QGridLayout;
     grid->setSpacing(kGap);
@@ -80,7 +83,11 @@ void QueryPage::label() {
         m_buttons[i]->setText(toText(readBack.caption < 300 ? m_with.captions.text(readBack.caption)
                                                             : m_with.captions.own(readBack.caption, readBack.design)));
     }
-    gelesen->setText(toText(m_with.captions.text(139)));
+    if (m_asked == nullptr) {
+        gelesen->setText(toText(m_with.captions.text(139)));
+    } else {
+        showAnswers();  // the same answers in the words of the new language
+    }
 }
 
 void QueryPage::Fragen_Schalter(bool on) {
@@ -89,12 +96,17 @@ void QueryPage::Fragen_Schalter(bool on) {
 
 void QueryPage::ask(const ReadBack& readBack) {
     if (!m_with.state.InstrumentOnline) return;
-    std::vector<std::string> answers;
+    m_answers.clear();
     for (const Query& query : readBack.queries(m_with.state.eonIdentifier)) {
-        answers.push_back(readBack.generator ? m_with.instrument.VRN_Abfrage(query.label, query.key)
-                                             : m_with.instrument.X4_Abfrage(query.label, query.key));
+        m_answers.push_back(readBack.generator ? m_with.instrument.VRN_Abfrage(query.label, query.key)
+                                               : m_with.instrument.X4_Abfrage(query.label, query.key));
     }
-    gelesen->setText(toText(readBack.words(answers, [this](int number) { return m_with.captions.text(number); })));
+    m_asked = &readBack;
+    showAnswers();
+}
+
+void QueryPage::showAnswers() {
+    gelesen->setText(toText(m_asked->words(m_answers, [this](int number) { return m_with.captions.text(number); })));
 }
 
 }  // namespace kdx

@@ -2,6 +2,7 @@
 
 #include <QWidget>
 
+#include <string>
 #include <vector>
 
 #include "ui/pagecontext.h"
@@ -26,9 +27,12 @@ public:
 private:
     /// What every button does: ask its questions in turn and show the answers; nothing while no session is open.
     void ask(const ReadBack& readBack);
+    void showAnswers();
 
     std::vector<QPushButton*> m_buttons;  // `Command1`, `Command4` to `Command22`, in that order
     QLabel* gelesen = nullptr;            // the read-back label
+    const ReadBack* m_asked = nullptr;    ///< whose answers are shown; none at first
+    std::vector<std::string> m_answers;
     PageContext m_with;
 };
 

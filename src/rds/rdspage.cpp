@@ -40,16 +40,21 @@ constexpr std::array<const char*, 8> kDecoderInfo = {"Mono",
                                                      "Stereo comp. Kunstkopf",
                                                      "Stereo comp. Kunstkopf"};
 
+/// Which entry of a list a stored number means; -1 when the list has none such.
+int positionOf(const std::string& stored, int count) {
+    const double number = leadingNumber(stored);
+    return number >= 0 && number < count ? static_cast<int>(number) : -1;
+}
+
 }  // namespace
 
 RdsPage::RdsPage(const PageContext& with, QWidget* parent) : QWidget(parent), m_with(with) {
     createServiceControls();
+    createTraffic();
+    createMusicSpeech();
+    createClock();
     createDecoderInfo();
     createRadiotext();
-    createClock();
-    m_ta = new TaFrame(
-        with, [this] { return Check1->isChecked(); }, this);
-    connect(m_ta, &TaFrame::optionChosen, this, [this] { m_dynamicPs->stopQuietly(); });
     arrange();
 }
 
@@ -60,8 +65,6 @@ void RdsPage::createServiceControls() {
     PS_Taste = named<QPushButton>("PS_Taste", this);
     connect(PS_Taste, &QPushButton::clicked, this, &RdsPage::PS_Taste_Click);
     connect(PS_T, &QLineEdit::returnPressed, PS_Taste, &QPushButton::click);
-    m_dynamicPs = new DynamicPs(
-        m_with, [this] { return toBytes(PS_T->text()); }, [this] { return toBytes(RT_Text1->text()); }, this);
 
     PI_Label = named<QLabel>("PI_Label", this);
     PI_T = named<QLineEdit>("PI_T", this);
@@ -76,9 +79,19 @@ void RdsPage::createServiceControls() {
     Label1->setBuddy(PTY_Combo1);
     connect(PTY_Combo1, &QComboBox::activated, this, &RdsPage::PTY_Combo1_Click);
 
+    m_dynamicPs = new DynamicPs(
+        m_with, [this] { return toBytes(PS_T->text()); }, [this] { return toBytes(RT_Text1->text()); }, this);
+}
+
+void RdsPage::createTraffic() {
     Check1 = named<QCheckBox>("Check1", this);
     connect(Check1, &QCheckBox::clicked, this, &RdsPage::Check1_Click);
+    m_ta = new TaFrame(
+        m_with, [this] { return Check1->isChecked(); }, this);
+    connect(m_ta, &TaFrame::optionChosen, this, [this] { m_dynamicPs->stopQuietly(); });
+}
 
+void RdsPage::createMusicSpeech() {
     Image1 = named<QLabel>("Image1", this);
     Image1->setPixmap(QIcon(QStringLiteral(":/kdx-rds-64.png")).pixmap(QSize(40, 40), devicePixelRatioF()));
 
@@ -137,8 +150,8 @@ void RdsPage::arrange() {
     dynamic->addWidget(m_dynamicPs->Taste_PS_Auto);
     dynamic->addWidget(m_dynamicPs->PS_dyn_Check);
     dynamic->addStretch();
-    service->addLayout(dynamic, 3, 1, 1, 2);
-    service->addWidget(Check1, 4, 0, 1, 3);
+    service->addLayout(dynamic, 3, 1);
+    service->addWidget(Check1, 3, 2);
     service->setColumnStretch(1, 1);
 
     auto* musicSpeech = new QHBoxLayout(MS_Frame);
@@ -155,7 +168,8 @@ void RdsPage::arrange() {
     decoder->setHorizontalSpacing(8);
     decoder->setVerticalSpacing(1);
     for (int i = 0; i < 16; ++i) decoder->addWidget(DI_Opt[static_cast<std::size_t>(i)], i % 8, i / 8);
-    decoder->setColumnStretch(0, 1);
+    decoder->setColumnStretch(0, 2);
+    decoder->setColumnStretch(1, 1);
 
     auto* radiotext = new QHBoxLayout(RT_Frame);
     tighten(radiotext);
@@ -196,6 +210,7 @@ void RdsPage::label() {
     for (QPushButton* send : {PS_Taste, Command3, RT_Taste1}) send->setText(toText(captions.text(53)));
     PS_Taste->setAccessibleName(PS_Taste->text() + QStringLiteral(" PS"));
     Command3->setAccessibleName(Command3->text() + QStringLiteral(" PI"));
+    RT_Taste1->setAccessibleName(RT_Taste1->text() + QStringLiteral(" RT"));
     Check1->setText(toText(captions.own(380, "TP on/off")));
     MS_Frame->setTitle(toText(captions.text(55)));
     MS_opt[0]->setText(toText(captions.text(56)));
@@ -219,11 +234,10 @@ void RdsPage::label() {
 }
 
 void RdsPage::fillProgrammeTypes() {
-    // A caption that does not fit the stored type leaves the list without a choice.
     PTY_Combo1->clear();
     for (std::size_t type = 0; type < 32; ++type) PTY_Combo1->addItem(toText(m_with.captions.programmeType(type)));
-    const auto stored = static_cast<int>(leadingNumber(m_with.data.ReadIni("RDS", "PTY", dataSetFile("1"))));
-    PTY_Combo1->setCurrentIndex(stored >= 0 && stored < PTY_Combo1->count() ? stored : -1);
+    const std::string stored = m_with.data.ReadIni("RDS", "PTY", dataSetFile("1"));
+    PTY_Combo1->setCurrentIndex(positionOf(stored, PTY_Combo1->count()));
     if (PTY_Combo1->currentIndex() >= 0) m_with.status.show(StatusSlot::Pty, PTY_Combo1->currentText());
 }
 
@@ -240,7 +254,9 @@ void RdsPage::loadDataSet() {
     PI_T->setText(toText(stored("PI")));
     m_with.status.show(StatusSlot::Pi, m_with.state.currentPi);
     RT_Text1->setText(toText(stored("RTA")));
-    RT_Text1->setToolTip(toText(stored("RTB")));  // the second text has no entry of its own
+    // The second text has no entry of its own.
+    const std::string second = stored("RTB");
+    RT_Text1->setToolTip(second.empty() ? QString() : toText("RTB: " + second));
     const std::string musicSpeech = stored("MS");
     MS_opt.choose(musicSpeech.empty() ? -1 : (musicSpeech == "M" ? 0 : 1));
     if (!musicSpeech.empty()) {
@@ -248,7 +264,7 @@ void RdsPage::loadDataSet() {
         showMusicSpeech();
     }
     const std::string decoderInfo = stored("DI");
-    DI_Opt.choose(decoderInfo.empty() ? -1 : static_cast<int>(leadingNumber(decoderInfo)));
+    DI_Opt.choose(decoderInfo.empty() ? -1 : positionOf(decoderInfo, DI_Opt.size()));
 }
 
 void RdsPage::loadProgrammeType() {
@@ -259,6 +275,8 @@ void RdsPage::sendTrafficFlags() {
     // The boxes keep what the window shows, so that window and coder agree after the session was opened.
     Check1_Click();
     m_ta->TA_Check_Click();
+    // The announcement box frees the automatic as well; without a traffic programme it stays locked.
+    if (!Check1->isChecked()) m_ta->setTrafficProgramme(false);
 }
 
 void RdsPage::sendPi() {
@@ -359,7 +377,8 @@ void RdsPage::Timer1_Timer() {
 
 void RdsPage::Uhr_Zeit_DblClick() {
     // A harmless prompt: the answer is not used, the time sent is always the PC's.
-    m_with.dialogs.input(QStringLiteral("Uhrzeit: "), QStringLiteral("Zeit eingabe"), pcTime());
+    m_with.dialogs.input(toText(m_with.captions.own(397, "Uhrzeit: ")),
+                         toText(m_with.captions.own(398, "Zeit eingabe")), pcTime());
 }
 
 void RdsPage::store(const char* key, const std::string& value) {

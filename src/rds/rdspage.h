@@ -55,7 +55,10 @@ public:
     [[nodiscard]] std::string clockText() const;
 
 private:
+    // In the order in which the tab key walks the page.
     void createServiceControls();
+    void createTraffic();
+    void createMusicSpeech();
     void createClock();
     void createDecoderInfo();
     void createRadiotext();
@@ -106,7 +109,7 @@ private:
 
     PageContext m_with;
     bool m_clockOn = false;
-    bool m_clockShowsWord = false;  ///< `Uhr_Zeit` shows the off word, not a time
+    bool m_clockShowsWord = true;  ///< `Uhr_Zeit` shows the off word, not a time
     bool m_trafficProgrammeShown = false;
 };
 

@@ -48,7 +48,7 @@ std::string ariType(const std::string& answer, const Caption& caption) {
 std::string onOff(const std::string& answer, const Caption& caption) {
     if (answer == "1") return caption(192);
     if (answer == "0") return caption(193);
-    return answer.empty() ? caption(143) : answer;
+    return answer;
 }
 
 std::string deviation(const std::string& answer, const Caption& caption) {
@@ -132,7 +132,7 @@ const std::vector<ReadBack>& readBacks() {
         // "Stereo Mode??" bears two question marks; it reaches the log only.
         {"Command1", "A R I ?", 134, false,
          [](Ask) -> Queries {
-             return {{"Ari ein/aus?", "ARI"}, {"Ari Hub?", "ARI-DEV"}, {"ARI mode?", "ARI-ID"}, {"BK?", "BK"}};
+             return {{"Ari ein/aus?", "ARI"}, {"ARI Hub?", "ARI-DEV"}, {"ARI mode?", "ARI-ID"}, {"BK?", "BK"}};
          },
          ari},
         {"Command4", "AF ?", 126, false, afQueries, afLists},

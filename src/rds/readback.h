@@ -17,7 +17,7 @@ using Caption = std::function<std::string(int)>;
 [[nodiscard]] std::string preemphasis(const std::string& answer, const Caption& caption);
 [[nodiscard]] std::string impedance(const std::string& answer);
 [[nodiscard]] std::string ariType(const std::string& answer, const Caption& caption);
-/// "1" is on, "0" off; an empty answer caption 143, any other answer itself.
+/// "1" is caption 192 (on), "0" 193 (off), any other answer itself: a failed read leaves the place empty.
 [[nodiscard]] std::string onOff(const std::string& answer, const Caption& caption);
 /// Caption 21, ": ", the answer times 10 and " Hz"; "" for an empty answer.
 [[nodiscard]] std::string deviation(const std::string& answer, const Caption& caption);

@@ -51,6 +51,9 @@ TaFrame::TaFrame(const PageContext& with, std::function<bool()> trafficProgramme
     TA_Check->setEnabled(false);
     connect(TA_Check, &QCheckBox::clicked, this, &TaFrame::TA_Check_Click);
 
+    TA_EON_Hilfe = named<QPushButton>("TA_EON_Hilfe", this);
+    connect(TA_EON_Hilfe, &QPushButton::clicked, this, &TaFrame::TA_EON_Hilfe_Click);
+
     TA_Option.create("TA_Option", this);
     TA_Option.choose(0);
     TA_Option[1]->setEnabled(false);
@@ -65,9 +68,6 @@ TaFrame::TaFrame(const PageContext& with, std::function<bool()> trafficProgramme
     TA_Rep_HScroll = timeBar("TA_Rep_HScroll", this, kShortestPeriod, kLongestPeriod, &TaFrame::showPeriod,
                              &TaFrame::TA_Rep_HScroll_Change);
     TA_Rep_Label = named<QLabel>("TA_Rep_Label", this);
-
-    TA_EON_Hilfe = named<QPushButton>("TA_EON_Hilfe", this);
-    connect(TA_EON_Hilfe, &QPushButton::clicked, this, &TaFrame::TA_EON_Hilfe_Click);
 
     TA_Timer = named<Ticker>("TA_Timer", this);
     TA_Timer->setPeriod(333);
@@ -123,10 +123,8 @@ void TaFrame::loadSettings() {
     const int period = stored("TA_REP");
     setQuietly(TA_Rep_HScroll, period);  // the period first: the duration must not lie above it
     setQuietly(TA_HScroll, std::min(duration, TA_Rep_HScroll->value()));
-    m_periodSeconds = TA_Rep_HScroll->value();
-    m_durationSeconds = TA_HScroll->value();
-    showPeriod(m_periodSeconds);
-    showDuration(m_durationSeconds);
+    showPeriod(TA_Rep_HScroll->value());
+    showDuration(TA_HScroll->value());
 }
 
 void TaFrame::setTrafficProgramme(bool on) {
@@ -159,24 +157,22 @@ void TaFrame::TA_Option_Click(int index) {
 // The two clamps differ on purpose: the duration may come down to the period, the period always stays above the
 // duration.
 void TaFrame::TA_HScroll_Change() {
-    if (TA_HScroll->value() > m_periodSeconds) setQuietly(TA_HScroll, m_periodSeconds);
-    m_durationSeconds = TA_HScroll->value();
-    showDuration(m_durationSeconds);
-    m_with.data.WriteIni("RDS", "TA_ON", std::to_string(m_durationSeconds), kGeneralSettings);
+    if (TA_HScroll->value() > TA_Rep_HScroll->value()) setQuietly(TA_HScroll, TA_Rep_HScroll->value());
+    showDuration(TA_HScroll->value());
+    m_with.data.WriteIni("RDS", "TA_ON", std::to_string(TA_HScroll->value()), kGeneralSettings);
 }
 
 void TaFrame::TA_Rep_HScroll_Change() {
-    if (TA_Rep_HScroll->value() <= m_durationSeconds) setQuietly(TA_Rep_HScroll, m_durationSeconds + 1);
-    m_periodSeconds = TA_Rep_HScroll->value();
-    showPeriod(m_periodSeconds);
-    m_with.data.WriteIni("RDS", "TA_REP", std::to_string(m_periodSeconds), kGeneralSettings);
+    if (TA_Rep_HScroll->value() <= TA_HScroll->value()) setQuietly(TA_Rep_HScroll, TA_HScroll->value() + 1);
+    showPeriod(TA_Rep_HScroll->value());
+    m_with.data.WriteIni("RDS", "TA_REP", std::to_string(TA_Rep_HScroll->value()), kGeneralSettings);
 }
 
 void TaFrame::TA_Timer_Timer() {
     if (!m_automatic) return;
     TA_Rep_Timer->setEnabled(false);
     if (!TA_Option[1]->isChecked()) return;
-    if (now() <= m_announcementStart + static_cast<float>(m_durationSeconds)) {
+    if (now() <= m_announcementStart + static_cast<float>(TA_HScroll->value())) {
         showAnnouncing(true);
         m_offSent = false;
         sendTa("1");
@@ -199,7 +195,7 @@ void TaFrame::TA_Timer_Timer() {
 void TaFrame::TA_Rep_Timer_Timer() {
     if (!TA_Option[1]->isChecked()) return;
     const float time = now();
-    if (time > m_repetitionStart + static_cast<float>(m_periodSeconds)) {
+    if (time > m_repetitionStart + static_cast<float>(TA_Rep_HScroll->value())) {
         m_repetitionStart = time;
         m_announcementStart = time;
     }

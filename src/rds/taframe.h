@@ -71,8 +71,6 @@ private:
     bool m_announcing = false;
     float m_announcementStart = 0;
     float m_repetitionStart = 0;
-    int m_durationSeconds = 0;
-    int m_periodSeconds = 0;
 };
 
 }  // namespace kdx

