@@ -5,6 +5,7 @@
 #include <QLabel>
 #include <QScopedValueRollback>
 
+#include <algorithm>
 #include <stdexcept>
 
 #include "base/clock.h"
@@ -99,7 +100,8 @@ void DynamicPs::showStopped() {
 
 void DynamicPs::Taste_PS_Auto_Click() {
     if (!m_running) {
-        PS_Timer->setPeriod(leadingNumber(m_with.data.ReadIni("RDS", "PS_Dyn", kGeneralSettings)));
+        const double interval = leadingNumber(m_with.data.ReadIni("RDS", "PS_Dyn", kGeneralSettings));
+        PS_Timer->setPeriod(std::clamp(interval, 0.0, double{Ticker::kLongestInterval}));
         Taste_PS_Auto->showState(true);
         m_running = true;
         return;
