@@ -94,10 +94,14 @@ void HMenue::createConnection() {
 void HMenue::createPages() {
     Frame7 = named<QGroupBox>("Frame7", this);
     SSTab1 = named<QTabWidget>("SSTab1", Frame7);
-    GTL_Taste = named<QPushButton>("GTL_Taste", QStringLiteral("Local"), SSTab1);
+    auto* corner = new QWidget(SSTab1);
+    auto* cornerLayout = new QHBoxLayout(corner);
+    cornerLayout->setContentsMargins(0, 0, 0, 1);
+    GTL_Taste = named<QPushButton>("GTL_Taste", QStringLiteral("Local"), corner);
+    cornerLayout->addWidget(GTL_Taste);
     connect(GTL_Taste, &QPushButton::clicked, this, &HMenue::GTL_Taste_Click);
     GTL_Taste->setFixedWidth(GTL_Taste->fontMetrics().horizontalAdvance(QStringLiteral("Local")) + 28);
-    SSTab1->setCornerWidget(GTL_Taste);
+    SSTab1->setCornerWidget(corner);
     SSTab1->tabBar()->setUsesScrollButtons(false);
     SSTab1->tabBar()->setExpanding(true);
 

@@ -1,5 +1,4 @@
 // What the main window does once at the start, and the sending of the whole data set.
-#include <QGuiApplication>
 #include <QTabWidget>
 
 #include "af/afpage.h"
@@ -32,6 +31,8 @@ void HMenue::startUp() {
     // The two blanks before the slash and at the end belong to the title.
     m_s.state.ProgramTitle = "KDX-RDS V 1.0  / Mar. 2009  ";
     setWindowTitle(toText(m_s.state.ProgramTitle));
+    // Stated, not left to the layouts: they would still know sizes from before captions were set and parts hidden.
+    setMinimumSize(kDesignSize);
     resize(kDesignSize);
     m_s.state.InterfaceKind = generalSetting("BUS", "INTERFACE");
     Schnittstellen_Toggle();

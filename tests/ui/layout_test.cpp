@@ -66,7 +66,9 @@ TEST_F(LayoutTest, EveryControlThatCanBeUsedHasANameForThoseWhoCannotSeeIt) {
                     continue;
                 }
                 const auto* button = qobject_cast<const QAbstractButton*>(control);
-                const bool ownText = button != nullptr && !button->text().isEmpty();
+                const auto* shown = qobject_cast<const QLabel*>(control);
+                const bool ownText =
+                    (button != nullptr && !button->text().isEmpty()) || (shown != nullptr && !shown->text().isEmpty());
                 bool buddy = false;
                 for (const QLabel* label : window->findChildren<QLabel*>()) buddy = buddy || label->buddy() == control;
                 EXPECT_TRUE(ownText || buddy || !control->accessibleName().isEmpty())
