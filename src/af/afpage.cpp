@@ -139,8 +139,22 @@ void AfPage::Taste_AF_Senden_Click() {
     }
 }
 
+int AfPage::commandsToSend() const {
+    int commands = 0;
+    for (int number = 1; number <= kAfLists; ++number) {
+        const std::string list = storedList(number);
+        if (number == 1 && list.empty()) return 0;
+        if (!list.empty() && afValue(list, number, chosenMethod())) ++commands;
+    }
+    return commands;
+}
+
+AfMethod AfPage::chosenMethod() const {
+    return AFMethod_opt.chosen() == 1 ? AfMethod::B : AfMethod::A;
+}
+
 void AfPage::sendList(int number, const std::string& list) {
-    if (auto value = afValue(list, number, AFMethod_opt.chosen() == 1 ? AfMethod::B : AfMethod::A)) {
+    if (auto value = afValue(list, number, chosenMethod())) {
         m_with.params.SendParam("AF" + std::to_string(number), std::move(*value));
         return;
     }

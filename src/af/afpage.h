@@ -1,5 +1,6 @@
 #pragma once
 
+#include "af/aflist.h"
 #include "ui/controls.h"
 #include "ui/pagecontext.h"
 
@@ -29,6 +30,8 @@ public:
 
     /// Sends all five lists; nothing at all when list 1 is empty.
     void Taste_AF_Senden_Click();
+    /// How many commands that sends.
+    [[nodiscard]] int commandsToSend() const;
 
     /// Replaces how the list editor is opened; the call returns when the editor has closed. By default the editor's
     /// window is shown, modal over this one.
@@ -39,6 +42,7 @@ private:
     void arrange();
     void AFList_Opt_Click(int index);
     void AF_Bearbeiten_Click();
+    [[nodiscard]] AfMethod chosenMethod() const;
     void showList(int index);
     void sendList(int number, const std::string& list);
     [[nodiscard]] std::string storedList(int number) const;

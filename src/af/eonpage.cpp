@@ -307,10 +307,16 @@ void EonPage::EON_AFB_Senden_Click() {
     }
 }
 
-void EonPage::removeNetworks() {
-    for (std::string& network : networksToDelete(m_with.instrument.X4_Abfrage("EON-PI", "EON PI?"))) {
-        m_with.params.SendParam("EON_DEL", network);
-    }
+int EonPage::removeNetworks() {
+    std::vector<std::string> networks = networksToDelete(m_with.instrument.X4_Abfrage("EON-PI", "EON PI?"));
+    for (std::string& network : networks) m_with.params.SendParam("EON_DEL", network);
+    return static_cast<int>(networks.size());
+}
+
+int EonPage::listsToSend() const {
+    int lists = 0;
+    for (int number = 1; number <= kAfLists; ++number) lists += storedList(number).empty() ? 0 : 1;
+    return lists;
 }
 
 void EonPage::sendNetwork() {

@@ -35,14 +35,16 @@ public:
     /// Start-up: brings the controls into the state that data set 1 holds; nothing is stored or sent.
     void loadDataSet();
 
-    /// Asks the coder for the other networks it holds and deletes them one by one.
-    void removeNetworks();
+    /// Asks the coder for the other networks it holds and deletes them one by one. @returns how many deletions went out.
+    int removeNetworks();
 
     /// Sends the network's PI, TA, TP and PS, then its AF lists.
     void sendNetwork();
 
     /// Sends the AF lists of the current data set that are not empty.
     void EON_AFB_Senden_Click();
+    /// How many commands that sends.
+    [[nodiscard]] int listsToSend() const;
 
     /// Replaces how the list editor is opened; the call returns when the editor has closed. By default the editor's
     /// window is shown, modal over this one.

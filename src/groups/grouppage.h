@@ -32,6 +32,7 @@ public:
 
     /// Stores the sequence in the current data set and sends it; does neither without a sequence.
     void Gruppenfolge();
+    [[nodiscard]] bool hasSequence() const { return !m_groups.empty(); }
 
 private:
     void create();

@@ -96,6 +96,7 @@ void QueryPage::Fragen_Schalter(bool on) {
 
 void QueryPage::ask(const ReadBack& readBack) {
     if (!m_with.state.InstrumentOnline) return;
+    const CommandSequence sequence(m_with.instrument);
     m_answers.clear();
     for (const Query& query : readBack.queries(m_with.state.eonIdentifier)) {
         m_answers.push_back(readBack.generator ? m_with.instrument.VRN_Abfrage(query.label, query.key)

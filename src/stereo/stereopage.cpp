@@ -84,8 +84,12 @@ std::string StereoPage::sourceValue() const {
     return optionValue(FM_Source_Opt);
 }
 
+bool StereoPage::isFirstImpedanceChosen() const {
+    return FM_Imp_Opt[0]->isChecked();
+}
+
 void StereoPage::selectFirstImpedance() {
-    if (FM_Imp_Opt[0]->isChecked()) return;
+    if (isFirstImpedanceChosen()) return;
     FM_Imp_Opt.choose(0);
     FM_Imp_Opt_Click(0);
 }

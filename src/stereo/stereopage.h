@@ -34,12 +34,14 @@ public:
     void hideRdsPhase();
     /// Sends all settings of this page that belong to a data set.
     void sendSettings();
+    static constexpr int kSettingsCommands = 7;  ///< how many commands that sends
     /// Total deviation as it is sent: five digits, units of 10 Hz.
     [[nodiscard]] std::string totalDeviation() const;
     /// Modulation source as it is sent: "0" to "3", or "" when none is chosen.
     [[nodiscard]] std::string sourceValue() const;
     /// Selects the first input impedance as a click would: nothing is sent or stored when it is chosen already.
     void selectFirstImpedance();
+    [[nodiscard]] bool isFirstImpedanceChosen() const;
 
 signals:
     /// `Btn_SetRdsStereo` was pressed: everything is to be sent.

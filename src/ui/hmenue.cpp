@@ -14,6 +14,7 @@
 
 #include "af/afpage.h"
 #include "af/eonpage.h"
+#include "base/clock.h"
 #include "groups/grouppage.h"
 #include "rds/querypage.h"
 #include "rds/rdspage.h"
@@ -29,9 +30,12 @@
 #include "ui/clickablelabel.h"
 #include "ui/controls.h"
 #include "ui/dialogs.h"
+#include "ui/logview.h"
+#include "ui/progressline.h"
 #include "ui/statusrow.h"
 #include "ui/text.h"
 #include "ui/ticker.h"
+#include "ui/trafficlog.h"
 
 namespace kdx {
 
@@ -58,12 +62,14 @@ HMenue::HMenue(const Surroundings& surroundings)
                                 m_s.clock}) {
     setObjectName(QStringLiteral("HMenue"));
     setWindowIcon(QIcon(QStringLiteral(":/kdx-rds.png")));
+    m_trafficLog = new TrafficLog(this);
+    m_instrument.onTraffic([this](const Traffic& traffic) { watchTraffic(traffic); });
     m_instrument.setCaptionSource([this](int number) { return m_s.captions.text(number); });
     createConnection();
     createPages();
     createMenu();
     arrange();
-    m_s.data.onUnsavedFileChanged([this] { showQuietLine(); });
+    m_s.data.onUnsavedFileChanged([this] { showNotice(); });
 }
 
 HMenue::~HMenue() {
@@ -163,6 +169,7 @@ void HMenue::createMenu() {
     Mnu_Info_RDS_RBDS = entry("Mnu_Info_RDS_RBDS", "RDS /RBDS", Mnu_Info, &HMenue::Mnu_Info_RDS_RBDS_Click);
     Mnu_Info_RS232 = entry("Mnu_Info_RS232", "RS232_Set", Mnu_Info, nullptr);
     Mnu_TMC_Edit = entry("Mnu_TMC_Edit", "TMC Edit", Mnu_Info, &HMenue::Mnu_TMC_Edit_Click);
+    Mnu_Info_Log = entry("Mnu_Info_Log", "Log", Mnu_Info, &HMenue::Mnu_Info_Log_Click);
     for (QAction* choice : {Mnu_Info_Sprache_D, Mnu_Info_Sprache_E, Mnu_Info_Sprache_US, Mnu_Info_RDS_RBDS}) {
         choice->setCheckable(true);
     }
@@ -186,10 +193,7 @@ void HMenue::arrange() {
     parameters->setContentsMargins(0, 0, 0, 0);
     parameters->addWidget(SSTab1);
 
-    m_quietLine = named<QLabel>("QuietLine", this);
-    m_quietLine->setTextFormat(Qt::PlainText);
-    m_quietLine->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Fixed);
-    m_quietLine->setFixedHeight(m_quietLine->fontMetrics().height());
+    m_lowerEdge = new ProgressLine(this);
 
     auto* middle = new QWidget(this);
     auto* column = new QVBoxLayout(middle);
@@ -198,7 +202,7 @@ void HMenue::arrange() {
     column->addLayout(top);
     column->addWidget(Frame7, 1);
     column->addWidget(m_status);
-    column->addWidget(m_quietLine);
+    column->addWidget(m_lowerEdge);
     setCentralWidget(middle);
 }
 
@@ -237,7 +241,9 @@ void HMenue::Beschrifter() {
     m_store->label();
     m_tmc->label();
     m_rf->label();
-    showQuietLine();
+    m_trafficLog->label(captions);
+    if (m_logView != nullptr) m_logView->label(captions);
+    showNotice();
 }
 
 void HMenue::labelMenu() {
@@ -255,6 +261,7 @@ void HMenue::labelMenu() {
     Mnu_Info_RDS_RBDS->setText(toText(captions.own(305, "RDS /RBDS")));
     Mnu_Info_RS232->setText(toText(captions.own(303, "RS232_Set")));
     Mnu_TMC_Edit->setText(toText(captions.own(304, "TMC Edit")));
+    Mnu_Info_Log->setText(toText(captions.own(680, "Log")));
     Mnu_Info_Sprache_D->setChecked(m_s.state.language == "deutsch");
     Mnu_Info_Sprache_E->setChecked(m_s.state.language == "english");
     Mnu_Info_Sprache_US->setChecked(m_s.state.language == "english US");
@@ -320,10 +327,10 @@ void HMenue::Mnu_TMC_Edit_Click() {
     m_tmc->reloadLists();
 }
 
-void HMenue::showQuietLine() {
+void HMenue::showNotice() {
     const auto unsaved = m_s.data.unsavedFile();
-    m_quietLine->setText(unsaved ? toText(m_s.captions.own(312, "Nicht gespeichert: %1")).arg(toText(*unsaved))
-                                 : m_startNotice);
+    m_lowerEdge->setNotice(unsaved ? toText(m_s.captions.own(312, "Nicht gespeichert: %1")).arg(toText(*unsaved))
+                                   : m_startNotice);
 }
 
 bool HMenue::showInterfaceError(const std::string& text, bool sequenceRuns) {
@@ -339,6 +346,23 @@ bool HMenue::showInterfaceError(const std::string& text, bool sequenceRuns) {
     }
     for (Ticker* ticker : tickers) ticker->setHeld(false);
     return stop;
+}
+
+void HMenue::Mnu_Info_Log_Click() {
+    if (m_logView == nullptr) m_logView = new LogView(*m_trafficLog, m_s.captions, this);
+    m_logView->show();
+    m_logView->raise();
+    m_logView->activateWindow();
+}
+
+void HMenue::watchTraffic(const Traffic& traffic) {
+    if (traffic.kind == Traffic::Kind::Written) m_lowerEdge->step();
+    m_trafficLog->add(traffic, m_s.clock.secondsSinceMidnight());
+    emit trafficPassed(traffic);
+}
+
+QString HMenue::progressPattern() const {
+    return toText(m_s.captions.own(324, "Sende Befehl %1 von %2"));
 }
 
 std::string HMenue::generalSetting(const char* section, const char* key) const {

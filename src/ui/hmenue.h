@@ -24,6 +24,8 @@ class AfPage;
 class ClickableLabel;
 class EonPage;
 class GroupPage;
+class LogView;
+class ProgressLine;
 class QueryPage;
 class RdsPage;
 class RfPage;
@@ -32,6 +34,7 @@ class StereoPage;
 class StorePage;
 class TestMode;
 class TmcPage;
+class TrafficLog;
 
 /// What the window works with; everything is borrowed and outlives it.
 struct Surroundings {
@@ -63,7 +66,11 @@ public:
     void INIT_Taste_Click();
     void GTL_Taste_Click();
 
-    [[nodiscard]] Instrument& instrument() { return m_instrument; }
+    [[nodiscard]] const Instrument& instrument() const { return m_instrument; }
+
+signals:
+    /// Something was written, read or logged.
+    void trafficPassed(const kdx::Traffic& traffic);
 
 protected:
     bool eventFilter(QObject* watched, QEvent* event) override;
@@ -85,6 +92,7 @@ private:
     void Mnu_Info_Sprache_US_Click();
     void Mnu_Info_RDS_RBDS_Click();
     void Mnu_TMC_Edit_Click();
+    void Mnu_Info_Log_Click();
     void SSTab1_Click(int page);
     void Schnittstellen_Toggle();
 
@@ -95,7 +103,10 @@ private:
     void sendBaseState();
     void labelMenu();
     void setUpTmc();
-    void showQuietLine();
+    void showNotice();
+    void watchTraffic(const Traffic& traffic);
+    [[nodiscard]] int commandsOfDataSet() const;
+    [[nodiscard]] QString progressPattern() const;
     bool showInterfaceError(const std::string& text, bool sequenceRuns);
     [[nodiscard]] std::string generalSetting(const char* section, const char* key) const;
 
@@ -115,8 +126,8 @@ private:
     QGroupBox* Frame7 = nullptr;  // the parameter controls
     QPushButton* GTL_Taste = nullptr;
     QTabWidget* SSTab1 = nullptr;
-    QLabel* m_quietLine = nullptr;  // the window's lower edge: what could not be saved or found
-    QString m_startNotice;          // what start-up missed
+    ProgressLine* m_lowerEdge = nullptr;  // progress, and what could not be saved or found
+    QString m_startNotice;                // what start-up missed
 
     TestMode* m_testMode = nullptr;
     StereoPage* m_stereo = nullptr;
@@ -142,6 +153,10 @@ private:
     QAction* Mnu_Info_RDS_RBDS = nullptr;
     QAction* Mnu_Info_RS232 = nullptr;
     QAction* Mnu_TMC_Edit = nullptr;
+    QAction* Mnu_Info_Log = nullptr;  // opens the live view of the commands
+
+    TrafficLog* m_trafficLog = nullptr;
+    LogView* m_logView = nullptr;
 };
 
 }  // namespace kdx

@@ -16,6 +16,7 @@
 #include "ui/clickablelabel.h"
 #include "ui/dialogs.h"
 #include "ui/hmenue.h"
+#include "ui/progressline.h"
 #include "ui/text.h"
 
 namespace kdx {
@@ -85,6 +86,9 @@ void HMenue::INIT_Taste_Click() {
         return;
     }
     m_s.state.InstrumentOnline = true;
+    const CommandSequence sequence(m_instrument);
+    const int ownCommands = 8 + (m_stereo->isFirstImpedanceChosen() ? 0 : 1);  // *IDN?, base state, RF output, audio
+    const CountedCommands count(*m_lowerEdge, progressPattern(), ownCommands + commandsOfDataSet());
     m_instrument.Send2Gen("*IDN?");
     setWindowTitle(toText(m_instrument.ReadFromGen()));
 
@@ -92,6 +96,7 @@ void HMenue::INIT_Taste_Click() {
     sendBaseState();
     m_stereo->selectFirstImpedance();
     SetRdsStereo();
+    if (m_instrument.isSequenceStopped()) return;
     m_rf->HfOnOffState_Click();
     m_rf->sendAudioFrequency();
 }

@@ -15,6 +15,7 @@
 #include "stereo/stereopage.h"
 #include "tmc/tmcpage.h"
 #include "ui/hmenue.h"
+#include "ui/progressline.h"
 #include "ui/text.h"
 
 #include <filesystem>
@@ -65,24 +66,33 @@ void HMenue::setUpTmc() {
     if (!std::filesystem::exists(m_s.data.file(kLanguageFile))) {
         m_startNotice = toText(m_s.captions.own(322, "Nicht gefunden: %1")).arg(QLatin1String(kLanguageFile));
     }
-    showQuietLine();
+    showNotice();
+}
+
+int HMenue::commandsOfDataSet() const {
+    constexpr int kServiceCommands = 8;  // PI, TP, TA, PS, test mode, MS, RT, PTY
+    constexpr int kNetworkCommands = 6;  // the question, one removal, PI, TA, TP, PS
+    constexpr int kRfCommands = 2;
+    return StereoPage::kSettingsCommands + kServiceCommands + m_af->commandsToSend() + kNetworkCommands +
+           m_eon->listsToSend() + (m_groups->hasSequence() ? 1 : 0) + kRfCommands;
 }
 
 void HMenue::SetRdsStereo() {
-    m_stereo->sendSettings();
-    m_rds->sendPi();
-    m_rds->sendTrafficFlags();
-    m_rds->sendPs();
-    m_testMode->toRdsMode();
-    m_rds->sendMusicSpeech();
-    m_rds->sendRadiotext();
-    m_af->Taste_AF_Senden_Click();
-    m_rds->sendProgrammeType();
-    m_eon->removeNetworks();
-    m_eon->sendNetwork();
-    m_groups->Gruppenfolge();
-    m_rf->sendFrequency();
-    m_rf->sendLevel();
+    const CommandSequence sequence(m_instrument);
+    const CountedCommands count(*m_lowerEdge, progressPattern(), commandsOfDataSet());
+    const std::function<void()> steps[] = {
+        [this] { m_stereo->sendSettings(); },   [this] { m_rds->sendPi(); },
+        [this] { m_rds->sendTrafficFlags(); },  [this] { m_rds->sendPs(); },
+        [this] { m_testMode->toRdsMode(); },    [this] { m_rds->sendMusicSpeech(); },
+        [this] { m_rds->sendRadiotext(); },     [this] { m_af->Taste_AF_Senden_Click(); },
+        [this] { m_rds->sendProgrammeType(); }, [this] { m_lowerEdge->addToTotal(m_eon->removeNetworks() - 1); },
+        [this] { m_eon->sendNetwork(); },       [this] { m_groups->Gruppenfolge(); },
+        [this] { m_rf->sendFrequency(); },      [this] { m_rf->sendLevel(); },
+    };
+    for (const auto& step : steps) {
+        if (m_instrument.isSequenceStopped()) return;
+        step();
+    }
 }
 
 }  // namespace kdx

@@ -55,7 +55,7 @@ int makeTour(HMenue& window, const TourDialogs& dialogs, const QString& folder,
              const std::function<void(const std::string&)>& print) {
     int failures = 0;
     int answers = 0;
-    window.instrument().onTraffic([&](const Traffic& traffic) {
+    const auto watch = QObject::connect(&window, &HMenue::trafficPassed, [&](const Traffic& traffic) {
         if (traffic.kind == Traffic::Kind::Logged) return;
         const bool read = traffic.kind == Traffic::Kind::Read;
         if (read) ++answers;
@@ -84,7 +84,7 @@ int makeTour(HMenue& window, const TourDialogs& dialogs, const QString& folder,
             if (button != nullptr) button->click();
         }
     }
-    window.instrument().onTraffic(nullptr);
+    QObject::disconnect(watch);
     if (answers == 0) ++failures;
     failures += dialogs.count();
     print(std::to_string(pictures) + " pictures, " + std::to_string(answers) + " answers, " + std::to_string(failures) +

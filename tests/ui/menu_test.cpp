@@ -46,10 +46,11 @@ TEST_F(MenuTest, TheTreeHasItsEntries) {
                                                            {"Mnu_Info_Sprache_US", "english US"},
                                                            {"Mnu_Info_RDS_RBDS", "RDS /RBDS"},
                                                            {"Mnu_Info_RS232", "RS232_Set"},
-                                                           {"Mnu_TMC_Edit", "TMC Edit"}};
+                                                           {"Mnu_TMC_Edit", "TMC Edit"},
+                                                           {"Mnu_Info_Log", "Log"}};
     for (const auto& [name, caption] : entries) EXPECT_EQ(action(name)->text().toStdString(), caption) << name;
     const auto* info = window->findChild<QMenu*>(QStringLiteral("Mnu_Info"));
-    EXPECT_EQ(info->actions().size(), 7);
+    EXPECT_EQ(info->actions().size(), 8);
 }
 
 TEST_F(MenuTest, ExitEndsTheProgramAtOnceWithoutAWord) {

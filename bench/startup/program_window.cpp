@@ -1,0 +1,66 @@
+// The program's own window with settings loaded, up to its first paint; with --count, how many controls of each kind
+// it has. Usage: program_window APP_FOLDER [--count]
+#include <QAbstractButton>
+#include <QCheckBox>
+#include <QComboBox>
+#include <QGroupBox>
+#include <QLabel>
+#include <QLineEdit>
+#include <QListWidget>
+#include <QPushButton>
+#include <QRadioButton>
+#include <QScrollBar>
+
+#include <cstdio>
+#include <cstring>
+
+#include "base/clock.h"
+#include "firstpaint.h"
+#include "link/lanvisa.h"
+#include "settings/captions.h"
+#include "settings/datafolder.h"
+#include "settings/programstate.h"
+#include "ui/application.h"
+#include "ui/hmenue.h"
+#include "ui/qtdialogs.h"
+
+namespace {
+
+template <typename Control>
+int count(const QWidget& window) {
+    int found = 0;
+    for (const Control* control : window.findChildren<Control*>()) {
+        if (!control->objectName().startsWith(QStringLiteral("qt_"))) ++found;
+    }
+    return found;
+}
+
+void printCounts(const QWidget& window) {
+    std::printf(
+        "QLabel=%d QPushButton=%d QRadioButton=%d QCheckBox=%d QComboBox=%d QLineEdit=%d QListWidget=%d "
+        "QScrollBar=%d QGroupBox=%d\n",
+        count<QLabel>(window), count<QPushButton>(window), count<QRadioButton>(window), count<QCheckBox>(window),
+        count<QComboBox>(window), count<QLineEdit>(window), count<QListWidget>(window), count<QScrollBar>(window),
+        count<QGroupBox>(window));
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+    if (argc < 2) return 2;
+    kdx::Application application(argc, argv);
+    kdx::SystemClock clock;
+    kdx::DataFolder data(argv[1]);
+    kdx::ProgramState state;
+    kdx::Captions captions(data);
+    kdx::QtDialogs dialogs(captions);
+    kdx::LanVisa visa;
+    kdx::HMenue window({visa, state, data, captions, clock, dialogs, QString(), [] {}});
+    window.startUp();
+    if (argc > 2 && std::strcmp(argv[2], "--count") == 0) {
+        printCounts(window);
+        return 0;
+    }
+    window.show();
+    return kdx::endAtFirstPaint(window);
+}
