@@ -1,5 +1,5 @@
-// The yardstick: a bare window with nine pages and as many controls of each kind as are named on the command line,
-// the same style and font, nothing read and nothing wired. Ends at its first paint.
+// The yardstick: a bare window with nine pages and as many controls of each kind as are named on the command line, in
+// frames as controls are, the same style and font; nothing read and nothing wired. Ends at its first paint.
 // Usage: bare_window QLabel=120 QPushButton=60 ...
 #include <QCheckBox>
 #include <QComboBox>
@@ -15,24 +15,24 @@
 #include <QScrollBar>
 #include <QTabWidget>
 
-#include <cstdio>
+#include <algorithm>
 #include <map>
 #include <string>
+#include <vector>
 
 #include "firstpaint.h"
 #include "ui/application.h"
 
 namespace {
 
-QWidget* make(const std::string& kind, QWidget* page) {
-    const QString text = QStringLiteral("Caption");
+QWidget* make(const std::string& kind, int number, QWidget* page) {
+    const QString text = QStringLiteral("Caption %1").arg(number);
     if (kind == "QPushButton") return new QPushButton(text, page);
     if (kind == "QRadioButton") return new QRadioButton(text, page);
     if (kind == "QCheckBox") return new QCheckBox(text, page);
     if (kind == "QLineEdit") return new QLineEdit(text, page);
     if (kind == "QScrollBar") return new QScrollBar(Qt::Horizontal, page);
     if (kind == "QListWidget") return new QListWidget(page);
-    if (kind == "QGroupBox") return new QGroupBox(text, page);
     if (kind == "QComboBox") return new QComboBox(page);
     return new QLabel(text, page);
 }
@@ -43,18 +43,31 @@ int main(int argc, char** argv) {
     kdx::Application application(argc, argv);
     QMainWindow window;
     auto* tabs = new QTabWidget(&window);
-    std::array<QGridLayout*, 9> pages{};
-    for (std::size_t i = 0; i < pages.size(); ++i) {
+    std::vector<QHBoxLayout*> pages;
+    for (int i = 0; i < 9; ++i) {
         auto* page = new QWidget(tabs);
-        pages[i] = new QGridLayout(page);
+        pages.push_back(new QHBoxLayout(page));
         tabs->addTab(page, QStringLiteral("Page %1").arg(i));
     }
-    int made = 0;
+    std::map<QString, int> counts;
     for (const QString& argument : QCoreApplication::arguments().mid(1)) {
         const auto parts = argument.split(QLatin1Char('='));
-        for (int i = 0; i < parts.value(1).toInt(); ++i, ++made) {
-            auto* page = pages[static_cast<std::size_t>(made) % pages.size()];
-            page->addWidget(make(parts.value(0).toStdString(), page->parentWidget()), made / 9 / 8, made / 9 % 8);
+        counts[parts.value(0)] = parts.value(1).toInt();
+    }
+    std::vector<QGridLayout*> frames;
+    for (int i = 0; i < std::max(counts[QStringLiteral("QGroupBox")], 9); ++i) {
+        QHBoxLayout* page = pages[static_cast<std::size_t>(i) % pages.size()];
+        auto* frame = new QGroupBox(QStringLiteral("Frame %1").arg(i), page->parentWidget());
+        page->addWidget(frame);
+        frames.push_back(new QGridLayout(frame));
+    }
+    int made = 0;
+    for (const auto& [kind, count] : counts) {
+        if (kind == QStringLiteral("QGroupBox")) continue;
+        for (int i = 0; i < count; ++i, ++made) {
+            QGridLayout* frame = frames[static_cast<std::size_t>(made) % frames.size()];
+            frame->addWidget(make(kind.toStdString(), made, frame->parentWidget()), frame->count() / 2,
+                             frame->count() % 2);
         }
     }
     window.setCentralWidget(tabs);

@@ -9,6 +9,7 @@
 #include <QPushButton>
 #include <QScrollBar>
 #include <QShortcut>
+#include <QStackedWidget>
 #include <QTabBar>
 #include <QTabWidget>
 
@@ -44,6 +45,18 @@ namespace {
 constexpr int kGroupPage = 3;
 constexpr int kQueryPage = 5;
 
+/// Tells its layout no sizes of its own: the window's size is stated, and asking all nine pages what they need takes a
+/// fifth of the whole start. That every page fits is the tests' concern.
+class PageTabs : public QTabWidget {
+public:
+    explicit PageTabs(QWidget* parent) : QTabWidget(parent) {
+        // Given a size, the stack of pages is not asked for its own at its first showing.
+        findChild<QStackedWidget*>()->resize(parent->size());
+    }
+    [[nodiscard]] QSize sizeHint() const override { return {}; }
+    [[nodiscard]] QSize minimumSizeHint() const override { return {}; }
+};
+
 // Captions of the pages as designed, in index order; some begin with a line feed to sit in the tab's second row.
 constexpr std::array kPageCaptions = {"FM / Stereo", "\nR D S",   "AF Liste", "Gruppen", "\nE O N",
                                       "Fragen",      "Speichern", "\nT M C",  "\n* * *"};
@@ -61,7 +74,7 @@ HMenue::HMenue(const Surroundings& surroundings)
       m_context(new PageContext{m_params, m_instrument, m_s.state, *m_status, m_s.captions, m_s.dialogs, m_s.data,
                                 m_s.clock}) {
     setObjectName(QStringLiteral("HMenue"));
-    setWindowIcon(QIcon(QStringLiteral(":/kdx-rds.png")));
+    setWindowIcon(QIcon(QStringLiteral(":/kdx-rds-64.png")));
     m_trafficLog = new TrafficLog(this);
     m_instrument.onTraffic([this](const Traffic& traffic) { watchTraffic(traffic); });
     m_instrument.setCaptionSource([this](int number) { return m_s.captions.text(number); });
@@ -93,13 +106,13 @@ void HMenue::createConnection() {
     Ende_Taste = named<QPushButton>("Ende_Taste", QStringLiteral("&Ende"), this);
     connect(Ende_Taste, &QPushButton::clicked, this, &HMenue::Ende_Taste_Click);
     Image2 = named<QLabel>("Image2", this);
-    Image2->setPixmap(QIcon(QStringLiteral(":/banner.png")).pixmap(QSize(300, 40), devicePixelRatioF()));
+    Image2->setPixmap(QPixmap(QStringLiteral(":/banner.png")));
     Image2->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
 }
 
 void HMenue::createPages() {
     Frame7 = named<QGroupBox>("Frame7", this);
-    SSTab1 = named<QTabWidget>("SSTab1", Frame7);
+    SSTab1 = named<PageTabs>("SSTab1", Frame7);
     auto* corner = new QWidget(SSTab1);
     auto* cornerLayout = new QHBoxLayout(corner);
     cornerLayout->setContentsMargins(0, 0, 0, 1);
