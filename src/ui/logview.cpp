@@ -33,6 +33,9 @@ LogView::LogView(TrafficLog& log, const Captions& captions, QWidget* parent) : Q
 
     m_table = named<QTableView>("LogTable", this);
     m_table->setModel(m_filtered);
+    QFont fixed = font();
+    fixed.setFamilies({QStringLiteral("Courier New"), QStringLiteral("Liberation Mono")});  // keys stay aligned
+    m_table->setFont(fixed);
     m_table->setSelectionBehavior(QAbstractItemView::SelectRows);
     m_table->setShowGrid(false);
     m_table->setWordWrap(false);
@@ -40,7 +43,7 @@ LogView::LogView(TrafficLog& log, const Captions& captions, QWidget* parent) : Q
     m_table->verticalHeader()->setDefaultSectionSize(fontMetrics().height() + 2);
     m_table->verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
     m_table->horizontalHeader()->setSectionResizeMode(TrafficLog::Text, QHeaderView::Stretch);
-    const int letter = fontMetrics().horizontalAdvance(QLatin1Char('0'));
+    const int letter = m_table->fontMetrics().horizontalAdvance(QLatin1Char('0'));
     m_table->setColumnWidth(TrafficLog::Time, letter * 14);
     m_table->setColumnWidth(TrafficLog::Direction, letter * 10);
     m_table->setColumnWidth(TrafficLog::Status, letter * 13);
@@ -66,7 +69,7 @@ LogView::LogView(TrafficLog& log, const Captions& captions, QWidget* parent) : Q
     tighten(column, 6);
     column->addWidget(m_table, 1);
     column->addLayout(buttons);
-    resize(620, 360);
+    resize(700, 360);
     label(captions);
 }
 
@@ -94,6 +97,11 @@ void LogView::copy() {
         text += m_log.line(m_filtered->mapToSource(m_filtered->index(row, 0)).row()) + QLatin1Char('\n');
     }
     QGuiApplication::clipboard()->setText(text);
+}
+
+void LogView::showEvent(QShowEvent* event) {
+    QDialog::showEvent(event);
+    m_table->scrollToBottom();
 }
 
 void LogView::followEnd() {

@@ -20,6 +20,9 @@ public:
     LogView(TrafficLog& log, const Captions& captions, QWidget* parent);
     void label(const Captions& captions);
 
+protected:
+    void showEvent(QShowEvent* event) override;
+
 private:
     void copy();
     void followEnd();
