@@ -1,0 +1,120 @@
+#include "ui/qtdialogs.h"
+
+#include <gtest/gtest.h>
+
+#include <QApplication>
+#include <QInputDialog>
+#include <QLineEdit>
+#include <QMessageBox>
+#include <QPushButton>
+#include <QTimer>
+
+#include <functional>
+
+#include "settings/captions.h"
+#include "settings/datafolder.h"
+#include "ui/text.h"
+
+namespace kdx {
+namespace {
+
+/// The real boxes, each met by a user who looks at it and then presses something.
+class QtDialogsTest : public ::testing::Test {
+protected:
+    QtDialogsTest() { captions.load("english", "RDS"); }
+
+    template <typename Box>
+    void meet(const std::function<void(Box& box)>& user) {
+        QTimer::singleShot(0, qApp, [this, user] {
+            auto* box = qobject_cast<Box*>(QApplication::activeModalWidget());
+            ASSERT_NE(box, nullptr);
+            met = true;
+            user(*box);
+        });
+    }
+    static QPushButton* button(const QWidget& box, const char* caption) {
+        for (QPushButton* found : box.findChildren<QPushButton*>()) {
+            if (found->text() == QLatin1String(caption)) return found;
+        }
+        throw std::runtime_error(std::string("no button ") + caption);
+    }
+
+    DataFolder data{KDX_SOURCE_DIR};
+    Captions captions{data};
+    QtDialogs dialogs{captions};
+    bool met = false;
+};
+
+TEST_F(QtDialogsTest, AMessageShowsItsPartsAsPlainText) {
+    meet<QMessageBox>([](QMessageBox& box) {
+        EXPECT_EQ(box.windowTitle(), QString());
+        EXPECT_EQ(box.text(), QStringLiteral("<b>\nline"));
+        EXPECT_EQ(box.informativeText(), QStringLiteral("details"));
+        EXPECT_EQ(box.textFormat(), Qt::PlainText);
+        EXPECT_EQ(box.icon(), QMessageBox::Warning);
+        EXPECT_TRUE(box.isModal());
+        button(box, "OK")->click();
+    });
+    dialogs.message(Dialogs::Icon::Exclamation, QString(), QStringLiteral("<b>\nline"), QStringLiteral("details"));
+    EXPECT_TRUE(met);
+}
+
+TEST_F(QtDialogsTest, AFailureBearsTheCriticalIcon) {
+    meet<QMessageBox>([](QMessageBox& box) {
+        EXPECT_EQ(box.windowTitle(), QStringLiteral("Interface Error"));
+        EXPECT_EQ(box.icon(), QMessageBox::Critical);
+        box.reject();
+    });
+    dialogs.message(Dialogs::Icon::Critical, QStringLiteral("Interface Error"), QStringLiteral("Fehler: -1"));
+    EXPECT_TRUE(met);
+}
+
+TEST_F(QtDialogsTest, OnlyItsOwnButtonStopsASequence) {
+    const auto answer = [this](const std::function<void(QMessageBox&)>& user) {
+        meet<QMessageBox>(user);
+        return dialogs.messageOrStop(QStringLiteral("Interface Error"), QStringLiteral("Fehler: -1"));
+    };
+    EXPECT_FALSE(answer([](QMessageBox& box) { button(box, "OK")->click(); }));
+    EXPECT_FALSE(answer([](QMessageBox& box) { box.reject(); }));  // the escape key
+    EXPECT_TRUE(answer([](QMessageBox& box) {
+        EXPECT_EQ(box.icon(), QMessageBox::Critical);
+        button(box, "&Stop the rest")->click();
+    }));
+}
+
+TEST_F(QtDialogsTest, AQuestionIsAnsweredByYesAndNo) {
+    const auto answer = [this](const std::function<void(QMessageBox&)>& user) {
+        meet<QMessageBox>(user);
+        return dialogs.confirm(QStringLiteral("AF list"), QStringLiteral("Delete?"));
+    };
+    EXPECT_TRUE(answer([](QMessageBox& box) { button(box, "&Yes")->click(); }));
+    EXPECT_FALSE(answer([](QMessageBox& box) { button(box, "&No")->click(); }));
+    EXPECT_FALSE(answer([](QMessageBox& box) { box.reject(); }));
+}
+
+TEST_F(QtDialogsTest, AnInputGivesWhatWasTypedAndNothingWhenCancelled) {
+    const auto answer = [this](const std::function<void(QInputDialog&)>& user) {
+        meet<QInputDialog>(user);
+        return dialogs.input(QStringLiteral("Please enter here: "), QStringLiteral("IEC Adress."),
+                             QStringLiteral("28"));
+    };
+    EXPECT_EQ(answer([](QInputDialog& box) {
+                  EXPECT_EQ(box.windowTitle(), QStringLiteral("IEC Adress."));
+                  EXPECT_EQ(box.labelText(), QStringLiteral("Please enter here: "));
+                  EXPECT_EQ(box.textValue(), QStringLiteral("28"));
+                  box.findChild<QLineEdit*>()->setText(QStringLiteral(" 17 "));
+                  button(box, "OK")->click();
+              }),
+              QStringLiteral(" 17 "));
+    EXPECT_EQ(answer([](QInputDialog& box) { button(box, "Cancel")->click(); }), QString());
+}
+
+TEST_F(QtDialogsTest, WithoutALanguageFileTheButtonsReadAsDesigned) {
+    captions.load("none", "RDS");
+    meet<QMessageBox>([](QMessageBox& box) { button(box, "&Nein")->click(); });
+    EXPECT_FALSE(dialogs.confirm(QString(), QString()));
+    EXPECT_TRUE(met);
+}
+
+}  // namespace
+}  // namespace kdx
