@@ -18,6 +18,9 @@ public:
     /// @param standard "RDS" or "RBDS": which programme type names go with a language other than "deutsch".
     void load(const std::string& language, const std::string& standard);
 
+    /// True when the file had no text at all for the language, or cannot be read.
+    [[nodiscard]] bool isEmpty() const { return m_texts.empty(); }
+
     /// The text of that number; "" where the file has none.
     [[nodiscard]] std::string text(int number) const;
 

@@ -38,6 +38,8 @@
 #include "ui/ticker.h"
 #include "ui/trafficlog.h"
 
+#include <filesystem>
+
 namespace kdx {
 
 namespace {
@@ -341,9 +343,27 @@ void HMenue::Mnu_TMC_Edit_Click() {
 }
 
 void HMenue::showNotice() {
-    const auto unsaved = m_s.data.unsavedFile();
-    m_lowerEdge->setNotice(unsaved ? toText(m_s.captions.own(312, "Nicht gespeichert: %1")).arg(toText(*unsaved))
-                                   : m_startNotice);
+    const Captions& captions = m_s.captions;
+    QStringList notes;
+    if (const QString missing = missingData(); !missing.isEmpty()) {
+        notes += toText(captions.own(322, "Nicht gefunden: %1")).arg(missing);
+    } else if (!m_startNotice.isEmpty()) {
+        notes += m_startNotice;
+    }
+    if (const auto unsaved = m_s.data.unsavedFile()) {
+        notes += toText(captions.own(312, "Nicht gespeichert: %1")).arg(toText(*unsaved));
+    }
+    m_lowerEdge->setNotice(notes.join(QStringLiteral("  -  ")));
+}
+
+QString HMenue::missingData() const {
+    const std::filesystem::path& folder = m_s.data.path();
+    std::error_code error;
+    if (!std::filesystem::is_directory(folder, error)) return QString::fromStdU16String(folder.u16string());
+    // Missing, unreadable, garbage, or without this language: the captions are empty all the same.
+    if (m_s.captions.isEmpty())
+        return QStringLiteral("%1 [%2]").arg(QLatin1String(kLanguageFile), toText(m_s.state.language));
+    return {};
 }
 
 bool HMenue::showInterfaceError(const std::string& text, bool sequenceRuns) {

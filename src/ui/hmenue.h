@@ -107,6 +107,7 @@ private:
     void watchTraffic(const Traffic& traffic);
     [[nodiscard]] int commandsOfDataSet() const;
     [[nodiscard]] QString progressPattern() const;
+    [[nodiscard]] QString missingData() const;
     bool showInterfaceError(const std::string& text, bool sequenceRuns);
     [[nodiscard]] std::string generalSetting(const char* section, const char* key) const;
 
@@ -127,7 +128,7 @@ private:
     QPushButton* GTL_Taste = nullptr;
     QTabWidget* SSTab1 = nullptr;
     ProgressLine* m_lowerEdge = nullptr;  // progress, and what could not be saved or found
-    QString m_startNotice;                // what start-up missed
+    QString m_startNotice;                // what start-up could not read
 
     TestMode* m_testMode = nullptr;
     StereoPage* m_stereo = nullptr;

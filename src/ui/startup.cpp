@@ -9,7 +9,6 @@
 #include "rds/rdspage.h"
 #include "rds/testmode.h"
 #include "settings/captions.h"
-#include "settings/datafolder.h"
 #include "settings/programstate.h"
 #include "stereo/rfpage.h"
 #include "stereo/stereopage.h"
@@ -17,8 +16,6 @@
 #include "ui/hmenue.h"
 #include "ui/progressline.h"
 #include "ui/text.h"
-
-#include <filesystem>
 
 namespace kdx {
 
@@ -62,9 +59,6 @@ void HMenue::setUpTmc() {
         m_tmc->setUp();
     } catch (const std::exception& error) {
         m_startNotice = QString::fromUtf8(error.what());  // the page goes on with empty boxes
-    }
-    if (!std::filesystem::exists(m_s.data.file(kLanguageFile))) {
-        m_startNotice = toText(m_s.captions.own(322, "Nicht gefunden: %1")).arg(QLatin1String(kLanguageFile));
     }
     showNotice();
 }

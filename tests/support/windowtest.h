@@ -22,8 +22,8 @@ protected:
     void start() {
         window.reset();
         state = ProgramState();
-        window = std::make_unique<HMenue>(
-            Surroundings{visa, state, data, captions, clock, dialogs, QStringLiteral("scripted"), [this] { ++ended; }});
+        window = std::make_unique<HMenue>(Surroundings{instrumentLink(), state, data, captions, clock, dialogs,
+                                                       QStringLiteral("scripted"), [this] { ++ended; }});
         window->startUp();
         window->show();
         QCoreApplication::processEvents();
@@ -35,6 +35,8 @@ protected:
     }
     void openSession() { click("INIT_Taste"); }
 
+    /// What the window sends through: the scripted instrument unless a test brings a link of its own.
+    virtual Visa& instrumentLink() { return visa; }
     QWidget& root() override { return *window; }
     QAction* action(const char* name) {
         auto* found = window->findChild<QAction*>(QString::fromLatin1(name));

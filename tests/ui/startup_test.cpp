@@ -1,11 +1,32 @@
 #include <gtest/gtest.h>
 
+#include "support/unprivileged.h"
 #include "support/windowtest.h"
 
 namespace kdx::test {
 namespace {
 
-class StartUpTest : public WindowTest {};
+class StartUpTest : public WindowTest {
+protected:
+    /// Opens the session, sends a new PS, asks something back, shows every page and closes.
+    void expectToWork() {
+        visa.answersTo[":STEREO:DIRECT? \"PS\""] = "\"ANDERES \"\n";
+        openSession();
+        EXPECT_EQ(window->windowTitle().trimmed(), QStringLiteral("KDX,TEST"));
+        for (int page = 0; page < 9; ++page) {
+            showPage(page);
+            QCoreApplication::processEvents();
+        }
+        sent();
+        type("PS_T", "ANDERES");
+        click("PS_Taste");
+        click("Command5");
+        EXPECT_EQ(sent(), (Lines{":STEREO:DIRECT \"PS=ANDERES \"", ":STEREO:DIRECT? \"PS\""}));
+        EXPECT_NE(text("gelesen").find("ANDERES"), std::string::npos);
+        click("GTL_Taste");
+        EXPECT_TRUE(find("INIT_Taste")->isEnabled());
+    }
+};
 
 TEST_F(StartUpTest, ShowsTheProgramsTitleWithItsBlanks) {
     startShipped();
@@ -164,10 +185,76 @@ TEST_F(StartUpTest, GarbageInTheSettingsStopsNothing) {
     folder.copyShipped();
     std::string garbage("\0[\x01=\xFF]]\r[BUS\n=\n", 18);
     garbage += std::string(1024 * 1024, 'x');
-    for (const char* file : {"RDS_Allg.INI", "Datenset1.INI", "Sprachen.ini", "Sch_On.ico"})
+    for (const char* file : {"RDS_Allg.INI", "Datenset1.INI", "Sprachen.ini", "Sch_On.ico", "Event.txt"})
         folder.write(file, garbage);
     start();
     EXPECT_EQ(text("INIT_Taste"), "Init IEEE");
+    EXPECT_EQ(text("QuietLine"), "Nicht gefunden: Sprachen.ini [deutsch]");
+    expectToWork();
+}
+
+class SettingsThatMakeNoSense : public StartUpTest, public ::testing::WithParamInterface<std::string> {};
+
+TEST_P(SettingsThatMakeNoSense, StopNothing) {
+    folder.copyShipped();
+    for (const char* file : {"RDS_Allg.INI", "Datenset1.INI"}) {
+        ProfileText settings(folder.read(file));
+        for (const char* section : {"FM", "RDS", "VRN"}) {
+            for (const auto& [key, value] : settings.section(section)) settings.setValue(section, key, GetParam());
+        }
+        folder.write(file, settings.bytes());
+    }
+    start();
+    expectToWork();
+}
+
+INSTANTIATE_TEST_SUITE_P(Values, SettingsThatMakeNoSense,
+                         ::testing::Values("", "-1", "6", "99999999999", "-99999999999", "1e308", "-1e999", "0x7F",
+                                           "nan", ",", ",,,,", "100.5,", "\"", "\x01\xFF", "%1%n",
+                                           std::string(300, '9'), std::string(300, ','), std::string(5000, 'A')));
+
+TEST_F(StartUpTest, AMissingDataFolderIsNamedAndTheWindowWorksWithoutIt) {
+    std::filesystem::remove_all(folder.data());
+    start();
+    EXPECT_EQ(text("QuietLine"), "Nicht gefunden: " + folder.data().string() + "  -  Nicht gespeichert: RDS_Allg.INI");
+    expectToWork();
+    EXPECT_FALSE(std::filesystem::exists(folder.data()));
+}
+
+TEST_F(StartUpTest, ADataFolderThatCannotBeReadIsToldAndTheWindowWorksWithoutIt) {
+    folder.copyShipped();
+    std::filesystem::permissions(folder.data(), std::filesystem::perms::none);
+    const Unprivileged ordinary;
+    start();
+    EXPECT_EQ(text("QuietLine"), "Nicht gefunden: Sprachen.ini [deutsch]  -  Nicht gespeichert: RDS_Allg.INI");
+    expectToWork();
+}
+
+TEST_F(StartUpTest, ADataFolderThatCannotBeWrittenLosesNothingAndIsTold) {
+    folder.copyShipped();
+    const std::string before = folder.read("Datenset1.INI");
+    std::filesystem::permissions(folder.path(), std::filesystem::perms::all);
+    using std::filesystem::perms;
+    std::filesystem::permissions(folder.data(),
+                                 perms::owner_read | perms::owner_exec | perms::others_read | perms::others_exec);
+    {
+        const Unprivileged ordinary;
+        start();
+        EXPECT_EQ(text("PS_T"), "MESSTURM");
+        EXPECT_EQ(text("QuietLine"), "");
+        expectToWork();
+        EXPECT_EQ(text("QuietLine"), "Nicht gespeichert: Datenset1.INI");
+    }
+    EXPECT_EQ(folder.read("Datenset1.INI"), before);
+}
+
+TEST_F(StartUpTest, AnUnknownLanguageIsTold) {
+    folder.copyShipped();
+    setGeneral("Sprache", "Sprache", "francais");
+    start();
+    EXPECT_EQ(text("QuietLine"), "Nicht gefunden: Sprachen.ini [francais]");
+    action("Mnu_Info_Sprache_E")->trigger();
+    EXPECT_EQ(text("QuietLine"), "");
 }
 
 TEST_F(StartUpTest, AMissingEventListLeavesTheBoxEmptyAndIsTold) {
@@ -182,7 +269,7 @@ TEST_F(StartUpTest, AMissingLanguageFileIsTold) {
     folder.copyShipped();
     std::filesystem::remove(folder.data() / kLanguageFile);
     start();
-    EXPECT_NE(text("QuietLine").find(kLanguageFile), std::string::npos);
+    EXPECT_EQ(text("QuietLine"), "Nicht gefunden: Sprachen.ini [deutsch]");
     EXPECT_EQ(find<QTabWidget>("SSTab1")->tabText(0), QString());
     EXPECT_EQ(text("GTL_Taste"), "Local");  // the program's own texts stay as designed
 }
