@@ -49,8 +49,65 @@ TEST_F(MenuTest, TheTreeHasItsEntries) {
                                                            {"Mnu_TMC_Edit", "TMC Edit"},
                                                            {"Mnu_Info_Log", "Log"}};
     for (const auto& [name, caption] : entries) EXPECT_EQ(action(name)->text().toStdString(), caption) << name;
-    const auto* info = window->findChild<QMenu*>(QStringLiteral("Mnu_Info"));
-    EXPECT_EQ(info->actions().size(), 8);
+    const auto entriesOf = [this](const char* menu) {
+        Lines names;
+        for (const QAction* entry : window->findChild<QMenu*>(QString::fromLatin1(menu))->actions()) {
+            const QObject* named = entry->menu() != nullptr ? static_cast<const QObject*>(entry->menu()) : entry;
+            names.push_back(named->objectName().toStdString());
+        }
+        return names;
+    };
+    EXPECT_EQ(entriesOf("Mnu_Info"),
+              (Lines{"Mnu_Info_Interface", "Mnu_Info_Ueber", "Mnu_Info_Hinweis", "Mnu_Info_Sprache",
+                     "Mnu_Info_RDS_RBDS", "Mnu_Info_RS232", "Mnu_TMC_Edit", "Mnu_Info_Log"}));
+    EXPECT_EQ(entriesOf("Mnu_Info_Interface"), (Lines{"Mnu_Info_Interface_COM", "Mnu_Info_Interface_IEC"}));
+    EXPECT_EQ(entriesOf("Mnu_Info_Sprache"),
+              (Lines{"Mnu_Info_Sprache_D", "Mnu_Info_Sprache_E", "Mnu_Info_Sprache_US"}));
+}
+
+TEST_F(MenuTest, TheLanguageInUseIsMarked) {
+    const auto marks = [this] {
+        std::string marked;
+        for (const char* entry : {"Mnu_Info_Sprache_D", "Mnu_Info_Sprache_E", "Mnu_Info_Sprache_US"}) {
+            marked += action(entry)->isChecked() ? 'x' : '-';
+        }
+        return marked;
+    };
+    EXPECT_EQ(marks(), "x--");
+    action("Mnu_Info_Sprache_D")->trigger();  // once more: the mark stays
+    EXPECT_EQ(marks(), "x--");
+    action("Mnu_Info_Sprache_E")->trigger();
+    EXPECT_EQ(marks(), "-x-");
+    action("Mnu_Info_Sprache_US")->trigger();
+    EXPECT_EQ(marks(), "--x");
+    start();
+    EXPECT_EQ(marks(), "--x");
+    EXPECT_EQ(text("Label10").substr(0, 12), "RDS sequence");
+}
+
+TEST_F(MenuTest, AChoiceThatCannotBeStoredIsNotMarked) {
+    std::filesystem::remove(folder.data() / kGeneralSettings);
+    std::filesystem::create_directory(folder.data() / kGeneralSettings);
+    action("Mnu_Info_Sprache_E")->trigger();
+    EXPECT_TRUE(action("Mnu_Info_Sprache_D")->isChecked());
+    EXPECT_FALSE(action("Mnu_Info_Sprache_E")->isChecked());
+    EXPECT_EQ(text("QuietLine"), "Nicht gespeichert: RDS_Allg.INI");
+}
+
+TEST_F(MenuTest, TheIndicatorsSpeakTheLanguageAtOnceEvenWhileASessionIsOpen) {
+    openSession();
+    EXPECT_EQ(text("Status_10") + text("Status_0"), "ausaus");
+    action("Mnu_Info_Sprache_E")->trigger();
+    EXPECT_EQ(text("Status_10") + text("Status_0"), "offoff");
+}
+
+TEST_F(MenuTest, TheSerialEntryDoesNothing) {
+    setGeneral("BUS", "INTERFACE", "TCPIP");
+    start();
+    const std::string before = folder.read(kGeneralSettings);
+    action("Mnu_Info_RS232")->trigger();
+    EXPECT_EQ(folder.read(kGeneralSettings), before);
+    EXPECT_EQ(visa.calls, Lines{});
 }
 
 TEST_F(MenuTest, ExitEndsTheProgramAtOnceWithoutAWord) {
