@@ -7,6 +7,7 @@
 
 #include <algorithm>
 #include <stdexcept>
+#include <utility>
 
 #include "base/clock.h"
 #include "base/numbers.h"
@@ -104,9 +105,11 @@ void DynamicPs::Taste_PS_Auto_Click() {
         PS_Timer->setPeriod(std::clamp(interval, 0.0, double{Ticker::kLongestInterval}));
         Taste_PS_Auto->showState(true);
         m_running = true;
+        m_failureTold = false;
         return;
     }
     Taste_PS_Auto->showState(false);
+    Taste_PS_Auto->repaint();  // at once: nothing is painted during the pause, and the switch would look dead
     PS_Timer->setPeriod(0);
     m_running = false;
     WaitMs(m_with.clock, kStopPauseMs);
@@ -119,8 +122,11 @@ void DynamicPs::PS_Timer_Timer() {
     std::string ps;
     try {
         ps = nextStep();
+        m_failureTold = false;
     } catch (const std::out_of_range&) {
-        PS_Timer->setPeriod(0);  // the next steps would fail alike: one box, not one after the other
+        // The next steps fail alike until the radiotext is shorter or the mode another: one box, not one after the
+        // other. The ticks go on, so that the steps go on by themselves then.
+        if (std::exchange(m_failureTold, true)) return;
         throw;
     }
     m_with.params.SendParam("PS", ps);

@@ -69,6 +69,7 @@ private:
     bool m_running = false;
     bool m_restored = false;
     bool m_stepping = false;
+    bool m_failureTold = false;  ///< the last step failed and that was told
 };
 
 }  // namespace kdx

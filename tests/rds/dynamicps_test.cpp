@@ -134,22 +134,70 @@ TEST_F(DynamicPsTest, PageModeTakesUpTo71Characters) {
     EXPECT_THROW(nextPagePs(record, std::string(200, 'x')), std::out_of_range);
 }
 
-TEST_F(DynamicPsTest, APageTooManyIsReportedOnceAndTheProgramGoesOn) {
-    Lines failures;
-    application().onFailure([&](const QString&, const QString& error) { failures.push_back(error.toStdString()); });
-    startRunning();
-    setMode(Qt::PartiallyChecked);
-    type("RT_Text1", std::string(72, 'x').c_str());
-    EXPECT_EQ(ticks(10), Lines{});
-    ASSERT_EQ(failures.size(), 1U);
-    EXPECT_EQ(failures[0], "Subscript out of range: the pages of a radiotext of 72 characters or more");
+class TooLongRadiotext : public DynamicPsTest {
+protected:
+    TooLongRadiotext() {
+        application().onFailure([this](const QString&, const QString& error) {
+            failures.push_back(error.toStdString());
+            // While the box waits for its OK the timers go on.
+            tick("PS_Timer");
+        });
+        type("RT_Text1", std::string(72, 'x').c_str());
+    }
+    ~TooLongRadiotext() override { application().onFailure({}); }
+    void failInPageMode() {
+        startRunning();
+        setMode(Qt::PartiallyChecked);
+        EXPECT_EQ(ticks(10), Lines{});
+        EXPECT_EQ(failures.size(), 1U);
+    }
 
-    type("RT_Text1", "ABC");
-    click("Taste_PS_Auto");  // off: the name is put back
-    EXPECT_EQ(sent(), Lines{ps("RADIO   ")});
-    click("Taste_PS_Auto");  // on again
+    Lines failures;
+};
+
+TEST_F(TooLongRadiotext, IsToldOnceHoweverOftenTheTimerTicks) {
+    failInPageMode();
+    EXPECT_EQ(failures, Lines{"Subscript out of range: the pages of a radiotext of 72 characters or more"});
+    EXPECT_TRUE(checked("Taste_PS_Auto"));
+}
+
+TEST_F(TooLongRadiotext, StepsGoOnByThemselvesOnceItIsShorter) {
+    failInPageMode();
+    type("RT_Text1", std::string(71, 'x').c_str());
     EXPECT_EQ(ticks(2), Lines(2, ps("        ")));
     EXPECT_EQ(failures.size(), 1U);
+    type("RT_Text1", std::string(72, 'x').c_str());
+    EXPECT_EQ(ticks(5), Lines{});
+    EXPECT_EQ(failures.size(), 2U);  // too long anew, told anew
+}
+
+TEST_F(TooLongRadiotext, StepsGoOnByThemselvesInAnotherMode) {
+    failInPageMode();
+    setMode(Qt::Unchecked);
+    EXPECT_EQ(ticks(1), Lines{ps("RADIO   ")});
+    setMode(Qt::Checked);
+    EXPECT_EQ(ticks(1), Lines{ps("xxxxxxxx")});
+    EXPECT_EQ(failures.size(), 1U);
+}
+
+TEST_F(TooLongRadiotext, TheSwitchStopsAndStartsAsEver) {
+    failInPageMode();
+    click("Taste_PS_Auto");
+    EXPECT_EQ(sent(), Lines{ps("RADIO   ")});
+    EXPECT_FALSE(tick("PS_Timer"));
+    click("Taste_PS_Auto");
+    EXPECT_EQ(ticks(5), Lines{});
+    EXPECT_EQ(failures.size(), 2U);  // started anew, told anew
+    type("RT_Text1", "ABC");
+    EXPECT_EQ(ticks(2), Lines(2, ps("        ")));
+}
+
+TEST_F(TooLongRadiotext, AtTheFirstTickItIsToldOnceAndTheNameIsPutBackLater) {
+    setMode(Qt::PartiallyChecked);
+    EXPECT_EQ(ticks(5), Lines{});
+    EXPECT_EQ(failures.size(), 1U);
+    type("RT_Text1", "ABC");
+    EXPECT_EQ(ticks(3), (Lines{ps("        "), ps("RADIO   ")}));
 }
 
 TEST_F(DynamicPsTest, ClicksOnTheBoxGoThroughToggleScrollAndPages) {
@@ -175,6 +223,36 @@ TEST_F(DynamicPsTest, StoppingSendsTheTypedNameAfterASecond) {
     EXPECT_FALSE(checked("Taste_PS_Auto"));
     EXPECT_FALSE(tick("PS_Timer"));
     EXPECT_NEAR(clock.secondsSinceMidnight() - before, 1.05, 0.01);  // and the pause before the command
+}
+
+/// Notes how much time had been slept away whenever the switch was painted in its off state.
+class PaintedOff : public QObject {
+public:
+    PaintedOff(QAbstractButton& watched, const FakeClock& clock) : m_watched(watched), m_clock(clock) {
+        watched.installEventFilter(this);
+    }
+    bool eventFilter(QObject*, QEvent* event) override {
+        if (event->type() == QEvent::Paint && !m_watched.isChecked()) sleptMs.push_back(m_clock.sleptMs());
+        return false;
+    }
+    std::vector<double> sleptMs;
+
+private:
+    QAbstractButton& m_watched;
+    const FakeClock& m_clock;
+};
+
+TEST_F(DynamicPsTest, TheSwitchShowsItsOffPictureBeforeThePause) {
+    page.show();
+    startRunning();
+    QCoreApplication::processEvents();
+    PaintedOff painted(*find<QAbstractButton>("Taste_PS_Auto"), clock);
+    const double before = clock.sleptMs();
+    find<QAbstractButton>("Taste_PS_Auto")->setChecked(false);  // as a click leaves it
+    QMetaObject::invokeMethod(find("Taste_PS_Auto"), "clicked");
+    ASSERT_FALSE(painted.sleptMs.empty());
+    EXPECT_EQ(painted.sleptMs.front(), before);
+    EXPECT_FALSE(checked("Taste_PS_Auto"));
 }
 
 TEST_F(DynamicPsTest, AnEmptyIntervalShowsTheSwitchOnButNeverTicks) {
