@@ -170,6 +170,21 @@ TEST_F(QueryPageTest, EonAsksNineQuestionsAndWritesTwentySevenLogLines) {
     EXPECT_EQ(lines, 27U);
 }
 
+TEST_F(QueryPageTest, TheQuestionsLeftAreNotAskedAfterAStop) {
+    visa.answers = {"\"D3C2\"\n"};
+    visa.readStatuses = {visa::kSuccess, visa::kTimeout};
+    dialogs.stopAtFailure = true;
+    dialogs.expectedMessages = 1;
+    click("Command19");
+    EXPECT_EQ(sent().size(), 2U);
+    EXPECT_EQ(text("gelesen"),
+              "EON-PI:  D3C2 / EON-PS:   / EON-TP:   / EON-TA:   / \nEON-AFB1:   / \nEON-AFB2:   / \nEON-AFB3:   / "
+              "\nEON-AFB4:   / \nEON-AFB5:  ");
+    visa.answers = {"\"RADIO\"\n"};
+    click("Command5");
+    EXPECT_EQ(text("gelesen"), "RADIO");
+}
+
 TEST_F(QueryPageTest, AnAnswerIsShownInWordsOverSeveralLines) {
     for (const char* answer : {"\"1\"\n", "\"350\"\n", "\"3\"\n", "\"B\"\n"}) visa.answers.emplace_back(answer);
     click("Command1");
