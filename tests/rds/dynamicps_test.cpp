@@ -297,7 +297,7 @@ TEST_F(DynamicPsTest, AnEarlyStopByATrafficOptionMakesOneMoreStepAndRestores) {
     click("Check1");
     sent();
     click("TA_Option_0");
-    EXPECT_EQ(ticks(2), (Lines{ps(">--<>--<"), ps("RADIO   ")}));
+    EXPECT_EQ(ticks(4), (Lines{ps(">--<>--<"), ps("RADIO   ")}));
 }
 
 TEST_F(DynamicPsTest, AStopThatComesInDuringAStepIsHeard) {

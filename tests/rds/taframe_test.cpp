@@ -109,8 +109,43 @@ TEST_F(TaFrameTest, TheAnnouncementComesAgainAfterThePeriod) {
     sent();
     runSeconds(61, 70);
     EXPECT_EQ(sent(), Lines(10, kOn));
+    EXPECT_FALSE(find<QTimer>("TA_Rep_Timer")->isActive());  // it waits for the pause
     runSeconds(71, 100);
     EXPECT_EQ(sent(), Lines{kOff});
+}
+
+TEST_F(TaFrameTest, ThePeriodIsOverOnlyPastItsLastMoment) {
+    startAutomatic();
+    runSeconds(1, 59);
+    sent();
+    clock.set(kNoon + 60);
+    tick("TA_Rep_Timer");
+    tick("TA_Timer");
+    EXPECT_EQ(sent(), Lines{});
+    clock.set(kNoon + 60.1);
+    tick("TA_Rep_Timer");
+    tick("TA_Timer");
+    EXPECT_EQ(sent(), Lines{kOn});
+}
+
+TEST_F(TaFrameTest, TicksThatComeInAfterTheOptionWasLeftDoNothing) {
+    startAutomatic();
+    runSeconds(1, 20);
+    sent();
+    find<QRadioButton>("TA_Option_0")->setChecked(true);  // its click has not been handled yet
+    runSeconds(21, 23);
+    EXPECT_FALSE(find<QTimer>("TA_Rep_Timer")->isActive());
+    EXPECT_EQ(sent(), Lines{});
+}
+
+TEST_F(TaFrameTest, ManualInThePauseLeavesNothingToComeAgain) {
+    startAutomatic();
+    runSeconds(1, 20);
+    sent();
+    click("TA_Option_0");
+    runSeconds(21, 200);
+    EXPECT_EQ(sent(), Lines{});
+    EXPECT_TRUE(enabled("TA_Check"));
 }
 
 TEST_F(TaFrameTest, EveryAnnouncementEndsWithOneOff) {
