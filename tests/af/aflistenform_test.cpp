@@ -74,6 +74,15 @@ TEST_F(EditorTest, TheTitleNamesTheKindOfTheLists) {
     EXPECT_EQ(editor->windowTitle(), QStringLiteral("Edit EON AF lists"));
 }
 
+TEST_F(EditorTest, TheControlsBearTheirTexts) {
+    open();
+    for (int i = 0; i < 5; ++i) {
+        EXPECT_EQ(text(("AFList_Opt_" + std::to_string(i)).c_str()), "Liste " + std::to_string(i + 1));
+    }
+    EXPECT_EQ(text("AF_OF_add"), "Einfügen");
+    EXPECT_EQ(text("Rem_Freq"), "Löschen");
+}
+
 TEST_F(EditorTest, ChoosingAListShowsItAndStoresNothing) {
     setList("AF_LISTE4", "100.1,88.0");
     const std::string before = folder.read(kSet1);
@@ -280,6 +289,7 @@ TEST_F(EditorTest, TheTunedFrequencyIsAskedForAndCutToOneDecimal) {
     EXPECT_EQ(text("AF_TN"), "101.2");
     ASSERT_EQ(dialogs.shown.size(), 1U);
     EXPECT_EQ(dialogs.shown[0].text, toText(captions.text(162)));
+    EXPECT_EQ(dialogs.shown[0].title, toText(captions.text(161)));
     EXPECT_EQ(dialogs.shown[0].preset, QStringLiteral("87.6"));
     click("Uebernahme_Knopf");
     EXPECT_EQ(profile(kSet1, "RDS", "AF_LISTE1"), "101.2,90.1,94.3");

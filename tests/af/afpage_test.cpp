@@ -271,6 +271,18 @@ TEST_F(AfPageTest, RelabellingKeepsTheListAndTheMethod) {
     EXPECT_EQ(rows(), Lines{"90.1"});
 }
 
+TEST_F(AfPageTest, TheControlsBearTheirTexts) {
+    const auto caption = [this](int number) { return toText(captions.text(number)).toStdString(); };
+    EXPECT_EQ(find<QGroupBox>("Frame2")->title(), QStringLiteral("alternative Frequenzen"));
+    EXPECT_EQ(text("AF_Bearbeiten"), caption(72));
+    EXPECT_EQ(text("Taste_AF_Senden"), caption(73));
+    EXPECT_EQ(text("AFMethod_opt_0"), caption(75));
+    EXPECT_EQ(text("AFMethod_opt_1"), caption(76));
+    for (int i = 0; i < 5; ++i) {
+        EXPECT_EQ(text(("AFList_Opt_" + std::to_string(i)).c_str()), "Liste " + std::to_string(i + 1));
+    }
+}
+
 TEST_F(AfPageTest, EveryCaptionFitsInEveryLanguage) {
     setList(1, listOf(25));
     page.loadDataSet();

@@ -34,6 +34,17 @@ TEST_F(GroupPageTest, EveryButtonAppendsItsGroup) {
     EXPECT_EQ(profile(kSet1, "RDS", "GR_FOLGE"), "");
 }
 
+TEST_F(GroupPageTest, TheControlsBearTheirTexts) {
+    const auto caption = [this](int number) { return toText(captions.text(number)).toStdString(); };
+    for (int number = 0; number < 16; ++number) {
+        const std::string shown = std::to_string(number);
+        EXPECT_EQ(text(("Gruppe" + shown).c_str()), "Gruppe " + shown);
+    }
+    EXPECT_EQ(text("newList"), caption(156));
+    EXPECT_EQ(text("GS_Senden"), caption(82));
+    EXPECT_EQ(text("Label10"), "Gruppenfolge:");
+}
+
 TEST_F(GroupPageTest, SendingStoresAndSendsTheSequence) {
     press({0, 2, 8});
     EXPECT_EQ(text("Label10"), "Gruppenfolge:0A,2A,8A,");

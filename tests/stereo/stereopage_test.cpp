@@ -141,7 +141,10 @@ INSTANTIATE_TEST_SUITE_P(
 
 INSTANTIATE_TEST_SUITE_P(AriAreas, StereoOption,
                          ::testing::Values(OptionCase{"BK_Opt_0", ":stereo:ari:bk A", "ARI-BK=A"},
+                                           OptionCase{"BK_Opt_1", ":stereo:ari:bk B", "ARI-BK=B"},
+                                           OptionCase{"BK_Opt_2", ":stereo:ari:bk C", "ARI-BK=C"},
                                            OptionCase{"BK_Opt_3", ":stereo:ari:bk D", "ARI-BK=D"},
+                                           OptionCase{"BK_Opt_4", ":stereo:ari:bk E", "ARI-BK=E"},
                                            OptionCase{"BK_Opt_5", ":stereo:ari:bk F", "ARI-BK=F"}));
 
 struct SwitchCase {
