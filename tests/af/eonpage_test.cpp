@@ -326,6 +326,16 @@ TEST_F(EonPageTest, WithoutTheOthersTrafficProgrammeNothingHappensAndNothingIsSa
     EXPECT_FALSE(timer().isActive());
 }
 
+TEST_F(EonPageTest, TheOwnProgrammesStateIsToldBeforeTheOthersTrafficProgrammeCounts) {
+    store("EON_TP", "0");
+    load();
+    indicate("ein", "ein");
+    dialogs.expectedMessages = 1;
+    click("EON_TA_Schalter");
+    ASSERT_THAT(dialogs.shown, SizeIs(1));
+    EXPECT_EQ(toBytes(dialogs.shown[0].text), captions.text(168));
+}
+
 TEST_F(EonPageTest, ARunningAnnouncementThatIsNoLongerAllowedIsRefusedAtEveryTickUntilItIs) {
     load();
     click("EON_TA_Schalter");
