@@ -331,6 +331,8 @@ void TmcBuilder::DurationCombo_Click() {
     TMC_DP1_Check->setChecked((duration & 4) != 0);
     TMC_DP2_Check->setChecked((duration & 2) != 0);
     TMC_DP3Check->setChecked((duration & 1) != 0);
+    // Boxes that stand as they should already say nothing: a first "0" must reach the display all the same.
+    showDuration();
 }
 
 void TmcBuilder::TMCInfoOnOff_Click() {

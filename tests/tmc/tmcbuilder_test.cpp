@@ -157,10 +157,9 @@ TEST_F(TmcBuilderTest, EveryDurationCanBeChosenAfterEveryOther) {
     }
 }
 
-TEST_F(TmcBuilderTest, ChoosingTheDurationThatShowsAtTheStartLeavesItsBitsUnset) {
-    // No box changes, so no box tells the display: the message stays incomplete until one has been touched.
+TEST_F(TmcBuilderTest, ChoosingTheDurationThatShowsAlreadySetsItsBits) {
     select("DurationCombo", 0);
-    EXPECT_EQ(text("TMCBL3_DP"), "-");
+    EXPECT_EQ(text("TMCBL3_DP"), "000");
 }
 
 TEST_F(TmcBuilderTest, TheBitDisplayIsHiddenAtTheStart) {

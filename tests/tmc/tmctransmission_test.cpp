@@ -162,6 +162,24 @@ TEST_F(TmcTransmissionTest, ThePositionGoesOnAfterAStop) {
     EXPECT_EQ(messagesSent(1), Lines{message(code(2))});
 }
 
+TEST_F(TmcTransmissionTest, ASingleMessageMovesThePositionOnToo) {
+    addMessages(4);
+    list().setCurrentRow(3);
+    click("TMC_Senden_Taste");
+    EXPECT_EQ(messagesSent(1), Lines{message(code(3))});
+    click("optMultiMessage");
+    click("TMC_Senden_Taste");
+    EXPECT_EQ(messagesSent(2), (Lines{message(code(2)), message(code(3))}));
+}
+
+TEST_F(TmcTransmissionTest, ChoosingSingleMessageEndsTheCyclingAtTheEntryThatIsSelected) {
+    startCycling(3);
+    messagesSent(1);
+    click("optSingleMessage");
+    EXPECT_EQ(messagesSent(1), Lines{message(code(1))});
+    EXPECT_FALSE(timer().isEnabled());
+}
+
 TEST_F(TmcTransmissionTest, RemovingStartsThePositionAnew) {
     startCycling(4);
     messagesSent(2);
@@ -178,6 +196,17 @@ TEST_F(TmcTransmissionTest, TheCurrentDataSetKeepsTheLastMessage) {
     messagesSent(1);
     EXPECT_EQ(profile("Datenset3.INI", "RDS", "TMC"), "02," + code(1));
     EXPECT_EQ(profile("Datenset1.INI", "RDS", "TMC"), "");
+}
+
+TEST_F(TmcTransmissionTest, TheAnnouncementIsStoredBeforeTheMessageReplacesIt) {
+    startCycling(2);
+    Lines stored;
+    instrument.onTraffic([&](const Traffic& traffic) {
+        if (traffic.kind == Traffic::Kind::Written) stored.push_back(profile("Datenset1.INI", "RDS", "TMC"));
+    });
+    EXPECT_TRUE(tick("TMC_Sende_Timer"));
+    EXPECT_TRUE(tick("TMC_Sende_Timer"));
+    EXPECT_EQ(stored, (Lines{"", "01,106100CD46", "02," + code(1), "01,100066CD46"}));
 }
 
 TEST_F(TmcTransmissionTest, WithoutASessionTheDataSetKeepsTheMessageAllTheSame) {
