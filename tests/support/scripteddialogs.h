@@ -19,11 +19,12 @@ public:
         Icon icon = Icon::None;
         QString title;
         QString text;
-        QString preset;  ///< of an input box; of a message box the details
+        QString preset;           ///< of an input box; of a message box the details
+        bool offersStop = false;  ///< has a second button that stops the running sequence
     };
 
     void message(Icon icon, const QString& title, const QString& text, const QString& details = {}) override {
-        shown.push_back({icon, title, text, details});
+        shown.push_back({icon, title, text, details, false});
         if (expectedMessages > 0) {
             --expectedMessages;
         } else {
@@ -32,10 +33,11 @@ public:
     }
     bool messageOrStop(const QString& title, const QString& text) override {
         message(Icon::Critical, title, text);
+        shown.back().offersStop = true;
         return stopAtFailure;
     }
     bool confirm(const QString& title, const QString& text) override {
-        shown.push_back({Icon::None, title, text, {}});
+        shown.push_back({Icon::None, title, text, {}, false});
         if (confirmations.empty()) {
             ADD_FAILURE() << "unexpected question: " << text.toStdString();
             return false;
@@ -45,7 +47,7 @@ public:
         return answer;
     }
     QString input(const QString& prompt, const QString& title, const QString& preset) override {
-        shown.push_back({Icon::None, title, prompt, preset});
+        shown.push_back({Icon::None, title, prompt, preset, false});
         if (inputs.empty()) {
             ADD_FAILURE() << "unexpected input box: " << prompt.toStdString();
             return {};
