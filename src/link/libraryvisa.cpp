@@ -142,8 +142,9 @@ VisaLibrary loadFirstVisaLibrary(std::span<const std::string> names) {
         result.visa = load(asFile(name), result.file, cause);
         if (result.visa) break;
         // The system's own message may begin with the name.
-        if (!cause.starts_with(name)) cause = name + ": " + cause;
-        result.reason += (result.reason.empty() ? "" : "\n") + cause;
+        if (!cause.starts_with(name)) cause.insert(0, name + ": ");
+        if (!result.reason.empty()) result.reason += '\n';
+        result.reason += cause;
     }
     return result;
 }

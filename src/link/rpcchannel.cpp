@@ -20,11 +20,11 @@ namespace {
 
 constexpr std::uint32_t kLastFragment = 0x80000000U;
 constexpr std::size_t kMarkBytes = 4;
-constexpr std::size_t kFixedCallBytes = 256;          // call header and all fields of fixed length, with room to spare
-constexpr std::size_t kLargestReply = 128 * 1024;     // twice the most that is ever asked for
-constexpr std::uint32_t kLargestVerifier = 400;       // of the RPC standard
-constexpr std::uint32_t kIsCall = 0, kIsReply = 1;    // message types
-constexpr std::uint32_t kAccepted = 0, kSuccess = 0;  // reply and accept states
+constexpr std::size_t kFixedCallBytes = 256;  // call header and all fields of fixed length, with room to spare
+constexpr std::size_t kLargestReply = std::size_t{128} * 1024;  // twice the most that is ever asked for
+constexpr std::uint32_t kLargestVerifier = 400;                 // of the RPC standard
+constexpr std::uint32_t kIsCall = 0, kIsReply = 1;              // message types
+constexpr std::uint32_t kAccepted = 0, kSuccess = 0;            // reply and accept states
 constexpr std::uint32_t kProgramUnavailable = 1, kProgramMismatch = 2;
 
 /// False at the deadline, at the latest.

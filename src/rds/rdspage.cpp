@@ -264,7 +264,7 @@ void RdsPage::loadDataSet() {
         showMusicSpeech();
     }
     const std::string decoderInfo = stored("DI");
-    DI_Opt.choose(decoderInfo.empty() ? -1 : positionOf(decoderInfo, DI_Opt.size()));
+    DI_Opt.choose(decoderInfo.empty() ? -1 : positionOf(decoderInfo, static_cast<int>(DI_Opt.size())));
 }
 
 void RdsPage::loadProgrammeType() {

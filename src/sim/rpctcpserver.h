@@ -15,7 +15,7 @@ namespace kdx {
 class RpcTcpServer {
 public:
     /// Longest call that is taken; a client that announces a longer one is cut off.
-    static constexpr std::size_t kLongestRecord = 1024 * 1024;
+    static constexpr std::size_t kLongestRecord = std::size_t{1024} * 1024;
     /// More clients than this wait until one has gone.
     static constexpr std::size_t kMostConnections = 128;
 

@@ -283,8 +283,8 @@ void TmcBuilder::TMC_Var_Combo_Click() {
     TMCGruppe8Maker();
 }
 
-void TmcBuilder::Tmc_richtung_Click(int Index) {
-    TMCBL3_U->setText(bit(Index == 1));
+void TmcBuilder::Tmc_richtung_Click(int index) {
+    TMCBL3_U->setText(bit(index == 1));
     TMCGruppe8Maker();
 }
 

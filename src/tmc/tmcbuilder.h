@@ -48,7 +48,7 @@ private:
     void TMC_Event_Combo_Click();
     void TMC_Loc_Combo_Click();
     void TMC_Var_Combo_Click();
-    void Tmc_richtung_Click(int Index);
+    void Tmc_richtung_Click(int index);
     void TMC_Div_Click();
     void TMC_F_Check_Click();
     void TMC_T_Check_Click();
