@@ -368,8 +368,7 @@ QString HMenue::missingData() const {
 
 bool HMenue::showInterfaceError(const std::string& text, bool sequenceRuns) {
     // While the box waits, timers would send more to the same broken link and pile up more boxes.
-    const QList<Ticker*> tickers = findChildren<Ticker*>();
-    for (Ticker* ticker : tickers) ticker->setHeld(true);
+    holdTimers(true);
     const QString title = QStringLiteral("Interface Error");
     bool stop = false;
     if (sequenceRuns) {
@@ -377,8 +376,12 @@ bool HMenue::showInterfaceError(const std::string& text, bool sequenceRuns) {
     } else {
         m_s.dialogs.message(Dialogs::Icon::Critical, title, toText(text));
     }
-    for (Ticker* ticker : tickers) ticker->setHeld(false);
+    holdTimers(false);
     return stop;
+}
+
+void HMenue::holdTimers(bool held) {
+    for (Ticker* ticker : findChildren<Ticker*>()) ticker->setHeld(held);
 }
 
 void HMenue::Mnu_Info_Log_Click() {

@@ -109,6 +109,7 @@ private:
     [[nodiscard]] QString progressPattern() const;
     [[nodiscard]] QString missingData() const;
     bool showInterfaceError(const std::string& text, bool sequenceRuns);
+    void holdTimers(bool held);
     [[nodiscard]] std::string generalSetting(const char* section, const char* key) const;
 
     Surroundings m_s;

@@ -92,6 +92,7 @@ void HMenue::INIT_Taste_Click() {
     m_instrument.Send2Gen("*IDN?");
     setWindowTitle(toText(m_instrument.ReadFromGen()));
 
+    holdTimers(false);
     showSessionOpen(true);
     sendBaseState();
     m_stereo->selectFirstImpedance();
@@ -108,10 +109,11 @@ void HMenue::sendBaseState() {
 }
 
 void HMenue::GTL_Taste_Click() {
-    // A failure stays silent. The session counts as open still and keeps its handle: only the switched-off pages keep
-    // commands away from it.
+    // A failure stays silent. The session counts as open still and keeps its handle: only the switched-off pages and
+    // the resting timers keep commands away from it.
     m_instrument.LastVisaStatus = m_instrument.visa().viClose(m_instrument.InstrSession);
     showSessionOpen(false);
+    holdTimers(true);
 }
 
 void HMenue::showSessionOpen(bool open) {

@@ -115,6 +115,28 @@ TEST_F(SessionTest, ClosingSwitchesThemBackExceptTheSerialEntry) {
     EXPECT_EQ(sent(), Lines{});
 }
 
+TEST_F(SessionTest, TimersRestFromTheClosingToTheNextOpening) {
+    // The clock is on from the start: it must not send to the closed handle every 20 s.
+    useLan();
+    EXPECT_TRUE(tick("Timer1"));  // before the first opening nothing is sent, and the clock runs on the page
+    openSession();
+    EXPECT_TRUE(tick("Timer1"));
+    click("GTL_Taste");
+    sent();
+    for (const char* timer : {"Timer1", "PS_Timer", "TA_Timer", "TA_Rep_Timer", "EON_TA_Zeit", "TMC_Sende_Timer"}) {
+        EXPECT_FALSE(tick(timer)) << timer;
+    }
+    visa.openStatus = visa::kTimeout;
+    dialogs.expectedMessages = 1;
+    openSession();
+    EXPECT_FALSE(tick("Timer1"));  // the opening failed
+    visa.openStatus = 0;
+    openSession();
+    sent();
+    EXPECT_TRUE(tick("Timer1"));
+    EXPECT_EQ(sent().size(), 1U);
+}
+
 TEST_F(SessionTest, AFailingCloseIsSilent) {
     visa.closeStatus = -1073807346;
     useLan();
