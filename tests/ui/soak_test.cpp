@@ -27,7 +27,7 @@ namespace {
 
 constexpr std::size_t kWarmUpCommands = 2500;  // until the live view of the commands is full
 constexpr std::size_t kCommands = kWarmUpCommands + 10000;
-constexpr double kLargestGrowthMib = 2;
+constexpr double kLargestGrowthMib = 1;
 
 /// Temporary folders in memory, where the system has them: every change of a setting is forced onto the disk, and on a
 /// slow one this would take most of the time.
@@ -197,7 +197,10 @@ protected:
         time = std::make_unique<VirtualTime>(clock, *window);
         QObject::connect(window.get(), &HMenue::trafficPassed, [this](const Traffic& traffic) { hear(traffic); });
     }
-    ~SoakTest() override { dynamic_cast<Application&>(*QApplication::instance()).onFailure({}); }
+    ~SoakTest() override {
+        window.reset();  // before what it works with
+        dynamic_cast<Application&>(*QApplication::instance()).onFailure({});
+    }
 
     void hear(const Traffic& traffic) {
         if (traffic.kind == Traffic::Kind::Logged) return;
