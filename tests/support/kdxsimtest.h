@@ -39,9 +39,9 @@ protected:
     std::string ask(const std::string& key) {
         const VisaHandle session = window->instrument().InstrSession;
         std::int32_t count = 0;
-        link().viWrite(session, ":STEREO:DIRECT? \"" + key + '"', count);
+        instrumentLink().viWrite(session, ":STEREO:DIRECT? \"" + key + '"', count);
         std::string answer(100, ' ');
-        if (link().viRead(session, answer, count) < 0 || count < 3) return {};
+        if (instrumentLink().viRead(session, answer, count) < 0 || count < 3) return {};
         return answer.substr(1, static_cast<std::size_t>(count) - 3);
     }
     /// What passed since the last call.
