@@ -234,10 +234,8 @@ TEST_F(BrokenLinkTest, MessagesThatCycleOnReachTheInstrumentAfterTheNextOpening)
     sim.kill();
     EXPECT_EQ(boxesOf([this] { time->advance(std::chrono::seconds(1)); }).size(), 2U);
     click("GTL_Taste");
-    // The timer is not stopped by closing: its commands go to the closed handle.
-    const auto boxes = boxesOf([this] { time->advance(std::chrono::seconds(1)); });
-    EXPECT_EQ(boxes.size(), 2U);
-    expectInterfaceErrors(boxes, QStringLiteral("Fehler: %1").arg(visa::kInvalidObject), false);
+    EXPECT_TRUE(boxesOf([this] { time->advance(std::chrono::seconds(10)); }).empty())
+        << "nothing goes to a closed link";
     restartAndOpenAgain();
     time->advance(std::chrono::seconds(2));
     EXPECT_EQ(ask("8A"), data.ReadIni("RDS", "TMC", dataSetFile("1")));
