@@ -172,8 +172,7 @@ QLayout* TmcBuilder::placeCode() {
     m_codeHeading = new QLabel(this);
     TMC_Gr8_Label = valueLabel("TMC_Gr8_Label", this);
     QFont font = TMC_Gr8_Label->font();
-    font.setFamilies({QStringLiteral("Arial"), QStringLiteral("Liberation Sans")});
-    font.setBold(true);
+    font.setFamilies(arialFamilies());
     TMC_Gr8_Label->setFont(font);
     TMC_Gr8_Label->setTextInteractionFlags(Qt::TextSelectableByMouse);
     TMC_Gr8_Label->setMinimumWidth(widthOf(TMC_Gr8_Label, static_cast<int>(kGroupCodeLength) + 1));

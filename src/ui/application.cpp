@@ -1,5 +1,7 @@
 #include "ui/application.h"
 
+#include "ui/controls.h"
+
 #include <QFont>
 #include <QStyleFactory>
 
@@ -13,7 +15,7 @@ Application::Application(int& argc, char** argv) : QApplication(argc, argv) {
     // One look on every desktop: the pages are laid out for it, and platform themes cost twice the start time.
     setStyle(QStyleFactory::create(QStringLiteral("Fusion")));
     QFont font = QApplication::font();
-    font.setFamilies({QStringLiteral("Arial"), QStringLiteral("Liberation Sans"), QStringLiteral("DejaVu Sans")});
+    font.setFamilies(arialFamilies());
     font.setPointSizeF(8.25);
     setFont(font);
 }

@@ -3,6 +3,7 @@
 #include <QGridLayout>
 
 #include "settings/captions.h"
+#include "ui/controls.h"
 #include "ui/named.h"
 #include "ui/text.h"
 
@@ -27,7 +28,7 @@ constexpr std::array kPairs = {
 
 QFont arial(const QFont& base) {
     QFont font = base;
-    font.setFamilies({QStringLiteral("Arial"), QStringLiteral("Liberation Sans")});
+    font.setFamilies(arialFamilies());
     return font;
 }
 
