@@ -3,7 +3,6 @@
 #include <QCheckBox>
 #include <QCoreApplication>
 #include <QLabel>
-#include <QScopedValueRollback>
 
 #include <algorithm>
 #include <stdexcept>
@@ -117,8 +116,7 @@ void DynamicPs::Taste_PS_Auto_Click() {
 }
 
 void DynamicPs::PS_Timer_Timer() {
-    if (m_stepping || (!m_running && m_restored)) return;
-    const QScopedValueRollback stepping(m_stepping, true);
+    if (!m_running && m_restored) return;
     std::string ps;
     try {
         ps = nextStep();

@@ -68,7 +68,6 @@ private:
     DynamicPsRecord m_record;
     bool m_running = false;
     bool m_restored = false;
-    bool m_stepping = false;
     bool m_failureTold = false;  ///< the last step failed and that was told
 };
 

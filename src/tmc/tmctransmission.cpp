@@ -12,7 +12,6 @@
 #include "ui/text.h"
 
 #include <QHBoxLayout>
-#include <QScopedValueRollback>
 #include <QVBoxLayout>
 
 #include <memory>
@@ -145,9 +144,7 @@ bool TmcTransmission::setInterval() {
 }
 
 void TmcTransmission::TMC_Sende_Timer_Timer() {
-    // A failed write shows its box in here while the timer goes on; the next message waits until it is closed.
-    if (m_ticking) return;
-    const QScopedValueRollback ticking(m_ticking, true);
+    // A failed write shows its box in here; the timer lets no further tick in until it is closed.
     m_sendPosition = nextPosition(m_sendPosition, TMC_List->count());
     sendAndStore("ODA", m_otherVariant ? kSecondAnnouncement : kFirstAnnouncement);
     m_otherVariant = !m_otherVariant;

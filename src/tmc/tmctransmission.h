@@ -47,7 +47,6 @@ private:
     const TmcBuilder& m_builder;
     int m_sendPosition = 0;
     bool m_otherVariant = false;  ///< which announcement comes next
-    bool m_ticking = false;
 
     QListWidget* TMC_List = nullptr;
     QPushButton* TMC_Gr8_apply = nullptr;
