@@ -4,7 +4,7 @@
 #include "af/aflistenform.h"
 #include "af/modul2.h"
 #include "base/numbers.h"
-#include "rds/sendparam.h"
+#include "coder/sendparam.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
 #include "settings/programstate.h"

@@ -6,7 +6,7 @@
 #include "af/modul2.h"
 #include "base/numbers.h"
 #include "link/instrument.h"
-#include "rds/sendparam.h"
+#include "coder/sendparam.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
 #include "settings/programstate.h"

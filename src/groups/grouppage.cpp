@@ -1,7 +1,7 @@
 #include "groups/grouppage.h"
 
 #include "groups/sequencelabel.h"
-#include "rds/sendparam.h"
+#include "coder/sendparam.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
 #include "settings/programstate.h"

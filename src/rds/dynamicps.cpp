@@ -10,7 +10,7 @@
 
 #include "base/clock.h"
 #include "base/numbers.h"
-#include "rds/sendparam.h"
+#include "coder/sendparam.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
 #include "ui/named.h"

@@ -9,7 +9,7 @@
 #include <array>
 
 #include "link/instrument.h"
-#include "rds/readback.h"
+#include "coder/readback.h"
 #include "settings/captions.h"
 #include "settings/programstate.h"
 #include "ui/controls.h"

@@ -3,7 +3,7 @@
 #include <QPushButton>
 #include <QVBoxLayout>
 
-#include "rds/sendparam.h"
+#include "coder/sendparam.h"
 #include "settings/captions.h"
 #include "ui/controls.h"
 #include "ui/text.h"

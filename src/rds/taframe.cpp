@@ -9,7 +9,7 @@
 
 #include "base/clock.h"
 #include "base/numbers.h"
-#include "rds/sendparam.h"
+#include "coder/sendparam.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
 #include "ui/dialogs.h"

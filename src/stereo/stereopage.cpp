@@ -2,7 +2,7 @@
 
 #include <QLabel>
 
-#include "rds/sendparam.h"
+#include "coder/sendparam.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
 #include "stereo/storedvalue.h"

@@ -1,6 +1,6 @@
 #include "tmc/tmctransmission.h"
 
-#include "rds/sendparam.h"
+#include "coder/sendparam.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
 #include "settings/programstate.h"

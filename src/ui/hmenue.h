@@ -7,7 +7,7 @@
 #include <memory>
 
 #include "link/instrument.h"
-#include "rds/sendparam.h"
+#include "coder/sendparam.h"
 #include "ui/pagecontext.h"
 
 class QAction;

@@ -6,7 +6,7 @@
 #include <QPushButton>
 #include <QTabWidget>
 
-#include "rds/readback.h"
+#include "coder/readback.h"
 #include "ui/hmenue.h"
 #include "ui/text.h"
 

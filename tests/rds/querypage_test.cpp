@@ -7,7 +7,7 @@
 #include <ostream>
 
 #include "base/numbers.h"
-#include "rds/readback.h"
+#include "coder/readback.h"
 #include "support/pagetest.h"
 
 namespace kdx::test {

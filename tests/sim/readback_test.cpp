@@ -4,7 +4,7 @@
 #include <vector>
 
 #include "link/instrument.h"
-#include "rds/sendparam.h"
+#include "coder/sendparam.h"
 #include "settings/datafolder.h"
 #include "settings/programstate.h"
 #include "sim/simtest.h"

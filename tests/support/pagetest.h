@@ -18,7 +18,7 @@
 #include <vector>
 
 #include "link/instrument.h"
-#include "rds/sendparam.h"
+#include "coder/sendparam.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
 #include "settings/profilefile.h"

@@ -1,4 +1,4 @@
-#include "rds/sendparam.h"
+#include "coder/sendparam.h"
 
 #include <algorithm>
 #include <array>

@@ -1,4 +1,4 @@
-#include "rds/readback.h"
+#include "coder/readback.h"
 
 #include "base/numbers.h"
 
