@@ -7,7 +7,7 @@
 #include "coder/sendparam.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
-#include "stereo/storedvalue.h"
+#include "settings/storedvalue.h"
 #include "ui/clickablelabel.h"
 #include "ui/controls.h"
 #include "ui/dialogs.h"

@@ -5,7 +5,7 @@
 #include "coder/sendparam.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
-#include "stereo/storedvalue.h"
+#include "settings/storedvalue.h"
 #include "ui/pictureswitch.h"
 #include "ui/text.h"
 

@@ -1,4 +1,4 @@
-#include "stereo/storedvalue.h"
+#include "settings/storedvalue.h"
 
 #include <algorithm>
 #include <cmath>
