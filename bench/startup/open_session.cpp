@@ -10,7 +10,7 @@
 #include "sim/simvisa.h"
 #include "sim/virtualinstrument.h"
 #include "ui/application.h"
-#include "ui/hmenue.h"
+#include "window/hmenue.h"
 #include "ui/qtdialogs.h"
 
 int main(int argc, char** argv) {

@@ -21,7 +21,7 @@
 #include "settings/datafolder.h"
 #include "settings/programstate.h"
 #include "ui/application.h"
-#include "ui/hmenue.h"
+#include "window/hmenue.h"
 #include "ui/qtdialogs.h"
 
 namespace {

@@ -6,7 +6,7 @@
 #include <memory>
 
 #include "support/pagetest.h"
-#include "ui/hmenue.h"
+#include "window/hmenue.h"
 
 namespace kdx::test {
 

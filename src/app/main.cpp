@@ -12,12 +12,12 @@
 #include "settings/programstate.h"
 #include "sim/virtualinstrument.h"
 #include "ui/application.h"
-#include "ui/choosevisa.h"
-#include "ui/hmenue.h"
-#include "ui/options.h"
+#include "app/choosevisa.h"
+#include "window/hmenue.h"
+#include "app/options.h"
 #include "ui/qtdialogs.h"
 #include "ui/text.h"
-#include "ui/tour.h"
+#include "window/tour.h"
 
 namespace {
 

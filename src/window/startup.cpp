@@ -13,8 +13,8 @@
 #include "stereo/rfpage.h"
 #include "stereo/stereopage.h"
 #include "tmc/tmcpage.h"
-#include "ui/hmenue.h"
-#include "ui/progressline.h"
+#include "window/hmenue.h"
+#include "window/progressline.h"
 #include "ui/text.h"
 
 namespace kdx {

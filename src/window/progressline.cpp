@@ -1,4 +1,4 @@
-#include "ui/progressline.h"
+#include "window/progressline.h"
 
 #include <QHBoxLayout>
 #include <QLabel>

@@ -9,11 +9,11 @@
 #include "tmc/tmclistedit.h"
 #include "tmc/tmcpage.h"
 #include "ui/dialogs.h"
-#include "ui/hmenue.h"
-#include "ui/logview.h"
+#include "window/hmenue.h"
+#include "window/logview.h"
 #include "ui/named.h"
 #include "ui/text.h"
-#include "ui/trafficlog.h"
+#include "window/trafficlog.h"
 
 namespace kdx {
 

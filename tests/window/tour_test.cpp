@@ -1,4 +1,4 @@
-#include "ui/tour.h"
+#include "window/tour.h"
 
 #include <gtest/gtest.h>
 

@@ -1,4 +1,4 @@
-#include "ui/logview.h"
+#include "window/logview.h"
 
 #include <QClipboard>
 #include <QGuiApplication>
@@ -17,7 +17,7 @@
 #include "settings/captions.h"
 #include "ui/controls.h"
 #include "ui/text.h"
-#include "ui/trafficlog.h"
+#include "window/trafficlog.h"
 
 namespace kdx {
 

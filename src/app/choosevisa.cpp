@@ -1,10 +1,10 @@
-#include "ui/choosevisa.h"
+#include "app/choosevisa.h"
 
 #include "link/lanvisa.h"
 #include "link/libraryvisa.h"
 #include "sim/simvisa.h"
 #include "sim/virtualinstrument.h"
-#include "ui/options.h"
+#include "app/options.h"
 
 namespace kdx {
 

@@ -1,4 +1,4 @@
-#include "ui/tour.h"
+#include "window/tour.h"
 
 #include <QCoreApplication>
 #include <QDir>
@@ -7,7 +7,7 @@
 #include <QTabWidget>
 
 #include "coder/readback.h"
-#include "ui/hmenue.h"
+#include "window/hmenue.h"
 #include "ui/text.h"
 
 namespace kdx {

@@ -1,4 +1,4 @@
-#include "ui/hmenue.h"
+#include "window/hmenue.h"
 
 #include <QGroupBox>
 #include <QHBoxLayout>
@@ -29,12 +29,12 @@
 #include "ui/clickablelabel.h"
 #include "ui/controls.h"
 #include "ui/dialogs.h"
-#include "ui/logview.h"
-#include "ui/progressline.h"
+#include "window/logview.h"
+#include "window/progressline.h"
 #include "ui/statusrow.h"
 #include "ui/text.h"
 #include "ui/ticker.h"
-#include "ui/trafficlog.h"
+#include "window/trafficlog.h"
 
 #include <filesystem>
 

@@ -15,8 +15,8 @@
 #include "stereo/stereopage.h"
 #include "ui/clickablelabel.h"
 #include "ui/dialogs.h"
-#include "ui/hmenue.h"
-#include "ui/progressline.h"
+#include "window/hmenue.h"
+#include "window/progressline.h"
 #include "ui/text.h"
 
 namespace kdx {

@@ -1,4 +1,4 @@
-#include "ui/logview.h"
+#include "window/logview.h"
 
 #include <gtest/gtest.h>
 
@@ -8,7 +8,7 @@
 #include <QTableView>
 
 #include "support/windowtest.h"
-#include "ui/trafficlog.h"
+#include "window/trafficlog.h"
 
 namespace kdx::test {
 namespace {

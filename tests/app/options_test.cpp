@@ -1,10 +1,10 @@
-#include "ui/options.h"
+#include "app/options.h"
 
 #include <gtest/gtest.h>
 
 #include "base/clock.h"
 #include "sim/virtualinstrument.h"
-#include "ui/choosevisa.h"
+#include "app/choosevisa.h"
 
 namespace kdx {
 namespace {

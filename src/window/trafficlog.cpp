@@ -1,4 +1,4 @@
-#include "ui/trafficlog.h"
+#include "window/trafficlog.h"
 
 #include <QBrush>
 #include <QTime>
