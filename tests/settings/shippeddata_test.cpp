@@ -368,7 +368,7 @@ TEST_P(ShippedTmcList, EveryLineIsATextAndAFiveDigitCodeOfItsOwn) {
 
 // Event codes have 11 bits, location codes 16; a message list shows 35 characters of either.
 INSTANTIATE_TEST_SUITE_P(Lists, ShippedTmcList,
-                         ::testing::Values(TmcList{kEventList, 42, 160, 2047, "Events"},
+                         ::testing::Values(TmcList{kEventList, 42, 400, 2047, "Events"},
                                            TmcList{kLocationList, 35, 60, 65535, "Locations"}),
                          caseName<TmcList>);
 
