@@ -366,10 +366,11 @@ TEST_P(ShippedTmcList, EveryLineIsATextAndAFiveDigitCodeOfItsOwn) {
     }
 }
 
-// Event codes have 11 bits, location codes 16; a message list shows 35 characters of either.
+// Event codes have 11 bits. Location codes have 16, but tables of locations end at 63487: the codes above it mean no
+// place of a table. A message list shows 35 characters of either text.
 INSTANTIATE_TEST_SUITE_P(Lists, ShippedTmcList,
                          ::testing::Values(TmcList{kEventList, 42, 400, 2047, "Events"},
-                                           TmcList{kLocationList, 35, 60, 65535, "Locations"}),
+                                           TmcList{kLocationList, 35, 60, 63487, "Locations"}),
                          caseName<TmcList>);
 
 TEST_F(ShippedData, ThePicturesAreIconsForOneAndTwoScreenScales) {
