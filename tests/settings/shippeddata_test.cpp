@@ -261,7 +261,8 @@ protected:
     }
 };
 
-/// True for a tuned frequency and at least one other, decimal MHz with a point, separated by single commas.
+/// True for a tuned frequency and at least one other, decimal MHz with one decimal, separated by single commas. Each
+/// must have an AF code of RDS, which counts from 87.6 to 107.9 in steps of 0.1 MHz.
 bool isAfList(const std::string& list) {
     std::size_t frequencies = 0;
     for (std::size_t start = 0; start <= list.size(); ++frequencies) {
@@ -271,7 +272,7 @@ bool isAfList(const std::string& list) {
         if (point == std::string::npos || point + 2 != frequency.size() ||
             frequency.find_first_not_of("0123456789.") != std::string::npos)
             return false;
-        if (leadingNumber(frequency) < 87.5 || leadingNumber(frequency) > 108.0) return false;
+        if (leadingNumber(frequency) < 87.6 || leadingNumber(frequency) > 107.9) return false;
         start = end + 1;
     }
     return frequencies >= 2;
