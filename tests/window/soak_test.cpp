@@ -15,7 +15,7 @@
 
 #include "link/lanvisa.h"
 #include "sim/virtualinstrument.h"
-#include "sim/vxi11server.h"
+#include "simserver/vxi11server.h"
 #include "support/virtualtime.h"
 #include "support/windowtest.h"
 #include "ui/application.h"

@@ -1,0 +1,19 @@
+#include "simserver/abortchannel.h"
+
+#include "simserver/corechannel.h"
+#include "simserver/xdr.h"
+
+#include <vxi11.h>
+
+namespace kdx {
+
+AbortChannel::AbortChannel(CoreChannel& core) : RpcProgram(DEVICE_ASYNC, DEVICE_ASYNC_VERSION), m_core(core) {}
+
+void AbortChannel::call(std::uint32_t procedure, std::string_view arguments, ConnectionId, const RpcReply& reply) {
+    if (procedure != device_abort) return reply({{}, PROC_UNAVAIL});
+    const XdrDecoded<Device_Link> link(arguments, xdr_Device_Link);
+    if (!link) return reply({{}, GARBAGE_ARGS});
+    reply({toXdr<Device_Error>({m_core.abort(*link)}, xdr_Device_Error)});
+}
+
+}  // namespace kdx

@@ -1,0 +1,42 @@
+#pragma once
+
+#include "simserver/portmapper.h"
+
+#include <memory>
+#include <string>
+#include <vector>
+
+namespace kdx {
+
+/// Lets clients find programs by the port mapper: by one of our own when the port can be had, else by registering with
+/// the one that runs on this machine.
+class PortAnnouncement {
+public:
+    enum class Way {
+        OwnMapper,   ///< we answer the questions ourselves
+        Registered,  ///< a running port mapper knows the programs
+        None         ///< nobody tells clients the port; see problem()
+    };
+
+    /// Takes at most some seconds when a port mapper runs but does not answer.
+    /// @param bindAddress where the programs listen: a port mapper of our own listens there too.
+    PortAnnouncement(PollLoop& loop, std::vector<PortMapping> mappings, const std::string& bindAddress,
+                     unsigned short mapperPort = kPortMapperPort);
+    PortAnnouncement(const PortAnnouncement&) = delete;
+    PortAnnouncement& operator=(const PortAnnouncement&) = delete;
+    /// Takes registrations back.
+    ~PortAnnouncement();
+
+    [[nodiscard]] Way way() const { return m_way; }
+    /// For the user: why clients cannot find the programs, and what to do about it. Empty unless way() is None.
+    [[nodiscard]] const std::string& problem() const { return m_problem; }
+
+private:
+    std::vector<PortMapping> m_mappings;
+    unsigned short m_mapperPort;
+    Way m_way = Way::None;
+    std::string m_problem;
+    std::unique_ptr<PortMapper> m_mapper;
+};
+
+}  // namespace kdx

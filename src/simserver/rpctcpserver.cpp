@@ -1,0 +1,131 @@
+#include "simserver/rpctcpserver.h"
+
+#include <netinet/in.h>
+#include <netinet/tcp.h>
+#include <poll.h>
+#include <sys/socket.h>
+
+#include <array>
+#include <cerrno>
+#include <utility>
+
+namespace kdx {
+namespace {
+
+// A client that does not fetch its replies gets no further calls served once this much is waiting for it.
+constexpr std::size_t kMostUnsent = 1024 * 1024;
+
+void setOption(int socket, int level, int option, int value) {
+    setsockopt(socket, level, option, &value, sizeof value);
+}
+
+// Replies are small and awaited, so they go out at once; a client that vanished without a word (power cut, cable) is
+// noticed after about a minute, and its links and locks are freed.
+void setUp(int socket) {
+    setOption(socket, IPPROTO_TCP, TCP_NODELAY, 1);
+    setOption(socket, SOL_SOCKET, SO_KEEPALIVE, 1);
+    setOption(socket, IPPROTO_TCP, TCP_KEEPIDLE, 30);
+    setOption(socket, IPPROTO_TCP, TCP_KEEPINTVL, 10);
+    setOption(socket, IPPROTO_TCP, TCP_KEEPCNT, 3);
+}
+
+}  // namespace
+
+RpcTcpServer::RpcTcpServer(PollLoop& loop, RpcProgram& program, const std::string& address, unsigned short port)
+    : m_loop(loop), m_program(program), m_listener(listenTcp(address, port)) {
+    m_loop.watch(m_listener.number(), POLLIN, [this](short) { acceptClients(); });
+}
+
+RpcTcpServer::~RpcTcpServer() {
+    m_loop.forget(m_listener.number());
+    for (const auto& [id, connection] : m_connections) m_loop.forget(connection.socket.number());
+}
+
+void RpcTcpServer::acceptClients() {
+    FileDescriptor socket(::accept4(m_listener.number(), nullptr, nullptr, SOCK_NONBLOCK | SOCK_CLOEXEC));
+    if (socket.number() < 0) return;  // the client has given up meanwhile
+    setUp(socket.number());
+    const ConnectionId id = ++m_lastId;
+    m_loop.watch(socket.number(), POLLIN, [this, id](short events) { serve(id, events); });
+    m_connections[id].socket = std::move(socket);
+    if (m_connections.size() >= kMostConnections) m_loop.setEvents(m_listener.number(), 0);
+}
+
+void RpcTcpServer::serve(ConnectionId id, short events) {
+    Connection& connection = m_connections.at(id);
+    if ((events & POLLIN) != 0) {
+        readCalls(id, connection);
+    } else if ((events & (POLLERR | POLLHUP | POLLNVAL)) != 0) {
+        close(id);
+        return;
+    }
+    if (!sendUnsent(connection) || (connection.inputEnded && connection.unsent.empty())) {
+        close(id);
+        return;
+    }
+    updateEvents(connection);
+}
+
+void RpcTcpServer::readCalls(ConnectionId id, Connection& connection) {
+    std::array<char, 65536> bytes;
+    const ssize_t count = ::recv(connection.socket.number(), bytes.data(), bytes.size(), 0);
+    if (count < 0 && (errno == EAGAIN || errno == EWOULDBLOCK || errno == EINTR)) return;
+    if (count <= 0) {
+        endInput(id, connection);
+        return;
+    }
+    connection.reader.feed({bytes.data(), static_cast<std::size_t>(count)});
+    while (const auto record = connection.reader.next()) {
+        const bool isCall =
+            m_program.handle(*record, id, [this, id](const std::string& reply) { sendRecord(id, reply); });
+        if (!isCall) {
+            endInput(id, connection);
+            return;
+        }
+    }
+    if (connection.reader.tooLong()) endInput(id, connection);
+}
+
+// What has been answered still goes out; what the program keeps for the client is given up.
+void RpcTcpServer::endInput(ConnectionId id, Connection& connection) {
+    connection.inputEnded = true;
+    m_program.connectionClosed(id);
+}
+
+void RpcTcpServer::sendRecord(ConnectionId id, const std::string& record) {
+    const auto found = m_connections.find(id);
+    if (found == m_connections.end()) return;
+    Connection& connection = found->second;
+    connection.unsent += framed(record);
+    // A connection that fails here is closed when the loop sees it: whoever answers may be in the midst of its own
+    // work.
+    sendUnsent(connection);
+    updateEvents(connection);
+}
+
+bool RpcTcpServer::sendUnsent(Connection& connection) {
+    while (!connection.unsent.empty()) {
+        const ssize_t count =
+            ::send(connection.socket.number(), connection.unsent.data(), connection.unsent.size(), MSG_NOSIGNAL);
+        if (count < 0) return errno == EAGAIN || errno == EWOULDBLOCK || errno == EINTR;
+        connection.unsent.erase(0, static_cast<std::size_t>(count));
+    }
+    return true;
+}
+
+void RpcTcpServer::updateEvents(const Connection& connection) {
+    int events = 0;
+    if (!connection.inputEnded && connection.unsent.size() < kMostUnsent) events |= POLLIN;
+    if (!connection.unsent.empty()) events |= POLLOUT;
+    m_loop.setEvents(connection.socket.number(), static_cast<short>(events));
+}
+
+void RpcTcpServer::close(ConnectionId id) {
+    const auto found = m_connections.find(id);
+    if (!found->second.inputEnded) m_program.connectionClosed(id);
+    m_loop.forget(found->second.socket.number());
+    m_connections.erase(found);
+    m_loop.setEvents(m_listener.number(), POLLIN);
+}
+
+}  // namespace kdx

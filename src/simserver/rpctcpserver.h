@@ -1,0 +1,54 @@
+#pragma once
+
+#include "simserver/pollloop.h"
+#include "simserver/rpcprogram.h"
+#include "simserver/rpcrecord.h"
+#include "simserver/socket.h"
+
+#include <cstddef>
+#include <map>
+#include <string>
+
+namespace kdx {
+
+/// Serves an RPC program on a TCP port to any number of clients at once; none of them can hold up another.
+class RpcTcpServer {
+public:
+    /// Longest call that is taken; a client that announces a longer one is cut off.
+    static constexpr std::size_t kLongestRecord = std::size_t{1024} * 1024;
+    /// More clients than this wait until one has gone.
+    static constexpr std::size_t kMostConnections = 128;
+
+    /// Listens at once; calls are served while the loop runs. Loop and program must outlive this.
+    /// @param address IPv4 address in dotted form; port 0 takes any free one. Throws std::system_error.
+    RpcTcpServer(PollLoop& loop, RpcProgram& program, const std::string& address, unsigned short port);
+    RpcTcpServer(const RpcTcpServer&) = delete;
+    RpcTcpServer& operator=(const RpcTcpServer&) = delete;
+    ~RpcTcpServer();
+
+    [[nodiscard]] unsigned short port() const { return localPort(m_listener); }
+
+private:
+    struct Connection {
+        FileDescriptor socket;
+        RecordReader reader{kLongestRecord};
+        std::string unsent;
+        bool inputEnded = false;
+    };
+    void acceptClients();
+    void serve(ConnectionId id, short events);
+    void readCalls(ConnectionId id, Connection& connection);
+    void endInput(ConnectionId id, Connection& connection);
+    void sendRecord(ConnectionId id, const std::string& record);
+    static bool sendUnsent(Connection& connection);
+    void updateEvents(const Connection& connection);
+    void close(ConnectionId id);
+
+    PollLoop& m_loop;
+    RpcProgram& m_program;
+    FileDescriptor m_listener;
+    std::map<ConnectionId, Connection> m_connections;
+    ConnectionId m_lastId = 0;
+};
+
+}  // namespace kdx

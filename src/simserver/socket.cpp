@@ -1,0 +1,68 @@
+#include "simserver/socket.h"
+
+#include <arpa/inet.h>
+#include <netinet/in.h>
+#include <sys/socket.h>
+#include <unistd.h>
+
+#include <cerrno>
+#include <system_error>
+#include <utility>
+
+namespace kdx {
+namespace {
+
+[[noreturn]] void fail(const std::string& what) {
+    throw std::system_error(errno, std::generic_category(), what);
+}
+
+FileDescriptor bound(int type, const std::string& address, unsigned short port) {
+    const std::string place = address + ":" + std::to_string(port);
+    sockaddr_in name{};
+    name.sin_family = AF_INET;
+    name.sin_port = htons(port);
+    if (inet_pton(AF_INET, address.c_str(), &name.sin_addr) != 1) {
+        errno = EINVAL;
+        fail(address);
+    }
+    FileDescriptor result(::socket(AF_INET, type | SOCK_NONBLOCK | SOCK_CLOEXEC, 0));
+    if (result.number() < 0) fail(place);
+    const int on = 1;
+    // TCP only: there it lets a restart take the port over from dying connections, with UDP two programs could share
+    // it.
+    if (type == SOCK_STREAM && setsockopt(result.number(), SOL_SOCKET, SO_REUSEADDR, &on, sizeof on) != 0) fail(place);
+    if (::bind(result.number(), reinterpret_cast<const sockaddr*>(&name), sizeof name) != 0) fail(place);
+    return result;
+}
+
+}  // namespace
+
+FileDescriptor::FileDescriptor(FileDescriptor&& other) noexcept : m_number(std::exchange(other.m_number, -1)) {}
+
+FileDescriptor& FileDescriptor::operator=(FileDescriptor&& other) noexcept {
+    std::swap(m_number, other.m_number);
+    return *this;
+}
+
+FileDescriptor::~FileDescriptor() {
+    if (m_number >= 0) ::close(m_number);
+}
+
+FileDescriptor listenTcp(const std::string& address, unsigned short port) {
+    FileDescriptor result = bound(SOCK_STREAM, address, port);
+    if (::listen(result.number(), SOMAXCONN) != 0) fail(address + ":" + std::to_string(port));
+    return result;
+}
+
+FileDescriptor bindUdp(const std::string& address, unsigned short port) {
+    return bound(SOCK_DGRAM, address, port);
+}
+
+unsigned short localPort(const FileDescriptor& socket) {
+    sockaddr_in name{};
+    socklen_t length = sizeof name;
+    if (::getsockname(socket.number(), reinterpret_cast<sockaddr*>(&name), &length) != 0) fail("getsockname");
+    return ntohs(name.sin_port);
+}
+
+}  // namespace kdx

@@ -1,0 +1,208 @@
+#include "simserver/trace.h"
+
+#include <algorithm>
+#include <array>
+#include <charconv>
+#include <cstdint>
+
+#include "base/codepage.h"
+#include "sim/scpi.h"
+
+namespace kdx {
+
+namespace {
+
+std::string number(std::uint64_t value) {
+    return std::to_string(value);
+}
+
+std::uint64_t hexValue(std::string_view digits) {
+    std::uint64_t value = 0;
+    std::from_chars(digits.data(), digits.data() + digits.size(), value, 16);
+    return value;
+}
+
+/// Takes bit fields off a group's contents, the most significant first.
+class BitReader {
+public:
+    BitReader(std::uint64_t bits, unsigned length) : m_bits(bits), m_left(length) {}
+    std::uint64_t take(unsigned count) {
+        m_left -= count;
+        return (m_bits >> m_left) & ((std::uint64_t{1} << count) - 1);
+    }
+
+private:
+    std::uint64_t m_bits;
+    unsigned m_left;
+};
+
+// "02," and ten characters, all hexadecimal digits.
+constexpr std::size_t kGroupPrefix = 3;
+constexpr std::size_t kGroupLength = 10;
+bool isGroup(std::string_view value) {
+    return value.size() == kGroupPrefix + kGroupLength && value[2] == ',' && isHex(value.substr(kGroupPrefix));
+}
+
+std::string describeTrafficMessage(std::string_view value) {
+    if (!isGroup(value)) return "incomplete traffic message";
+    const bool t = value[kGroupPrefix] != '0';
+    BitReader bits(hexValue(value.substr(kGroupPrefix + 1)), 36);
+    const bool single = bits.take(1) == 1;
+    const std::uint64_t duration = bits.take(3);
+    const bool diversion = bits.take(1) == 1;
+    const bool backward = bits.take(1) == 1;
+    const std::uint64_t extent = bits.take(3);
+    const std::uint64_t event = bits.take(11);
+    const std::uint64_t location = bits.take(16);
+    return "traffic message: event " + number(event) + ", location " + number(location) + ", extent " + number(extent) +
+           ", direction " + (backward ? "backward" : "forward") + ", duration " + number(duration) + ", " +
+           (diversion ? "diversion" : "no diversion") + ", F " + (single ? "1" : "0") + ", T " + (t ? "1" : "0");
+}
+
+std::string yesNo(std::uint64_t bit) {
+    return bit == 0 ? "no" : "yes";
+}
+
+std::string groupName(std::uint64_t code) {
+    return number(code >> 1) + ((code & 1) == 0 ? "A" : "B");
+}
+
+// The 16 bits that an announcement of traffic messages carries; what they mean depends on the variant in front.
+std::string describeSystemInformation(std::uint64_t word) {
+    BitReader bits(word, 16);
+    const std::uint64_t variant = bits.take(2);
+    if (variant == 0) {
+        bits.take(2);  // reserved
+        const std::uint64_t table = bits.take(6);
+        const std::uint64_t alternative = bits.take(1);
+        const std::uint64_t enhanced = bits.take(1);
+        std::string scope;
+        for (const char* area : {"international ", "national ", "regional ", "urban "}) {
+            if (bits.take(1) == 1) scope += area;
+        }
+        return "location table " + number(table) + ", alternative frequencies " + yesNo(alternative) +
+               ", enhanced mode " + yesNo(enhanced) + ", scope " +
+               (scope.empty() ? "none" : scope.substr(0, scope.size() - 1));
+    }
+    if (variant == 1) {
+        const std::uint64_t gap = bits.take(2);
+        return "gap code " + number(gap) + ", service " + number(bits.take(6));
+    }
+    return "variant " + number(variant);
+}
+
+std::string describeOpenData(std::string_view value) {
+    if (!isGroup(value)) return "incomplete open-data announcement";
+    BitReader bits(hexValue(value.substr(kGroupPrefix)), 40);
+    const std::uint64_t group = bits.take(8);
+    const std::uint64_t word = bits.take(16);
+    const std::uint64_t application = bits.take(16);
+    std::string text = "open data in group " + groupName(group) + ", application ";
+    text.append(value.substr(value.size() - 4));
+    constexpr std::uint64_t kTrafficApplication = 0xCD46;
+    if (application == kTrafficApplication) text += " (traffic messages), " + describeSystemInformation(word);
+    return text;
+}
+
+std::string describePs(std::string_view value) {
+    return "programme service name \"" + std::string(value) + "\"";
+}
+
+std::string describePi(std::string_view value) {
+    return "programme identification " + std::string(value);
+}
+
+std::string describePty(std::string_view value) {
+    return "programme type " + std::string(value);
+}
+
+std::string describeRadiotext(std::string_view value) {
+    const auto text = cutAt(cutAt(value, ',').tail.value_or(""), ',').tail.value_or("");
+    if (text.empty()) return "radiotext cleared";
+    return "radiotext of " + number(text.size()) + " characters";
+}
+
+// "N,87.6,90.1" or, after a network's PI, the same without or with the letter.
+std::string describeFrequencies(std::string_view value) {
+    const auto [mode, rest] = cutAt(value, ',');
+    const bool append = mode == "+";
+    const std::vector<std::string_view> frequencies = splitOutsideQuotes(rest.value_or(""), ',');
+    // Method B repeats the tuned frequency in every pair: it stands twice at the beginning.
+    const bool methodB = frequencies.size() > 1 && frequencies[0] == frequencies[1];
+    const std::size_t alternatives = methodB ? (frequencies.size() - 1) / 2 : frequencies.size() - 1;
+    return std::string(append ? "a further AF list" : "first AF list of a new set") + ", tuned to " +
+           std::string(frequencies[0]) + " MHz, " + number(alternatives) + " alternatives, method " +
+           (methodB ? "B" : "A");
+}
+
+std::string describeNetworkFrequencies(std::string_view value) {
+    const auto [pi, list] = cutAt(value, ',');
+    return "other network " + std::string(pi) + ": " + describeFrequencies(list.value_or(""));
+}
+
+std::string describeClock(std::string_view value) {
+    return equalNoCase(value, "off") ? "clock time no longer sent" : "clock time set";
+}
+
+std::string describeGroups(std::string_view value) {
+    return "sequence of " + number(splitOutsideQuotes(value, ',').size()) + " groups";
+}
+
+std::string describeTest(std::string_view value) {
+    return value == "0" ? "normal operation" : "test pattern " + std::string(value);
+}
+
+// The program may send a programme type's name under this command.
+std::string describeNewNetwork(std::string_view pi) {
+    if (pi.size() != 4 || !isHex(pi)) return "no programme identification: " + quoted(pi);
+    return "other network " + std::string(pi) + " added";
+}
+
+struct TraceRow {
+    std::string_view name;
+    std::string (*describe)(std::string_view value);
+};
+
+constexpr std::array kTraceRows = {
+    TraceRow{"PS", describePs},
+    TraceRow{"PI", describePi},
+    TraceRow{"PTY", describePty},
+    TraceRow{"RT", describeRadiotext},
+    TraceRow{"CT", describeClock},
+    TraceRow{"AF", describeFrequencies},
+    TraceRow{"GS", describeGroups},
+    TraceRow{"BIN", describeTest},
+    TraceRow{"3A", describeOpenData},
+    TraceRow{"8A", describeTrafficMessage},
+    TraceRow{"EON-PI", describeNewNetwork},
+    TraceRow{"EON-DEL", [](std::string_view pi) { return "other network " + std::string(pi) + " removed"; }},
+    TraceRow{"EON-AFB", describeNetworkFrequencies},
+    TraceRow{"STORE", [](std::string_view memory) { return "set-up stored in memory " + std::string(memory); }},
+    TraceRow{"DS", [](std::string_view memory) { return "set-up recalled from memory " + std::string(memory); }},
+};
+
+std::string describeCoderCommand(std::string_view command) {
+    const auto [head, value] = cutAt(command, '=');
+    if (!value) return {};
+    const std::string_view name = trimmed(head);
+    const auto row = std::find_if(kTraceRows.begin(), kTraceRows.end(),
+                                  [name](const TraceRow& r) { return equalNoCase(r.name, name); });
+    return row == kTraceRows.end() ? std::string() : row->describe(*value);
+}
+
+}  // namespace
+
+std::string describe(std::string_view message) {
+    std::string words;
+    for (const std::string_view text : splitOutsideQuotes(message, ';')) {
+        const CommandUnit unit = readUnit(text);
+        if (unit.query || !headerMatches("STEReo:DIRect", unit.header)) continue;
+        const std::string description = describeCoderCommand(unquoted(unit.parameter).value_or(""));
+        if (description.empty()) continue;
+        if (!words.empty()) words += "; ";
+        words += description;
+    }
+    return words;
+}
+
+}  // namespace kdx

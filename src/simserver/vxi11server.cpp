@@ -1,0 +1,50 @@
+#include "simserver/vxi11server.h"
+
+#include "simserver/abortchannel.h"
+#include "simserver/corechannel.h"
+#include "simserver/rpctcpserver.h"
+
+namespace kdx {
+
+struct Vxi11Server::Parts {
+    Parts(MessageDevice& device, const Vxi11Options& options)
+        : core(loop, device, options),
+          abort(core),
+          abortServer(loop, abort, options.bindAddress, 0),
+          coreServer(loop, core, options.bindAddress, options.port) {
+        core.setAbortPort(abortServer.port());
+    }
+
+    PollLoop loop;
+    CoreChannel core;
+    AbortChannel abort;
+    RpcTcpServer abortServer;
+    RpcTcpServer coreServer;
+};
+
+Vxi11Server::Vxi11Server(MessageDevice& device, const Vxi11Options& options)
+    : m_parts(std::make_unique<Parts>(device, options)) {}
+
+Vxi11Server::~Vxi11Server() = default;
+
+unsigned short Vxi11Server::corePort() const {
+    return m_parts->coreServer.port();
+}
+
+unsigned short Vxi11Server::abortPort() const {
+    return m_parts->abortServer.port();
+}
+
+PollLoop& Vxi11Server::loop() {
+    return m_parts->loop;
+}
+
+void Vxi11Server::run() {
+    m_parts->loop.run();
+}
+
+void Vxi11Server::stop() {
+    m_parts->loop.stop();
+}
+
+}  // namespace kdx
