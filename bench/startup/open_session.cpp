@@ -22,8 +22,8 @@ int main(int argc, char** argv) {
     kdx::ProgramState state;
     kdx::Captions captions(data);
     kdx::QtDialogs dialogs(captions);
-    kdx::VirtualInstrument instrument(clock);
-    kdx::SimVisa visa(instrument);
+    kdx::sim::VirtualInstrument instrument(clock);
+    kdx::sim::SimVisa visa(instrument);
     kdx::HMenue window({visa, state, data, captions, clock, dialogs, QString(), [] {}});
     window.startUp();
     window.show();

@@ -16,8 +16,8 @@ ChosenVisa& ChosenVisa::operator=(ChosenVisa&& other) noexcept = default;
 ChosenVisa chooseVisa(const Options& options, const Clock& clock) {
     ChosenVisa chosen;
     if (options.simulate) {
-        chosen.simulated = std::make_unique<VirtualInstrument>(clock);
-        chosen.visa = std::make_unique<SimVisa>(*chosen.simulated);
+        chosen.simulated = std::make_unique<sim::VirtualInstrument>(clock);
+        chosen.visa = std::make_unique<sim::SimVisa>(*chosen.simulated);
         chosen.description = "Virtual instrument inside the program";
         return chosen;
     }

@@ -5,17 +5,20 @@
 
 #include "link/visa.h"
 
+namespace kdx::sim {
+class VirtualInstrument;
+}
+
 namespace kdx {
 
 class Clock;
-class VirtualInstrument;
 struct Options;
 
 /// The instrument link that was chosen, and why, in words for the user.
 struct ChosenVisa {
-    std::unique_ptr<VirtualInstrument> simulated;  ///< the virtual instrument, when it is the one
-    std::unique_ptr<Visa> visa;                    ///< null when a library that was asked for cannot be used
-    std::string description;                       ///< what is used, and why not something else
+    std::unique_ptr<sim::VirtualInstrument> simulated;  ///< the virtual instrument, when it is the one
+    std::unique_ptr<Visa> visa;                         ///< null when a library that was asked for cannot be used
+    std::string description;                            ///< what is used, and why not something else
     ChosenVisa();
     ~ChosenVisa();
     ChosenVisa(ChosenVisa&& other) noexcept;

@@ -2,7 +2,7 @@
 
 #include "sim/scpi.h"
 
-namespace kdx {
+namespace kdx::sim {
 
 namespace {
 
@@ -41,4 +41,4 @@ ScpiError AfLists::check(std::string_view list) {
     return ScpiError::None;
 }
 
-}  // namespace kdx
+}  // namespace kdx::sim

@@ -7,7 +7,7 @@
 
 #include "sim/errorqueue.h"
 
-namespace kdx {
+namespace kdx::sim {
 
 /// The AF lists of one programme, kept as they were sent: for method A the tuned frequency and its alternatives, for
 /// method B the tuned frequency and then pairs that repeat it.
@@ -32,4 +32,4 @@ private:
     std::size_t m_used = 0;
 };
 
-}  // namespace kdx
+}  // namespace kdx::sim

@@ -7,7 +7,7 @@
 #include "sim/parameters.h"
 #include "sim/scpi.h"
 
-namespace kdx {
+namespace kdx::sim {
 
 namespace {
 
@@ -201,4 +201,4 @@ std::string Coder::filledMemories() const {
     return numbers;
 }
 
-}  // namespace kdx
+}  // namespace kdx::sim

@@ -10,7 +10,7 @@
 #include "sim/errorqueue.h"
 #include "sim/setup.h"
 
-namespace kdx {
+namespace kdx::sim {
 
 /// The stereo/RDS coder: reads the commands and queries of its own language, which reach it inside the generator's
 /// ":STEREO:DIRECT". Letter case of names does not matter, and a blank in a name stands for the hyphen.
@@ -57,4 +57,4 @@ private:
     std::array<std::optional<Setup>, kMemories> m_memories;
 };
 
-}  // namespace kdx
+}  // namespace kdx::sim

@@ -10,7 +10,7 @@
 #include "base/numbers.h"
 #include "sim/scpi.h"
 
-namespace kdx {
+namespace kdx::sim {
 
 namespace {
 
@@ -70,4 +70,4 @@ CoderClock::Time CoderClock::now() const {
     return sys_days{date} + milliseconds{std::llround(m_clock.secondsSinceMidnight() * 1000.0)};
 }
 
-}  // namespace kdx
+}  // namespace kdx::sim

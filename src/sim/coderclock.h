@@ -8,8 +8,10 @@
 #include "sim/errorqueue.h"
 
 namespace kdx {
-
 class Clock;
+}
+
+namespace kdx::sim {
 
 /// The clock time that the coder transmits: once set it runs on by itself, in step with the clock handed in.
 class CoderClock {
@@ -30,4 +32,4 @@ private:
     std::optional<std::chrono::milliseconds> m_lead;  ///< how far it runs ahead of the clock handed in
 };
 
-}  // namespace kdx
+}  // namespace kdx::sim

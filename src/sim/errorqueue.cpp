@@ -2,7 +2,7 @@
 
 #include <array>
 
-namespace kdx {
+namespace kdx::sim {
 
 namespace {
 
@@ -52,4 +52,4 @@ std::string ErrorQueue::pop() {
     return std::to_string(static_cast<int>(error)).append(",\"").append(errorText(error)).append("\"");
 }
 
-}  // namespace kdx
+}  // namespace kdx::sim

@@ -6,7 +6,7 @@
 #include <string>
 #include <string_view>
 
-namespace kdx {
+namespace kdx::sim {
 
 /// Error numbers of the SCPI standard that the virtual instrument reports.
 enum class ScpiError : int {
@@ -49,4 +49,4 @@ private:
     std::deque<ScpiError> m_errors;
 };
 
-}  // namespace kdx
+}  // namespace kdx::sim

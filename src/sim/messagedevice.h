@@ -3,7 +3,7 @@
 #include <string>
 #include <string_view>
 
-namespace kdx {
+namespace kdx::sim {
 
 /// An instrument as whatever carries messages to it sees it. All calls come from one thread.
 class MessageDevice {
@@ -20,4 +20,4 @@ public:
     virtual void unansweredRead() = 0;
 };
 
-}  // namespace kdx
+}  // namespace kdx::sim

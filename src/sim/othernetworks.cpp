@@ -7,7 +7,7 @@
 #include "base/numbers.h"
 #include "sim/scpi.h"
 
-namespace kdx {
+namespace kdx::sim {
 
 namespace {
 
@@ -158,4 +158,4 @@ const OtherNetwork* OtherNetworks::find(std::string_view pi) const {
     return network == m_networks.end() ? nullptr : &*network;
 }
 
-}  // namespace kdx
+}  // namespace kdx::sim

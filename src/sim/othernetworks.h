@@ -8,7 +8,7 @@
 #include "sim/aflists.h"
 #include "sim/errorqueue.h"
 
-namespace kdx {
+namespace kdx::sim {
 
 /// One other programme that the coder announces.
 struct OtherNetwork {
@@ -46,4 +46,4 @@ private:
     std::vector<OtherNetwork> m_networks;
 };
 
-}  // namespace kdx
+}  // namespace kdx::sim

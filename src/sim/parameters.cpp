@@ -9,7 +9,7 @@
 #include "sim/scpi.h"
 #include "sim/setup.h"
 
-namespace kdx {
+namespace kdx::sim {
 
 using Settings = InstrumentSettings;
 using Words = std::span<const std::string_view>;
@@ -273,4 +273,4 @@ std::string coderAnswer(const Parameter& parameter, const InstrumentSettings& se
     return std::visit([&](const auto* row) { return askCoder(*row, settings); }, parameter);
 }
 
-}  // namespace kdx
+}  // namespace kdx::sim

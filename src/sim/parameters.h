@@ -7,7 +7,7 @@
 
 #include "sim/errorqueue.h"
 
-namespace kdx {
+namespace kdx::sim {
 
 struct InstrumentSettings;
 struct SwitchRow;
@@ -36,4 +36,4 @@ ScpiError setFromCoder(const Parameter& parameter, std::string_view value, Instr
 /// The value as the coder answers it, without quotes.
 [[nodiscard]] std::string coderAnswer(const Parameter& parameter, const InstrumentSettings& settings);
 
-}  // namespace kdx
+}  // namespace kdx::sim

@@ -6,7 +6,7 @@
 
 #include "base/codepage.h"
 
-namespace kdx {
+namespace kdx::sim {
 
 namespace {
 
@@ -135,4 +135,4 @@ bool hasControlCharacter(std::string_view text) {
     return std::any_of(text.begin(), text.end(), [](char c) { return static_cast<unsigned char>(c) < 0x20; });
 }
 
-}  // namespace kdx
+}  // namespace kdx::sim

@@ -5,7 +5,7 @@
 #include <string_view>
 #include <vector>
 
-namespace kdx {
+namespace kdx::sim {
 
 /// One command of a program message, cut into its pieces; the views point into the message.
 struct CommandUnit {
@@ -62,4 +62,4 @@ struct NumberWithSuffix {
 /// True when the text has a control character in it, which neither the air nor an answer could carry.
 [[nodiscard]] bool hasControlCharacter(std::string_view text);
 
-}  // namespace kdx
+}  // namespace kdx::sim

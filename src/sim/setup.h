@@ -5,7 +5,7 @@
 #include "sim/aflists.h"
 #include "sim/othernetworks.h"
 
-namespace kdx {
+namespace kdx::sim {
 
 /// What the coder transmits: the part of the instrument's state that its five memories keep. The values here are those
 /// after switching on.
@@ -59,4 +59,4 @@ struct Generator {
 /// All settings of the instrument.
 struct InstrumentSettings : Setup, Generator {};
 
-}  // namespace kdx
+}  // namespace kdx::sim

@@ -9,7 +9,7 @@
 #include "sim/scpi.h"
 #include "sim/virtualinstrument.h"
 
-namespace kdx {
+namespace kdx::sim {
 
 namespace {
 
@@ -119,4 +119,4 @@ VisaStatus SimVisa::viClose(VisaHandle object) {
     return m_sessions.erase(object) > 0 ? visa::kSuccess : visa::kInvalidObject;
 }
 
-}  // namespace kdx
+}  // namespace kdx::sim

@@ -7,7 +7,7 @@
 
 #include "link/visa.h"
 
-namespace kdx {
+namespace kdx::sim {
 
 class VirtualInstrument;
 
@@ -41,4 +41,4 @@ private:
     VisaHandle m_lastHandle = 0;  // handles are never used twice: a closed one stays invalid
 };
 
-}  // namespace kdx
+}  // namespace kdx::sim

@@ -6,7 +6,7 @@
 #include "sim/parameters.h"
 #include "sim/scpi.h"
 
-namespace kdx {
+namespace kdx::sim {
 
 namespace {
 
@@ -151,4 +151,4 @@ std::string VirtualInstrument::takeEvents() {
     return events;
 }
 
-}  // namespace kdx
+}  // namespace kdx::sim

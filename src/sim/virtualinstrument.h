@@ -9,8 +9,11 @@
 #include "sim/setup.h"
 
 namespace kdx {
-
 class Clock;
+}
+
+namespace kdx::sim {
+
 struct CommandUnit;
 
 inline constexpr const char* kDefaultIdentification = "KDX,KDX-X4,100001,1.00";
@@ -63,4 +66,4 @@ private:
     unsigned char m_events = 0;
 };
 
-}  // namespace kdx
+}  // namespace kdx::sim

@@ -5,7 +5,7 @@
 
 #include <vxi11.h>
 
-namespace kdx {
+namespace kdx::simserver {
 
 AbortChannel::AbortChannel(CoreChannel& core) : RpcProgram(DEVICE_ASYNC, DEVICE_ASYNC_VERSION), m_core(core) {}
 
@@ -16,4 +16,4 @@ void AbortChannel::call(std::uint32_t procedure, std::string_view arguments, Con
     reply({toXdr<Device_Error>({m_core.abort(*link)}, xdr_Device_Error)});
 }
 
-}  // namespace kdx
+}  // namespace kdx::simserver

@@ -2,7 +2,7 @@
 
 #include "simserver/rpcprogram.h"
 
-namespace kdx {
+namespace kdx::simserver {
 
 class CoreChannel;
 
@@ -18,4 +18,4 @@ private:
     CoreChannel& m_core;
 };
 
-}  // namespace kdx
+}  // namespace kdx::simserver

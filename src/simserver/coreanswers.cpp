@@ -4,7 +4,7 @@
 
 #include <vxi11.h>
 
-namespace kdx {
+namespace kdx::simserver {
 
 RpcAnswer errorOnly(long error) {
     return {toXdr<Device_Error>({error}, xdr_Device_Error)};
@@ -31,4 +31,4 @@ RpcAnswer docmdAnswer(long error) {
     return {toXdr<Device_DocmdResp>({error, {0, nullptr}}, xdr_Device_DocmdResp)};
 }
 
-}  // namespace kdx
+}  // namespace kdx::simserver

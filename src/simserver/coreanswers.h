@@ -7,7 +7,7 @@
 
 struct Create_LinkResp;
 
-namespace kdx {
+namespace kdx::simserver {
 
 // Numbers of the VXI-11 standard: errors, flags of calls, reasons why a read has stopped.
 
@@ -41,4 +41,4 @@ RpcAnswer readAnswer(long error, long reason, std::string data);
 RpcAnswer statusByteAnswer(long error, unsigned char status);
 RpcAnswer docmdAnswer(long error);
 
-}  // namespace kdx
+}  // namespace kdx::simserver

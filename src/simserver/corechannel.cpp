@@ -9,7 +9,7 @@
 #include <array>
 #include <utility>
 
-namespace kdx {
+namespace kdx::simserver {
 namespace {
 
 using std::chrono::milliseconds;
@@ -64,7 +64,7 @@ void withArguments(std::string_view bytes, XdrRoutine<Arguments> routine, const 
 
 }  // namespace
 
-CoreChannel::CoreChannel(PollLoop& loop, MessageDevice& device, Vxi11Options options)
+CoreChannel::CoreChannel(PollLoop& loop, sim::MessageDevice& device, Vxi11Options options)
     : RpcProgram(DEVICE_CORE, DEVICE_CORE_VERSION), m_loop(loop), m_device(device), m_options(std::move(options)) {}
 
 void CoreChannel::call(std::uint32_t procedure, std::string_view arguments, ConnectionId from, const RpcReply& reply) {
@@ -396,4 +396,4 @@ void CoreChannel::trace(LinkId link, std::string_view what, std::string_view tex
     m_options.trace("link " + std::to_string(link) + " " + std::string(what) + printable(text));
 }
 
-}  // namespace kdx
+}  // namespace kdx::simserver

@@ -18,7 +18,7 @@ struct Device_WriteParms;
 struct Device_LockParms;
 struct Device_GenericParms;
 
-namespace kdx {
+namespace kdx::simserver {
 
 /// The VXI-11 core channel: links, their buffers, the device lock, and calls that wait.
 /// A call that cannot be answered yet is parked: other calls, of the same client too, are served meanwhile.
@@ -27,7 +27,7 @@ public:
     using LinkId = long;
     using ErrorCode = long;  ///< Device_ErrorCode of the standard; 0: no error
 
-    CoreChannel(PollLoop& loop, MessageDevice& device, Vxi11Options options);
+    CoreChannel(PollLoop& loop, sim::MessageDevice& device, Vxi11Options options);
 
     /// The port that clients are told for the abort channel.
     void setAbortPort(unsigned short port) { m_abortPort = port; }
@@ -81,7 +81,7 @@ private:
     void trace(LinkId link, std::string_view what, std::string_view text = {}) const;
 
     PollLoop& m_loop;
-    MessageDevice& m_device;
+    sim::MessageDevice& m_device;
     Vxi11Options m_options;
     unsigned short m_abortPort = 0;
     std::map<LinkId, Link> m_links;
@@ -90,4 +90,4 @@ private:
     Parked m_parked;
 };
 
-}  // namespace kdx
+}  // namespace kdx::simserver

@@ -39,8 +39,8 @@ runs.
 )";
 
 struct Options {
-    kdx::Vxi11Options server;
-    std::string identification = kdx::kDefaultIdentification;
+    kdx::simserver::Vxi11Options server;
+    std::string identification = kdx::sim::kDefaultIdentification;
     bool help = false;
     bool version = false;
 };
@@ -88,14 +88,14 @@ Options readOptions(std::span<char*> arguments) {
 }
 
 /// The virtual instrument as the server sees it.
-class InstrumentDevice final : public kdx::MessageDevice {
+class InstrumentDevice final : public kdx::sim::MessageDevice {
 public:
     /// @param explains whether what a message asks of the coder is printed in words, too.
     InstrumentDevice(const std::string& identification, bool explains)
         : m_instrument(m_clock, identification), m_explains(explains) {}
     std::string execute(std::string_view message) override {
         if (m_explains) {
-            const std::string words = kdx::describe(message);
+            const std::string words = kdx::simserver::describe(message);
             if (!words.empty()) printLine("       " + words);
         }
         return m_instrument.execute(message);
@@ -106,19 +106,19 @@ public:
 
 private:
     kdx::SystemClock m_clock;
-    kdx::VirtualInstrument m_instrument;
+    kdx::sim::VirtualInstrument m_instrument;
     bool m_explains;
 };
 
 /// Makes SIGINT and SIGTERM end the server's run instead of the process.
 class EndSignals {
 public:
-    explicit EndSignals(kdx::Vxi11Server& server) : m_loop(server.loop()) {
+    explicit EndSignals(kdx::simserver::Vxi11Server& server) : m_loop(server.loop()) {
         sigset_t signals;
         sigemptyset(&signals);
         sigaddset(&signals, SIGINT);
         sigaddset(&signals, SIGTERM);
-        m_descriptor = kdx::FileDescriptor(::signalfd(-1, &signals, SFD_NONBLOCK | SFD_CLOEXEC));
+        m_descriptor = kdx::simserver::FileDescriptor(::signalfd(-1, &signals, SFD_NONBLOCK | SFD_CLOEXEC));
         if (m_descriptor.number() < 0 || ::sigprocmask(SIG_BLOCK, &signals, nullptr) != 0) {
             throw std::system_error(errno, std::generic_category(), "signals");
         }
@@ -129,17 +129,17 @@ public:
     ~EndSignals() { m_loop.forget(m_descriptor.number()); }
 
 private:
-    kdx::PollLoop& m_loop;
-    kdx::FileDescriptor m_descriptor;
+    kdx::simserver::PollLoop& m_loop;
+    kdx::simserver::FileDescriptor m_descriptor;
 };
 
-std::string portMapperText(kdx::PortAnnouncement::Way way) {
+std::string portMapperText(kdx::simserver::PortAnnouncement::Way way) {
     switch (way) {
-        case kdx::PortAnnouncement::Way::OwnMapper:
+        case kdx::simserver::PortAnnouncement::Way::OwnMapper:
             return "answers port-mapper questions itself";
-        case kdx::PortAnnouncement::Way::Registered:
+        case kdx::simserver::PortAnnouncement::Way::Registered:
             return "registered with the running port mapper";
-        case kdx::PortAnnouncement::Way::None:
+        case kdx::simserver::PortAnnouncement::Way::None:
             break;
     }
     return "unknown to any port mapper";
@@ -149,12 +149,12 @@ int serve(const Options& options) {
     // The RPC library writes to the port mapper without a guard; one that hangs up must not end this program.
     std::signal(SIGPIPE, SIG_IGN);
     InstrumentDevice device(options.identification, options.server.trace != nullptr);
-    kdx::Vxi11Server server(device, options.server);
+    kdx::simserver::Vxi11Server server(device, options.server);
     const EndSignals endSignals(server);
-    const kdx::PortAnnouncement announcement(server.loop(),
-                                             {{DEVICE_CORE, DEVICE_CORE_VERSION, server.corePort()},
-                                              {DEVICE_ASYNC, DEVICE_ASYNC_VERSION, server.abortPort()}},
-                                             options.server.bindAddress);
+    const kdx::simserver::PortAnnouncement announcement(server.loop(),
+                                                        {{DEVICE_CORE, DEVICE_CORE_VERSION, server.corePort()},
+                                                         {DEVICE_ASYNC, DEVICE_ASYNC_VERSION, server.abortPort()}},
+                                                        options.server.bindAddress);
     if (!announcement.problem().empty()) std::cerr << "kdx-sim: " << announcement.problem() << std::endl;
     printLine("ready: " + options.server.bindAddress + " port " + std::to_string(server.corePort()) + ", " +
               portMapperText(announcement.way()));

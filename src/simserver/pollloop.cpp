@@ -9,7 +9,7 @@
 #include <system_error>
 #include <vector>
 
-namespace kdx {
+namespace kdx::simserver {
 namespace {
 
 constexpr std::chrono::milliseconds kLongestWait = std::chrono::hours(1);
@@ -97,4 +97,4 @@ void PollLoop::runTimers() {
     }
 }
 
-}  // namespace kdx
+}  // namespace kdx::simserver

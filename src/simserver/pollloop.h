@@ -9,7 +9,7 @@
 #include <map>
 #include <utility>
 
-namespace kdx {
+namespace kdx::simserver {
 
 /// Waits for many sockets and points in time at once and calls back: everything runs in the one thread inside run().
 class PollLoop {
@@ -54,4 +54,4 @@ private:
     FileDescriptor m_wakeUpWrite;
 };
 
-}  // namespace kdx
+}  // namespace kdx::simserver

@@ -9,7 +9,7 @@
 #include <system_error>
 #include <utility>
 
-namespace kdx {
+namespace kdx::simserver {
 namespace {
 
 constexpr timeval kAnswerTimeout{2, 0};
@@ -124,4 +124,4 @@ PortAnnouncement::~PortAnnouncement() {
     for (const PortMapping& mapping : m_mappings) running.remove(mapping);
 }
 
-}  // namespace kdx
+}  // namespace kdx::simserver

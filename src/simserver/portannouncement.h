@@ -6,7 +6,7 @@
 #include <string>
 #include <vector>
 
-namespace kdx {
+namespace kdx::simserver {
 
 /// Lets clients find programs by the port mapper: by one of our own when the port can be had, else by registering with
 /// the one that runs on this machine.
@@ -39,4 +39,4 @@ private:
     std::unique_ptr<PortMapper> m_mapper;
 };
 
-}  // namespace kdx
+}  // namespace kdx::simserver

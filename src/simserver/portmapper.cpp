@@ -10,7 +10,7 @@
 #include <array>
 #include <utility>
 
-namespace kdx {
+namespace kdx::simserver {
 namespace {
 
 constexpr ConnectionId kNoConnection = 0;
@@ -73,4 +73,4 @@ std::string PortMapper::dump() const {
     return list + toXdr<bool_t>(FALSE, xdr_bool);
 }
 
-}  // namespace kdx
+}  // namespace kdx::simserver

@@ -8,7 +8,7 @@
 #include <string>
 #include <vector>
 
-namespace kdx {
+namespace kdx::simserver {
 
 /// The port of port mappers.
 constexpr unsigned short kPortMapperPort = 111;
@@ -46,4 +46,4 @@ private:
     FileDescriptor m_udp;
 };
 
-}  // namespace kdx
+}  // namespace kdx::simserver

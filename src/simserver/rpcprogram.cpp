@@ -4,7 +4,7 @@
 
 #include <utility>
 
-namespace kdx {
+namespace kdx::simserver {
 namespace {
 
 // The library's routine for replies calls this for the results; they are appended as they are.
@@ -83,4 +83,4 @@ bool RpcProgram::handle(std::string_view message, ConnectionId from, std::functi
     return true;
 }
 
-}  // namespace kdx
+}  // namespace kdx::simserver

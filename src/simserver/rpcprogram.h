@@ -7,7 +7,7 @@
 #include <string>
 #include <string_view>
 
-namespace kdx {
+namespace kdx::simserver {
 
 /// Numbers the connections that calls come by.
 using ConnectionId = std::uint64_t;
@@ -48,4 +48,4 @@ private:
     std::uint32_t m_version;
 };
 
-}  // namespace kdx
+}  // namespace kdx::simserver

@@ -3,7 +3,7 @@
 #include <cstdint>
 #include <utility>
 
-namespace kdx {
+namespace kdx::simserver {
 namespace {
 
 constexpr std::size_t kMarkSize = 4;
@@ -40,4 +40,4 @@ std::string framed(std::string_view record) {
     return result.append(record);
 }
 
-}  // namespace kdx
+}  // namespace kdx::simserver

@@ -9,7 +9,7 @@
 #include <cerrno>
 #include <utility>
 
-namespace kdx {
+namespace kdx::simserver {
 namespace {
 
 // A client that does not fetch its replies gets no further calls served once this much is waiting for it.
@@ -128,4 +128,4 @@ void RpcTcpServer::close(ConnectionId id) {
     m_loop.setEvents(m_listener.number(), POLLIN);
 }
 
-}  // namespace kdx
+}  // namespace kdx::simserver

@@ -9,7 +9,7 @@
 #include <map>
 #include <string>
 
-namespace kdx {
+namespace kdx::simserver {
 
 /// Serves an RPC program on a TCP port to any number of clients at once; none of them can hold up another.
 class RpcTcpServer {
@@ -51,4 +51,4 @@ private:
     ConnectionId m_lastId = 0;
 };
 
-}  // namespace kdx
+}  // namespace kdx::simserver

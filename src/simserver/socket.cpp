@@ -9,7 +9,7 @@
 #include <system_error>
 #include <utility>
 
-namespace kdx {
+namespace kdx::simserver {
 namespace {
 
 [[noreturn]] void fail(const std::string& what) {
@@ -65,4 +65,4 @@ unsigned short localPort(const FileDescriptor& socket) {
     return ntohs(name.sin_port);
 }
 
-}  // namespace kdx
+}  // namespace kdx::simserver

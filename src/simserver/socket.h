@@ -2,7 +2,7 @@
 
 #include <string>
 
-namespace kdx {
+namespace kdx::simserver {
 
 /// An open file descriptor, closed when this goes.
 class FileDescriptor {
@@ -30,4 +30,4 @@ FileDescriptor bindUdp(const std::string& address, unsigned short port);
 /// The port that a bound socket has. Throws std::system_error.
 unsigned short localPort(const FileDescriptor& socket);
 
-}  // namespace kdx
+}  // namespace kdx::simserver

@@ -8,9 +8,13 @@
 #include "base/codepage.h"
 #include "sim/scpi.h"
 
-namespace kdx {
+namespace kdx::simserver {
 
 namespace {
+
+using sim::cutAt;
+using sim::isHex;
+using sim::splitOutsideQuotes;
 
 std::string number(std::uint64_t value) {
     return std::to_string(value);
@@ -154,7 +158,7 @@ std::string describeTest(std::string_view value) {
 
 // The program may send a programme type's name under this command.
 std::string describeNewNetwork(std::string_view pi) {
-    if (pi.size() != 4 || !isHex(pi)) return "no programme identification: " + quoted(pi);
+    if (pi.size() != 4 || !isHex(pi)) return "no programme identification: " + sim::quoted(pi);
     return "other network " + std::string(pi) + " added";
 }
 
@@ -184,7 +188,7 @@ constexpr std::array kTraceRows = {
 std::string describeCoderCommand(std::string_view command) {
     const auto [head, value] = cutAt(command, '=');
     if (!value) return {};
-    const std::string_view name = trimmed(head);
+    const std::string_view name = sim::trimmed(head);
     const auto row = std::find_if(kTraceRows.begin(), kTraceRows.end(),
                                   [name](const TraceRow& r) { return equalNoCase(r.name, name); });
     return row == kTraceRows.end() ? std::string() : row->describe(*value);
@@ -195,9 +199,9 @@ std::string describeCoderCommand(std::string_view command) {
 std::string describe(std::string_view message) {
     std::string words;
     for (const std::string_view text : splitOutsideQuotes(message, ';')) {
-        const CommandUnit unit = readUnit(text);
-        if (unit.query || !headerMatches("STEReo:DIRect", unit.header)) continue;
-        const std::string description = describeCoderCommand(unquoted(unit.parameter).value_or(""));
+        const sim::CommandUnit unit = sim::readUnit(text);
+        if (unit.query || !sim::headerMatches("STEReo:DIRect", unit.header)) continue;
+        const std::string description = describeCoderCommand(sim::unquoted(unit.parameter).value_or(""));
         if (description.empty()) continue;
         if (!words.empty()) words += "; ";
         words += description;
@@ -205,4 +209,4 @@ std::string describe(std::string_view message) {
     return words;
 }
 
-}  // namespace kdx
+}  // namespace kdx::simserver

@@ -4,10 +4,10 @@
 #include "simserver/corechannel.h"
 #include "simserver/rpctcpserver.h"
 
-namespace kdx {
+namespace kdx::simserver {
 
 struct Vxi11Server::Parts {
-    Parts(MessageDevice& device, const Vxi11Options& options)
+    Parts(sim::MessageDevice& device, const Vxi11Options& options)
         : core(loop, device, options),
           abort(core),
           abortServer(loop, abort, options.bindAddress, 0),
@@ -22,7 +22,7 @@ struct Vxi11Server::Parts {
     RpcTcpServer coreServer;
 };
 
-Vxi11Server::Vxi11Server(MessageDevice& device, const Vxi11Options& options)
+Vxi11Server::Vxi11Server(sim::MessageDevice& device, const Vxi11Options& options)
     : m_parts(std::make_unique<Parts>(device, options)) {}
 
 Vxi11Server::~Vxi11Server() = default;
@@ -47,4 +47,4 @@ void Vxi11Server::stop() {
     m_parts->loop.stop();
 }
 
-}  // namespace kdx
+}  // namespace kdx::simserver

@@ -9,7 +9,7 @@
 #include <string>
 #include <string_view>
 
-namespace kdx {
+namespace kdx::simserver {
 
 /// What can be chosen about a server.
 struct Vxi11Options {
@@ -29,7 +29,7 @@ class Vxi11Server {
 public:
     /// Listens at once; serves in run(), and only there calls the device, which must outlive the server.
     /// Throws std::system_error when address or port cannot be had.
-    explicit Vxi11Server(MessageDevice& device, const Vxi11Options& options = {});
+    explicit Vxi11Server(sim::MessageDevice& device, const Vxi11Options& options = {});
     ~Vxi11Server();
 
     [[nodiscard]] unsigned short corePort() const;
@@ -47,4 +47,4 @@ private:
     std::unique_ptr<Parts> m_parts;
 };
 
-}  // namespace kdx
+}  // namespace kdx::simserver

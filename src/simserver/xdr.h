@@ -7,7 +7,7 @@
 #include <string>
 #include <string_view>
 
-namespace kdx {
+namespace kdx::simserver {
 
 /// An XDR routine as the RPC library and its generator make them.
 template <class Value>
@@ -67,4 +67,4 @@ std::string toXdr(Value value, XdrRoutine<Value> routine, std::size_t variableBy
     return bytes;
 }
 
-}  // namespace kdx
+}  // namespace kdx::simserver

@@ -43,8 +43,8 @@ protected:
     void expectNoError() { EXPECT_EQ(error(), "0,\"No error\""); }
 
     std::vector<std::string> failures;
-    VirtualInstrument device{clock};
-    SimVisa library{device};
+    sim::VirtualInstrument device{clock};
+    sim::SimVisa library{device};
     Instrument link{library, state, data, clock, [this](const std::string& text, bool) {
                         failures.push_back(text);
                         return false;

@@ -2,7 +2,7 @@
 
 #include "sim/simtest.h"
 
-namespace kdx::test {
+namespace kdx::sim {
 namespace {
 
 using namespace std::chrono_literals;
@@ -414,4 +414,4 @@ TEST_F(OtherNetworksTest, AnswerAnEmptyTextAndReportAnErrorForAnUnknownOne) {
 }
 
 }  // namespace
-}  // namespace kdx::test
+}  // namespace kdx::sim

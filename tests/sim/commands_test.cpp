@@ -5,7 +5,7 @@
 #include "base/codepage.h"
 #include "sim/simtest.h"
 
-namespace kdx::test {
+namespace kdx::sim {
 namespace {
 
 std::string lowerCase(std::string text) {
@@ -379,4 +379,4 @@ TEST_F(CommandReader, AnswersANumberInTheUnitItTakesWithoutOne) {
 }
 
 }  // namespace
-}  // namespace kdx::test
+}  // namespace kdx::sim

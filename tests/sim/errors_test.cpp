@@ -3,7 +3,7 @@
 
 #include "sim/simtest.h"
 
-namespace kdx::test {
+namespace kdx::sim {
 namespace {
 
 class ErrorsTest : public SimTest {};
@@ -250,4 +250,4 @@ TEST_F(BadInputTest, OfAnyKindNeverStopsTheInstrument) {
 }
 
 }  // namespace
-}  // namespace kdx::test
+}  // namespace kdx::sim

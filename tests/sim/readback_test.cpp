@@ -11,7 +11,7 @@
 #include "sim/simvisa.h"
 #include "support/tempfolder.h"
 
-namespace kdx::test {
+namespace kdx::sim {
 namespace {
 
 /// The program's own link, talking to the virtual instrument.
@@ -24,7 +24,7 @@ protected:
     }
     std::string networks() { return link.X4_Abfrage("EON-PI", "EON PI?"); }
 
-    TempFolder folder;
+    test::TempFolder folder;
     DataFolder data{folder.path()};
     ProgramState state;
     SimVisa library{instrument};
@@ -259,4 +259,4 @@ TEST_F(ReadbackTest, AQueryTheInstrumentDoesNotKnowFailsOnceAndTheNextOneWorks) 
 }
 
 }  // namespace
-}  // namespace kdx::test
+}  // namespace kdx::sim

@@ -7,7 +7,7 @@
 #include "sim/virtualinstrument.h"
 #include "support/fakeclock.h"
 
-namespace kdx::test {
+namespace kdx::sim {
 
 /// A virtual instrument just switched on, and short ways to talk to it.
 class SimTest : public ::testing::Test {
@@ -31,8 +31,8 @@ protected:
     /// Takes the oldest error; only its number.
     int error() { return std::stoi(tell("SYST:ERR?")); }
 
-    FakeClock clock;
+    test::FakeClock clock;
     VirtualInstrument instrument{clock};
 };
 
-}  // namespace kdx::test
+}  // namespace kdx::sim

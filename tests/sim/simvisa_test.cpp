@@ -2,7 +2,7 @@
 
 #include "sim/simtest.h"
 
-namespace kdx::test {
+namespace kdx::sim {
 namespace {
 
 class SimVisaTest : public SimTest {
@@ -135,4 +135,4 @@ TEST_F(SimVisaTest, DescribesItsStatuses) {
 }
 
 }  // namespace
-}  // namespace kdx::test
+}  // namespace kdx::sim

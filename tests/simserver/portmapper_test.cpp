@@ -14,7 +14,7 @@
 #include <functional>
 #include <map>
 
-namespace kdx {
+namespace kdx::simserver {
 namespace {
 
 constexpr std::uint32_t kCore = DEVICE_CORE;
@@ -225,4 +225,4 @@ TEST_F(PortAnnouncementTest, SaysSoWhenNobodyAnswersAndThePortIsTaken) {
 }
 
 }  // namespace
-}  // namespace kdx
+}  // namespace kdx::simserver

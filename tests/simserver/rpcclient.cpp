@@ -11,7 +11,7 @@
 
 #include <array>
 
-namespace kdx {
+namespace kdx::simserver {
 namespace {
 
 std::uint32_t wordAt(std::string_view bytes, std::size_t n) {
@@ -70,7 +70,7 @@ RpcClient::~RpcClient() {
 std::string RpcClient::callMessage(std::uint32_t procedure, std::string_view arguments) {
     std::string message;
     for (const std::uint32_t value : {++m_lastXid, 0U, 2U, m_program, m_version, procedure, 0U, 0U, 0U, 0U}) {
-        message += kdx::word(value);
+        message += simserver::word(value);
     }
     return message.append(arguments);
 }
@@ -128,4 +128,4 @@ void RpcClient::crash() {
     m_socket = -1;
 }
 
-}  // namespace kdx
+}  // namespace kdx::simserver

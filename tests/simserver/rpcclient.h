@@ -9,7 +9,7 @@
 #include <string>
 #include <string_view>
 
-namespace kdx {
+namespace kdx::simserver {
 
 /// Connects to a port of this machine; fails the test when nobody listens. The caller closes the socket.
 int connectTo(unsigned short port);
@@ -63,4 +63,4 @@ private:
 /// Takes a reply message (without the length in front) apart.
 Reply parseReply(std::string_view message);
 
-}  // namespace kdx
+}  // namespace kdx::simserver

@@ -1,7 +1,7 @@
 #include "simserver/rpcrecord.h"
 #include "simserver/vxi11fixture.h"
 
-namespace kdx {
+namespace kdx::simserver {
 namespace {
 
 using namespace std::string_literals;
@@ -191,4 +191,4 @@ TEST_F(RpcErrorTest, AClientThatNeverFetchesItsRepliesHoldsUpNobody) {
 }
 
 }  // namespace
-}  // namespace kdx
+}  // namespace kdx::simserver

@@ -4,7 +4,7 @@
 
 #include <string>
 
-namespace kdx {
+namespace kdx::simserver {
 namespace {
 
 using namespace std::string_literals;
@@ -51,4 +51,4 @@ TEST(RpcRecord, FragmentsCountTogetherForTheLimit) {
 }
 
 }  // namespace
-}  // namespace kdx
+}  // namespace kdx::simserver

@@ -4,7 +4,7 @@
 
 #include <ostream>
 
-namespace kdx {
+namespace kdx::simserver {
 namespace {
 
 struct TraceCase {
@@ -79,4 +79,4 @@ INSTANTIATE_TEST_SUITE_P(
         TraceCase{R"(:STEREO:DIRECT "PS=A)", ""}, TraceCase{"", ""}));
 
 }  // namespace
-}  // namespace kdx
+}  // namespace kdx::simserver

@@ -14,11 +14,11 @@
 #include <thread>
 #include <vector>
 
-namespace kdx {
+namespace kdx::simserver {
 
 /// Answers "NAME?" by "NAME" and a line feed, "LONG?" by 500 bytes, everything else by nothing; writes down what it
 /// got.
-class FakeDevice final : public MessageDevice {
+class FakeDevice final : public sim::MessageDevice {
 public:
     std::string execute(std::string_view message) override {
         const std::lock_guard guard(m_mutex);
@@ -147,4 +147,4 @@ protected:
     std::thread m_thread;
 };
 
-}  // namespace kdx
+}  // namespace kdx::simserver

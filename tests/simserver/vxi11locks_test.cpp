@@ -1,6 +1,6 @@
 #include "simserver/vxi11fixture.h"
 
-namespace kdx {
+namespace kdx::simserver {
 namespace {
 
 using Lines = std::vector<std::string>;
@@ -243,4 +243,4 @@ TEST_F(Vxi11LockTest, CallsThatWaitAreLimited) {
 }
 
 }  // namespace
-}  // namespace kdx
+}  // namespace kdx::simserver

@@ -7,7 +7,7 @@
 #include <csignal>
 #include <system_error>
 
-namespace kdx {
+namespace kdx::simserver {
 namespace {
 
 using Lines = std::vector<std::string>;
@@ -386,4 +386,4 @@ TEST(Vxi11Server, ARestartGetsTheSamePortAtOnce) {
 }
 
 }  // namespace
-}  // namespace kdx
+}  // namespace kdx::simserver

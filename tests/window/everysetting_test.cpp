@@ -20,7 +20,7 @@ namespace kdx::test {
 namespace {
 
 /// The virtual instrument as a network device; only the server's thread comes near it.
-class InstrumentDevice final : public MessageDevice {
+class InstrumentDevice final : public sim::MessageDevice {
 public:
     std::string execute(std::string_view message) override { return m_instrument.execute(message); }
     void clear() override { m_instrument.deviceClear(); }
@@ -29,7 +29,7 @@ public:
 
 private:
     FakeClock m_clock;  // stands still: the coder answers the very time it was given
-    VirtualInstrument m_instrument{m_clock};
+    sim::VirtualInstrument m_instrument{m_clock};
 };
 
 /// A VXI-11 instrument of this machine, in a thread of its own.
@@ -50,7 +50,7 @@ public:
 
 private:
     InstrumentDevice m_device;
-    Vxi11Server m_server{m_device};
+    simserver::Vxi11Server m_server{m_device};
     std::thread m_thread;
 };
 
@@ -113,7 +113,7 @@ protected:
         window->show();
         openSession();
         ASSERT_TRUE(state.InstrumentOnline);
-        EXPECT_TRUE(window->windowTitle().startsWith(QString::fromLatin1(kDefaultIdentification)));
+        EXPECT_TRUE(window->windowTitle().startsWith(QString::fromLatin1(sim::kDefaultIdentification)));
         // Before the data set's network goes out those that the coder holds are deleted. It holds none, and the one
         // delete that is sent all the same names nothing.
         EXPECT_EQ(observer.errors(), kIllegalValue);

@@ -46,7 +46,7 @@ private:
 };
 
 /// The virtual instrument, which writes down what it was told.
-class WritingDevice final : public MessageDevice {
+class WritingDevice final : public sim::MessageDevice {
 public:
     std::string execute(std::string_view message) override {
         const std::lock_guard guard(m_mutex);
@@ -66,7 +66,7 @@ public:
 
 private:
     SystemClock m_clock;
-    VirtualInstrument m_instrument{m_clock};
+    sim::VirtualInstrument m_instrument{m_clock};
     std::mutex m_mutex;
     Lines m_received;
 };
@@ -74,7 +74,7 @@ private:
 /// Serves the device over VXI-11 in a thread of its own.
 class ServerThread {
 public:
-    explicit ServerThread(MessageDevice& device) : m_server(device), m_thread([this] { m_server.run(); }) {}
+    explicit ServerThread(sim::MessageDevice& device) : m_server(device), m_thread([this] { m_server.run(); }) {}
     ~ServerThread() {
         m_server.stop();
         m_thread.join();
@@ -84,7 +84,7 @@ public:
     [[nodiscard]] unsigned short port() const { return m_server.corePort(); }
 
 private:
-    Vxi11Server m_server;
+    simserver::Vxi11Server m_server;
     std::thread m_thread;
 };
 

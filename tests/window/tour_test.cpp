@@ -34,8 +34,8 @@ protected:
 };
 
 TEST_F(TourTest, LeavesNinePicturesAndEveryQuestionAnswered) {
-    VirtualInstrument instrument(clock);
-    SimVisa visa(instrument);
+    sim::VirtualInstrument instrument(clock);
+    sim::SimVisa visa(instrument);
     EXPECT_EQ(tour(visa), 0) << ::testing::PrintToString(printed);
     for (int page = 0; page < 9; ++page) {
         const auto file = pictures / ("page_" + std::to_string(page) + ".png");
@@ -46,8 +46,8 @@ TEST_F(TourTest, LeavesNinePicturesAndEveryQuestionAnswered) {
 }
 
 TEST_F(TourTest, PrintsWhatIsSentAndAnswered) {
-    VirtualInstrument instrument(clock);
-    SimVisa visa(instrument);
+    sim::VirtualInstrument instrument(clock);
+    sim::SimVisa visa(instrument);
     tour(visa);
     EXPECT_EQ(printed.front(), "-> *IDN?");
     EXPECT_NE(std::find(printed.begin(), printed.end(), "-> :STEREO:DIRECT \"PS=MESSTURM\""), printed.end());
@@ -69,8 +69,8 @@ TEST_F(TourTest, AnInstrumentThatIsNotThereIsAFailure) {
 TEST_F(TourTest, AFolderThatCannotBeMadeIsAFailure) {
     std::ofstream(folder.path() / "file") << "x";
     pictures = folder.path() / "file" / "pictures";
-    VirtualInstrument instrument(clock);
-    SimVisa visa(instrument);
+    sim::VirtualInstrument instrument(clock);
+    sim::SimVisa visa(instrument);
     EXPECT_EQ(tour(visa), 1);
 }
 
