@@ -4,6 +4,7 @@
 #include "link/rpcchannel.h"
 #include "link/visastatus.h"
 #include "vxi11.h"
+#include "vxi11/numbers.h"
 
 #include <netinet/in.h>
 #include <rpc/pmap_prot.h>
@@ -17,10 +18,6 @@ namespace {
 
 using std::chrono::steady_clock;
 
-// Flags and reasons of the VXI-11 standard.
-constexpr long kEndFlag = 8;
-constexpr long kReasonTermCharacter = 2;
-constexpr long kReasonEnd = 4;
 constexpr std::size_t kSmallestMaxReceive = 1024;    // every device must take as much
 constexpr std::size_t kLargestTransfer = 64 * 1024;  // bytes in one call
 
@@ -42,18 +39,18 @@ VisaStatus statusOf(RpcOutcome outcome) {
 
 VisaStatus statusOfDeviceError(long error) {
     switch (error) {
-        case 0:
+        case vxi11::kNoError:
             return visa::kSuccess;
-        case 3:   // device not accessible
-        case 21:  // invalid address
+        case vxi11::kDeviceNotAccessible:
+        case vxi11::kInvalidAddress:
             return visa::kResourceNotFound;
-        case 4:  // invalid link: the device has forgotten us, as after its restart
+        case vxi11::kInvalidLink:  // the device has forgotten us, as after its restart
             return visa::kConnectionLost;
-        case 11:
+        case vxi11::kLockedByAnotherLink:
             return visa::kResourceLocked;
-        case 15:
+        case vxi11::kIoTimeout:
             return visa::kTimeout;
-        case 23:
+        case vxi11::kAborted:
             return visa::kAborted;
         default:
             return visa::kInputOutput;
@@ -171,7 +168,7 @@ VisaStatus LanVisa::viWrite(VisaHandle session, std::span<const char> bytes, std
         Device_WriteParms wanted{};
         wanted.lid = link->id;
         wanted.io_timeout = millisecondsUntil(deadline);
-        wanted.flags = part.size() == bytes.size() ? kEndFlag : 0;
+        wanted.flags = part.size() == bytes.size() ? vxi11::kFlagEnd : 0;
         wanted.data.data_len = static_cast<u_int>(part.size());
         wanted.data.data_val = const_cast<char*>(part.data());  // only read from
         Device_WriteResp done{};
@@ -214,8 +211,8 @@ VisaStatus LanVisa::viRead(VisaHandle session, std::span<char> buffer, std::int3
         if (status != visa::kSuccess) return status;
         count += static_cast<std::int32_t>(got);
         buffer = buffer.subspan(got);
-        if ((reason & kReasonEnd) != 0) return visa::kSuccess;
-        if ((reason & kReasonTermCharacter) != 0) return visa::kTermCharacter;
+        if ((reason & vxi11::kReasonEnd) != 0) return visa::kSuccess;
+        if ((reason & vxi11::kReasonTermChar) != 0) return visa::kTermCharacter;
         if (got == 0) return visa::kInputOutput;  // neither bytes nor an end: it would never be over
     }
     return visa::kMaxCountReached;

@@ -1,5 +1,7 @@
 #include "link/rpcchannel.h"
 
+#include "vxi11/xdr.h"
+
 #include <arpa/inet.h>
 #include <netdb.h>
 #include <netinet/in.h>
@@ -18,13 +20,10 @@ namespace kdx {
 
 namespace {
 
-constexpr std::uint32_t kLastFragment = 0x80000000U;
-constexpr std::size_t kMarkBytes = 4;
-constexpr std::size_t kFixedCallBytes = 256;  // call header and all fields of fixed length, with room to spare
-constexpr std::size_t kLargestReply = std::size_t{128} * 1024;  // twice the most that is ever asked for
-constexpr std::uint32_t kLargestVerifier = 400;                 // of the RPC standard
-constexpr std::uint32_t kIsCall = 0, kIsReply = 1;              // message types
-constexpr std::uint32_t kAccepted = 0, kSuccess = 0;            // reply and accept states
+constexpr std::size_t kFixedCallBytes = 256;          // call header and all fields of fixed length, with room to spare
+constexpr std::uint32_t kLargestVerifier = 400;       // of the RPC standard
+constexpr std::uint32_t kIsCall = 0, kIsReply = 1;    // message types
+constexpr std::uint32_t kAccepted = 0, kSuccess = 0;  // reply and accept states
 constexpr std::uint32_t kProgramUnavailable = 1, kProgramMismatch = 2;
 
 /// False at the deadline, at the latest.
@@ -41,12 +40,6 @@ bool waitFor(int descriptor, short event, Deadline deadline) {
 
 bool wouldBlock() {
     return errno == EAGAIN || errno == EWOULDBLOCK || errno == EINTR;
-}
-
-std::uint32_t bigEndian(const char* bytes) {
-    std::uint32_t value = 0;
-    std::memcpy(&value, bytes, sizeof value);
-    return ntohl(value);
 }
 
 }  // namespace
@@ -81,7 +74,7 @@ bool RpcChannel::connect(const sockaddr_in& address, std::uint16_t port, Deadlin
     const int on = 1;  // a short question must not wait for the acknowledgement of the command before it
     setsockopt(fresh.descriptor(), IPPROTO_TCP, TCP_NODELAY, &on, sizeof on);
     m_socket = std::move(fresh);
-    m_received.clear();
+    m_received = RecordReader(kLargestReply);
     return true;
 }
 
@@ -97,16 +90,14 @@ RpcOutcome RpcChannel::call(std::uint32_t procedure, std::size_t variableBytes, 
 }
 
 bool RpcChannel::encodeCall(std::uint32_t procedure, std::size_t variableBytes, const Coder& arguments) {
-    m_request.resize(kMarkBytes + kFixedCallBytes + variableBytes);
+    std::string message(kFixedCallBytes + variableBytes, '\0');
     XDR xdr;
-    xdrmem_create(&xdr, m_request.data(), static_cast<u_int>(m_request.size()), XDR_ENCODE);
-    // Room for the record mark, the header with RPC version 2, and neither credentials nor verifier.
-    std::array<std::uint32_t, 11> header = {0, m_lastCall, kIsCall, 2, m_program, m_version, procedure, 0, 0, 0, 0};
+    xdrmem_create(&xdr, message.data(), static_cast<u_int>(message.size()), XDR_ENCODE);
+    // RPC version 2, and neither credentials nor verifier.
+    std::array<std::uint32_t, 10> header = {m_lastCall, kIsCall, 2, m_program, m_version, procedure, 0, 0, 0, 0};
     for (std::uint32_t& field : header) xdr_uint32_t(&xdr, &field);
     if (!arguments(&xdr)) return false;
-    m_request.resize(xdr_getpos(&xdr));
-    const std::uint32_t mark = htonl(kLastFragment | static_cast<std::uint32_t>(m_request.size() - kMarkBytes));
-    std::memcpy(m_request.data(), &mark, sizeof mark);
+    m_request = framed(std::string_view(message).substr(0, xdr_getpos(&xdr)));
     return true;
 }
 
@@ -131,45 +122,23 @@ RpcOutcome RpcChannel::send(Deadline deadline) {
 RpcOutcome RpcChannel::receiveReply(Deadline deadline) {
     std::array<char, 8192> piece;
     for (;;) {
-        const RpcOutcome message = takeMessage();
-        if (message == RpcOutcome::Done) {
+        while (auto message = m_received.next()) {
             // Calls are numbered from 1: a smaller number is the late answer to a call that was given up.
-            const std::uint32_t number = m_reply.size() >= 4 ? bigEndian(m_reply.data()) : 0;
-            if (number == m_lastCall) return RpcOutcome::Done;
+            const std::uint32_t number = message->size() >= 4 ? xdrWord(*message) : 0;
             if (number == 0 || number > m_lastCall) return close(RpcOutcome::Failed);
-            continue;
+            if (number < m_lastCall) continue;
+            m_reply = std::move(*message);
+            return RpcOutcome::Done;
         }
-        if (message == RpcOutcome::Failed) return close(message);
+        if (m_received.tooLong()) return close(RpcOutcome::Failed);
         if (!waitFor(m_socket.descriptor(), POLLIN, deadline)) return RpcOutcome::TimedOut;
         const ssize_t got = recv(m_socket.descriptor(), piece.data(), piece.size(), 0);
         if (got > 0) {
-            m_received.insert(m_received.end(), piece.data(), piece.data() + got);
+            m_received.feed({piece.data(), static_cast<std::size_t>(got)});
         } else if (got == 0 || !wouldBlock()) {
             return close(RpcOutcome::Lost);
         }
     }
-}
-
-/// Moves the first whole message from m_received to m_reply: Done; TimedOut while there is none yet; Failed when what
-/// has arrived is none.
-RpcOutcome RpcChannel::takeMessage() {
-    m_reply.clear();
-    std::size_t at = 0;
-    while (m_received.size() - at >= kMarkBytes) {
-        const std::uint32_t mark = bigEndian(m_received.data() + at);
-        const std::size_t length = mark & ~kLastFragment;
-        at += kMarkBytes;
-        if (at + length > kLargestReply) return RpcOutcome::Failed;
-        if (m_received.size() - at < length) break;
-        const auto begin = m_received.begin() + static_cast<std::ptrdiff_t>(at);
-        m_reply.insert(m_reply.end(), begin, begin + static_cast<std::ptrdiff_t>(length));
-        at += length;
-        if ((mark & kLastFragment) != 0) {
-            m_received.erase(m_received.begin(), m_received.begin() + static_cast<std::ptrdiff_t>(at));
-            return RpcOutcome::Done;
-        }
-    }
-    return RpcOutcome::TimedOut;
 }
 
 RpcOutcome RpcChannel::decodeReply(const Coder& results) {

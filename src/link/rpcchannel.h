@@ -1,5 +1,7 @@
 #pragma once
 
+#include "vxi11/rpcrecord.h"
+
 #include <rpc/types.h>
 #include <rpc/xdr.h>
 
@@ -62,10 +64,11 @@ public:
                     Deadline deadline);
 
 private:
+    static constexpr std::size_t kLargestReply = std::size_t{128} * 1024;  // twice the most that is ever asked for
+
     bool encodeCall(std::uint32_t procedure, std::size_t variableBytes, const Coder& arguments);
     RpcOutcome send(Deadline deadline);
     RpcOutcome receiveReply(Deadline deadline);
-    RpcOutcome takeMessage();
     RpcOutcome decodeReply(const Coder& results);
     RpcOutcome close(RpcOutcome because);
 
@@ -73,9 +76,9 @@ private:
     std::uint32_t m_version;
     Socket m_socket;
     std::uint32_t m_lastCall = 0;  ///< number of the call under way; answers bear it
-    std::vector<char> m_request;   ///< with its record mark
-    std::vector<char> m_received;  ///< what has arrived and was not taken yet
-    std::vector<char> m_reply;     ///< one whole message, without record marks
+    std::string m_request;         ///< with its record mark
+    RecordReader m_received{kLargestReply};
+    std::string m_reply;  ///< one whole message, without record marks
 };
 
 /// The IPv4 addresses of a host, empty when it is unknown. Blocks while the system's name service looks it up.

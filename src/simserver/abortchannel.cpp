@@ -1,7 +1,7 @@
 #include "simserver/abortchannel.h"
 
 #include "simserver/corechannel.h"
-#include "simserver/xdr.h"
+#include "vxi11/xdr.h"
 
 #include <vxi11.h>
 

@@ -1,6 +1,6 @@
 #include "simserver/coreanswers.h"
 
-#include "simserver/xdr.h"
+#include "vxi11/xdr.h"
 
 #include <vxi11.h>
 

@@ -1,7 +1,8 @@
 #include "simserver/corechannel.h"
 
 #include "simserver/coreanswers.h"
-#include "simserver/xdr.h"
+#include "vxi11/numbers.h"
+#include "vxi11/xdr.h"
 
 #include <vxi11.h>
 
@@ -119,12 +120,12 @@ void CoreChannel::call(std::uint32_t procedure, std::string_view arguments, Conn
                                        [&](Device_Link link) { reply(errorOnly(destroyLink(link, from))); });
             break;
         case device_docmd:
-            reply(docmdAnswer(kNotSupported));
+            reply(docmdAnswer(vxi11::kNotSupported));
             break;
         case device_enable_srq:
         case create_intr_chan:
         case destroy_intr_chan:
-            reply(errorOnly(kNotSupported));
+            reply(errorOnly(vxi11::kNotSupported));
             break;
         default:
             reply({{}, PROC_UNAVAIL});
@@ -135,18 +136,18 @@ void CoreChannel::call(std::uint32_t procedure, std::string_view arguments, Conn
 void CoreChannel::createLink(const Create_LinkParms& parms, ConnectionId from, const RpcReply& reply) {
     const std::string name = parms.device;
     const auto fail = [reply](ErrorCode error) { reply(createLinkAnswer({error, 0, 0, 0})); };
-    if (!isDeviceName(name)) return fail(kDeviceNotAccessible);
+    if (!isDeviceName(name)) return fail(vxi11::kDeviceNotAccessible);
     const bool withLock = parms.lockDevice != 0;
     const auto create = [this, from, reply, fail, name, withLock] {
         if (m_links.size() >= m_options.maxLinks) {
-            fail(kOutOfResources);
+            fail(vxi11::kOutOfResources);
             return true;
         }
         const LinkId id = ++m_lastLink;
         m_links[id].owner = from;
         if (withLock) m_lockHolder = id;
         trace(id, withLock ? "opened with lock: " : "opened: ", name);
-        reply(createLinkAnswer({kNoError, id, m_abortPort, m_options.maxRecvSize}));
+        reply(createLinkAnswer({vxi11::kNoError, id, m_abortPort, m_options.maxRecvSize}));
         return true;
     };
     if (!withLock) {
@@ -163,15 +164,17 @@ void CoreChannel::createLink(const Create_LinkParms& parms, ConnectionId from, c
 
 void CoreChannel::write(const Device_WriteParms& parms, ConnectionId from, const RpcReply& reply) {
     const auto fail = [reply](ErrorCode error) { reply(writeAnswer(error, 0)); };
-    if (find(parms.lid, from) != nullptr && parms.data.data_len > m_options.maxRecvSize) return fail(kParameterError);
-    const bool end = (parms.flags & kFlagEnd) != 0;
+    if (find(parms.lid, from) != nullptr && parms.data.data_len > m_options.maxRecvSize) {
+        return fail(vxi11::kParameterError);
+    }
+    const bool end = (parms.flags & vxi11::kFlagEnd) != 0;
     const auto take = [this, id = parms.lid, end, reply, fail,
                        data = std::string(parms.data.data_val, parms.data.data_len)] {
         Link& link = m_links.at(id);
         if (link.input.size() + data.size() > kLongestMessage) {
             trace(id, "message too long, dropped");
             link.input.clear();
-            fail(kIoError);
+            fail(vxi11::kIoError);
             return true;
         }
         link.input += data;
@@ -181,12 +184,12 @@ void CoreChannel::write(const Device_WriteParms& parms, ConnectionId from, const
             link.output = m_device.execute(std::exchange(link.input, {}));
             if (!link.output.empty()) trace(id, "> ", link.output);
         }
-        reply(writeAnswer(kNoError, data.size()));
+        reply(writeAnswer(vxi11::kNoError, data.size()));
         return true;
     };
     start({.connection = from,
            .link = parms.lid,
-           .waitForLock = (parms.flags & kFlagWaitLock) != 0,
+           .waitForLock = (parms.flags & vxi11::kFlagWaitLock) != 0,
            .lockTimeout = milliseconds(parms.lock_timeout),
            .ioTimeout = milliseconds(parms.io_timeout),
            .perform = take,
@@ -200,28 +203,28 @@ void CoreChannel::read(const Device_ReadParms& parms, ConnectionId from, const R
         if (link.output.empty() && most > 0) return false;
         std::size_t count = std::min<std::size_t>(most, link.output.size());
         long reason = 0;
-        if ((flags & kFlagTermChar) != 0) {
+        if ((flags & vxi11::kFlagTermChar) != 0) {
             const std::size_t found = link.output.find(termChar);
             if (found < count) {
                 count = found + 1;
-                reason |= kReasonTermChar;
+                reason |= vxi11::kReasonTermChar;
             }
         }
-        if (count == most) reason |= kReasonRequestCount;
-        if (count > 0 && count == link.output.size()) reason |= kReasonEnd;
+        if (count == most) reason |= vxi11::kReasonRequestCount;
+        if (count > 0 && count == link.output.size()) reason |= vxi11::kReasonEnd;
         std::string data = link.output.substr(0, count);
         link.output.erase(0, count);
-        reply(readAnswer(kNoError, reason, std::move(data)));
+        reply(readAnswer(vxi11::kNoError, reason, std::move(data)));
         return true;
     };
     start({.connection = from,
            .link = parms.lid,
-           .waitForLock = (parms.flags & kFlagWaitLock) != 0,
+           .waitForLock = (parms.flags & vxi11::kFlagWaitLock) != 0,
            .lockTimeout = milliseconds(parms.lock_timeout),
            .ioTimeout = milliseconds(parms.io_timeout),
            .perform = give,
            .fail = [this, reply](ErrorCode error) {
-               if (error == kIoTimeout) m_device.unansweredRead();
+               if (error == vxi11::kIoTimeout) m_device.unansweredRead();
                reply(readAnswer(error, 0, {}));
            }});
 }
@@ -230,12 +233,12 @@ void CoreChannel::lock(const Device_LockParms& parms, ConnectionId from, const R
     const auto take = [this, id = parms.lid, reply] {
         m_lockHolder = id;
         trace(id, "locks");
-        reply(errorOnly(kNoError));
+        reply(errorOnly(vxi11::kNoError));
         return true;
     };
     start({.connection = from,
            .link = parms.lid,
-           .waitForLock = (parms.flags & kFlagWaitLock) != 0,
+           .waitForLock = (parms.flags & vxi11::kFlagWaitLock) != 0,
            .lockTimeout = milliseconds(parms.lock_timeout),
            .perform = take,
            .fail = [reply](ErrorCode error) { reply(errorOnly(error)); }});
@@ -245,12 +248,12 @@ void CoreChannel::readStatusByte(const Device_GenericParms& parms, ConnectionId 
     const auto give = [this, id = parms.lid, reply] {
         unsigned char status = m_device.statusByte();
         if (!m_links.at(id).output.empty()) status |= kMessageAvailable;
-        reply(statusByteAnswer(kNoError, status));
+        reply(statusByteAnswer(vxi11::kNoError, status));
         return true;
     };
     start({.connection = from,
            .link = parms.lid,
-           .waitForLock = (parms.flags & kFlagWaitLock) != 0,
+           .waitForLock = (parms.flags & vxi11::kFlagWaitLock) != 0,
            .lockTimeout = milliseconds(parms.lock_timeout),
            .ioTimeout = milliseconds(parms.io_timeout),
            .perform = give,
@@ -261,46 +264,46 @@ void CoreChannel::generic(const Device_GenericParms& parms, ConnectionId from, c
                           std::function<void(Link&)> action) {
     start({.connection = from,
            .link = parms.lid,
-           .waitForLock = (parms.flags & kFlagWaitLock) != 0,
+           .waitForLock = (parms.flags & vxi11::kFlagWaitLock) != 0,
            .lockTimeout = milliseconds(parms.lock_timeout),
            .ioTimeout = milliseconds(parms.io_timeout),
            .perform =
                [this, id = parms.lid, reply, name, action = std::move(action)] {
                    trace(id, name);
                    action(m_links.at(id));
-                   reply(errorOnly(kNoError));
+                   reply(errorOnly(vxi11::kNoError));
                    return true;
                },
            .fail = [reply](ErrorCode error) { reply(errorOnly(error)); }});
 }
 
 CoreChannel::ErrorCode CoreChannel::unlock(LinkId id, ConnectionId from) {
-    if (find(id, from) == nullptr) return kInvalidLink;
-    if (m_lockHolder != id) return kNoLockHeld;
+    if (find(id, from) == nullptr) return vxi11::kInvalidLink;
+    if (m_lockHolder != id) return vxi11::kNoLockHeld;
     m_lockHolder.reset();
     trace(id, "unlocks");
-    return kNoError;
+    return vxi11::kNoError;
 }
 
 CoreChannel::ErrorCode CoreChannel::destroyLink(LinkId id, ConnectionId from) {
-    if (find(id, from) == nullptr) return kInvalidLink;
+    if (find(id, from) == nullptr) return vxi11::kInvalidLink;
     removeLink(id);
-    return kNoError;
+    return vxi11::kNoError;
 }
 
 CoreChannel::ErrorCode CoreChannel::abort(LinkId link) {
-    if (!m_links.contains(link)) return kInvalidLink;
+    if (!m_links.contains(link)) return vxi11::kInvalidLink;
     trace(link, "aborted");
     for (auto operation = m_parked.begin(); operation != m_parked.end();) {
         if (operation->link == link) {
             m_loop.cancel(operation->timer);
-            operation->fail(kAbort);
+            operation->fail(vxi11::kAborted);
             operation = m_parked.erase(operation);
         } else {
             ++operation;
         }
     }
-    return kNoError;
+    return vxi11::kNoError;
 }
 
 void CoreChannel::connectionClosed(ConnectionId connection) {
@@ -322,7 +325,7 @@ void CoreChannel::connectionClosed(ConnectionId connection) {
 
 void CoreChannel::start(Operation operation) {
     if (advance(operation)) return;
-    if (m_parked.size() >= kMostParked) return operation.fail(kOutOfResources);
+    if (m_parked.size() >= kMostParked) return operation.fail(vxi11::kOutOfResources);
     m_parked.push_back(std::move(operation));
     park(std::prev(m_parked.end()));
 }
@@ -330,11 +333,11 @@ void CoreChannel::start(Operation operation) {
 // True: it is done and answered. False: it waits, for the lock until lockPassed, then for data.
 bool CoreChannel::advance(Operation& operation) {
     if (operation.link && find(*operation.link, operation.connection) == nullptr) {
-        operation.fail(kInvalidLink);
+        operation.fail(vxi11::kInvalidLink);
         return true;
     }
     if (!operation.lockPassed && lockedAgainst(operation.link)) {
-        if (!operation.waitForLock) operation.fail(kLockedByAnotherLink);
+        if (!operation.waitForLock) operation.fail(vxi11::kLockedByAnotherLink);
         return !operation.waitForLock;
     }
     operation.lockPassed = true;
@@ -345,7 +348,7 @@ void CoreChannel::park(Parked::iterator operation) {
     const bool forLock = !operation->lockPassed;
     const auto timeout = forLock ? operation->lockTimeout : operation->ioTimeout;
     operation->timer = m_loop.callAt(std::chrono::steady_clock::now() + timeout, [this, operation, forLock] {
-        operation->fail(forLock ? kLockedByAnotherLink : kIoTimeout);
+        operation->fail(forLock ? vxi11::kLockedByAnotherLink : vxi11::kIoTimeout);
         m_parked.erase(operation);
     });
 }

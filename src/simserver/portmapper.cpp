@@ -1,6 +1,6 @@
 #include "simserver/portmapper.h"
 
-#include "simserver/xdr.h"
+#include "vxi11/xdr.h"
 
 #include <netinet/in.h>
 #include <poll.h>

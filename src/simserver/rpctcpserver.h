@@ -2,8 +2,8 @@
 
 #include "simserver/pollloop.h"
 #include "simserver/rpcprogram.h"
-#include "simserver/rpcrecord.h"
 #include "simserver/socket.h"
+#include "vxi11/rpcrecord.h"
 
 #include <cstddef>
 #include <map>

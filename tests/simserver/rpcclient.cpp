@@ -1,6 +1,6 @@
 #include "simserver/rpcclient.h"
 
-#include "simserver/rpcrecord.h"
+#include "vxi11/rpcrecord.h"
 
 #include <arpa/inet.h>
 #include <gtest/gtest.h>
@@ -15,13 +15,11 @@ namespace kdx::simserver {
 namespace {
 
 std::uint32_t wordAt(std::string_view bytes, std::size_t n) {
-    std::uint32_t value = 0;
     if (bytes.size() < 4 * (n + 1)) {
         ADD_FAILURE() << "too short for word " << n;
         return 0;
     }
-    for (const char byte : bytes.substr(4 * n, 4)) value = value << 8U | static_cast<unsigned char>(byte);
-    return value;
+    return xdrWord(bytes, 4 * n);
 }
 
 bool readable(int socket, int timeoutMs) {

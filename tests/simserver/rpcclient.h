@@ -1,6 +1,6 @@
 #pragma once
 
-#include "simserver/xdr.h"
+#include "vxi11/xdr.h"
 
 #include <sys/types.h>
 

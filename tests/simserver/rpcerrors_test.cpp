@@ -1,5 +1,5 @@
-#include "simserver/rpcrecord.h"
 #include "simserver/vxi11fixture.h"
+#include "vxi11/rpcrecord.h"
 
 namespace kdx::simserver {
 namespace {

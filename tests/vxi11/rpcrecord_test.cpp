@@ -1,10 +1,10 @@
-#include "simserver/rpcrecord.h"
+#include "vxi11/rpcrecord.h"
 
 #include <gtest/gtest.h>
 
 #include <string>
 
-namespace kdx::simserver {
+namespace kdx {
 namespace {
 
 using namespace std::string_literals;
@@ -51,4 +51,4 @@ TEST(RpcRecord, FragmentsCountTogetherForTheLimit) {
 }
 
 }  // namespace
-}  // namespace kdx::simserver
+}  // namespace kdx

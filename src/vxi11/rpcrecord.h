@@ -5,7 +5,7 @@
 #include <string>
 #include <string_view>
 
-namespace kdx::simserver {
+namespace kdx {
 
 /// Puts the records of an RPC byte stream together again: each comes in one or more fragments with a length in front.
 class RecordReader {
@@ -30,4 +30,4 @@ private:
 /// The record as one fragment with its length in front.
 std::string framed(std::string_view record);
 
-}  // namespace kdx::simserver
+}  // namespace kdx

@@ -3,11 +3,12 @@
 #include <rpc/rpc.h>
 
 #include <cstddef>
+#include <cstdint>
 #include <limits>
 #include <string>
 #include <string_view>
 
-namespace kdx::simserver {
+namespace kdx {
 
 /// An XDR routine as the RPC library and its generator make them.
 template <class Value>
@@ -15,6 +16,13 @@ using XdrRoutine = bool_t (*)(XDR*, Value*);
 
 /// Stands for "no counted field" in XdrDecoded.
 constexpr std::size_t kNoCount = std::numeric_limits<std::size_t>::max();
+
+/// The 32-bit word whose four bytes stand there; they have to be there.
+inline std::uint32_t xdrWord(std::string_view bytes, std::size_t at = 0) {
+    std::uint32_t value = 0;
+    for (const char byte : bytes.substr(at, 4)) value = value << 8U | static_cast<unsigned char>(byte);
+    return value;
+}
 
 /// A value read from XDR, with the memory that belongs to it.
 template <class Value>
@@ -43,10 +51,7 @@ public:
 
 private:
     static bool countFits(std::string_view bytes, std::size_t countAt) {
-        if (bytes.size() < countAt + 4) return false;
-        std::size_t count = 0;
-        for (const char byte : bytes.substr(countAt, 4)) count = count << 8U | static_cast<unsigned char>(byte);
-        return count <= bytes.size() - countAt - 4;
+        return bytes.size() >= countAt + 4 && xdrWord(bytes, countAt) <= bytes.size() - countAt - 4;
     }
 
     XdrRoutine<Value> m_routine;
@@ -67,4 +72,4 @@ std::string toXdr(Value value, XdrRoutine<Value> routine, std::size_t variableBy
     return bytes;
 }
 
-}  // namespace kdx::simserver
+}  // namespace kdx

@@ -1,25 +1,21 @@
-#include "simserver/rpcrecord.h"
+#include "vxi11/rpcrecord.h"
+
+#include "vxi11/xdr.h"
 
 #include <cstdint>
 #include <utility>
 
-namespace kdx::simserver {
+namespace kdx {
 namespace {
 
 constexpr std::size_t kMarkSize = 4;
 constexpr std::uint32_t kLastFragment = 0x80000000U;
 
-std::uint32_t readMark(std::string_view bytes) {
-    std::uint32_t mark = 0;
-    for (const char byte : bytes.substr(0, kMarkSize)) mark = mark << 8U | static_cast<unsigned char>(byte);
-    return mark;
-}
-
 }  // namespace
 
 std::optional<std::string> RecordReader::next() {
     while (!m_tooLong && m_unread.size() >= kMarkSize) {
-        const std::uint32_t mark = readMark(m_unread);
+        const std::uint32_t mark = xdrWord(m_unread);
         const std::size_t length = mark & ~kLastFragment;
         if (length > m_longest - m_record.size()) {
             m_tooLong = true;
@@ -40,4 +36,4 @@ std::string framed(std::string_view record) {
     return result.append(record);
 }
 
-}  // namespace kdx::simserver
+}  // namespace kdx
