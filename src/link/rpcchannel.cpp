@@ -8,7 +8,6 @@
 #include <netinet/tcp.h>
 #include <poll.h>
 #include <sys/socket.h>
-#include <unistd.h>
 
 #include <array>
 #include <cerrno>
@@ -44,35 +43,20 @@ bool wouldBlock() {
 
 }  // namespace
 
-Socket::Socket(Socket&& other) noexcept : m_descriptor(std::exchange(other.m_descriptor, -1)) {}
-
-Socket& Socket::operator=(Socket&& other) noexcept {
-    if (this != &other) {
-        close();
-        m_descriptor = std::exchange(other.m_descriptor, -1);
-    }
-    return *this;
-}
-
-void Socket::close() {
-    if (m_descriptor >= 0) ::close(m_descriptor);
-    m_descriptor = -1;
-}
-
 bool RpcChannel::connect(const sockaddr_in& address, std::uint16_t port, Deadline deadline) {
-    Socket fresh(::socket(AF_INET, SOCK_STREAM | SOCK_NONBLOCK | SOCK_CLOEXEC, IPPROTO_TCP));
+    FileDescriptor fresh(::socket(AF_INET, SOCK_STREAM | SOCK_NONBLOCK | SOCK_CLOEXEC, IPPROTO_TCP));
     if (!fresh.isOpen()) return false;
     sockaddr_in peer = address;
     peer.sin_port = htons(port);
-    if (::connect(fresh.descriptor(), reinterpret_cast<const sockaddr*>(&peer), sizeof peer) != 0) {
+    if (::connect(fresh.number(), reinterpret_cast<const sockaddr*>(&peer), sizeof peer) != 0) {
         if (errno != EINPROGRESS && errno != EINTR) return false;
-        if (!waitFor(fresh.descriptor(), POLLOUT, deadline)) return false;
+        if (!waitFor(fresh.number(), POLLOUT, deadline)) return false;
         int failure = 0;
         socklen_t size = sizeof failure;
-        if (getsockopt(fresh.descriptor(), SOL_SOCKET, SO_ERROR, &failure, &size) != 0 || failure != 0) return false;
+        if (getsockopt(fresh.number(), SOL_SOCKET, SO_ERROR, &failure, &size) != 0 || failure != 0) return false;
     }
     const int on = 1;  // a short question must not wait for the acknowledgement of the command before it
-    setsockopt(fresh.descriptor(), IPPROTO_TCP, TCP_NODELAY, &on, sizeof on);
+    setsockopt(fresh.number(), IPPROTO_TCP, TCP_NODELAY, &on, sizeof on);
     m_socket = std::move(fresh);
     m_received = RecordReader(kLargestReply);
     return true;
@@ -104,13 +88,12 @@ bool RpcChannel::encodeCall(std::uint32_t procedure, std::size_t variableBytes, 
 RpcOutcome RpcChannel::send(Deadline deadline) {
     std::size_t sent = 0;
     while (sent < m_request.size()) {
-        const ssize_t taken =
-            ::send(m_socket.descriptor(), m_request.data() + sent, m_request.size() - sent, MSG_NOSIGNAL);
+        const ssize_t taken = ::send(m_socket.number(), m_request.data() + sent, m_request.size() - sent, MSG_NOSIGNAL);
         if (taken > 0) {
             sent += static_cast<std::size_t>(taken);
         } else if (taken < 0 && !wouldBlock()) {
             return close(RpcOutcome::Lost);
-        } else if (!waitFor(m_socket.descriptor(), POLLOUT, deadline)) {
+        } else if (!waitFor(m_socket.number(), POLLOUT, deadline)) {
             // The rest of a request begun could not be told from the next one.
             return sent == 0 ? RpcOutcome::TimedOut : close(RpcOutcome::TimedOut);
         }
@@ -131,8 +114,8 @@ RpcOutcome RpcChannel::receiveReply(Deadline deadline) {
             return RpcOutcome::Done;
         }
         if (m_received.tooLong()) return close(RpcOutcome::Failed);
-        if (!waitFor(m_socket.descriptor(), POLLIN, deadline)) return RpcOutcome::TimedOut;
-        const ssize_t got = recv(m_socket.descriptor(), piece.data(), piece.size(), 0);
+        if (!waitFor(m_socket.number(), POLLIN, deadline)) return RpcOutcome::TimedOut;
+        const ssize_t got = recv(m_socket.number(), piece.data(), piece.size(), 0);
         if (got > 0) {
             m_received.feed({piece.data(), static_cast<std::size_t>(got)});
         } else if (got == 0 || !wouldBlock()) {

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "base/filedescriptor.h"
 #include "vxi11/rpcrecord.h"
 
 #include <rpc/types.h>
@@ -25,21 +26,6 @@ enum class RpcOutcome {
     Lost,         ///< the peer closed the connection, or nobody is there any more
     Unavailable,  ///< the peer does not serve the program
     Failed,       ///< the peer refused the call or answered something that is no answer
-};
-
-/// An open socket, closed with its owner.
-class Socket {
-public:
-    explicit Socket(int descriptor = -1) : m_descriptor(descriptor) {}
-    ~Socket() { close(); }
-    Socket(Socket&& other) noexcept;
-    Socket& operator=(Socket&& other) noexcept;
-    void close();
-    [[nodiscard]] int descriptor() const { return m_descriptor; }
-    [[nodiscard]] bool isOpen() const { return m_descriptor >= 0; }
-
-private:
-    int m_descriptor;
 };
 
 /// Remote procedure calls (ONC RPC version 2) over one TCP connection: one program, one call at a time.
@@ -74,7 +60,7 @@ private:
 
     std::uint32_t m_program;
     std::uint32_t m_version;
-    Socket m_socket;
+    FileDescriptor m_socket;
     std::uint32_t m_lastCall = 0;  ///< number of the call under way; answers bear it
     std::string m_request;         ///< with its record mark
     RecordReader m_received{kLargestReply};

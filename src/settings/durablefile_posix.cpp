@@ -4,34 +4,12 @@
 
 #include <cerrno>
 
+#include "base/filedescriptor.h"
 #include "settings/durablefile.h"
 
 namespace kdx {
 
 namespace {
-
-/// An open file, closed with the scope.
-class Descriptor {
-public:
-    explicit Descriptor(int number) : m_number(number) {}
-    ~Descriptor() {
-        if (m_number >= 0) ::close(m_number);
-    }
-    Descriptor(const Descriptor&) = delete;
-    Descriptor& operator=(const Descriptor&) = delete;
-
-    [[nodiscard]] bool valid() const { return m_number >= 0; }
-    [[nodiscard]] int number() const { return m_number; }
-    /// Some file systems tell only here that the bytes did not fit.
-    [[nodiscard]] bool close() {
-        const int number = m_number;
-        m_number = -1;
-        return ::close(number) == 0;
-    }
-
-private:
-    int m_number;
-};
 
 bool writeAll(int file, std::string_view bytes) {
     while (!bytes.empty()) {
@@ -62,16 +40,16 @@ bool writeNewFile(const std::filesystem::path& file, std::string_view bytes, con
     struct stat modelStatus {};
     const bool hasModel = ::stat(model.c_str(), &modelStatus) == 0;
     const mode_t mode = hasModel ? 0600 : 0666;  // a model's mode is set below; without one the user's mask decides
-    Descriptor descriptor(::open(file.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, mode));
-    if (!descriptor.valid()) return false;
+    FileDescriptor descriptor(::open(file.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, mode));
+    if (!descriptor.isOpen()) return false;
     if (!writeAll(descriptor.number(), bytes)) return false;
     if (hasModel && !takeOver(descriptor.number(), modelStatus)) return false;
     return ::fsync(descriptor.number()) == 0 && descriptor.close();
 }
 
 void flushFolder(const std::filesystem::path& folder) {
-    const Descriptor descriptor(::open(folder.empty() ? "." : folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC));
-    if (descriptor.valid()) ::fsync(descriptor.number());
+    const FileDescriptor descriptor(::open(folder.empty() ? "." : folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC));
+    if (descriptor.isOpen()) ::fsync(descriptor.number());
 }
 
 }  // namespace kdx

@@ -118,8 +118,8 @@ public:
         sigemptyset(&signals);
         sigaddset(&signals, SIGINT);
         sigaddset(&signals, SIGTERM);
-        m_descriptor = kdx::simserver::FileDescriptor(::signalfd(-1, &signals, SFD_NONBLOCK | SFD_CLOEXEC));
-        if (m_descriptor.number() < 0 || ::sigprocmask(SIG_BLOCK, &signals, nullptr) != 0) {
+        m_descriptor = kdx::FileDescriptor(::signalfd(-1, &signals, SFD_NONBLOCK | SFD_CLOEXEC));
+        if (!m_descriptor.isOpen() || ::sigprocmask(SIG_BLOCK, &signals, nullptr) != 0) {
             throw std::system_error(errno, std::generic_category(), "signals");
         }
         m_loop.watch(m_descriptor.number(), POLLIN, [&server](short) { server.stop(); });
@@ -130,7 +130,7 @@ public:
 
 private:
     kdx::simserver::PollLoop& m_loop;
-    kdx::simserver::FileDescriptor m_descriptor;
+    kdx::FileDescriptor m_descriptor;
 };
 
 std::string portMapperText(kdx::simserver::PortAnnouncement::Way way) {

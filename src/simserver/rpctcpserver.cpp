@@ -43,7 +43,7 @@ RpcTcpServer::~RpcTcpServer() {
 
 void RpcTcpServer::acceptClients() {
     FileDescriptor socket(::accept4(m_listener.number(), nullptr, nullptr, SOCK_NONBLOCK | SOCK_CLOEXEC));
-    if (socket.number() < 0) return;  // the client has given up meanwhile
+    if (!socket.isOpen()) return;  // the client has given up meanwhile
     setUp(socket.number());
     const ConnectionId id = ++m_lastId;
     m_loop.watch(socket.number(), POLLIN, [this, id](short events) { serve(id, events); });

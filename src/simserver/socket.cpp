@@ -3,11 +3,9 @@
 #include <arpa/inet.h>
 #include <netinet/in.h>
 #include <sys/socket.h>
-#include <unistd.h>
 
 #include <cerrno>
 #include <system_error>
-#include <utility>
 
 namespace kdx::simserver {
 namespace {
@@ -26,7 +24,7 @@ FileDescriptor bound(int type, const std::string& address, unsigned short port) 
         fail(address);
     }
     FileDescriptor result(::socket(AF_INET, type | SOCK_NONBLOCK | SOCK_CLOEXEC, 0));
-    if (result.number() < 0) fail(place);
+    if (!result.isOpen()) fail(place);
     const int on = 1;
     // TCP only: there it lets a restart take the port over from dying connections, with UDP two programs could share
     // it.
@@ -36,17 +34,6 @@ FileDescriptor bound(int type, const std::string& address, unsigned short port) 
 }
 
 }  // namespace
-
-FileDescriptor::FileDescriptor(FileDescriptor&& other) noexcept : m_number(std::exchange(other.m_number, -1)) {}
-
-FileDescriptor& FileDescriptor::operator=(FileDescriptor&& other) noexcept {
-    std::swap(m_number, other.m_number);
-    return *this;
-}
-
-FileDescriptor::~FileDescriptor() {
-    if (m_number >= 0) ::close(m_number);
-}
 
 FileDescriptor listenTcp(const std::string& address, unsigned short port) {
     FileDescriptor result = bound(SOCK_STREAM, address, port);

@@ -1,24 +1,10 @@
 #pragma once
 
+#include "base/filedescriptor.h"
+
 #include <string>
 
 namespace kdx::simserver {
-
-/// An open file descriptor, closed when this goes.
-class FileDescriptor {
-public:
-    FileDescriptor() = default;
-    explicit FileDescriptor(int number) : m_number(number) {}
-    FileDescriptor(FileDescriptor&& other) noexcept;
-    FileDescriptor& operator=(FileDescriptor&& other) noexcept;
-    ~FileDescriptor();
-
-    /// The system's number of it; -1: nothing is open.
-    [[nodiscard]] int number() const { return m_number; }
-
-private:
-    int m_number = -1;
-};
 
 /// Opens a TCP socket that listens and never blocks.
 /// @param address IPv4 address in dotted form; port 0 takes any free one. Throws std::system_error.
