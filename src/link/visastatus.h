@@ -7,7 +7,7 @@
 namespace kdx {
 
 namespace visa {
-constexpr VisaStatus kUnknownStatus = 1073676420;  // 3FFF0084: the status has no description
+constexpr VisaStatus kUnknownStatus = 1073676421;  // 3FFF0085: the status has no description
 }  // namespace visa
 
 /// Describes a status in words. Takes the status; gives kSuccess and its text, or kUnknownStatus and a text with the

@@ -1,11 +1,11 @@
 #include "sim/simvisa.h"
 
 #include <algorithm>
-#include <array>
 #include <string_view>
 #include <vector>
 
 #include "base/codepage.h"
+#include "link/visastatus.h"
 #include "sim/scpi.h"
 #include "sim/virtualinstrument.h"
 
@@ -13,21 +13,7 @@ namespace kdx::sim {
 
 namespace {
 
-constexpr VisaStatus kUnknownStatus = 1073676421;  // 3FFF0085
 constexpr int kHighestGpibAddress = 30;
-
-struct StatusRow {
-    VisaStatus status;
-    const char* text;
-};
-
-constexpr std::array kStatuses = {
-    StatusRow{visa::kSuccess, "Operation completed successfully."},
-    StatusRow{visa::kMaxCountReached, "The read stopped at the maximum count; more is left to read."},
-    StatusRow{visa::kInvalidObject, "The session or object is not valid."},
-    StatusRow{visa::kInvalidResourceName, "The resource name cannot be parsed."},
-    StatusRow{visa::kTimeout, "The time-out expired before the operation completed."},
-};
 
 std::vector<std::string_view> fields(std::string_view resource) {
     std::vector<std::string_view> result;
@@ -66,10 +52,7 @@ VisaStatus SimVisa::viOpenDefaultRM(VisaHandle& resourceManager) {
 }
 
 VisaStatus SimVisa::viStatusDesc(VisaHandle, VisaStatus status, std::string& description) {
-    const auto row =
-        std::find_if(kStatuses.begin(), kStatuses.end(), [status](const StatusRow& r) { return r.status == status; });
-    description = row == kStatuses.end() ? "Unknown status." : row->text;
-    return row == kStatuses.end() ? kUnknownStatus : visa::kSuccess;
+    return describeStatus(status, description);
 }
 
 VisaStatus SimVisa::viOpen(VisaHandle resourceManager, const std::string& resource, std::uint32_t, std::uint32_t,

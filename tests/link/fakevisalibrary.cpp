@@ -55,7 +55,7 @@ std::int32_t viOpen(std::uint32_t resourceManager, char* resource, std::uint32_t
 
 std::int32_t viStatusDesc(std::uint32_t object, std::int32_t status, char* description) {
     std::snprintf(description, 256, "status %d of %u", status, object);
-    return status == 7 ? 1073676420 : 0;
+    return status == 7 ? 1073676421 : 0;
 }
 
 std::int32_t viWrite(std::uint32_t session, const unsigned char* bytes, std::uint32_t count, std::uint32_t* written) {

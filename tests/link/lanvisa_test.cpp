@@ -662,7 +662,7 @@ TEST_F(LanVisaTest, StatusesAreDescribed) {
     std::string text;
     EXPECT_EQ(visa->viStatusDesc(manager, visa::kTimeout, text), visa::kSuccess);
     EXPECT_THAT(text, ::testing::HasSubstr("time-out"));
-    EXPECT_EQ(visa->viStatusDesc(manager, -4711, text), 1073676420);
+    EXPECT_EQ(visa->viStatusDesc(manager, -4711, text), 1073676421);
     EXPECT_THAT(text, ::testing::HasSubstr("-4711"));
     EXPECT_EQ(visa->viStatusDesc(4711, 0, text), visa::kInvalidObject);
 }

@@ -61,7 +61,7 @@ TEST_F(LibraryVisaTest, StatusesOfAllKindsComeThrough) {
     EXPECT_EQ(library.visa->viWrite(session, warning, count), 1073676294);
     EXPECT_EQ(count, 17);
     std::string text;
-    EXPECT_EQ(library.visa->viStatusDesc(manager, 7, text), 1073676420);
+    EXPECT_EQ(library.visa->viStatusDesc(manager, 7, text), 1073676421);
 }
 
 TEST_F(LibraryVisaTest, BytesAreWrittenAndReadAsTheyStand) {
