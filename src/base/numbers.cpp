@@ -60,6 +60,10 @@ double leadingNumber(std::string_view text) {
     return negative ? -value : value;
 }
 
+bool isDecimal(std::string_view text) {
+    return !text.empty() && digitsEnd(text, 0) == text.size();
+}
+
 std::string shortestDecimal(double value) {
     if (value == 0.0) return "0";  // also for -0, which has no text of its own
     // 15 digits hide the last bit's noise: 67.6 * 10 is 676, not 676.0000000000001.
@@ -78,6 +82,10 @@ std::string shortestDecimal(double value) {
 
 std::string fixedDecimal(double value, int decimals) {
     return format(value, std::chars_format::fixed, decimals);
+}
+
+std::string twoDigits(int number) {
+    return rightmost("0" + std::to_string(number), 2);
 }
 
 std::string rightmost(std::string_view text, std::size_t count) {

@@ -11,12 +11,18 @@ namespace kdx {
 /// infinity.
 [[nodiscard]] double leadingNumber(std::string_view text);
 
+/// True for a text of decimal digits only (not empty).
+[[nodiscard]] bool isDecimal(std::string_view text);
+
 /// The shortest decimal text that reads back as the same number, at most 15 significant digits, with a point and no
 /// leading blank: 675, 2.5, -30. Numbers of 1e15 and more are written with an exponent.
 [[nodiscard]] std::string shortestDecimal(double value);
 
 /// The number with exactly the given count of decimals, a point as separator whatever the locale: (0.05, 2) gives 0.05.
 [[nodiscard]] std::string fixedDecimal(double value, int decimals);
+
+/// The last two digits of a number that is not negative: 5 gives 05, 2009 gives 09.
+[[nodiscard]] std::string twoDigits(int number);
 
 /// The text's last `count` characters; the whole text when it is shorter.
 [[nodiscard]] std::string rightmost(std::string_view text, std::size_t count);

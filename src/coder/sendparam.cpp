@@ -230,10 +230,6 @@ std::string formatted(const ParamRow& row, std::string& value, const ParamContex
     return {};
 }
 
-std::string twoDigits(int number) {
-    return rightmost("0" + std::to_string(number), 2);
-}
-
 std::string timeText(double secondsSinceMidnight) {
     const int seconds = static_cast<int>(secondsSinceMidnight);
     return twoDigits(seconds / 3600) + ":" + twoDigits(seconds / 60 % 60) + ":" + twoDigits(seconds % 60);

@@ -3,7 +3,6 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
-#include <cstdint>
 
 #include "base/clock.h"
 #include "base/codepage.h"
@@ -31,10 +30,6 @@ std::array<int, 6> fields(std::string_view text) {
     return values;
 }
 
-std::string twoDigits(std::int64_t value) {
-    return rightmost("0" + std::to_string(value), 2);
-}
-
 }  // namespace
 
 ScpiError CoderClock::set(std::string_view value) {
@@ -58,9 +53,10 @@ std::string CoderClock::text() const {
     const auto midnight = floor<days>(time);
     const year_month_day date{midnight};
     const hh_mm_ss clock{floor<seconds>(time - midnight)};
-    return twoDigits(clock.hours().count()) + ":" + twoDigits(clock.minutes().count()) + ":" +
-           twoDigits(clock.seconds().count()) + "," + twoDigits(static_cast<unsigned>(date.day())) + "." +
-           twoDigits(static_cast<unsigned>(date.month())) + "." + twoDigits(static_cast<int>(date.year()));
+    const auto twoDigitsOf = [](auto number) { return twoDigits(static_cast<int>(number)); };
+    return twoDigitsOf(clock.hours().count()) + ":" + twoDigitsOf(clock.minutes().count()) + ":" +
+           twoDigitsOf(clock.seconds().count()) + "," + twoDigitsOf(static_cast<unsigned>(date.day())) + "." +
+           twoDigitsOf(static_cast<unsigned>(date.month())) + "." + twoDigits(static_cast<int>(date.year()));
 }
 
 CoderClock::Time CoderClock::now() const {

@@ -71,7 +71,7 @@ constexpr std::array kNetworkRows = {
                }},
     NetworkRow{"EON-PTY", setPty,
                [](const OtherNetwork& network, std::optional<std::string_view>) -> Reply {
-                   return {ScpiError::None, rightmost("0" + std::to_string(network.pty), 2)};
+                   return {ScpiError::None, twoDigits(network.pty)};
                }},
     NetworkRow{"EON-TP", [](OtherNetwork& network, std::string_view value) { return setFlag(network.tp, value); },
                [](const OtherNetwork& network, std::optional<std::string_view>) -> Reply {

@@ -5,6 +5,7 @@
 #include <limits>
 
 #include "base/codepage.h"
+#include "base/numbers.h"
 
 namespace kdx::sim {
 
@@ -13,10 +14,6 @@ namespace {
 // IEEE 488.2 counts the blank and every control character as white space (the line feed is gone before).
 bool isWhite(char c) {
     return static_cast<unsigned char>(c) <= 0x20;
-}
-
-bool isDigit(char c) {
-    return c >= '0' && c <= '9';
 }
 
 bool wordMatches(std::string_view pattern, std::string_view word) {
@@ -102,7 +99,7 @@ std::optional<NumberWithSuffix> readNumber(std::string_view text) {
     const bool negative = !text.empty() && text.front() == '-';
     const std::string_view digits = text.substr(negative ? 1 : 0);
     // from_chars would take "inf" and "nan" too.
-    if (digits.empty() || (!isDigit(digits.front()) && digits.front() != '.')) return std::nullopt;
+    if (digits.empty() || (!isDecimal(digits.substr(0, 1)) && digits.front() != '.')) return std::nullopt;
     NumberWithSuffix number;
     const auto result = std::from_chars(digits.data(), digits.data() + digits.size(), number.value);
     if (result.ec == std::errc::invalid_argument) return std::nullopt;
@@ -121,10 +118,6 @@ std::optional<int> readWhole(std::string_view text) {
     // All digits, yet too many of them: a number, and outside every range.
     if (result.ec == std::errc::result_out_of_range) return std::numeric_limits<int>::max();
     return value;
-}
-
-bool isDecimal(std::string_view text) {
-    return !text.empty() && std::all_of(text.begin(), text.end(), isDigit);
 }
 
 bool isHex(std::string_view text) {

@@ -53,9 +53,6 @@ struct NumberWithSuffix {
 /// A whole number that fills the text but for blanks around it; nothing when it is anything else.
 [[nodiscard]] std::optional<int> readWhole(std::string_view text);
 
-/// True for a text of decimal digits only (not empty).
-[[nodiscard]] bool isDecimal(std::string_view text);
-
 /// True for a text of hexadecimal digits only (not empty), in any letter case.
 [[nodiscard]] bool isHex(std::string_view text);
 

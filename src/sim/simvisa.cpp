@@ -1,49 +1,12 @@
 #include "sim/simvisa.h"
 
 #include <algorithm>
-#include <string_view>
-#include <vector>
 
-#include "base/codepage.h"
+#include "link/resource.h"
 #include "link/visastatus.h"
-#include "sim/scpi.h"
 #include "sim/virtualinstrument.h"
 
 namespace kdx::sim {
-
-namespace {
-
-constexpr int kHighestGpibAddress = 30;
-
-std::vector<std::string_view> fields(std::string_view resource) {
-    std::vector<std::string_view> result;
-    for (std::size_t end = resource.find("::"); end != std::string_view::npos; end = resource.find("::")) {
-        result.push_back(resource.substr(0, end));
-        resource.remove_prefix(end + 2);
-    }
-    result.push_back(resource);
-    return result;
-}
-
-bool isInterface(std::string_view text, std::string_view kind) {
-    const std::string_view board = text.substr(std::min(kind.size(), text.size()));
-    return equalNoCase(text.substr(0, kind.size()), kind) && (board.empty() || isDecimal(board));
-}
-
-bool isGpibAddress(std::string_view text) {
-    return isDecimal(text) && readWhole(text) <= kHighestGpibAddress;
-}
-
-// Interface and board, address, for LAN perhaps a device name, "INSTR".
-bool isResource(std::string_view resource) {
-    const std::vector<std::string_view> parts = fields(resource);
-    const bool complete = std::none_of(parts.begin(), parts.end(), [](std::string_view part) { return part.empty(); });
-    if (!complete || parts.size() < 3 || parts.size() > 4 || !equalNoCase(parts.back(), "INSTR")) return false;
-    if (isInterface(parts[0], "TCPIP")) return true;
-    return isInterface(parts[0], "GPIB") && std::all_of(parts.begin() + 1, parts.end() - 1, isGpibAddress);
-}
-
-}  // namespace
 
 VisaStatus SimVisa::viOpenDefaultRM(VisaHandle& resourceManager) {
     resourceManager = ++m_lastHandle;
@@ -59,7 +22,7 @@ VisaStatus SimVisa::viOpen(VisaHandle resourceManager, const std::string& resour
                            VisaHandle& session) {
     session = 0;
     if (!m_resourceManagers.contains(resourceManager)) return visa::kInvalidObject;
-    if (!isResource(resource)) return visa::kInvalidResourceName;
+    if (!parseResource(resource).wellFormed) return visa::kInvalidResourceName;
     session = ++m_lastHandle;
     m_sessions.emplace(session, Session{resourceManager, {}});
     return visa::kSuccess;

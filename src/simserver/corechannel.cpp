@@ -1,5 +1,8 @@
 #include "simserver/corechannel.h"
 
+#include "base/codepage.h"
+#include "base/printable.h"
+#include "link/resource.h"
 #include "simserver/coreanswers.h"
 #include "vxi11/numbers.h"
 #include "vxi11/xdr.h"
@@ -23,35 +26,11 @@ constexpr std::size_t kDeviceNameAt = 12;
 constexpr std::size_t kWriteDataAt = 16;
 
 bool isDeviceName(std::string_view name) {
-    std::string lower(name);
-    for (char& c : lower) {
-        if (c >= 'A' && c <= 'Z') c = static_cast<char>(c - 'A' + 'a');
-    }
-    if (lower == "inst0") return true;
-    constexpr std::string_view kGpib = "gpib0,";
-    constexpr int kHighestGpibAddress = 30;
+    if (equalNoCase(name, "inst0")) return true;
     for (int address = 0; address <= kHighestGpibAddress; ++address) {
-        if (lower == std::string(kGpib) + std::to_string(address)) return true;
+        if (equalNoCase(name, "gpib0," + std::to_string(address))) return true;
     }
     return false;
-}
-
-std::string printable(std::string_view text) {
-    constexpr std::string_view kDigits = "0123456789ABCDEF";
-    std::string result;
-    for (const char c : text) {
-        const auto byte = static_cast<unsigned char>(c);
-        if (c == '\n') {
-            result += "\\n";
-        } else if (c == '\r') {
-            result += "\\r";
-        } else if (byte < 0x20 || byte >= 0x7F) {
-            result += {'\\', 'x', kDigits[byte >> 4U], kDigits[byte & 0xFU]};
-        } else {
-            result += c;
-        }
-    }
-    return result;
 }
 
 // Reads the arguments and calls the handler with them; what cannot be read is turned down.

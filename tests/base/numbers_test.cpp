@@ -60,6 +60,18 @@ TEST(FixedDecimalTest, HasExactlyTheDecimalsAskedFor) {
     EXPECT_EQ(fixedDecimal(-4, 0), "-4");
 }
 
+TEST(TwoDigitsTest, AreTheLastTwoOfANumber) {
+    EXPECT_EQ(twoDigits(0), "00");
+    EXPECT_EQ(twoDigits(7), "07");
+    EXPECT_EQ(twoDigits(59), "59");
+    EXPECT_EQ(twoDigits(2009), "09");
+}
+
+TEST(IsDecimalTest, DigitsAloneAreTaken) {
+    for (const char* text : {"0", "007", "123456789012345678901234567890"}) EXPECT_TRUE(isDecimal(text)) << text;
+    for (const char* text : {"", " 1", "1 ", "-1", "+1", "1.5", "1a", "\xB2"}) EXPECT_FALSE(isDecimal(text)) << text;
+}
+
 TEST(FieldTest, TextsAreCutAndPadded) {
     EXPECT_EQ(rightmost("12345", 4), "2345");
     EXPECT_EQ(rightmost("1", 4), "1");

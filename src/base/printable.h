@@ -1,0 +1,16 @@
+#pragma once
+
+#include <string>
+#include <string_view>
+
+namespace kdx {
+
+/// The text as visible characters of ASCII, so that a line stays a line on any terminal: line feed and carriage return
+/// as \n and \r, other control characters and everything above ASCII as \x and two hexadecimal digits.
+[[nodiscard]] std::string printable(std::string_view text);
+
+/// The text with each control character (below 20) replaced by the substitute, so that a line stays a line where the
+/// code page's characters can be shown.
+[[nodiscard]] std::string printable(std::string_view text, char substitute);
+
+}  // namespace kdx

@@ -1,0 +1,25 @@
+#pragma once
+
+#include <string_view>
+
+namespace kdx {
+
+/// Addresses of the GPIB run from 0 to this one, primary and secondary ones.
+constexpr int kHighestGpibAddress = 30;
+
+/// A VISA resource string taken apart; the views point into it.
+struct Resource {
+    enum class Kind { Unknown, Lan, Gpib };
+    /// Told by the first part alone: "TCPIP" or "GPIB" in any letter case, with or without a board number.
+    Kind kind = Kind::Unknown;
+    /// The rest is as it should be: an address, perhaps a device, "INSTR" in any letter case, none of them empty. On
+    /// the GPIB both are numbers in range; what LAN addresses look like is for the network to know.
+    bool wellFormed = false;
+    std::string_view address;  ///< host or primary address; empty unless wellFormed
+    std::string_view device;   ///< device at the host or secondary address; empty when there is none
+};
+
+/// Takes "TCPIP::host::INSTR", "TCPIP::host::device::INSTR", "GPIB0::28::INSTR" and the like apart.
+[[nodiscard]] Resource parseResource(std::string_view text);
+
+}  // namespace kdx
