@@ -9,40 +9,32 @@
 #include <poll.h>
 #include <sys/signalfd.h>
 #include <vxi11.h>
+#include <CLI/CLI.hpp>
 
 #include <cerrno>
 #include <charconv>
 #include <csignal>
 #include <exception>
 #include <iostream>
-#include <span>
-#include <stdexcept>
 #include <string>
 #include <string_view>
 #include <system_error>
 
 namespace {
 
-constexpr std::string_view kHelp = R"(Usage: kdx-sim [options]
-The virtual signal generator with its stereo/RDS coder, as a VXI-11 network instrument.
+constexpr int kFailed = 1;
+constexpr int kWrongUsage = 2;
 
-  --port N      TCP port of the instrument; any free one if left out
-  --bind ADDR   IPv4 address to listen at; 127.0.0.1 (this machine only) if left out
-  --idn TEXT    the answer to *IDN?
-  --trace       print what happens on every link
-  --help        print this and end
-  --version     print the version and end
-
-Clients open it as TCPIP::ADDR::inst0::INSTR or TCPIP::ADDR::gpib0,N::INSTR (N: 0 to 30). They learn the port from the
+constexpr const char* kDescription =
+    "The virtual signal generator with its stereo/RDS coder, as a VXI-11 network instrument.";
+constexpr const char* kFooter =
+    R"(Clients open it as TCPIP::ADDR::inst0::INSTR or TCPIP::ADDR::gpib0,N::INSTR (N: 0 to 30). They learn the port from the
 port mapper, which kdx-sim is itself when port 111 is free and it may use it; otherwise it registers with the one that
-runs.
-)";
+runs.)";
 
 struct Options {
     kdx::simserver::Vxi11Options server;
     std::string identification = kdx::sim::kDefaultIdentification;
-    bool help = false;
-    bool version = false;
 };
 
 unsigned short portNumber(const std::string& text) {
@@ -50,7 +42,7 @@ unsigned short portNumber(const std::string& text) {
     const char* end = text.data() + text.size();
     const auto read = std::from_chars(text.data(), end, port);
     if (text.empty() || read.ec != std::errc() || read.ptr != end) {
-        throw std::invalid_argument("--port takes a number from 0 to 65535, not \"" + text + "\"");
+        throw CLI::ValidationError("--port", "takes a number from 0 to 65535, not \"" + text + "\"");
     }
     return port;
 }
@@ -59,32 +51,28 @@ void printLine(std::string_view line) {
     std::cout << line << std::endl;
 }
 
-// Throws std::invalid_argument with a message for the user.
-Options readOptions(std::span<char*> arguments) {
-    Options options;
-    for (std::size_t i = 0; i < arguments.size(); ++i) {
-        const std::string option = arguments[i];
-        const auto value = [&]() -> std::string {
-            if (i + 1 == arguments.size()) throw std::invalid_argument(option + " takes a value");
-            return arguments[++i];
-        };
-        if (option == "--port") {
-            options.server.port = portNumber(value());
-        } else if (option == "--bind") {
-            options.server.bindAddress = value();
-        } else if (option == "--idn") {
-            options.identification = value();
-        } else if (option == "--trace") {
-            options.server.trace = printLine;
-        } else if (option == "--help") {
-            options.help = true;
-        } else if (option == "--version") {
-            options.version = true;
-        } else {
-            throw std::invalid_argument("unknown option \"" + option + "\"; --help lists them all");
-        }
-    }
-    return options;
+/// Tells the command line where its options belong. Of an option given twice the last counts.
+void declareOptions(CLI::App& commandLine, Options& options) {
+    const auto takePort = [&](const std::string& text) { options.server.port = portNumber(text); };
+    commandLine
+        .add_option_function<std::string>("--port", takePort, "TCP port of the instrument; any free one if left out")
+        ->type_name("N")
+        ->take_last();
+    commandLine
+        .add_option("--bind", options.server.bindAddress,
+                    "IPv4 address to listen at; 127.0.0.1 (this machine only) if left out")
+        ->type_name("ADDR")
+        ->take_last();
+    commandLine.add_option("--idn", options.identification, "the answer to *IDN?")->type_name("TEXT")->take_last();
+    commandLine.add_flag_callback(
+        "--trace", [&] { options.server.trace = printLine; }, "print what happens on every link");
+    commandLine.set_help_flag("--help", "print this and end");
+    commandLine.set_version_flag("--version", "kdx-sim " KDX_VERSION, "print the version and end");
+    commandLine.footer(kFooter);
+    commandLine.get_formatter()->column_width(16);
+    commandLine.failure_message([](const CLI::App*, const CLI::Error& error) {
+        return std::string("kdx-sim: ") + error.what() + "; --help lists the options\n";
+    });
 }
 
 /// The virtual instrument as the server sees it.
@@ -165,22 +153,14 @@ int serve(const Options& options) {
 }  // namespace
 
 int main(int argc, char** argv) {
-    constexpr int kFailed = 1;
-    constexpr int kWrongUsage = 2;
+    CLI::App commandLine(kDescription, "kdx-sim");
     try {
-        const Options options = readOptions(std::span(argv, static_cast<std::size_t>(argc)).subspan(1));
-        if (options.help) {
-            std::cout << kHelp;
-            return 0;
-        }
-        if (options.version) {
-            printLine("kdx-sim " KDX_VERSION);
-            return 0;
-        }
+        Options options;
+        declareOptions(commandLine, options);
+        commandLine.parse(argc, argv);
         return serve(options);
-    } catch (const std::invalid_argument& error) {
-        std::cerr << "kdx-sim: " << error.what() << "\n";
-        return kWrongUsage;
+    } catch (const CLI::ParseError& end) {  // thrown to print help or version, too
+        return commandLine.exit(end) == 0 ? 0 : kWrongUsage;
     } catch (const std::exception& error) {
         std::cerr << "kdx-sim: " << error.what() << "\n";
         return kFailed;

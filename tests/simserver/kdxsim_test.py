@@ -98,6 +98,18 @@ class Run(unittest.TestCase):
             self.assertEqual(sim.output.splitlines(), ["link 1 opened: gpib0,28", r"link 1 < *IDN?\r\n",
                                                        r"link 1 > ME\n", "link 1 closed"])
 
+    def testTheIdentificationIsAnsweredAsItWasGiven(self):
+        for identification in ("KDX,KDX-X4,7,2.00", "[a,b]", "-7", "--trace", "'x' \"y\"", "%%", "{}"):
+            with self.subTest(identification=identification), KdxSim(PROGRAM, "--idn", identification) as sim:
+                device = pyvisa.ResourceManager("@py").open_resource("TCPIP::127.0.0.1::inst0::INSTR")
+                self.assertEqual(device.query("*IDN?"), identification + "\n")
+                device.close()
+                self.assertEqual(sim.end(), 0)
+
+    def testTheLastOfTwoEqualOptionsCounts(self):
+        with KdxSim(PROGRAM, "--bind", "nonsense", "--bind", "127.0.0.2") as sim:
+            self.assertEqual(sim.address, "127.0.0.2")
+
     def testASecondOneSaysThatClientsWillFindTheFirst(self):
         with KdxSim(PROGRAM) as first, KdxSim(PROGRAM) as second:
             self.assertIn("unknown to any port mapper", second.ready)
