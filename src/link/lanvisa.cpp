@@ -18,8 +18,8 @@ namespace {
 
 using std::chrono::steady_clock;
 
-constexpr std::size_t kSmallestMaxReceive = 1024;    // every device must take as much
-constexpr std::size_t kLargestTransfer = 64 * 1024;  // bytes in one call
+constexpr std::size_t kSmallestMaxReceive = 1024;                 // every device must take as much
+constexpr std::size_t kLargestTransfer = std::size_t{64} * 1024;  // bytes in one call
 
 VisaStatus statusOf(RpcOutcome outcome) {
     switch (outcome) {

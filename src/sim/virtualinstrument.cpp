@@ -146,7 +146,7 @@ void VirtualInstrument::clearStatus() {
 }
 
 std::string VirtualInstrument::takeEvents() {
-    const std::string events = std::to_string(m_events);
+    std::string events = std::to_string(m_events);
     m_events = 0;
     return events;
 }

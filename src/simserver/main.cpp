@@ -150,17 +150,23 @@ int serve(const Options& options) {
     return 0;
 }
 
+int run(int argc, char** argv) {
+    Options options;
+    CLI::App commandLine(kDescription, "kdx-sim");
+    declareOptions(commandLine, options);
+    try {
+        commandLine.parse(argc, argv);
+    } catch (const CLI::ParseError& end) {  // thrown to print help or version, too
+        return commandLine.exit(end) == 0 ? 0 : kWrongUsage;
+    }
+    return serve(options);
+}
+
 }  // namespace
 
 int main(int argc, char** argv) {
-    CLI::App commandLine(kDescription, "kdx-sim");
     try {
-        Options options;
-        declareOptions(commandLine, options);
-        commandLine.parse(argc, argv);
-        return serve(options);
-    } catch (const CLI::ParseError& end) {  // thrown to print help or version, too
-        return commandLine.exit(end) == 0 ? 0 : kWrongUsage;
+        return run(argc, argv);
     } catch (const std::exception& error) {
         std::cerr << "kdx-sim: " << error.what() << "\n";
         return kFailed;

@@ -13,7 +13,7 @@ namespace kdx::simserver {
 namespace {
 
 // A client that does not fetch its replies gets no further calls served once this much is waiting for it.
-constexpr std::size_t kMostUnsent = 1024 * 1024;
+constexpr std::size_t kMostUnsent = std::size_t{1024} * 1024;
 
 void setOption(int socket, int level, int option, int value) {
     setsockopt(socket, level, option, &value, sizeof value);
