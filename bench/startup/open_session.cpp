@@ -9,9 +9,27 @@
 #include "settings/programstate.h"
 #include "sim/simvisa.h"
 #include "sim/virtualinstrument.h"
+#include "station/session.h"
 #include "ui/application.h"
-#include "window/hmenue.h"
 #include "ui/qtdialogs.h"
+#include "ui/ticker.h"
+#include "window/hmenue.h"
+
+namespace {
+
+class CommandCounter final : public kdx::TrafficWatcher {
+public:
+    explicit CommandCounter(kdx::Instrument& instrument) { instrument.addWatcher(*this); }
+    void passed(const kdx::Traffic& traffic) override {
+        if (traffic.kind == kdx::Traffic::Kind::Written) ++m_commands;
+    }
+    [[nodiscard]] int commands() const { return m_commands; }
+
+private:
+    int m_commands = 0;
+};
+
+}  // namespace
 
 int main(int argc, char** argv) {
     if (argc < 2) return 2;
@@ -24,16 +42,16 @@ int main(int argc, char** argv) {
     kdx::QtDialogs dialogs(captions);
     kdx::sim::VirtualInstrument instrument(clock);
     kdx::sim::SimVisa visa(instrument);
-    kdx::HMenue window({visa, state, data, captions, clock, dialogs, QString(), [] {}});
+    kdx::Session session(visa, state, data, captions, clock, [] {});
+    kdx::TickerGroup tickers;
+    kdx::HMenue window({session, state, data, captions, clock, dialogs, tickers, QString(), [] {}});
     window.startUp();
     window.show();
-    int commands = -1;  // "*IDN?" goes out without a pause
-    QObject::connect(&window, &kdx::HMenue::trafficPassed, [&](const kdx::Traffic& traffic) {
-        if (traffic.kind == kdx::Traffic::Kind::Written) ++commands;
-    });
+    CommandCounter counter(session.instrument);
     const auto start = std::chrono::steady_clock::now();
     window.INIT_Taste_Click();
     const std::chrono::duration<double, std::milli> taken = std::chrono::steady_clock::now() - start;
+    const int commands = counter.commands() - 1;  // "*IDN?" goes out without a pause
     std::printf("commands=%d taken_ms=%.1f ratio=%.4f\n", commands, taken.count(), taken.count() / (commands * 50.0));
     return 0;
 }

@@ -20,9 +20,11 @@
 #include "settings/captions.h"
 #include "settings/datafolder.h"
 #include "settings/programstate.h"
+#include "station/session.h"
 #include "ui/application.h"
-#include "window/hmenue.h"
 #include "ui/qtdialogs.h"
+#include "ui/ticker.h"
+#include "window/hmenue.h"
 
 namespace {
 
@@ -55,7 +57,9 @@ int main(int argc, char** argv) {
     kdx::Captions captions(data);
     kdx::QtDialogs dialogs(captions);
     kdx::LanVisa visa;
-    kdx::HMenue window({visa, state, data, captions, clock, dialogs, QString(), [] {}});
+    kdx::Session session(visa, state, data, captions, clock, [] {});
+    kdx::TickerGroup tickers;
+    kdx::HMenue window({session, state, data, captions, clock, dialogs, tickers, QString(), [] {}});
     window.startUp();
     if (argc > 2 && std::strcmp(argv[2], "--count") == 0) {
         printCounts(window);

@@ -6,8 +6,8 @@
 
 namespace kdx {
 
-std::string afListKey(std::string_view kind, int number) {
-    return (kind == kEonAfKind ? "EON_AFB" : "AF_LISTE") + std::to_string(number);
+std::string newOrFurtherList(int number) {
+    return number == 1 ? "N," : "+,";
 }
 
 std::size_t afCount(std::string_view list) {
@@ -24,7 +24,7 @@ std::string rewrittenForMethodB(std::string_view list) {
 
 std::optional<std::string> afValue(std::string_view list, int number, AfMethod method) {
     if (method == AfMethod::B && afCount(list) > kMostAfsOfMethodB) return std::nullopt;
-    return (number == 1 ? "N," : "+,") + (method == AfMethod::B ? rewrittenForMethodB(list) : std::string(list));
+    return newOrFurtherList(number) + (method == AfMethod::B ? rewrittenForMethodB(list) : std::string(list));
 }
 
 std::optional<AfList> splitForDisplay(std::string_view list) {
@@ -57,7 +57,7 @@ bool isAlternativeFrequency(std::string_view text) {
 }
 
 std::string withOneDecimal(std::string_view tuned) {
-    const std::string text(tuned);
+    std::string text(tuned);
     switch (tuned.find('.')) {
         case std::string_view::npos:
             return (text + ".00").substr(0, leadingNumber(tuned) < 100 ? 4 : 5);

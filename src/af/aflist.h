@@ -22,8 +22,8 @@ inline constexpr const char* kEonAfKind = "EON AF";
 
 enum class AfMethod { A, B };
 
-/// The list's key in the data set: "AF_LISTE" or, for the kind "EON AF", "EON_AFB", followed by the number (1 to 5).
-[[nodiscard]] std::string afListKey(std::string_view kind, int number);
+/// What leads the sent list `number` (1 to 5): "N," starts a new set with list 1, "+," adds the others to it.
+[[nodiscard]] std::string newOrFurtherList(int number);
 
 /// How many AFs the list holds: its commas.
 [[nodiscard]] std::size_t afCount(std::string_view list);
@@ -32,8 +32,7 @@ enum class AfMethod { A, B };
 /// T,a1,a2 becomes T,T,a1,T,a2. A list without AFs has no pairs and stays as it is.
 [[nodiscard]] std::string rewrittenForMethodB(std::string_view list);
 
-/// What is sent for list `number` (1 to 5): "N," starts a new set with list 1, "+," adds the others to it. Nothing when
-/// the list has too many AFs for method B.
+/// What is sent for list `number` (1 to 5); nothing when the list has too many AFs for method B.
 [[nodiscard]] std::optional<std::string> afValue(std::string_view list, int number, AfMethod method);
 
 /// A list taken apart for showing it.

@@ -1,9 +1,7 @@
 #include "af/aflistenform.h"
 
-#include "af/aflist.h"
-#include "af/modul2.h"
-#include "settings/captions.h"
-#include "settings/datafolder.h"
+#include "af/aflistset.h"
+#include "settings/profile.h"
 #include "settings/programstate.h"
 #include "ui/clickablelabel.h"
 #include "ui/dialogs.h"
@@ -11,7 +9,6 @@
 
 #include <QBoxLayout>
 #include <QGroupBox>
-#include <QLabel>
 #include <QLineEdit>
 #include <QListWidget>
 #include <QPushButton>
@@ -30,35 +27,26 @@ AF_Listenform::AF_Listenform(const PageContext& with, QWidget* parent) : QDialog
 }
 
 void AF_Listenform::create() {
+    m_book.text(this, {m_with.state.afEditorKind == kEonAfKind ? 165 : 163});
     m_choice = new QGroupBox(this);
     m_content = new QGroupBox(this);
     m_change = new QGroupBox(this);
+    m_book.text(m_choice, {650, "Auswahl"});
+    m_book.text(m_content, {651, "Inhalt"});
+    m_book.text(m_change, {652, "Ändern"});
 
-    AFList_Opt.create("AFList_Opt", m_choice);
-    for (int i = 0; i < kAfLists; ++i) {
-        connect(AFList_Opt[static_cast<std::size_t>(i)], &QRadioButton::clicked, this,
-                [this, i] { AFList_Opt_Click(i); });
-    }
-    m_tunedHeading = new QLabel(m_content);
-    AF_TN = named<ClickableLabel>("AF_TN", m_content);
-    m_tunedHeading->setBuddy(AF_TN);
+    m_view.createOptions("AFList_Opt", 74, m_book, m_choice);
+    m_view.options().onClick(this, &AF_Listenform::AFList_Opt_Click);
+    AF_TN = m_view.createContent<ClickableLabel>({"AF_TN", {653, "Sendefrequenz [MHz]"}},
+                                                 {"AF_List1", {654, "AF [MHz]"}}, m_book, m_content);
+    m_book.tip(AF_TN, {661, "zum Ändern anklicken"});
     connect(AF_TN, &ClickableLabel::clicked, this, &AF_Listenform::AF_TN_Click);
-    m_listHeading = new QLabel(m_content);
-    AF_List1 = named<QListWidget>("AF_List1", m_content);
-    m_listHeading->setBuddy(AF_List1);
+    AF_List1 = m_view.list();
+    createChange();
 
-    m_entryHeading = new QLabel(m_change);
-    Text2 = named<QLineEdit>("Text2", m_change);
-    m_entryHeading->setBuddy(Text2);
-    Command1 = named<QPushButton>("Command1", m_change);
-    connect(Command1, &QPushButton::clicked, this, &AF_Listenform::Command1_Click);
-    AF_OF_add = named<QPushButton>("AF_OF_add", m_change);
-    connect(AF_OF_add, &QPushButton::clicked, this, &AF_Listenform::AF_OF_add_Click);
-    Rem_Freq = named<QPushButton>("Rem_Freq", m_change);
-    connect(Rem_Freq, &QPushButton::clicked, this, &AF_Listenform::Rem_Freq_Click);
-    Uebernahme_Knopf = named<QPushButton>("Uebernahme_Knopf", this);
+    Uebernahme_Knopf = m_book.captioned<QPushButton>("Uebernahme_Knopf", {659, "Über&nehmen"}, this);
     connect(Uebernahme_Knopf, &QPushButton::clicked, this, &AF_Listenform::Uebernahme_Knopf_Click);
-    Ende_Knopf = named<QPushButton>("Ende_Knopf", this);
+    Ende_Knopf = m_book.captioned<QPushButton>("Ende_Knopf", {660, "&Schließen"}, this);
     connect(Ende_Knopf, &QPushButton::clicked, this, &AF_Listenform::Ende_Knopf_Click);
 
     // The enter key in the text box appends and never stores or closes by accident.
@@ -66,25 +54,36 @@ void AF_Listenform::create() {
     Command1->setDefault(true);
 }
 
+void AF_Listenform::createChange() {
+    m_entryHeading = new QLabel(m_change);
+    m_book.text(m_entryHeading, {655, "Frequenz [MHz]"});
+    Text2 = named<QLineEdit>("Text2", m_change);
+    m_entryHeading->setBuddy(Text2);
+    m_book.spokenAs(Text2, m_entryHeading);
+    Command1 = m_book.captioned<QPushButton>("Command1", {656, "&Anhängen"}, m_change);
+    connect(Command1, &QPushButton::clicked, this, &AF_Listenform::Command1_Click);
+    AF_OF_add = m_book.captioned<QPushButton>("AF_OF_add", {657, "Einfügen"}, m_change);
+    m_book.tip(AF_OF_add, {662, "vor der ausgewählten Zeile"});
+    connect(AF_OF_add, &QPushButton::clicked, this, &AF_Listenform::AF_OF_add_Click);
+    Rem_Freq = m_book.captioned<QPushButton>("Rem_Freq", {658, "Löschen"}, m_change);
+    connect(Rem_Freq, &QPushButton::clicked, this, &AF_Listenform::Rem_Freq_Click);
+}
+
 void AF_Listenform::arrange() {
     auto* choice = new QVBoxLayout(m_choice);
     tighten(choice);
-    for (QRadioButton* option : AFList_Opt) choice->addWidget(option);
-    choice->addStretch();
+    m_view.arrangeOptions(choice);
 
     auto* content = new QVBoxLayout(m_content);
     tighten(content);
-    for (QWidget* control : std::initializer_list<QWidget*>{m_tunedHeading, AF_TN, m_listHeading, AF_List1}) {
-        content->addWidget(control);
-    }
+    m_view.arrangeContent(content);
     AF_List1->setMinimumWidth(fontMetrics().horizontalAdvance(QLatin1Char('0')) * 20);
 
     auto* change = new QVBoxLayout(m_change);
     tighten(change);
-    change->addWidget(m_entryHeading);
-    change->addWidget(Text2);
-    change->addWidget(Command1);
-    change->addWidget(AF_OF_add);
+    for (QWidget* control : std::initializer_list<QWidget*>{m_entryHeading, Text2, Command1, AF_OF_add}) {
+        change->addWidget(control);
+    }
     change->addSpacing(2 * kGap);
     change->addWidget(Rem_Freq);
     change->addStretch();
@@ -107,50 +106,22 @@ void AF_Listenform::arrange() {
     window->addLayout(closing);
 }
 
-void AF_Listenform::label() {
-    const Captions& captions = m_with.captions;
-    setWindowTitle(toText(captions.text(m_with.state.afEditorKind == kEonAfKind ? 165 : 163)));
-    for (std::size_t i = 0; i < AFList_Opt.size(); ++i) {
-        AFList_Opt[i]->setText(toText(captions.text(74) + " " + std::to_string(i + 1)));
-    }
-    m_choice->setTitle(toText(captions.own(650, "Auswahl")));
-    m_content->setTitle(toText(captions.own(651, "Inhalt")));
-    m_change->setTitle(toText(captions.own(652, "\xC4ndern")));
-    m_tunedHeading->setText(toText(captions.own(653, "Sendefrequenz [MHz]")));
-    m_listHeading->setText(toText(captions.own(654, "AF [MHz]")));
-    m_entryHeading->setText(toText(captions.own(655, "Frequenz [MHz]")));
-    Command1->setText(toText(captions.own(656, "&Anh\xE4ngen")));
-    AF_OF_add->setText(toText(captions.own(657, "Einf\xFCgen")));
-    Rem_Freq->setText(toText(captions.own(658, "L\xF6schen")));
-    Uebernahme_Knopf->setText(toText(captions.own(659,
-                                                  "\xDC"
-                                                  "ber&nehmen")));
-    Ende_Knopf->setText(toText(captions.own(660,
-                                            "&Schlie\xDF"
-                                            "en")));
-    AF_TN->setToolTip(toText(captions.own(661, "zum \xC4ndern anklicken")));
-    AF_OF_add->setToolTip(toText(captions.own(662, "vor der ausgew\xE4hlten Zeile")));
-    AF_TN->setAccessibleName(m_tunedHeading->text());
-    AF_List1->setAccessibleName(m_listHeading->text());
-    Text2->setAccessibleName(m_entryHeading->text());
-}
-
 void AF_Listenform::Form_Load() {
-    label();
-    AFList_Opt.choose(0);
+    m_book.label(m_with.captions);
+    m_view.options().choose(0);
     AFList_Opt_Click(0);
     Text2->setFocus();
 }
 
 void AF_Listenform::AFList_Opt_Click(int index) {
     // A list without AFs leaves the former one in view, as on the pages: it can so be taken over into a new list.
-    FillAfLists(*AF_List1, *AF_TN, m_with.data.ReadIni("RDS", key(index), dataSetFile(m_with.state.CurrentDataSet)));
+    m_view.show(m_with.profile.read(place(index)));
 }
 
 void AF_Listenform::AF_TN_Click() {
     QString answer = AF_TN->text();
     while (true) {
-        answer = m_with.dialogs.input(toText(m_with.captions.text(162)), toText(m_with.captions.text(161)), answer);
+        answer = m_with.dialogs.input(captionText(m_with.captions, {162}), captionText(m_with.captions, {161}), answer);
         if (answer.isEmpty()) return;
         if (answer.contains(QLatin1Char(','))) {
             refuse(166);
@@ -190,7 +161,7 @@ void AF_Listenform::Uebernahme_Knopf_Click() {
     for (int row = 0; row < AF_List1->count(); ++row) {
         list.frequencies.push_back(toBytes(AF_List1->item(row)->text()));
     }
-    m_with.data.WriteIni("RDS", key(AFList_Opt.chosen()), joined(list), dataSetFile(m_with.state.CurrentDataSet));
+    m_with.profile.write(place(m_view.options().chosen()), joined(list));
     accept();
 }
 
@@ -198,8 +169,8 @@ void AF_Listenform::Ende_Knopf_Click() {
     reject();
 }
 
-std::string AF_Listenform::key(int index) const {
-    return afListKey(m_with.state.afEditorKind, index + 1);
+const Place& AF_Listenform::place(int index) const {
+    return afListPlace(m_with.state.afEditorKind, index + 1);
 }
 
 int AF_Listenform::selectedRow() const {
@@ -214,9 +185,9 @@ QString AF_Listenform::checkedEntry() {
     return {};
 }
 
-void AF_Listenform::refuse(int caption) {
-    m_with.dialogs.message(Dialogs::Icon::Exclamation, toText(m_with.captions.text(161)),
-                           toText(m_with.captions.text(caption)));
+void AF_Listenform::refuse(int reason) {
+    m_with.dialogs.message(Dialogs::Icon::Exclamation, captionText(m_with.captions, {161}),
+                           captionText(m_with.captions, {reason}));
 }
 
 }  // namespace kdx

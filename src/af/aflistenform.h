@@ -1,21 +1,18 @@
 #pragma once
 
-#include "ui/controls.h"
+#include "af/aflistview.h"
 #include "ui/pagecontext.h"
 
 #include <QDialog>
 
-#include <string>
-
 class QGroupBox;
-class QLabel;
 class QLineEdit;
-class QListWidget;
 class QPushButton;
 
 namespace kdx {
 
 class ClickableLabel;
+struct Place;
 
 /// The editor of the five AF lists of the current data set: the own programme's or, when ProgramState::afEditorKind is
 /// "EON AF", the other network's. It edits and stores only. It opens on list 1, in the current language.
@@ -26,8 +23,8 @@ public:
 
 private:
     void create();
+    void createChange();
     void arrange();
-    void label();
     void Form_Load();
     void AFList_Opt_Click(int index);
     void AF_TN_Click();
@@ -37,17 +34,18 @@ private:
     void Uebernahme_Knopf_Click();
     void Ende_Knopf_Click();
 
-    /// Key of the list with that option in the data set.
-    [[nodiscard]] std::string key(int index) const;
+    /// Where the list with that option is kept.
+    [[nodiscard]] const Place& place(int index) const;
     /// Number of the selected row, -1 when none is selected.
     [[nodiscard]] int selectedRow() const;
     /// What `Text2` reads when it is an allowed AF; else says so and gives an empty text.
     [[nodiscard]] QString checkedEntry();
-    void refuse(int caption);
+    void refuse(int reason);
 
     PageContext m_with;
+    CaptionBook m_book;
 
-    OptionArray<5> AFList_Opt;
+    AfListView m_view;                // AFList_Opt, AF_TN, AF_List1
     ClickableLabel* AF_TN = nullptr;  // tuned frequency; a click asks for a new one
     QListWidget* AF_List1 = nullptr;
     QLineEdit* Text2 = nullptr;        // AF to be added, MHz
@@ -60,8 +58,6 @@ private:
     QGroupBox* m_choice = nullptr;
     QGroupBox* m_content = nullptr;
     QGroupBox* m_change = nullptr;
-    QLabel* m_tunedHeading = nullptr;
-    QLabel* m_listHeading = nullptr;
     QLabel* m_entryHeading = nullptr;
 };
 

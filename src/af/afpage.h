@@ -1,37 +1,27 @@
 #pragma once
 
-#include "af/aflist.h"
-#include "ui/controls.h"
-#include "ui/pagecontext.h"
-
-#include <QWidget>
+#include "af/aflistset.h"
+#include "af/aflistview.h"
+#include "ui/page.h"
 
 #include <functional>
-#include <string>
 
 class QGroupBox;
-class QLabel;
-class QListWidget;
 class QPushButton;
 
 namespace kdx {
 
 /// The page "AF Liste": shows one of the five lists of alternative frequencies and sends them all.
-class AfPage : public QWidget {
+class AfPage : public Page {
     Q_OBJECT
 public:
-    AfPage(const PageContext& with, QWidget* parent);
+    /// @param lists those of the data set at work.
+    AfPage(const PageContext& with, AfListSet& lists, QWidget* parent);
 
-    /// Captions every control in the current language; the list shown stays.
-    void label();
-
-    /// Start-up: chooses and shows the list that data set 1 names, method A; nothing is stored or sent.
-    void loadDataSet();
-
-    /// Sends all five lists; nothing at all when list 1 is empty.
-    void Taste_AF_Senden_Click();
-    /// How many commands that sends.
-    [[nodiscard]] int commandsToSend() const;
+    /// Chooses and shows the list that the data set names.
+    void load() override;
+    /// Says so when a list is refused.
+    void stepGoesOut(const Step& step) override;
 
     /// Replaces how the list editor is opened; the call returns when the editor has closed. By default the editor's
     /// window is shown, modal over this one.
@@ -42,18 +32,16 @@ private:
     void arrange();
     void AFList_Opt_Click(int index);
     void AF_Bearbeiten_Click();
-    [[nodiscard]] AfMethod chosenMethod() const;
+    void AFMethod_opt_Click(int index);
+    void Taste_AF_Senden_Click();
     void showList(int index);
-    void sendList(int number, const std::string& list);
-    [[nodiscard]] std::string storedList(int number) const;
+    void refuse(int number);
 
-    PageContext m_with;
+    AfListSet& m_lists;
     std::function<void()> m_openEditor;
 
     QGroupBox* Frame2 = nullptr;
-    OptionArray<5> AFList_Opt;
-    QListWidget* AF_List1 = nullptr;
-    QLabel* AF_TN = nullptr;  // tuned frequency of the list shown
+    AfListView m_view;  // AFList_Opt, AF_TN, AF_List1
     OptionArray<2> AFMethod_opt;
     QPushButton* Taste_AF_Senden = nullptr;
     QPushButton* AF_Bearbeiten = nullptr;
@@ -61,8 +49,6 @@ private:
     QGroupBox* m_choice = nullptr;
     QGroupBox* m_shown = nullptr;
     QGroupBox* m_transmission = nullptr;
-    QLabel* m_tunedHeading = nullptr;
-    QLabel* m_listHeading = nullptr;
 };
 
 }  // namespace kdx

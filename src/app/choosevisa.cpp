@@ -1,10 +1,10 @@
 #include "app/choosevisa.h"
 
+#include "app/options.h"
 #include "link/lanvisa.h"
 #include "link/libraryvisa.h"
 #include "sim/simvisa.h"
 #include "sim/virtualinstrument.h"
-#include "app/options.h"
 
 namespace kdx {
 

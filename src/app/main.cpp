@@ -5,18 +5,21 @@
 #include <string>
 #include <vector>
 
+#include "app/choosevisa.h"
+#include "app/options.h"
+#include "app/platform.h"
 #include "base/clock.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
 #include "settings/dataplace.h"
 #include "settings/programstate.h"
 #include "sim/virtualinstrument.h"
+#include "station/session.h"
 #include "ui/application.h"
-#include "app/choosevisa.h"
-#include "window/hmenue.h"
-#include "app/options.h"
 #include "ui/qtdialogs.h"
 #include "ui/text.h"
+#include "ui/ticker.h"
+#include "window/hmenue.h"
 #include "window/tour.h"
 
 namespace {
@@ -27,28 +30,10 @@ void print(const std::string& line) {
     std::puts(line.c_str());
 }
 
-bool hasDisplay() {
-#ifdef __unix__
-    const auto isSet = [](const char* name) {
-        const char* value = std::getenv(name);
-        return value != nullptr && *value != '\0';
-    };
-    return isSet("DISPLAY") || isSet("WAYLAND_DISPLAY") || isSet("QT_QPA_PLATFORM");
-#else
-    return true;
-#endif
-}
-
-std::filesystem::path programFolder(const char* program) {
-    std::error_code error;
-    const auto self = std::filesystem::canonical("/proc/self/exe", error);
-    return (error ? std::filesystem::absolute(program, error) : self).parent_path();
-}
-
 std::filesystem::path appFolder(const kdx::Options& options, const char* program, std::string& problem) {
     kdx::DataPlaces places;
     if (options.appFolder) places.asked = *options.appFolder;
-    places.program = programFolder(program);
+    places.program = kdx::programFolder(program);
     places.user = kdx::userFolder();
     places.shipped = places.program / ".." / "share" / "kdx-rds";
     if (!std::filesystem::exists(places.shipped / "Daten")) places.shipped = KDX_SHIPPED_DATA;
@@ -77,7 +62,7 @@ int main(int argc, char** argv) {
         std::fprintf(stderr, "kdx-rds: %s\n", link.description.c_str());
         return EXIT_FAILURE;
     }
-    if (!hasDisplay()) {
+    if (!kdx::hasDisplay()) {
         if (!options.tourFolder) {
             std::fputs("kdx-rds: there is no display; --tour DIR works without one.\n", stderr);
             return EXIT_FAILURE;
@@ -98,11 +83,14 @@ int main(int argc, char** argv) {
         dialogs.message(kdx::Dialogs::Icon::Critical, kdx::toText(captions.own(313, "Fehler")),
                         kdx::toText(captions.own(314, "Bei \"%1\": %2")).arg(doing, error));
     });
-    kdx::HMenue window({*link.visa, state, data, captions, clock, dialogs, QString::fromStdString(link.description),
-                        [] { QCoreApplication::quit(); }});
+    const auto end = [] { QCoreApplication::quit(); };
+    kdx::Session session(*link.visa, state, data, captions, clock, end);
+    kdx::TickerGroup tickers;
+    kdx::HMenue window(
+        {session, state, data, captions, clock, dialogs, tickers, QString::fromStdString(link.description), end});
     window.startUp();
     if (options.tourFolder) {
-        return kdx::makeTour(window, tourBoxes, QString::fromStdString(*options.tourFolder), print);
+        return kdx::makeTour(window, session.instrument, tourBoxes, QString::fromStdString(*options.tourFolder), print);
     }
     window.show();
     return kdx::Application::exec();

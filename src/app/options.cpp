@@ -1,60 +1,53 @@
 #include "app/options.h"
 
+#include <CLI/CLI.hpp>
+
+#include <algorithm>
+#include <memory>
+
 namespace kdx {
+
+namespace {
+
+/// The command line's options, which fill `options` when they are read.
+std::unique_ptr<CLI::App> commandLine(Options& options) {
+    auto app =
+        std::make_unique<CLI::App>("Sets up what a KDX signal generator with stereo/RDS coder transmits.", "kdx-rds");
+    app->set_help_flag();  // a flag like the others: without a short form, and it takes no value
+    app->add_option("--app-folder", options.appFolder, "the program's folder; settings and texts are in DIR/Daten")
+        ->type_name("DIR");
+    auto* library =
+        app->add_option("--visa-library", options.visaLibrary, "use this VISA library to reach the instrument")
+            ->type_name("FILE");
+    app->add_flag("--simulate", options.simulate, "use the virtual instrument inside the program")
+        ->disable_flag_override()
+        ->excludes(library);
+    app->add_option("--tour", options.tourFolder,
+                    "open the session, show every page, leave a picture of each in DIR, ask every value back, print "
+                    "the traffic and end; needs no display")
+        ->type_name("DIR");
+    app->add_flag("--version", options.version, "print the version and how instruments are reached")
+        ->disable_flag_override();
+    app->add_flag("--help", options.help, "print this text")->disable_flag_override();
+    return app;
+}
+
+}  // namespace
 
 Options parseOptions(const std::vector<std::string>& arguments) {
     Options options;
-    for (std::size_t i = 0; i < arguments.size(); ++i) {
-        std::string name = arguments[i];
-        std::optional<std::string> attached;
-        if (const auto equals = name.find('='); name.starts_with("--") && equals != std::string::npos) {
-            attached = name.substr(equals + 1);
-            name.erase(equals);
-        }
-        const auto take = [&](std::optional<std::string>& into) {
-            if (attached) {
-                into = *attached;
-            } else if (i + 1 < arguments.size()) {
-                into = arguments[++i];
-            }
-            if (!into || into->empty()) options.error = name + " needs a value";
-        };
-        const auto flag = [&](bool& into) {
-            into = true;
-            if (attached) options.error = name + " takes no value";
-        };
-        if (name == "--app-folder") {
-            take(options.appFolder);
-        } else if (name == "--visa-library") {
-            take(options.visaLibrary);
-        } else if (name == "--tour") {
-            take(options.tourFolder);
-        } else if (name == "--simulate") {
-            flag(options.simulate);
-        } else if (name == "--help") {
-            flag(options.help);
-        } else if (name == "--version") {
-            flag(options.version);
-        } else {
-            options.error = "unknown option " + arguments[i];
-        }
-        if (!options.error.empty()) return options;
+    std::vector<std::string> reversed(arguments.rbegin(), arguments.rend());  // as the library takes them
+    try {
+        commandLine(options)->parse(reversed);
+    } catch (const CLI::ParseError& error) {
+        options.error = error.what();
     }
-    if (options.simulate && options.visaLibrary) options.error = "--simulate and --visa-library exclude each other";
     return options;
 }
 
 std::string helpText() {
-    return "Usage: kdx-rds [options]\n"
-           "Sets up what a KDX signal generator with stereo/RDS coder transmits.\n"
-           "\n"
-           "  --app-folder DIR     the program's folder; settings and texts are in DIR/Daten\n"
-           "  --visa-library FILE  use this VISA library to reach the instrument\n"
-           "  --simulate           use the virtual instrument inside the program\n"
-           "  --tour DIR           open the session, show every page, leave a picture of each in DIR,\n"
-           "                       ask every value back, print the traffic and end\n"
-           "  --version            print the version and how instruments are reached\n"
-           "  --help               print this text\n";
+    Options options;
+    return commandLine(options)->help();
 }
 
 }  // namespace kdx

@@ -6,7 +6,7 @@
 
 namespace kdx {
 
-/// What the command line asked for.
+/// What the command line of kdx-rds asked for.
 struct Options {
     std::optional<std::string> appFolder;    ///< the program's folder; data in its sub-folder "Daten"
     std::optional<std::string> visaLibrary;  ///< the VISA library to load

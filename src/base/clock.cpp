@@ -1,24 +1,11 @@
 #include "base/clock.h"
 
 #include <algorithm>
-#include <ctime>
 #include <thread>
 
+#include "base/localtime.h"
+
 namespace kdx {
-
-namespace {
-
-std::tm localTime(std::time_t time) {
-    std::tm local{};
-#ifdef _WIN32
-    localtime_s(&local, &time);
-#else
-    localtime_r(&time, &local);
-#endif
-    return local;
-}
-
-}  // namespace
 
 double SystemClock::secondsSinceMidnight() const {
     using namespace std::chrono;

@@ -39,6 +39,26 @@ char toCodePage(char16_t codePoint) {
     return byte < 0 ? '?' : static_cast<char>(byte);
 }
 
+std::string fromUtf8(std::string_view text) {
+    std::string bytes;
+    for (std::size_t at = 0; at < text.size();) {
+        const auto lead = static_cast<unsigned char>(text[at]);
+        // How many bytes the character takes: those of 4 lie beyond the code page, like everything malformed.
+        const std::size_t length = lead < 0x80 ? 1 : lead >= 0xF0 ? 4 : lead >= 0xE0 ? 3 : lead >= 0xC2 ? 2 : 0;
+        std::size_t got = length == 0 ? 0 : 1;
+        unsigned code = length == 1 ? lead : lead & (0x7FU >> length);
+        for (; got < length && at + got < text.size(); ++got) {
+            const auto next = static_cast<unsigned char>(text[at + got]);
+            if ((next & 0xC0U) != 0x80) break;
+            code = code << 6U | (next & 0x3FU);
+        }
+        const bool whole = length > 0 && got == length && code <= 0xFFFF;
+        bytes += whole ? toCodePage(static_cast<char16_t>(code)) : '?';
+        at += got == 0 ? 1 : got;
+    }
+    return bytes;
+}
+
 bool inCodePage(char16_t codePoint) {
     return byteOf(codePoint) >= 0;
 }

@@ -12,6 +12,9 @@ namespace kdx {
 /// The Windows-1252 byte of a code point, or '?' where the code page has none.
 [[nodiscard]] char toCodePage(char16_t codePoint);
 
+/// UTF-8 text in Windows-1252; '?' for each character or stray byte that the code page does not have.
+[[nodiscard]] std::string fromUtf8(std::string_view text);
+
 /// True when the code page has a byte for the code point.
 [[nodiscard]] bool inCodePage(char16_t codePoint);
 

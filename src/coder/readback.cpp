@@ -1,12 +1,13 @@
 #include "coder/readback.h"
 
 #include "base/numbers.h"
+#include "settings/captions.h"
 
 namespace kdx {
 
 namespace readback {
 
-std::string decoderInfo(const std::string& answer, const Caption& caption) {
+std::string decoderInfo(const std::string& answer, const Captions& captions) {
     if (answer == "0") return "Mono";
     if (answer == "1") return "Stereo";
     if (answer == "2" || answer == "7") return "NN";
@@ -15,20 +16,20 @@ std::string decoderInfo(const std::string& answer, const Caption& caption) {
     if (answer == "5") return "Stereo compressed";
     // The closing quote belongs to the text as it has always been shown.
     if (answer == "6") return "Stereo compressed Kunstkopf\"";
-    return caption(143);
+    return captions.text(143);
 }
 
-std::string musicSpeech(const std::string& answer, const Caption& caption) {
-    if (answer == "S") return caption(57);
-    if (answer == "M") return caption(56);
-    return answer.empty() ? caption(143) : answer;
+std::string musicSpeech(const std::string& answer, const Captions& captions) {
+    if (answer == "S") return captions.text(57);
+    if (answer == "M") return captions.text(56);
+    return answer.empty() ? captions.text(143) : answer;
 }
 
-std::string preemphasis(const std::string& answer, const Caption& caption) {
-    if (answer == "0") return caption(22);
+std::string preemphasis(const std::string& answer, const Captions& captions) {
+    if (answer == "0") return captions.text(22);
     if (answer == "1") return "50\xB5s";
     if (answer == "2") return "75\xB5s";
-    return answer.empty() ? caption(143) : answer;
+    return answer.empty() ? captions.text(143) : answer;
 }
 
 std::string impedance(const std::string& answer) {
@@ -37,43 +38,42 @@ std::string impedance(const std::string& answer) {
     return {};
 }
 
-std::string ariType(const std::string& answer, const Caption& caption) {
-    if (answer == "0") return caption(193);
+std::string ariType(const std::string& answer, const Captions& captions) {
+    if (answer == "0") return captions.text(193);
     if (answer == "1") return "DK";
     if (answer == "2") return "BK";
     if (answer == "3") return "BK + DK";
-    return answer.empty() ? caption(143) : answer;
+    return answer.empty() ? captions.text(143) : answer;
 }
 
-std::string onOff(const std::string& answer, const Caption& caption) {
-    if (answer == "1") return caption(192);
-    if (answer == "0") return caption(193);
+std::string onOff(const std::string& answer, const Captions& captions) {
+    if (answer == "1") return captions.text(192);
+    if (answer == "0") return captions.text(193);
     return answer;
 }
 
-std::string deviation(const std::string& answer, const Caption& caption) {
+std::string deviation(const std::string& answer, const Captions& captions) {
     if (answer.empty()) return {};
-    return caption(21) + ": " + shortestDecimal(leadingNumber(answer) * 10) + " Hz";
+    return captions.text(21) + ": " + shortestDecimal(leadingNumber(answer) * 10) + " Hz";
 }
 
 }  // namespace readback
 
 namespace {
 
-using readback::Caption;
 using Answers = std::vector<std::string>;
 using Queries = std::vector<Query>;
 
-std::string asItStands(const Answers& answers, const Caption& /*caption*/) {
+std::string asItStands(const Answers& answers, const Captions& /*captions*/) {
     return answers[0];
 }
 
-std::string ari(const Answers& answers, const Caption& caption) {
-    return "ARI " + readback::onOff(answers[0], caption) + "\nARI " + readback::deviation(answers[1], caption) + "\n" +
-           readback::ariType(answers[2], caption) + "\n" + answers[3];
+std::string ari(const Answers& answers, const Captions& captions) {
+    return "ARI " + readback::onOff(answers[0], captions) + "\nARI " + readback::deviation(answers[1], captions) +
+           "\n" + readback::ariType(answers[2], captions) + "\n" + answers[3];
 }
 
-std::string afLists(const Answers& answers, const Caption& /*caption*/) {
+std::string afLists(const Answers& answers, const Captions& /*captions*/) {
     std::string text;
     for (std::size_t i = 0; i < answers.size(); ++i) {
         if (i > 0) text += "\n";
@@ -82,20 +82,20 @@ std::string afLists(const Answers& answers, const Caption& /*caption*/) {
     return text;
 }
 
-std::string fmDeviation(const Answers& answers, const Caption& caption) {
-    return answers[0].empty() ? std::string() : "FM " + readback::deviation(answers[0], caption);
+std::string fmDeviation(const Answers& answers, const Captions& captions) {
+    return answers[0].empty() ? std::string() : "FM " + readback::deviation(answers[0], captions);
 }
 
-std::string pilot(const Answers& answers, const Caption& caption) {
-    return "Pilot " + readback::onOff(answers[0], caption) + "\n" + readback::deviation(answers[1], caption) +
+std::string pilot(const Answers& answers, const Captions& captions) {
+    return "Pilot " + readback::onOff(answers[0], captions) + "\n" + readback::deviation(answers[1], captions) +
            "\nPhase: " + answers[2] + "\xB0";
 }
 
-std::string rds(const Answers& answers, const Caption& caption) {
-    return "RDS " + readback::onOff(answers[0], caption) + "\n" + readback::deviation(answers[1], caption);
+std::string rds(const Answers& answers, const Captions& captions) {
+    return "RDS " + readback::onOff(answers[0], captions) + "\n" + readback::deviation(answers[1], captions);
 }
 
-std::string eon(const Answers& answers, const Caption& /*caption*/) {
+std::string eon(const Answers& answers, const Captions& /*captions*/) {
     std::string text = "EON-PI:  " + answers[0] + " / EON-PS:  " + answers[1] + " / EON-TP:  " + answers[2] +
                        " / EON-TA:  " + answers[3];
     for (std::size_t list = 1; list <= 5; ++list) {
@@ -165,7 +165,7 @@ const std::vector<ReadBack>& readBacks() {
          [](Ask) -> Queries {
              return {{"Freq?", "FREQ"}};
          },
-         [](const Answers& answers, const Caption&) { return answers[0] + " MHz"; }},
+         [](const Answers& answers, const Captions&) { return answers[0] + " MHz"; }},
         {"Command11", "FM Hub ?", 135, false,
          [](Ask) -> Queries {
              return {{"MPX Hub?", "MPX-DEV"}};
@@ -175,12 +175,12 @@ const std::vector<ReadBack>& readBacks() {
          [](Ask) -> Queries {
              return {{"Mod Eingang?", "SRC"}};
          },
-         [](const Answers& answers, const Caption&) { return "Mod Quelle: " + answers[0]; }},
+         [](const Answers& answers, const Captions&) { return "Mod Quelle: " + answers[0]; }},
         {"Command13", "Pre.phase ?", 137, false,
          [](Ask) -> Queries {
              return {{"Preemphasis?", "PRE"}};
          },
-         [](const Answers& answers, const Caption& caption) { return readback::preemphasis(answers[0], caption); }},
+         [](const Answers& answers, const Captions& captions) { return readback::preemphasis(answers[0], captions); }},
         {"Command14", "Pilot-Ton ?", 132, false,
          [](Ask) -> Queries {
              return {{"Pilot?", "PIL"}, {"Pilot Hub?", "PIL-DEV"}, {"Pilot Phase?", "PIL-PH"}};
@@ -205,23 +205,23 @@ const std::vector<ReadBack>& readBacks() {
          [](Ask) -> Queries {
              return {{"Impedanz?", "IMP"}};
          },
-         [](const Answers& answers, const Caption&) { return readback::impedance(answers[0]); }},
+         [](const Answers& answers, const Captions&) { return readback::impedance(answers[0]); }},
         {"Command19", "EON  ?", 121, false, eonQueries, eon},
         {"Command20", "M / S ?", 129, false,
          [](Ask) -> Queries {
              return {{"M/S ?", "MS"}};
          },
-         [](const Answers& answers, const Caption& caption) { return readback::musicSpeech(answers[0], caption); }},
+         [](const Answers& answers, const Captions& captions) { return readback::musicSpeech(answers[0], captions); }},
         {"Command21", "D I ?", 128, false,
          [](Ask) -> Queries {
              return {{"Decoder?", "DI"}};
          },
-         [](const Answers& answers, const Caption& caption) { return readback::decoderInfo(answers[0], caption); }},
+         [](const Answers& answers, const Captions& captions) { return readback::decoderInfo(answers[0], captions); }},
         {"Command22", "Pegel ?", 521, true,
          [](Ask) -> Queries {
              return {{"Pegel?", "POW"}};
          },
-         [](const Answers& answers, const Caption&) { return answers[0] + " dBm"; }},
+         [](const Answers& answers, const Captions&) { return answers[0] + " dBm"; }},
     };
     return all;
 }

@@ -1,26 +1,24 @@
 #pragma once
 
-#include <functional>
 #include <string>
 #include <vector>
 
 namespace kdx {
 
+class Captions;
+
 /// How an answer becomes the text that is shown. Texts are 8-bit Windows-1252; "" stands for a failed read.
 namespace readback {
 
-/// Looks up a caption by its number.
-using Caption = std::function<std::string(int)>;
-
-[[nodiscard]] std::string decoderInfo(const std::string& answer, const Caption& caption);
-[[nodiscard]] std::string musicSpeech(const std::string& answer, const Caption& caption);
-[[nodiscard]] std::string preemphasis(const std::string& answer, const Caption& caption);
+[[nodiscard]] std::string decoderInfo(const std::string& answer, const Captions& captions);
+[[nodiscard]] std::string musicSpeech(const std::string& answer, const Captions& captions);
+[[nodiscard]] std::string preemphasis(const std::string& answer, const Captions& captions);
 [[nodiscard]] std::string impedance(const std::string& answer);
-[[nodiscard]] std::string ariType(const std::string& answer, const Caption& caption);
+[[nodiscard]] std::string ariType(const std::string& answer, const Captions& captions);
 /// "1" is caption 192 (on), "0" 193 (off), any other answer itself: a failed read leaves the place empty.
-[[nodiscard]] std::string onOff(const std::string& answer, const Caption& caption);
+[[nodiscard]] std::string onOff(const std::string& answer, const Captions& captions);
 /// Caption 21, ": ", the answer times 10 and " Hz"; "" for an empty answer.
-[[nodiscard]] std::string deviation(const std::string& answer, const Caption& caption);
+[[nodiscard]] std::string deviation(const std::string& answer, const Captions& captions);
 
 }  // namespace readback
 
@@ -37,7 +35,7 @@ struct ReadBack {
     int caption;         ///< its caption number
     bool generator;      ///< asks the generator itself, not the coder
     std::vector<Query> (*queries)(const std::string& eonIdentifier);
-    std::string (*words)(const std::vector<std::string>& answers, const readback::Caption& caption);
+    std::string (*words)(const std::vector<std::string>& answers, const Captions& captions);
 };
 
 /// All twenty buttons, in the order of their names.

@@ -241,6 +241,10 @@ std::string dateText(const Date& date) {
 
 }  // namespace
 
+bool isParameter(std::string_view key) {
+    return rowOf(key) != nullptr;
+}
+
 std::optional<std::string> composeCommand(std::string_view key, std::string& value, const ParamContext& context) {
     const ParamRow* row = rowOf(key);
     if (row == nullptr) return std::nullopt;
@@ -250,13 +254,8 @@ std::optional<std::string> composeCommand(std::string_view key, std::string& val
     return row->route == Route::Scpi ? command : ":STEREO:DIRECT \"" + command + "\"";
 }
 
-ParamSender::ParamSender(Instrument& instrument, ProgramState& state, Clock& clock,
-                         std::function<std::string()> clockText, std::function<void()> endProgram)
-    : m_instrument(instrument),
-      m_state(state),
-      m_clock(clock),
-      m_clockText(std::move(clockText)),
-      m_endProgram(std::move(endProgram)) {}
+ParamSender::ParamSender(Instrument& instrument, ProgramState& state, Clock& clock, std::function<void()> endProgram)
+    : m_instrument(instrument), m_state(state), m_clock(clock), m_endProgram(std::move(endProgram)) {}
 
 void ParamSender::SendParam(const std::string& key, std::string& value, const std::string& /*extra1*/,
                             const std::string& /*extra2*/, std::int16_t& /*mode*/) {
@@ -265,7 +264,7 @@ void ParamSender::SendParam(const std::string& key, std::string& value, const st
         m_endProgram();
         return;
     }
-    const ParamContext context{m_state.eonIdentifier, m_clockText(), timeText(m_clock.secondsSinceMidnight()),
+    const ParamContext context{m_state.eonIdentifier, m_state.shownClock, timeText(m_clock.secondsSinceMidnight()),
                                dateText(m_clock.today())};
     const std::optional<std::string> command = composeCommand(key, value, context);
     if (!command || m_instrument.isSequenceStopped()) return;

@@ -28,12 +28,14 @@ struct ParamContext {
 [[nodiscard]] std::optional<std::string> composeCommand(std::string_view key, std::string& value,
                                                         const ParamContext& context);
 
+/// Whether the key table has a row for the key.
+[[nodiscard]] bool isParameter(std::string_view key);
+
 /// The single place where a named parameter becomes text for the instrument.
 class ParamSender {
 public:
-    /// @param clockText gives the caption of `Uhr_Zeit`; @param endProgram ends the application at once (key "DS").
-    ParamSender(Instrument& instrument, ProgramState& state, Clock& clock, std::function<std::string()> clockText,
-                std::function<void()> endProgram);
+    /// @param endProgram ends the application at once (key "DS").
+    ParamSender(Instrument& instrument, ProgramState& state, Clock& clock, std::function<void()> endProgram);
 
     /// Composes the command, logs it, waits 50 ms and writes it. Unknown keys and "NFShape Sinus" do nothing at all.
     /// @param value see composeCommand; @param extra1 used by "DS" only; @param extra2 not used;
@@ -50,7 +52,6 @@ private:
     Instrument& m_instrument;
     ProgramState& m_state;
     Clock& m_clock;
-    std::function<std::string()> m_clockText;
     std::function<void()> m_endProgram;
 };
 

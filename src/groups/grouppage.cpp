@@ -1,9 +1,7 @@
 #include "groups/grouppage.h"
 
 #include "groups/sequencelabel.h"
-#include "coder/sendparam.h"
-#include "settings/captions.h"
-#include "settings/datafolder.h"
+#include "groups/settings.h"
 #include "settings/programstate.h"
 #include "ui/controls.h"
 #include "ui/dialogs.h"
@@ -15,22 +13,25 @@
 
 namespace kdx {
 
-GroupPage::GroupPage(const PageContext& with, QWidget* parent) : QWidget(parent), m_with(with) {
+GroupPage::GroupPage(const PageContext& with, GroupSequence& sequence, QWidget* parent)
+    : Page(with, parent), m_sequence(sequence) {
     create();
     arrange();
 }
 
 void GroupPage::create() {
     for (int number = 0; number < kGroups; ++number) {
+        const std::string name = "Gruppe" + std::to_string(number);
         QPushButton*& button = Gruppe[static_cast<std::size_t>(number)];
-        button = named<QPushButton>(("Gruppe" + std::to_string(number)).c_str(), this);
+        button = captioned<QPushButton>(name.c_str(), {81, "", QStringLiteral(" %1").arg(number)}, this);
         connect(button, &QPushButton::clicked, this, [this, number] { Gruppe_Click(number); });
     }
     m_sequenceView = new QScrollArea(this);
+    m_book.spoken(m_sequenceView, {83});
     Label10 = named<SequenceLabel>("Label10", m_sequenceView);
-    newList = named<QPushButton>("newList", this);
+    newList = captioned<QPushButton>("newList", {156}, this);
     connect(newList, &QPushButton::clicked, this, &GroupPage::newList_Click);
-    GS_Senden = named<QPushButton>("GS_Senden", this);
+    GS_Senden = captioned<QPushButton>("GS_Senden", {82}, this);
     connect(GS_Senden, &QPushButton::clicked, this, &GroupPage::GS_Senden_Click);
 }
 
@@ -63,43 +64,40 @@ void GroupPage::arrange() {
 }
 
 void GroupPage::label() {
-    const Captions& captions = m_with.captions;
-    for (int number = 0; number < kGroups; ++number) {
-        Gruppe[static_cast<std::size_t>(number)]->setText(toText(captions.text(81) + " " + std::to_string(number)));
-    }
-    newList->setText(toText(captions.text(156)));
-    GS_Senden->setText(toText(captions.text(82)));
-    m_sequenceView->setAccessibleName(toText(captions.text(83)));
+    Page::label();
     showSequence();
 }
 
-void GroupPage::loadDataSet() {
-    m_with.state.groupCount = 0;
-    m_with.state.group8ACount = 0;
+void GroupPage::load() {
+    countAnew();
     showStored();
 }
 
-void GroupPage::pageOpened() {
+void GroupPage::opened() {
     showStored();
     Gruppe[4]->setEnabled(false);
 }
 
 void GroupPage::Gruppe_Click(int number) {
-    m_groups += groupText(number);
+    m_sequence.groups += groupText(number);
     countUp(m_with.state.groupCount);
     if (number == kTmcGroup) countUp(m_with.state.group8ACount);
     showSequence();
 }
 
 void GroupPage::newList_Click() {
-    m_groups.clear();
-    m_with.state.groupCount = 0;
-    m_with.state.group8ACount = 0;
+    m_sequence.groups.clear();
+    countAnew();
     showSequence();
 }
 
+void GroupPage::countAnew() {
+    m_with.state.groupCount = 0;
+    m_with.state.group8ACount = 0;
+}
+
 void GroupPage::GS_Senden_Click() {
-    if (m_groups.empty()) {
+    if (m_sequence.groups.empty()) {
         m_with.dialogs.message(Dialogs::Icon::Exclamation, QStringLiteral("Group Error"),
                                QStringLiteral("Please select a group!"));
         return;
@@ -110,21 +108,25 @@ void GroupPage::GS_Senden_Click() {
 }
 
 void GroupPage::Gruppenfolge() {
-    if (m_groups.empty()) return;
-    std::string sequence = sequenceToSend(m_groups);
-    m_with.data.WriteIni("RDS", "GR_Folge", sequence + ",", dataSetFile(m_with.state.CurrentDataSet));
-    m_with.params.SendParam("GROUPSEQ", sequence);
+    Steps steps;
+    m_sequence.appendSteps(steps);
+    send(steps);
+}
+
+void GroupPage::stepGoesOut(const Step& step) {
+    constexpr const Setting& kSequence = setting::kGroupSequence;
+    if (step.key == kSequence.sendKey) m_with.profile.write(kSequence.place, step.value + ",");
 }
 
 void GroupPage::showStored() {
-    // Data set 1 whatever set is current, although sending stores in the current one.
-    m_groups = m_with.data.ReadIni("RDS", "GR_FOLGE", dataSetFile("1"));
-    m_with.state.storedGroupSequence = m_groups;
+    // Data set 1 whatever set is at work, although sending stores in the one at work.
+    m_sequence.groups = m_with.profile.read(setting::kShownGroupSequence);
+    m_with.state.storedGroupSequence = m_sequence.groups;
     showSequence();
 }
 
 void GroupPage::showSequence() {
-    Label10->setText(toText(m_with.captions.text(83) + ":" + m_groups));
+    Label10->setText(caption({83}) + QLatin1Char(':') + toText(m_sequence.groups));
 }
 
 }  // namespace kdx

@@ -1,12 +1,9 @@
 #pragma once
 
 #include "groups/groupsequence.h"
-#include "ui/pagecontext.h"
-
-#include <QWidget>
+#include "ui/page.h"
 
 #include <array>
-#include <string>
 
 class QPushButton;
 class QScrollArea;
@@ -16,23 +13,19 @@ namespace kdx {
 class SequenceLabel;
 
 /// The page "Gruppen": composes the order in which the coder sends its groups.
-class GroupPage : public QWidget {
+class GroupPage : public Page {
     Q_OBJECT
 public:
-    GroupPage(const PageContext& with, QWidget* parent);
+    /// @param sequence what is composed; lent.
+    GroupPage(const PageContext& with, GroupSequence& sequence, QWidget* parent);
 
-    /// Captions every control in the current language; the chosen groups stay.
-    void label();
-
+    void label() override;
     /// Start-up: shows the sequence of data set 1; both counters start at 0.
-    void loadDataSet();
-
-    /// The page has been opened: shows the sequence of data set 1 again, in place of what was composed.
-    void pageOpened();
-
-    /// Stores the sequence in the current data set and sends it; does neither without a sequence.
-    void Gruppenfolge();
-    [[nodiscard]] bool hasSequence() const { return !m_groups.empty(); }
+    void load() override;
+    /// Shows the sequence of data set 1 again, in place of what was composed.
+    void opened() override;
+    /// The sequence that goes out is stored in the data set at work.
+    void stepGoesOut(const Step& step) override;
 
 private:
     void create();
@@ -40,11 +33,12 @@ private:
     void Gruppe_Click(int number);  // Gruppe0_Click to Gruppe15_Click
     void newList_Click();
     void GS_Senden_Click();
+    void Gruppenfolge();
+    void countAnew();
     void showStored();
     void showSequence();
 
-    PageContext m_with;
-    std::string m_groups;  ///< what follows the heading and its colon; kept apart, as headings differ in length
+    GroupSequence& m_sequence;
 
     std::array<QPushButton*, kGroups> Gruppe{};  // sixteen buttons of their own: Gruppe0 to Gruppe15
     QPushButton* newList = nullptr;

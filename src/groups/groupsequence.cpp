@@ -2,6 +2,8 @@
 
 #include <limits>
 
+#include "groups/settings.h"
+
 namespace kdx {
 
 std::string groupText(int number) {
@@ -11,6 +13,14 @@ std::string groupText(int number) {
 std::string sequenceToSend(std::string_view groups) {
     // The last character goes whatever it is: a sequence stored by hand without its last comma loses an "A".
     return std::string(groups.substr(0, groups.empty() ? 0 : groups.size() - 1));
+}
+
+void GroupSequence::load(const Profile& profile) {
+    groups = profile.read(setting::kGroupSequence.place);
+}
+
+void GroupSequence::appendSteps(Steps& steps) const {
+    if (!groups.empty()) appendStep(steps, setting::kGroupSequence.sendKey, sequenceToSend(groups));
 }
 
 void countUp(std::int16_t& counter) {

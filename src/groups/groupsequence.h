@@ -4,7 +4,11 @@
 #include <string>
 #include <string_view>
 
+#include "coder/step.h"
+
 namespace kdx {
+
+class Profile;
 
 // A group sequence is the groups in their order, each followed by a comma: "0A,2A,8A,". That is how it is shown after
 // its heading, and how it is stored.
@@ -17,6 +21,15 @@ inline constexpr int kTmcGroup = 8;
 
 /// The sequence as the coder takes it: without its last character, the comma after the last group.
 [[nodiscard]] std::string sequenceToSend(std::string_view groups);
+
+/// The group sequence of a data set.
+struct GroupSequence {
+    std::string groups;  ///< each followed by a comma
+
+    void load(const Profile& profile);
+    /// Adds the sequence; no step without one.
+    void appendSteps(Steps& steps) const;
+};
 
 /// Counts one more; a full counter stays full.
 void countUp(std::int16_t& counter);

@@ -5,6 +5,8 @@
 
 #include "base/clock.h"
 #include "base/numbers.h"
+#include "link/commandsequence.h"
+#include "settings/captions.h"
 #include "settings/datafolder.h"
 #include "settings/programstate.h"
 
@@ -20,8 +22,19 @@ std::string cutAtLineFeed(const std::string& answer) {
 
 }  // namespace
 
-Instrument::Instrument(Visa& visa, ProgramState& state, DataFolder& data, Clock& clock, InterfaceError interfaceError)
-    : m_visa(visa), m_state(state), m_data(data), m_clock(clock), m_interfaceError(std::move(interfaceError)) {}
+VisaStatus Instrument::open(const std::string& kind, const std::string& address) {
+    LastVisaStatus = m_visa.viOpenDefaultRM(DefaultRm);
+    std::string description;  // asked for and not shown; its status takes the place of the manager's
+    LastVisaStatus = m_visa.viStatusDesc(DefaultRm, LastVisaStatus, description);
+    const std::string resource = (kind == "TCPIP" ? "TCPIP::" : "GPIB0::") + address + "::INSTR";
+    LastVisaStatus = m_visa.viOpen(DefaultRm, resource, 0, 0, InstrSession);
+    if (LastVisaStatus == 0) m_state.InstrumentOnline = true;
+    return LastVisaStatus;
+}
+
+void Instrument::close() {
+    LastVisaStatus = m_visa.viClose(InstrSession);
+}
 
 void Instrument::Send2Gen(const std::string& command) {
     if (!m_state.InstrumentOnline || m_sequenceStopped) return;
@@ -46,7 +59,7 @@ std::string Instrument::ReadFromGen() {
 }
 
 void Instrument::WriteLog(std::string_view key, std::string_view value, std::string_view note) {
-    if (m_sequenceStopped || (!m_state.LogEnabled && !m_observer)) return;
+    if (m_sequenceStopped || (!m_state.LogEnabled && m_watchers.empty())) return;
     std::string line = rightmost(std::string(20, ' ').append(key), kLogKeyWidth);
     line.append("= ").append(value);
     if (!note.empty()) line.append("\"").append(note).append("\"");
@@ -71,16 +84,16 @@ std::string Instrument::X4_Abfrage(const std::string& label, const std::string& 
     WriteLog(label, "Answer ", answer);
     if (answer == kReadError) return {};
     // The empty test comes before the cut here, and after it in VRN_Abfrage: a bare line feed shows as empty text.
-    std::string shown = answer.empty() ? key + " " + caption(143) : answer;
+    std::string shown = answer.empty() ? key + " " + m_captions.text(143) : answer;
     shown = cutAtLineFeed(shown);
     if (shown.size() > 1) {
         if (shown[1] == '"') {
-            shown = key + ": " + caption(144) + " | ";  // the coder answered with an empty quoted text
+            shown = key + ": " + m_captions.text(144) + " | ";  // the coder answered with an empty quoted text
         } else {
             shown = shown.substr(1, shown.size() - 2);
         }
     }
-    WriteLog(caption(142), shown, "");
+    WriteLog(m_captions.text(142), shown, "");
     return shown;
 }
 
@@ -93,23 +106,21 @@ std::string Instrument::VRN_Abfrage(const std::string& label, const std::string&
     WriteLog(label, "Answer ", answer);
     if (answer == kReadError) return {};
     std::string shown = cutAtLineFeed(answer);
-    if (shown.empty()) shown = command + " " + caption(143);
-    WriteLog(caption(142), shown, "");
+    if (shown.empty()) shown = command + " " + m_captions.text(143);
+    WriteLog(m_captions.text(142), shown, "");
     return shown;
 }
 
 void Instrument::fail() {
     const bool sequenceRuns = m_sequences > 0;
+    if (!m_interfaceError) return;
     const bool stop = m_interfaceError("Fehler: " + std::to_string(LastVisaStatus), sequenceRuns);
-    m_sequenceStopped = stop && sequenceRuns;
+    if (stop && sequenceRuns) m_sequenceStopped = true;
 }
 
 void Instrument::notify(Traffic::Kind kind, std::string text, VisaStatus status) const {
-    if (m_observer) m_observer({kind, std::move(text), status});
-}
-
-std::string Instrument::caption(int number) const {
-    return m_caption ? m_caption(number) : std::string();
+    const Traffic traffic{kind, std::move(text), status};
+    for (TrafficWatcher* watcher : m_watchers) watcher->passed(traffic);
 }
 
 CommandSequence::CommandSequence(Instrument& instrument) : m_instrument(instrument) {

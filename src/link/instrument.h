@@ -4,11 +4,14 @@
 #include <functional>
 #include <string>
 #include <string_view>
+#include <vector>
 
+#include "link/traffic.h"
 #include "link/visa.h"
 
 namespace kdx {
 
+class Captions;
 class Clock;
 class DataFolder;
 struct ProgramState;
@@ -18,22 +21,32 @@ inline constexpr std::size_t kAnswerLength = 60;
 /// Pause before every command and between a question and its answer.
 inline constexpr std::int16_t kCommandPauseMs = 50;
 
-/// What passed between the program and the instrument, for whoever wants to watch it.
-struct Traffic {
-    enum class Kind { Written, Read, Logged };
-    Kind kind;
-    std::string text;       ///< the command, the answer as read (60 characters) or the log line without its end
-    VisaStatus status = 0;  ///< of the write or read
-};
+inline constexpr const char* kNoSessionAnswer = "Offline";  ///< of ReadFromGen while no session has been opened
+inline constexpr const char* kReadError = "Error";          ///< of ReadFromGen after a failed read; callers compare
 
-/// The command transport: every byte to and from the instrument and every log line passes here.
+/// The instrument session: every byte to and from the instrument and every log line passes here.
 class Instrument {
 public:
     /// Shows one failure: the text ("Fehler: " and the status) for a box titled "Interface Error". While a sequence
     /// runs the user may want to stop it: true then.
     using InterfaceError = std::function<bool(const std::string& text, bool sequenceRuns)>;
 
-    Instrument(Visa& visa, ProgramState& state, DataFolder& data, Clock& clock, InterfaceError interfaceError);
+    /// @param captions gives the query texts 142 ("display"), 143 ("no answer") and 144 ("empty").
+    Instrument(Visa& visa, ProgramState& state, DataFolder& data, const Captions& captions, Clock& clock)
+        : m_visa(visa), m_state(state), m_data(data), m_captions(captions), m_clock(clock) {}
+
+    /// Who shows failures; without one they pass silently.
+    void onFailure(InterfaceError interfaceError) { m_interfaceError = std::move(interfaceError); }
+    void addWatcher(TrafficWatcher& watcher) { m_watchers.push_back(&watcher); }
+    void removeWatcher(TrafficWatcher& watcher) { std::erase(m_watchers, &watcher); }
+
+    /// Opens the session anew, with a resource manager of its own each time.
+    /// @param kind "TCPIP" for the LAN, anything else for GPIB; @param address exactly as typed.
+    /// @returns the status of the opening; with 0 the instrument counts as online from here on.
+    VisaStatus open(const std::string& kind, const std::string& address);
+    /// Closes the session; a failure stays silent. The handle keeps its value and the instrument counts as online
+    /// still: whoever closes keeps commands away from it.
+    void close();
 
     /// Writes the command byte for byte. Does nothing while no session has been opened. Any non-zero status is
     /// reported once; there is no retry.
@@ -57,15 +70,10 @@ public:
     /// Asks the generator for one value; `command` is the header without its question mark.
     std::string VRN_Abfrage(const std::string& label, const std::string& command);
 
-    /// Hears of everything written, read and logged (logged: also while the log file is off).
-    void onTraffic(std::function<void(const Traffic&)> observer) { m_observer = std::move(observer); }
-    /// Where the query texts 142 ("display"), 143 ("no answer") and 144 ("empty") come from.
-    void setCaptionSource(std::function<std::string(int)> captions) { m_caption = std::move(captions); }
-
-    [[nodiscard]] Visa& visa() { return m_visa; }
-
     /// True when the user stopped the running sequence: until it ends nothing is written, read or logged.
     [[nodiscard]] bool isSequenceStopped() const { return m_sequenceStopped; }
+    /// Stops the running sequence, if any.
+    void stopSequence() { m_sequenceStopped = m_sequences > 0; }
 
     VisaHandle DefaultRm = 0;
     VisaHandle InstrSession = 0;  ///< 0 until opened; closing keeps the old value
@@ -77,35 +85,16 @@ private:
 
     void fail();
     void notify(Traffic::Kind kind, std::string text, VisaStatus status = 0) const;
-    [[nodiscard]] std::string caption(int number) const;
 
     Visa& m_visa;
     ProgramState& m_state;
     DataFolder& m_data;
+    const Captions& m_captions;
     Clock& m_clock;
     InterfaceError m_interfaceError;
-    std::function<void(const Traffic&)> m_observer;
-    std::function<std::string(int)> m_caption;
+    std::vector<TrafficWatcher*> m_watchers;
     int m_sequences = 0;
     bool m_sequenceStopped = false;
 };
-
-/// While one of these lives, the commands sent and the values asked belong together: a whole data set, or the questions
-/// of one button. When the instrument has gone away in the middle, the user can stop the rest at the first box.
-class CommandSequence {
-public:
-    explicit CommandSequence(Instrument& instrument);
-    ~CommandSequence();
-    CommandSequence(const CommandSequence&) = delete;
-    CommandSequence& operator=(const CommandSequence&) = delete;
-
-private:
-    Instrument& m_instrument;
-};
-
-/// What ReadFromGen gives while no session has been opened.
-inline constexpr const char* kNoSessionAnswer = "Offline";
-/// What ReadFromGen gives after a failed read; callers compare with it.
-inline constexpr const char* kReadError = "Error";
 
 }  // namespace kdx

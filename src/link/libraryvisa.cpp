@@ -7,27 +7,21 @@
 #include <cstdint>
 #include <filesystem>
 
-#if defined(_WIN32) && !defined(_WIN64)
-#define KDX_VISA_CALL __stdcall
-#else
-#define KDX_VISA_CALL
-#endif
-
 namespace kdx {
 
 namespace {
 
 /// The operations as the VISA standard declares them for C.
 struct Operations {
-    std::int32_t(KDX_VISA_CALL* viOpenDefaultRM)(std::uint32_t* resourceManager);
-    std::int32_t(KDX_VISA_CALL* viOpen)(std::uint32_t resourceManager, char* resource, std::uint32_t accessMode,
-                                        std::uint32_t openTimeout, std::uint32_t* session);
-    std::int32_t(KDX_VISA_CALL* viClose)(std::uint32_t object);
-    std::int32_t(KDX_VISA_CALL* viStatusDesc)(std::uint32_t object, std::int32_t status, char* description);
-    std::int32_t(KDX_VISA_CALL* viWrite)(std::uint32_t session, const unsigned char* bytes, std::uint32_t count,
-                                         std::uint32_t* written);
-    std::int32_t(KDX_VISA_CALL* viRead)(std::uint32_t session, unsigned char* buffer, std::uint32_t size,
-                                        std::uint32_t* count);
+    std::int32_t(KDX_LIBRARY_CALL* viOpenDefaultRM)(std::uint32_t* resourceManager);
+    std::int32_t(KDX_LIBRARY_CALL* viOpen)(std::uint32_t resourceManager, char* resource, std::uint32_t accessMode,
+                                           std::uint32_t openTimeout, std::uint32_t* session);
+    std::int32_t(KDX_LIBRARY_CALL* viClose)(std::uint32_t object);
+    std::int32_t(KDX_LIBRARY_CALL* viStatusDesc)(std::uint32_t object, std::int32_t status, char* description);
+    std::int32_t(KDX_LIBRARY_CALL* viWrite)(std::uint32_t session, const unsigned char* bytes, std::uint32_t count,
+                                            std::uint32_t* written);
+    std::int32_t(KDX_LIBRARY_CALL* viRead)(std::uint32_t session, unsigned char* buffer, std::uint32_t size,
+                                           std::uint32_t* count);
 };
 
 std::int32_t atMost(std::uint32_t count, std::size_t limit) {
@@ -124,16 +118,6 @@ std::filesystem::path asFile(const std::string& name) {
 }
 
 }  // namespace
-
-std::vector<std::string> usualVisaLibraryNames() {
-#ifdef _WIN64
-    return {"visa64.dll", "VISA32.DLL"};
-#elif defined(_WIN32)
-    return {"VISA32.DLL"};
-#else
-    return {"libvisa.so", "libvisa.so.0", "libktvisa32.so", "libiovisa.so"};
-#endif
-}
 
 VisaLibrary loadFirstVisaLibrary(std::span<const std::string> names) {
     VisaLibrary result;

@@ -17,9 +17,6 @@ struct VisaLibrary {
     std::string reason;
 };
 
-/// The file names under which VISA libraries are installed on this system, in the order in which they are tried.
-std::vector<std::string> usualVisaLibraryNames();
-
 /// Loads the first of these libraries that can be loaded and has all six operations.
 VisaLibrary loadFirstVisaLibrary(std::span<const std::string> names);
 

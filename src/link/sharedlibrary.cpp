@@ -13,6 +13,11 @@ namespace kdx {
 
 #ifdef _WIN32
 
+std::vector<std::string> usualVisaLibraryNames() {
+    return sizeof(void*) == 8 ? std::vector<std::string>{"visa64.dll", "VISA32.DLL"}
+                              : std::vector<std::string>{"VISA32.DLL"};
+}
+
 std::unique_ptr<SharedLibrary> SharedLibrary::load(const std::filesystem::path& file, std::string& reason) {
     if (HMODULE handle = LoadLibraryW(file.c_str())) return std::unique_ptr<SharedLibrary>(new SharedLibrary(handle));
     reason = std::system_category().message(static_cast<int>(GetLastError()));
@@ -34,6 +39,10 @@ std::string SharedLibrary::file() const {
 }
 
 #else
+
+std::vector<std::string> usualVisaLibraryNames() {
+    return {"libvisa.so", "libvisa.so.0", "libktvisa32.so", "libiovisa.so"};
+}
 
 std::unique_ptr<SharedLibrary> SharedLibrary::load(const std::filesystem::path& file, std::string& reason) {
     // All at once: a library that lacks something itself must fail here and not in the middle of a measurement.

@@ -3,8 +3,19 @@
 #include <filesystem>
 #include <memory>
 #include <string>
+#include <vector>
+
+/// How functions of the system's libraries are called.
+#if defined(_WIN32) && !defined(_WIN64)
+#define KDX_LIBRARY_CALL __stdcall
+#else
+#define KDX_LIBRARY_CALL
+#endif
 
 namespace kdx {
+
+/// The file names under which VISA libraries are installed on this system, in the order in which they are tried.
+[[nodiscard]] std::vector<std::string> usualVisaLibraryNames();
 
 /// A library loaded at run time; it stays loaded as long as this object lives.
 class SharedLibrary {

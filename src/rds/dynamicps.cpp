@@ -11,9 +11,9 @@
 #include "base/clock.h"
 #include "base/numbers.h"
 #include "coder/sendparam.h"
-#include "settings/captions.h"
-#include "settings/datafolder.h"
-#include "ui/named.h"
+#include "rds/programme.h"
+#include "rds/settings.h"
+#include "ui/caption.h"
 #include "ui/pictureswitch.h"
 #include "ui/statusrow.h"
 #include "ui/text.h"
@@ -23,8 +23,6 @@ namespace kdx {
 
 namespace {
 
-constexpr std::size_t kPsLength = 8;
-constexpr int kMostPages = 9;
 constexpr std::int16_t kStopPauseMs = 1000;
 
 /// Toggle, scroll, page mode in this order: the first click ticks the box as its tool tip says, the third, greyed
@@ -48,50 +46,21 @@ protected:
 
 }  // namespace
 
-std::string nextScrollPs(DynamicPsRecord& record, const std::string& radiotext) {
-    if (record.position > record.length) record.position = 0;
-    ++record.position;
-    record.length = static_cast<int>(radiotext.size());
-    const std::string field = radiotext + std::string(kPsLength, ' ');
-    const auto start = static_cast<std::size_t>(record.position - 1);
-    return start < field.size() ? field.substr(start, kPsLength) : std::string();
-}
-
-std::string nextTogglePs(DynamicPsRecord& record, const std::string& typedPs) {
-    record.ps = record.ps == kPsMarker ? typedPs : kPsMarker;
-    return record.ps;
-}
-
-std::string nextPagePs(DynamicPsRecord& record, const std::string& radiotext) {
-    record.length = static_cast<int>(radiotext.size() / kPsLength);
-    // Pages 0 to that number would be cut out: a tenth has no place.
-    if (record.length >= kMostPages) {
-        throw std::out_of_range("Subscript out of range: the pages of a radiotext of 72 characters or more");
-    }
-    // The pages are not used any further: this mode blanks the PS on every step and is left exactly so.
-    return {};
-}
-
-DynamicPs::DynamicPs(const PageContext& with, std::function<std::string()> typedPs,
-                     std::function<std::string()> radiotext, QWidget* page)
-    : QObject(page), m_with(with), m_typedPs(std::move(typedPs)), m_radiotext(std::move(radiotext)) {
-    PS_A_Label = named<QLabel>("PS_A_Label", page);
+DynamicPs::DynamicPs(const PageContext& with, const Programme& programme, std::function<std::string()> typedPs,
+                     CaptionBook& book, QWidget* page)
+    : QObject(page), m_with(with), m_programme(programme), m_typedPs(std::move(typedPs)) {
+    PS_A_Label = book.captioned<QLabel>("PS_A_Label", {390, "PS dyn."}, page);
     Taste_PS_Auto = named<PictureSwitch>("Taste_PS_Auto", with.data, page);
-    connect(Taste_PS_Auto, &PictureSwitch::clicked, this, &DynamicPs::Taste_PS_Auto_Click);
+    book.spokenAs(Taste_PS_Auto, PS_A_Label);
     PS_A_Label->setBuddy(Taste_PS_Auto);
-    PS_dyn_Check = named<ModeBox>("PS_dyn_Check", page);
+    connect(Taste_PS_Auto, &PictureSwitch::clicked, this, &DynamicPs::Taste_PS_Auto_Click);
+    PS_dyn_Check = book.captioned<ModeBox>("PS_dyn_Check", {391, "Serial"}, page);
+    book.tip(PS_dyn_Check, {392, "unchecked:  PS toggles. / checked: PS scrolls"});
 
-    PS_Timer = named<Ticker>("PS_Timer", this);
+    PS_Timer = named<Ticker>("PS_Timer", with.tickers, this);
     PS_Timer->setPeriod(2500);
     PS_Timer->setEnabled(true);
     connect(PS_Timer, &QTimer::timeout, this, &DynamicPs::PS_Timer_Timer);
-}
-
-void DynamicPs::label() {
-    PS_A_Label->setText(toText(m_with.captions.own(390, "PS dyn.")));
-    Taste_PS_Auto->setAccessibleName(PS_A_Label->text());
-    PS_dyn_Check->setText(toText(m_with.captions.own(391, "Serial")));
-    PS_dyn_Check->setToolTip(toText(m_with.captions.own(392, "unchecked:  PS toggles. / checked: PS scrolls")));
 }
 
 void DynamicPs::showStopped() {
@@ -100,7 +69,7 @@ void DynamicPs::showStopped() {
 
 void DynamicPs::Taste_PS_Auto_Click() {
     if (!m_running) {
-        const double interval = leadingNumber(m_with.data.ReadIni("RDS", "PS_Dyn", kGeneralSettings));
+        const double interval = leadingNumber(m_with.profile.read(setting::kDynamicPsInterval));
         PS_Timer->setPeriod(std::clamp(interval, 0.0, double{Ticker::kLongestInterval}));
         Taste_PS_Auto->showState(true);
         m_running = true;
@@ -127,7 +96,7 @@ void DynamicPs::PS_Timer_Timer() {
         if (std::exchange(m_failureTold, true)) return;
         throw;
     }
-    m_with.params.SendParam("PS", ps);
+    m_with.params.SendParam(setting::kPs.sendKey, ps);
     // A click that came in meanwhile may stop the steps: it is heard before the typed PS is looked at. The timer's
     // own next tick is not let in, however short its interval is.
     QCoreApplication::processEvents();
@@ -141,9 +110,9 @@ std::string DynamicPs::nextStep() {
     std::string ps;
     switch (PS_dyn_Check->checkState()) {
         case Qt::PartiallyChecked:
-            return nextPagePs(m_record, m_radiotext());
+            return nextPagePs(m_record, m_programme.radiotext);
         case Qt::Checked:
-            ps = nextScrollPs(m_record, m_radiotext());
+            ps = nextScrollPs(m_record, m_programme.radiotext);
             break;
         case Qt::Unchecked:
             ps = nextTogglePs(m_record, m_typedPs());
@@ -155,7 +124,7 @@ std::string DynamicPs::nextStep() {
 
 void DynamicPs::restoreTypedPs() {
     m_with.status.show(StatusSlot::Ps, m_typedPs());
-    m_with.params.SendParam("PS", toBytes(m_with.status.text(StatusSlot::Ps)));
+    m_with.params.SendParam(setting::kPs.sendKey, toBytes(m_with.status.text(StatusSlot::Ps)));
 }
 
 }  // namespace kdx

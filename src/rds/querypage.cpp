@@ -2,15 +2,13 @@
 
 #include <QFrame>
 #include <QGridLayout>
-#include <QGroupBox>
 #include <QLabel>
 #include <QPushButton>
 
 #include <array>
 
-#include "link/instrument.h"
 #include "coder/readback.h"
-#include "settings/captions.h"
+#include "link/commandsequence.h"
 #include "settings/programstate.h"
 #include "ui/controls.h"
 #include "ui/text.h"
@@ -31,13 +29,18 @@ constexpr std::array kOrder = {2,  3,  4,  17, 18,   // PS, PI, PTY, M/S, DI
 
 }  // namespace
 
-QueryPage::QueryPage(const PageContext& with, QWidget* parent) : QWidget(parent), m_with(with) {
+QueryPage::QueryPage(const PageContext& with, QWidget* parent) : Page(with, parent) {
+    create();
+    arrange();
+}
+
+void QueryPage::create() {
     for (const ReadBack& readBack : readBacks()) {
-        auto* button = named<QPushButton>(readBack.button, this);
+        auto* button = captioned<QPushButton>(readBack.button, {readBack.caption, readBack.design}, this);
         connect(button, &QPushButton::clicked, this, [this, &readBack] { ask(readBack); });
         m_buttons.push_back(button);
     }
-    gelesen = named<QLabel>("gelesen", this);
+    gelesen = captioned<QLabel>("gelesen", {139}, this);
     gelesen->setTextFormat(Qt::PlainText);
     gelesen->setFrameStyle(QFrame::Panel | QFrame::Sunken);
     gelesen->setAlignment(Qt::AlignLeft | Qt::AlignTop);
@@ -48,7 +51,14 @@ QueryPage::QueryPage(const PageContext& with, QWidget* parent) : QWidget(parent)
     larger.setPointSizeF(1.2 * larger.pointSizeF());  // read from a distance, with the hands at the instrument
     gelesen->setFont(larger);
     gelesen->setMinimumHeight(gelesen->fontMetrics().lineSpacing() * 10 + 16);
+}
 
+void QueryPage::arrange() {
+    const auto line = [this] {
+        auto* separator = new QFrame(this);
+        separator->setFrameStyle(QFrame::HLine | QFrame::Sunken);
+        return separator;
+    };
     auto* grid = new QGridLayout;
     grid->setSpacing(kGap);
     int row = 0;
@@ -59,35 +69,20 @@ QueryPage::QueryPage(const PageContext& with, QWidget* parent) : QWidget(parent)
         grid->addWidget(button, row, column);
         if (previous != nullptr) setTabOrder(previous, button);
         previous = button;
-        if (++column == kColumns) {
-            column = 0;
-            if (++row == kCoderRows) {
-                auto* line = new QFrame(this);
-                line->setFrameStyle(QFrame::HLine | QFrame::Sunken);
-                grid->addWidget(line, row++, 0, 1, kColumns);
-            }
-        }
+        if (++column < kColumns) continue;
+        column = 0;
+        if (++row == kCoderRows) grid->addWidget(line(), row++, 0, 1, kColumns);
     }
-    auto* line = new QFrame(this);
-    line->setFrameStyle(QFrame::HLine | QFrame::Sunken);
     auto* page = new QVBoxLayout(this);
     tighten(page, 8);
     page->addLayout(grid);
-    page->addWidget(line);
+    page->addWidget(line());
     page->addWidget(gelesen, 1);
 }
 
 void QueryPage::label() {
-    for (std::size_t i = 0; i < m_buttons.size(); ++i) {
-        const ReadBack& readBack = readBacks()[i];
-        m_buttons[i]->setText(toText(readBack.caption < 300 ? m_with.captions.text(readBack.caption)
-                                                            : m_with.captions.own(readBack.caption, readBack.design)));
-    }
-    if (m_asked == nullptr) {
-        gelesen->setText(toText(m_with.captions.text(139)));
-    } else {
-        showAnswers();  // the same answers in the words of the new language
-    }
+    Page::label();
+    if (m_asked != nullptr) showAnswers();
 }
 
 void QueryPage::Fragen_Schalter(bool on) {
@@ -107,7 +102,7 @@ void QueryPage::ask(const ReadBack& readBack) {
 }
 
 void QueryPage::showAnswers() {
-    gelesen->setText(toText(m_asked->words(m_answers, [this](int number) { return m_with.captions.text(number); })));
+    gelesen->setText(toText(m_asked->words(m_answers, m_with.captions)));
 }
 
 }  // namespace kdx

@@ -1,11 +1,9 @@
 #pragma once
 
-#include <QWidget>
-
-#include <string>
+#include <optional>
 
 #include "ui/controls.h"
-#include "ui/pagecontext.h"
+#include "ui/page.h"
 
 class QCheckBox;
 class QComboBox;
@@ -21,47 +19,26 @@ class DynamicPs;
 class PictureSwitch;
 class TaFrame;
 class Ticker;
+struct Programme;
 
 /// The page "R D S": programme service name, identification and type, traffic flags, music/speech, decoder
 /// information, radiotext and clock time.
-class RdsPage : public QWidget {
+class RdsPage : public Page {
     Q_OBJECT
 public:
-    RdsPage(const PageContext& with, QWidget* parent);
+    /// @param programme the own programme of the data set; lent.
+    RdsPage(const PageContext& with, Programme& programme, QWidget* parent);
 
-    /// Captions everything in the current language; entries, times and indicators keep their values.
-    void label();
-    /// Fills the programme type list in the current language and standard and selects the one stored in data set 1.
-    void fillProgrammeTypes();
-
-    /// Start-up: duration and period of the traffic announcements.
-    void loadTaSettings();
-    /// Start-up: PS, PI, radiotext, music/speech and decoder information of data set 1; nothing is sent or stored.
-    void loadDataSet();
-    /// Start-up: the programme type of data set 1 and its indicator.
-    void loadProgrammeType();
-    void Zeit_Taste_Click();
-
-    /// Sends the traffic programme and traffic announcement flags as the window shows them.
-    void sendTrafficFlags();
-    /// Sends PI, PS, music/speech, radiotext or programme type as they stand.
-    void sendPi();
-    void sendPs();
-    void sendMusicSpeech();
-    void sendRadiotext();
-    void sendProgrammeType();
-
-    /// Caption of `Uhr_Zeit`: the time that is sent to the coder.
-    [[nodiscard]] std::string clockText() const;
+    /// Fills the programme type list anew as well, and selects the type stored in data set 1.
+    void label() override;
+    /// The first time the clock is switched on.
+    void load() override;
+    void stepGoesOut(const Step& step) override;
 
 private:
-    // In the order in which the tab key walks the page.
-    void createServiceControls();
-    void createTraffic();
-    void createMusicSpeech();
-    void createClock();
-    void createDecoderInfo();
-    void createRadiotext();
+    void create();
+    void createService();
+    QPushButton* sendButton(const char* name, const char* what, QLineEdit* entry, QWidget* parent);
     void arrange();
 
     void PS_Taste_Click();
@@ -71,15 +48,21 @@ private:
     void Check1_Click();
     void MS_opt_Click(int index);
     void DI_Opt_Click(int index);
+    void RT_Text1_Change();
     void RT_Taste1_Click();
     void RT_clear1_Click();
+    void Zeit_Taste_Click();
     void Timer1_Timer();
     void Uhr_Zeit_DblClick();
 
-    void store(const char* key, const std::string& value);
+    void fillProgrammeTypes();
     void showMusicSpeech();
-    void showTrafficProgramme();
+    void setTrafficProgramme(bool on);
+    void showTrafficProgramme(bool on);
+    void showClock(const QString& text);
     [[nodiscard]] QString pcTime() const;
+
+    Programme& m_programme;
 
     QLabel* PS_Label = nullptr;
     QLineEdit* PS_T = nullptr;
@@ -89,28 +72,27 @@ private:
     QPushButton* Command3 = nullptr;  // sends the PI
     QLabel* Label1 = nullptr;         // heading of the programme type list
     QComboBox* PTY_Combo1 = nullptr;
-    QCheckBox* Check1 = nullptr;  // traffic programme (TP)
-    QLabel* Image1 = nullptr;     // picture of the page
-    TaFrame* m_ta = nullptr;
     DynamicPs* m_dynamicPs = nullptr;
-
+    QCheckBox* Check1 = nullptr;  // traffic programme (TP)
+    TaFrame* m_ta = nullptr;
+    QLabel* Image1 = nullptr;  // picture of the page
     QGroupBox* MS_Frame = nullptr;
     OptionArray<2> MS_opt;
+    QGroupBox* Time_Frame = nullptr;
+    PictureSwitch* Zeit_Taste = nullptr;
+    ClickableLabel* Uhr_Zeit = nullptr;
+    Ticker* Timer1 = nullptr;  // sends the clock
     QGroupBox* DI_Frame = nullptr;
     OptionArray<16> DI_Opt;
     QGroupBox* RT_Frame = nullptr;
     QLineEdit* RT_Text1 = nullptr;
     QPushButton* RT_Taste1 = nullptr;
     QPushButton* RT_clear1 = nullptr;
-    QGroupBox* Time_Frame = nullptr;
-    PictureSwitch* Zeit_Taste = nullptr;
-    ClickableLabel* Uhr_Zeit = nullptr;
-    Ticker* Timer1 = nullptr;  // sends the clock
 
-    PageContext m_with;
+    bool m_loaded = false;
     bool m_clockOn = false;
-    bool m_clockShowsWord = true;  ///< `Uhr_Zeit` shows the off word, not a time
-    bool m_trafficProgrammeShown = false;
+    bool m_clockShowsWord = true;                 ///< `Uhr_Zeit` shows the off word, not a time
+    std::optional<bool> m_shownTrafficProgramme;  ///< what the TP indicator says; nothing at first
 };
 
 }  // namespace kdx

@@ -1,27 +1,26 @@
 #pragma once
 
-#include <QWidget>
-
 #include <array>
 
-#include "ui/pagecontext.h"
+#include "ui/page.h"
 
 class QPushButton;
 
 namespace kdx {
 
 /// The page "Speichern": five buttons that save the coder's present state in one of its own memories.
-class StorePage : public QWidget {
+class StorePage : public Page {
     Q_OBJECT
 public:
     StorePage(const PageContext& with, QWidget* parent);
-    void label();
 
 private:
+    void create();
+    void arrange();
+
     void Store_Taste_Click(int index);
 
     std::array<QPushButton*, 5> Store_Taste{};
-    PageContext m_with;
 };
 
 }  // namespace kdx

@@ -2,6 +2,7 @@
 
 #include <QCheckBox>
 #include <QGridLayout>
+#include <QGroupBox>
 #include <QLabel>
 #include <QPushButton>
 
@@ -10,12 +11,10 @@
 #include "base/clock.h"
 #include "base/numbers.h"
 #include "coder/sendparam.h"
-#include "settings/captions.h"
-#include "settings/datafolder.h"
+#include "rds/programme.h"
+#include "rds/settings.h"
 #include "ui/dialogs.h"
-#include "ui/named.h"
 #include "ui/statusrow.h"
-#include "ui/text.h"
 #include "ui/ticker.h"
 
 namespace kdx {
@@ -27,62 +26,72 @@ constexpr int kLongestDuration = 600;
 constexpr int kShortestPeriod = 2;
 constexpr int kLongestPeriod = 3600;
 
-/// A scroll bar that acts where it comes to rest, not on the way; `follow` hears of the way.
-template <typename Follow, typename Change>
-QScrollBar* timeBar(const char* name, TaFrame* frame, int shortest, int longest, Follow follow, Change change) {
-    auto* bar = named<QScrollBar>(name, Qt::Horizontal, frame);
+/// A scroll bar that acts where it comes to rest, not on the way.
+QScrollBar* timeBar(const char* name, QWidget* parent, int shortest, int longest) {
+    auto* bar = named<QScrollBar>(name, Qt::Horizontal, parent);
     bar->setRange(shortest, longest);
     bar->setPageStep(10);
     bar->setTracking(false);
     bar->setFocusPolicy(Qt::StrongFocus);
     bar->setMinimumWidth(100);
-    QObject::connect(bar, &QScrollBar::sliderMoved, frame, follow);
-    QObject::connect(bar, &QScrollBar::valueChanged, frame, change);
     return bar;
 }
 
 }  // namespace
 
-TaFrame::TaFrame(const PageContext& with, std::function<bool()> trafficProgramme, QWidget* parent)
-    : QGroupBox(parent), m_with(with), m_trafficProgramme(std::move(trafficProgramme)) {
-    setObjectName(QStringLiteral("Frame1"));
+TaFrame::TaFrame(const PageContext& with, Programme& programme, QWidget* parent)
+    : Page(with, parent), m_programme(programme) {
+    create();
+    arrange();
+}
 
-    TA_Check = named<QCheckBox>("TA_Check", this);
+void TaFrame::create() {
+    Frame1 = captioned<QGroupBox>("Frame1", {47}, this);
+
+    TA_Check = captioned<QCheckBox>("TA_Check", {381, "TA on / off"}, Frame1);
     TA_Check->setEnabled(false);
     connect(TA_Check, &QCheckBox::clicked, this, &TaFrame::TA_Check_Click);
-
-    TA_EON_Hilfe = named<QPushButton>("TA_EON_Hilfe", this);
+    TA_EON_Hilfe = captioned<QPushButton>("TA_EON_Hilfe", {385, "EON ?"}, Frame1);
     connect(TA_EON_Hilfe, &QPushButton::clicked, this, &TaFrame::TA_EON_Hilfe_Click);
 
-    TA_Option.create("TA_Option", this);
+    TA_Option.create("TA_Option", Frame1);
+    TA_Option.onClick(this, &TaFrame::TA_Option_Click);
     TA_Option.choose(0);
     TA_Option[1]->setEnabled(false);
-    for (int i = 0; i < 2; ++i) {
-        connect(TA_Option[static_cast<std::size_t>(i)], &QRadioButton::clicked, this,
-                [this, i] { TA_Option_Click(i); });
-    }
+    m_book.text(TA_Option[0], {48});
+    m_book.tip(TA_Option[0], {382, "TA Single"});
+    m_book.text(TA_Option[1], {383, "&Automatisch"});
+    m_book.tip(TA_Option[1], {384, "TA Repetition"});
 
-    TA_HScroll = timeBar("TA_HScroll", this, kShortestDuration, kLongestDuration, &TaFrame::showDuration,
-                         &TaFrame::TA_HScroll_Change);
-    TA_Zeit_Label = named<QLabel>("TA_Zeit_Label", this);
-    TA_Rep_HScroll = timeBar("TA_Rep_HScroll", this, kShortestPeriod, kLongestPeriod, &TaFrame::showPeriod,
-                             &TaFrame::TA_Rep_HScroll_Change);
-    TA_Rep_Label = named<QLabel>("TA_Rep_Label", this);
+    m_durationTitle = new QLabel(Frame1);
+    m_book.text(m_durationTitle, {386, "Dauer"});
+    TA_HScroll = timeBar("TA_HScroll", Frame1, kShortestDuration, kLongestDuration);
+    m_book.spokenAs(TA_HScroll, m_durationTitle);
+    m_durationTitle->setBuddy(TA_HScroll);
+    connect(TA_HScroll, &QScrollBar::sliderMoved, this, &TaFrame::showDuration);
+    connect(TA_HScroll, &QScrollBar::valueChanged, this, &TaFrame::TA_HScroll_Change);
+    TA_Zeit_Label = named<QLabel>("TA_Zeit_Label", Frame1);
 
-    TA_Timer = named<Ticker>("TA_Timer", this);
+    m_periodTitle = new QLabel(Frame1);
+    m_book.text(m_periodTitle, {387, "Wiederholung"});
+    TA_Rep_HScroll = timeBar("TA_Rep_HScroll", Frame1, kShortestPeriod, kLongestPeriod);
+    m_book.spokenAs(TA_Rep_HScroll, m_periodTitle);
+    m_periodTitle->setBuddy(TA_Rep_HScroll);
+    connect(TA_Rep_HScroll, &QScrollBar::sliderMoved, this, &TaFrame::showPeriod);
+    connect(TA_Rep_HScroll, &QScrollBar::valueChanged, this, &TaFrame::TA_Rep_HScroll_Change);
+    TA_Rep_Label = named<QLabel>("TA_Rep_Label", Frame1);
+
+    TA_Timer = named<Ticker>("TA_Timer", m_with.tickers, this);
     TA_Timer->setPeriod(333);
     TA_Timer->setEnabled(true);
     connect(TA_Timer, &QTimer::timeout, this, &TaFrame::TA_Timer_Timer);
-    TA_Rep_Timer = named<Ticker>("TA_Rep_Timer", this);
+    TA_Rep_Timer = named<Ticker>("TA_Rep_Timer", m_with.tickers, this);
     TA_Rep_Timer->setPeriod(500);
     connect(TA_Rep_Timer, &QTimer::timeout, this, &TaFrame::TA_Rep_Timer_Timer);
+}
 
-    m_durationTitle = new QLabel(this);
-    m_durationTitle->setBuddy(TA_HScroll);
-    m_periodTitle = new QLabel(this);
-    m_periodTitle->setBuddy(TA_Rep_HScroll);
-
-    auto* grid = new QGridLayout(this);
+void TaFrame::arrange() {
+    auto* grid = new QGridLayout(Frame1);
     tighten(grid);
     grid->addWidget(TA_Check, 0, 0);
     grid->addWidget(TA_EON_Hilfe, 0, 1, Qt::AlignRight);
@@ -95,36 +104,35 @@ TaFrame::TaFrame(const PageContext& with, std::function<bool()> trafficProgramme
     grid->addWidget(TA_Rep_Label, 4, 1, Qt::AlignRight);
     grid->addWidget(TA_Rep_HScroll, 5, 0, 1, 2);
     grid->setRowStretch(6, 1);
+    auto* whole = new QVBoxLayout(this);
+    tighten(whole, 0);
+    whole->addWidget(Frame1);
 }
 
 void TaFrame::label() {
-    const Captions& captions = m_with.captions;
-    setTitle(toText(captions.text(47)));
-    TA_Check->setText(toText(captions.own(381, "TA on / off")));
-    TA_Option[0]->setText(toText(captions.text(48)));
-    TA_Option[0]->setToolTip(toText(captions.own(382, "TA Single")));
-    TA_Option[1]->setText(toText(captions.own(383, "&Automatisch")));
-    TA_Option[1]->setToolTip(toText(captions.own(384, "TA Repetition")));
-    TA_EON_Hilfe->setText(toText(captions.own(385, "EON ?")));
-    m_durationTitle->setText(toText(captions.own(386, "Dauer")));
-    m_periodTitle->setText(toText(captions.own(387, "Wiederholung")));
-    TA_HScroll->setAccessibleName(m_durationTitle->text());
-    TA_Rep_HScroll->setAccessibleName(m_periodTitle->text());
+    Page::label();
     showDuration(TA_HScroll->sliderPosition());
     showPeriod(TA_Rep_HScroll->sliderPosition());
     if (m_statusShown) showAnnouncing(m_announcing);
 }
 
-void TaFrame::loadSettings() {
-    const auto stored = [this](const char* key) {
-        return static_cast<int>(std::clamp(leadingNumber(m_with.data.ReadIni("RDS", key, kGeneralSettings)), 0.0, 1e6));
+void TaFrame::load() {
+    const auto stored = [this](const Place& place) {
+        return static_cast<int>(std::clamp(leadingNumber(m_with.profile.read(place)), 0.0, 1e6));
     };
-    const int duration = stored("TA_ON");
-    const int period = stored("TA_REP");
+    const int duration = stored(setting::kAnnouncementSeconds);
+    const int period = stored(setting::kRepetitionSeconds);
     setQuietly(TA_Rep_HScroll, period);  // the period first: the duration must not lie above it
     setQuietly(TA_HScroll, std::min(duration, TA_Rep_HScroll->value()));
     showPeriod(TA_Rep_HScroll->value());
     showDuration(TA_HScroll->value());
+}
+
+void TaFrame::stepGoesOut(const Step& step) {
+    if (step.key != setting::kAnnouncement) return;
+    showByHand(step.value == "1");
+    // The end of the announcement frees the automatic; without a traffic programme it stays locked.
+    if (m_programme.trafficProgramme != "1") setTrafficProgramme(false);
 }
 
 void TaFrame::setTrafficProgramme(bool on) {
@@ -134,10 +142,9 @@ void TaFrame::setTrafficProgramme(bool on) {
 }
 
 void TaFrame::TA_Check_Click() {
-    const bool on = TA_Check->isChecked();
-    showAnnouncing(on);
-    TA_Option[1]->setEnabled(!on);
-    sendTa(on ? "1" : "0");
+    m_programme.announcement = TA_Check->isChecked() ? "1" : "0";
+    showByHand(TA_Check->isChecked());
+    sendTa(m_programme.announcement);
 }
 
 void TaFrame::TA_Option_Click(int index) {
@@ -159,13 +166,13 @@ void TaFrame::TA_Option_Click(int index) {
 void TaFrame::TA_HScroll_Change() {
     if (TA_HScroll->value() > TA_Rep_HScroll->value()) setQuietly(TA_HScroll, TA_Rep_HScroll->value());
     showDuration(TA_HScroll->value());
-    m_with.data.WriteIni("RDS", "TA_ON", std::to_string(TA_HScroll->value()), kGeneralSettings);
+    m_with.profile.write(setting::kAnnouncementSeconds, std::to_string(TA_HScroll->value()));
 }
 
 void TaFrame::TA_Rep_HScroll_Change() {
     if (TA_Rep_HScroll->value() <= TA_HScroll->value()) setQuietly(TA_Rep_HScroll, TA_HScroll->value() + 1);
     showPeriod(TA_Rep_HScroll->value());
-    m_with.data.WriteIni("RDS", "TA_REP", std::to_string(TA_Rep_HScroll->value()), kGeneralSettings);
+    m_with.profile.write(setting::kRepetitionSeconds, std::to_string(TA_Rep_HScroll->value()));
 }
 
 void TaFrame::TA_Timer_Timer() {
@@ -185,7 +192,7 @@ void TaFrame::TA_Timer_Timer() {
         m_offSent = true;
     }
     TA_Option[0]->setEnabled(true);
-    if (!m_trafficProgramme()) {
+    if (m_programme.trafficProgramme != "1") {
         TA_Option.choose(0);
         TA_Option_Click(0);
     }
@@ -202,34 +209,38 @@ void TaFrame::TA_Rep_Timer_Timer() {
 }
 
 void TaFrame::TA_EON_Hilfe_Click() {
-    const Captions& captions = m_with.captions;
-    m_with.dialogs.message(Dialogs::Icon::Information, toText(captions.own(388, "EON TA")),
-                           toText(captions.own(389,
-                                               "EON TA l\xE4sst sich nur geben, solange TP aus und TA ein ist "
-                                               "und EON TP angekreuzt ist.")));
+    m_with.dialogs.message(Dialogs::Icon::Information, caption({388, "EON TA"}),
+                           caption({389,
+                                    "EON TA lässt sich nur geben, solange TP aus und TA ein ist und EON TP "
+                                    "angekreuzt ist."}));
 }
 
 float TaFrame::now() const {
     return static_cast<float>(m_with.clock.secondsSinceMidnight());
 }
 
+void TaFrame::showByHand(bool on) {
+    showAnnouncing(on);
+    TA_Option[1]->setEnabled(!on);
+}
+
 void TaFrame::showAnnouncing(bool announcing) {
     m_statusShown = true;
     m_announcing = announcing;
-    m_with.status.show(StatusSlot::Ta, m_with.captions.text(announcing ? 192 : 193));
+    m_with.status.show(StatusSlot::Ta, caption({announcing ? 192 : 193}));
     m_with.status.setAnnouncing(announcing);
 }
 
 void TaFrame::showDuration(int seconds) {
-    TA_Zeit_Label->setText(QStringLiteral(" %1 %2").arg(seconds).arg(toText(m_with.captions.text(40))));
+    TA_Zeit_Label->setText(QStringLiteral(" %1 %2").arg(seconds).arg(caption({40})));
 }
 
 void TaFrame::showPeriod(int seconds) {
-    TA_Rep_Label->setText(QStringLiteral("%1 %2").arg(seconds).arg(toText(m_with.captions.text(41))));
+    TA_Rep_Label->setText(QStringLiteral("%1 %2").arg(seconds).arg(caption({41})));
 }
 
-void TaFrame::sendTa(const char* value) {
-    m_with.params.SendParam("TA", std::string(value));
+void TaFrame::sendTa(std::string value) {
+    m_with.params.SendParam(setting::kAnnouncement, value);
 }
 
 }  // namespace kdx

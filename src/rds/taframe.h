@@ -1,43 +1,43 @@
 #pragma once
 
-#include <QGroupBox>
-#include <QScrollBar>
-
-#include <functional>
-
 #include "ui/controls.h"
-#include "ui/pagecontext.h"
+#include "ui/page.h"
 
 class QCheckBox;
+class QGroupBox;
 class QLabel;
 class QPushButton;
 
 namespace kdx {
 
 class Ticker;
+struct Programme;
 
 /// The traffic announcement by hand or by itself: an announcement of a set duration, repeated after a set period.
 /// Times are seconds since midnight in single precision and are not corrected at midnight.
-class TaFrame : public QGroupBox {
+class TaFrame : public Page {
     Q_OBJECT
 public:
-    /// @param trafficProgramme tells whether the traffic programme flag (`Check1`) is ticked.
-    TaFrame(const PageContext& with, std::function<bool()> trafficProgramme, QWidget* parent);
+    /// @param programme its traffic flags: whether there is a traffic programme, and the announcement by hand; lent.
+    TaFrame(const PageContext& with, Programme& programme, QWidget* parent);
 
     /// Captions everything in the current language; times keep their values.
-    void label();
+    void label() override;
     /// Sets duration and period from the general settings; sends and stores nothing.
-    void loadSettings();
+    void load() override;
+    void stepGoesOut(const Step& step) override;
     /// The traffic programme flag was switched: announcements can be chosen only while it is on.
     void setTrafficProgramme(bool on);
-
-    void TA_Check_Click();
 
 signals:
     /// Choosing manual or automatic stops a running dynamic PS.
     void optionChosen();
 
 private:
+    void create();
+    void arrange();
+
+    void TA_Check_Click();
     void TA_Option_Click(int index);
     void TA_HScroll_Change();
     void TA_Rep_HScroll_Change();
@@ -46,11 +46,14 @@ private:
     void TA_EON_Hilfe_Click();
 
     [[nodiscard]] float now() const;
+    /// The announcement by hand was switched: while it runs the automatic cannot be chosen.
+    void showByHand(bool on);
     void showAnnouncing(bool announcing);
     void showDuration(int seconds);
     void showPeriod(int seconds);
-    void sendTa(const char* value);
+    void sendTa(std::string value);
 
+    QGroupBox* Frame1 = nullptr;
     QCheckBox* TA_Check = nullptr;
     OptionArray<2> TA_Option;
     QScrollBar* TA_HScroll = nullptr;  // announcement duration
@@ -63,8 +66,7 @@ private:
     Ticker* TA_Timer = nullptr;
     Ticker* TA_Rep_Timer = nullptr;
 
-    PageContext m_with;
-    std::function<bool()> m_trafficProgramme;
+    Programme& m_programme;
     bool m_automatic = false;
     bool m_offSent = false;
     bool m_statusShown = false;  ///< the TA indicator shows one of the two words

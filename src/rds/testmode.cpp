@@ -1,12 +1,11 @@
 #include "rds/testmode.h"
 
 #include <QGridLayout>
+#include <QGroupBox>
 #include <QPushButton>
 
 #include "coder/sendparam.h"
-#include "settings/captions.h"
-#include "ui/named.h"
-#include "ui/text.h"
+#include "rds/settings.h"
 
 namespace kdx {
 
@@ -21,48 +20,55 @@ constexpr std::array kPatterns = {"0 0 0 0 0 0 0 0", "1 1 1 1 1 1 1 1", "0 1 0 1
 
 }  // namespace
 
-TestMode::TestMode(const PageContext& with, QWidget* parent) : QGroupBox(parent), m_with(with) {
-    setObjectName(QStringLiteral("Frame11"));
-    auto* grid = new QGridLayout(this);
-    tighten(grid);
-    Taste_DATA_MODE = named<QPushButton>("Taste_DATA_MODE", kStartCaption.toString(), this);
+TestMode::TestMode(const PageContext& with, QWidget* parent) : Page(with, parent) {
+    create();
+    arrange();
+}
+
+void TestMode::create() {
+    Frame11 = captioned<QGroupBox>("Frame11", {420, "Test Mode"}, this);
+    Taste_DATA_MODE = named<QPushButton>("Taste_DATA_MODE", kStartCaption.toString(), Frame11);
+    m_book.tip(Taste_DATA_MODE, {421, "Zwischen RDS-Betrieb und Testmuster umschalten"});
     connect(Taste_DATA_MODE, &QPushButton::clicked, this, &TestMode::Taste_DATA_MODE_Click);
-    grid->addWidget(Taste_DATA_MODE, 0, 0, 1, 2);
-    TestDat_Opt.create("TestDat_Opt", this);
-    for (std::size_t i = 0; i < kPatterns.size(); ++i) {
-        TestDat_Opt[i]->setText(QString::fromLatin1(kPatterns[i]));
-        connect(TestDat_Opt[i], &QRadioButton::clicked, this, [this, i] { TestDat_Opt_Click(static_cast<int>(i)); });
-        grid->addWidget(TestDat_Opt[i], 1 + static_cast<int>(i) / 2, static_cast<int>(i) % 2);
-    }
+    TestDat_Opt.create("TestDat_Opt", Frame11);
+    TestDat_Opt.onClick(this, &TestMode::TestDat_Opt_Click);
+    for (std::size_t i = 0; i < kPatterns.size(); ++i) TestDat_Opt[i]->setText(QString::fromLatin1(kPatterns[i]));
     // The coder starts in RDS mode, where a pattern command would be read as a change of mode.
     enablePatterns(false);
-    label();
 }
 
-void TestMode::label() {
-    setTitle(toText(m_with.captions.own(420, "Test Mode")));
-    Taste_DATA_MODE->setToolTip(toText(m_with.captions.own(421, "Zwischen RDS-Betrieb und Testmuster umschalten")));
+void TestMode::arrange() {
+    auto* grid = new QGridLayout(Frame11);
+    tighten(grid);
+    grid->addWidget(Taste_DATA_MODE, 0, 0, 1, 2);
+    for (int i = 0; i < 4; ++i) grid->addWidget(TestDat_Opt[static_cast<std::size_t>(i)], 1 + i / 2, i % 2);
+    auto* whole = new QVBoxLayout(this);
+    tighten(whole, 0);
+    whole->addWidget(Frame11);
 }
 
-void TestMode::selectFirstPattern() {
+void TestMode::load() {
     TestDat_Opt.choose(0);
 }
 
-void TestMode::toRdsMode() {
-    Taste_DATA_MODE->setText(QString());
-    Taste_DATA_MODE_Click();
+void TestMode::stepGoesOut(const Step& step) {
+    if (step.key == setting::kTestMode) showMode(step.value == "1");
 }
 
 void TestMode::Taste_DATA_MODE_Click() {
     // The design caption has no ampersand, so the first click after the start selects RDS mode and not the test.
     const bool toTest = Taste_DATA_MODE->text() == kRdsMode;
-    m_with.params.SendParam("TEST_M", toTest ? "1" : "0");
-    Taste_DATA_MODE->setText((toTest ? kTestMode : kRdsMode).toString());
-    enablePatterns(toTest);
+    m_with.params.SendParam(setting::kTestMode, toTest ? "1" : "0");
+    showMode(toTest);
 }
 
 void TestMode::TestDat_Opt_Click(int index) {
-    m_with.params.SendParam("TEST_D", std::to_string(index + 1));
+    m_with.params.SendParam(setting::kTestPattern, std::to_string(index + 1));
+}
+
+void TestMode::showMode(bool test) {
+    Taste_DATA_MODE->setText((test ? kTestMode : kRdsMode).toString());
+    enablePatterns(test);
 }
 
 void TestMode::enablePatterns(bool enabled) {

@@ -1,36 +1,36 @@
 #pragma once
 
-#include <QGroupBox>
-
 #include "ui/controls.h"
-#include "ui/pagecontext.h"
+#include "ui/page.h"
 
+class QGroupBox;
 class QPushButton;
 
 namespace kdx {
 
 /// The frame `Frame11`: switches the coder between RDS operation and a fixed 8-bit test pattern. The caption of its
 /// button is the only record of the mode; nothing is stored.
-class TestMode : public QGroupBox {
+class TestMode : public Page {
     Q_OBJECT
 public:
     TestMode(const PageContext& with, QWidget* parent);
 
-    /// Captions the frame in the current language. The button keeps its caption, which is its state.
-    void label();
     /// Selects the first pattern without sending it.
-    void selectFirstPattern();
-    /// Returns the coder to RDS mode, whatever the mode is.
-    void toRdsMode();
+    void load() override;
+    void stepGoesOut(const Step& step) override;
 
 private:
+    void create();
+    void arrange();
+
     void Taste_DATA_MODE_Click();
     void TestDat_Opt_Click(int index);
+
+    void showMode(bool test);
     void enablePatterns(bool enabled);
 
-    PageContext m_with;
-
-    QPushButton* Taste_DATA_MODE = nullptr;
+    QGroupBox* Frame11 = nullptr;
+    QPushButton* Taste_DATA_MODE = nullptr;  // its caption is the mode and no language changes it
     OptionArray<4> TestDat_Opt;
 };
 

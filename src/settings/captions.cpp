@@ -1,5 +1,6 @@
 #include "settings/captions.h"
 
+#include "base/codepage.h"
 #include "base/numbers.h"
 #include "settings/datafolder.h"
 #include "settings/profilefile.h"
@@ -37,7 +38,7 @@ std::string Captions::text(int number) const {
 
 std::string Captions::own(int number, std::string_view design) const {
     const auto found = m_texts.find(number);
-    return found == m_texts.end() || found->second.empty() ? std::string(design) : found->second;
+    return found == m_texts.end() || found->second.empty() ? fromUtf8(design) : found->second;
 }
 
 }  // namespace kdx

@@ -9,6 +9,9 @@ namespace kdx {
 
 class DataFolder;
 
+/// How many programme types there are (IEC 62106, table of programme types).
+inline constexpr int kProgrammeTypes = 32;
+
 /// The caption table of the current language: every text by its number, as 8-bit Windows-1252 text.
 class Captions {
 public:
@@ -24,7 +27,8 @@ public:
     /// The text of that number; "" where the file has none.
     [[nodiscard]] std::string text(int number) const;
 
-    /// The text of one of the program's additional numbers (from 300 up); the design text where the file has none.
+    /// The text of one of the program's additional numbers (from 300 up); where the file has none the design text,
+    /// which is UTF-8.
     [[nodiscard]] std::string own(int number, std::string_view design) const;
 
     /// Name of a programme type (0 to 31) in the current language and standard; "" where the file has none.
@@ -33,7 +37,7 @@ public:
 private:
     const DataFolder& m_data;
     std::map<int, std::string> m_texts;
-    std::array<std::string, 32> m_programmeTypes;
+    std::array<std::string, kProgrammeTypes> m_programmeTypes;
 };
 
 }  // namespace kdx

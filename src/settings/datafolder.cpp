@@ -21,7 +21,7 @@ bool isThere(const fs::path& path) {
 /// The folder's entry of that name in any letter case, the exactly spelled one first, else the first by the alphabet;
 /// without one the path at which it would be created.
 fs::path entryNamed(const fs::path& folder, std::string_view name) {
-    const fs::path exact = folder / name;
+    fs::path exact = folder / name;
     if (isThere(exact)) return exact;
     fs::path found;
     std::error_code error;
@@ -52,13 +52,12 @@ std::string DataFolder::ReadIni(std::string_view section, std::string_view key, 
 void DataFolder::WriteIni(std::string_view section, std::string_view key, std::string_view value,
                           std::string_view fileName) {
     const fs::path path = file(fileName);
-    const std::optional<std::string> before = readFile(path);
-    std::error_code error;
-    if (!before && fs::status(path, error).type() != fs::file_type::not_found) {
-        noteSaved(fileName, false);  // there but not readable: writing would lose what is in it
+    const std::optional<std::string> before = readToChange(path);
+    if (!before) {
+        noteSaved(fileName, false);
         return;
     }
-    ProfileText text(before.value_or(""));
+    ProfileText text(*before);
     text.setValue(section, key, value);
     if (before == text.bytes()) return;  // the value stands there already: spare the disk
     noteSaved(fileName, replaceFile(path, text.bytes()));

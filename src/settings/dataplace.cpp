@@ -1,6 +1,5 @@
 #include "settings/dataplace.h"
 
-#include <cstdlib>
 #include <fstream>
 
 #include "settings/datafolder.h"
@@ -51,20 +50,6 @@ fs::path chooseAppFolder(const DataPlaces& places, std::string& problem) {
     if (isWritableFolder(DataFolder(places.program).path())) return places.program;
     fillFrom(DataFolder(places.shipped).path(), DataFolder(places.user), problem);
     return places.user;
-}
-
-fs::path userFolder() {
-    const auto variable = [](const char* name) -> fs::path {
-        const char* value = std::getenv(name);
-        return value == nullptr ? fs::path() : fs::path(value);
-    };
-#ifdef _WIN32
-    return variable("APPDATA") / "KDX-RDS";
-#else
-    const fs::path data = variable("XDG_DATA_HOME");
-    // The XDG base directory standard: a relative path there is to be ignored.
-    return (data.is_absolute() ? data : variable("HOME") / ".local" / "share") / "kdx-rds";
-#endif
 }
 
 }  // namespace kdx

@@ -19,7 +19,4 @@ struct DataPlaces {
 /// @param problem gets a message when the user's folder could not be filled.
 [[nodiscard]] std::filesystem::path chooseAppFolder(const DataPlaces& places, std::string& problem);
 
-/// The user's folder for this program: XDG_DATA_HOME or ~/.local/share, %APPDATA% on Windows.
-[[nodiscard]] std::filesystem::path userFolder();
-
 }  // namespace kdx

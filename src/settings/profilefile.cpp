@@ -156,4 +156,13 @@ std::optional<std::string> readFile(const std::filesystem::path& file) {
     return std::move(bytes).str();
 }
 
+std::optional<std::string> readToChange(const std::filesystem::path& file) {
+    std::optional<std::string> bytes = readFile(file);
+    std::error_code error;
+    const auto type = std::filesystem::status(file, error).type();
+    // A link that leads nowhere counts as missing: what is written goes where it leads.
+    if (!bytes && type == std::filesystem::file_type::not_found) bytes.emplace();
+    return bytes;
+}
+
 }  // namespace kdx

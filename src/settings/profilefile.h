@@ -37,6 +37,10 @@ private:
 /// The file's bytes, or nothing when it is missing or cannot be read.
 [[nodiscard]] std::optional<std::string> readFile(const std::filesystem::path& file);
 
+/// The file's bytes, to be changed and written back: "" for one yet to be made, nothing for one that is there but
+/// cannot be read, as writing it would lose what is in it.
+[[nodiscard]] std::optional<std::string> readToChange(const std::filesystem::path& file);
+
 /// Replaces the file's content in one step: written beside it, flushed to disk, renamed over it; owner and mode are
 /// kept, a link is followed. False on any failure, and then the file is as it was.
 [[nodiscard]] bool replaceFile(const std::filesystem::path& file, std::string_view bytes);

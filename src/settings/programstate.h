@@ -13,10 +13,8 @@ struct ProgramState {
     bool LogEnabled = false;
     std::string CurrentDataSet = "1";  ///< "1" to "5"
 
-    std::string currentPs;      ///< at most 8 characters
-    std::string currentPi;      ///< the PI box's text; sending turns it into its 4-character form
-    std::string currentMs;      ///< "M" or "S"
     std::string eonIdentifier;  ///< PI of the other network being edited; leads every EON command
+    std::string shownClock;     ///< what `Uhr_Zeit` reads: the time that is sent to the coder
 
     std::string language;             ///< "deutsch", "english" or "english US"; compared by its exact text
     std::string standard;             ///< "RDS" or "RBDS"

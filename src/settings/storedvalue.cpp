@@ -29,6 +29,15 @@ int storedOption(std::string_view text, int first, int last) {
     return -1;
 }
 
+int storedEntry(std::string_view text, int count) {
+    const double number = leadingNumber(text);
+    return number >= 0 && number < count ? static_cast<int>(number) : -1;
+}
+
+std::string storedFlag(std::string_view text) {
+    return text == "1" ? "1" : "0";
+}
+
 int storedPosition(std::string_view text, int lowest, int highest) {
     const double within = std::clamp(leadingNumber(text), static_cast<double>(lowest), static_cast<double>(highest));
     return static_cast<int>(std::lround(within));

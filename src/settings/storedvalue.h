@@ -1,5 +1,6 @@
 #pragma once
 
+#include <string>
 #include <string_view>
 
 namespace kdx {
@@ -7,6 +8,13 @@ namespace kdx {
 /// The option that a stored text names: 0 for the text of `first`, 1 for the one after it, up to `last`; -1 (none) for
 /// every other text, an empty one included.
 [[nodiscard]] int storedOption(std::string_view text, int first, int last);
+
+/// The entry of a list of `count` that a stored number means, counted from 0; -1 when the list has none such. A text
+/// without a number means the first one.
+[[nodiscard]] int storedEntry(std::string_view text, int count);
+
+/// The text of a flag: "1" for a stored "1", else "0".
+[[nodiscard]] std::string storedFlag(std::string_view text);
 
 /// The position of a scroll bar for a stored text: the number it begins with (0 when none), rounded to a whole one and
 /// kept within the range.

@@ -5,13 +5,11 @@
 #include <QVBoxLayout>
 
 #include "coder/sendparam.h"
-#include "settings/captions.h"
-#include "settings/datafolder.h"
 #include "settings/storedvalue.h"
+#include "stereo/carrier.h"
 #include "ui/clickablelabel.h"
 #include "ui/controls.h"
 #include "ui/dialogs.h"
-#include "ui/named.h"
 #include "ui/pictureswitch.h"
 #include "ui/text.h"
 
@@ -19,28 +17,51 @@ namespace kdx {
 
 namespace {
 
-constexpr const char* kSection = "VRN";
+constexpr const char* kLowestLevel = "0";
+constexpr const char* kHighestLevel = "120";
 constexpr double kValueFontScale = 1.75;
 
 }  // namespace
 
-const RfPage::Value RfPage::kFrequency{"HF_Frequenz",          "FM_Ulim", "FM_Olim", "", "", 210, "HF-Frequenz",
-                                       StatusSlot::RfFrequency};
-const RfPage::Value RfPage::kLevel{"HF_Pegel", "", "", "0", "120", 216, "HF-Pegel", StatusSlot::RfLevel};
-const RfPage::Value RfPage::kAudioFrequency{
-    "NF_Frequenz", "NF_Ulim", "NF_Olim", "", "", 213, "NF-Frequenz", StatusSlot::AudioFrequency};
+RfPage::RfPage(const PageContext& with, Carrier& carrier, QWidget* parent) : Page(with, parent), m_carrier(carrier) {
+    create();
+    arrange();
+    RfPage::label();
+}
 
-RfPage::RfPage(const PageContext& with, QWidget* parent) : QWidget(parent), m_with(with) {
-    RF_Freq_Frame = makeValue("RF_Freq_Frame", "Input_HF_Freq_Label", Input_HF_Freq_Label);
-    RF_Level_Frame = makeValue("RF_Level_Frame", "Input_HF_Pegel_Label", Input_HF_Pegel_Label);
-    AF_Freq_Frame = makeValue("AF_Freq_Frame", "Input_AF_Freq_Label", Input_AF_Freq_Label);
-    connect(Input_HF_Freq_Label, &ClickableLabel::clicked, this, &RfPage::Input_HF_Freq_Label_Click);
-    connect(Input_HF_Pegel_Label, &ClickableLabel::clicked, this, &RfPage::Input_HF_Pegel_Label_Click);
-    connect(Input_AF_Freq_Label, &ClickableLabel::clicked, this, &RfPage::Input_AF_Freq_Label_Click);
-
+void RfPage::create() {
+    createValue(Input_HF_Freq_Label, "Input_HF_Freq_Label", "RF_Freq_Frame", {212}, &RfPage::Input_HF_Freq_Label_Click);
+    createValue(Input_HF_Pegel_Label, "Input_HF_Pegel_Label", "RF_Level_Frame", {218},
+                &RfPage::Input_HF_Pegel_Label_Click);
+    createValue(Input_AF_Freq_Label, "Input_AF_Freq_Label", "AF_Freq_Frame", {215}, &RfPage::Input_AF_Freq_Label_Click);
     m_outputFrame = new QGroupBox(this);
+    m_book.text(m_outputFrame, {630, "HF-Ausgang"});
     HfOnOffState = named<PictureSwitch>("HfOnOffState", m_with.data, m_outputFrame);
+    m_book.describe(HfOnOffState, {632, "HF-Ausgang ein / aus"});
     connect(HfOnOffState, &PictureSwitch::clicked, this, &RfPage::HfOnOffState_Click);
+}
+
+void RfPage::createValue(Value& value, const char* name, const char* frame, const Caption& title,
+                         void (RfPage::*handler)()) {
+    value.frame = captioned<QGroupBox>(frame, title, this);
+    value.label = named<ClickableLabel>(name, value.frame);
+    m_book.tip(value.label, {631, "Klicken, um einen neuen Wert einzugeben"});
+    value.label->setText(QStringLiteral("-"));
+    value.label->setAlignment(Qt::AlignCenter);
+    value.label->setMargin(2 * kGap);
+    QFont font = value.label->font();
+    font.setPointSizeF(font.pointSizeF() * kValueFontScale);
+    value.label->setFont(font);
+    // A text of any length may be entered: it must not push the frames about.
+    value.label->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Preferred);
+    connect(value.label, &ClickableLabel::clicked, this, handler);
+}
+
+void RfPage::arrange() {
+    for (const Value* value : values()) {
+        tighten(new QVBoxLayout(value->frame));
+        value->frame->layout()->addWidget(value->label);
+    }
     auto* output = new QVBoxLayout(m_outputFrame);
     tighten(output);
     output->addWidget(HfOnOffState, 0, Qt::AlignCenter);
@@ -48,111 +69,60 @@ RfPage::RfPage(const PageContext& with, QWidget* parent) : QWidget(parent), m_wi
     auto* grid = new QGridLayout(this);
     tighten(grid, kPageMargin);
     grid->setSpacing(2 * kGap);
-    grid->addWidget(RF_Freq_Frame, 0, 0);
-    grid->addWidget(RF_Level_Frame, 0, 1);
-    grid->addWidget(AF_Freq_Frame, 1, 0);
+    grid->addWidget(Input_HF_Freq_Label.frame, 0, 0);
+    grid->addWidget(Input_HF_Pegel_Label.frame, 0, 1);
+    grid->addWidget(Input_AF_Freq_Label.frame, 1, 0);
     grid->addWidget(m_outputFrame, 1, 1);
     grid->setColumnStretch(0, 1);
     grid->setColumnStretch(1, 1);
     grid->setRowStretch(2, 1);
-    label();
-}
-
-QGroupBox* RfPage::makeValue(const char* frame, const char* name, ClickableLabel*& shown) {
-    auto* box = named<QGroupBox>(frame, this);
-    shown = named<ClickableLabel>(name, box);
-    shown->setText(QStringLiteral("-"));
-    shown->setAlignment(Qt::AlignCenter);
-    shown->setMargin(2 * kGap);
-    QFont font = shown->font();
-    font.setPointSizeF(font.pointSizeF() * kValueFontScale);
-    shown->setFont(font);
-    // A text of any length may be entered: it must not push the frames about.
-    shown->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Preferred);
-    tighten(new QVBoxLayout(box));
-    box->layout()->addWidget(shown);
-    return box;
 }
 
 void RfPage::label() {
-    const Captions& captions = m_with.captions;
-    RF_Freq_Frame->setTitle(toText(captions.text(212)));
-    AF_Freq_Frame->setTitle(toText(captions.text(215)));
-    RF_Level_Frame->setTitle(toText(captions.text(218)));
-    m_outputFrame->setTitle(toText(captions.own(630, "HF-Ausgang")));
-    const QString entry = toText(captions.own(631, "Klicken, um einen neuen Wert einzugeben"));
-    for (ClickableLabel* value : {Input_HF_Freq_Label, Input_HF_Pegel_Label, Input_AF_Freq_Label}) {
-        value->setToolTip(entry);
-        const auto* frame = static_cast<const QGroupBox*>(value->parentWidget());
-        value->setAccessibleName(frame->title() + QStringLiteral(": ") + value->text());
+    Page::label();
+    for (const Value* value : values()) {
+        value->label->setAccessibleName(value->frame->title() + QStringLiteral(": ") + value->label->text());
     }
-    const QString output = toText(captions.own(632, "HF-Ausgang ein / aus"));
-    HfOnOffState->setToolTip(output);
-    HfOnOffState->setAccessibleName(output);
 }
 
-void RfPage::sendFrequency() {
-    sendStored(kFrequency, Input_HF_Freq_Label);
-}
-
-void RfPage::sendLevel() {
-    sendStored(kLevel, Input_HF_Pegel_Label);
-}
-
-void RfPage::sendAudioFrequency() {
-    m_with.params.SendParam("NFShape Sinus", "");
-    sendStored(kAudioFrequency, Input_AF_Freq_Label);
+void RfPage::stepGoesOut(const Step& step) {
+    if (step.key == setting::kRfOutput) showOutput(step.value == outputText(true));
+    for (const Value* value : values()) {
+        if (step.key == value->setting.sendKey) showValue(*value, toText(step.value));
+    }
 }
 
 void RfPage::HfOnOffState_Click() {
-    const bool on = !HfOnOffState->isChecked();
-    HfOnOffState->showState(on);
-    m_with.params.SendParam("HF:PEGEL:STATE", on ? "ON" : "OFF");
+    showOutput(!m_carrier.outputOn);
+    m_with.params.SendParam(setting::kRfOutput, outputText(m_carrier.outputOn));
 }
 
-void RfPage::Input_HF_Freq_Label_Click() {
-    enter(kFrequency, Input_HF_Freq_Label);
-}
-
-void RfPage::Input_HF_Pegel_Label_Click() {
-    enter(kLevel, Input_HF_Pegel_Label);
-}
-
-void RfPage::Input_AF_Freq_Label_Click() {
-    enter(kAudioFrequency, Input_AF_Freq_Label);
-}
-
-void RfPage::enter(const Value& value, ClickableLabel* shown) {
-    const bool fixed = *value.lowerKey == '\0';
-    const std::string lower = fixed ? value.fixedLower : stored(value.lowerKey);
-    const std::string upper = fixed ? value.fixedUpper : stored(value.upperKey);
-    const QString prompt = toText(m_with.captions.text(value.prompt));
-    const QString title = toText(m_with.captions.text(value.prompt + 1));
-    QString answer = toText(stored(value.profileKey));
+void RfPage::enter(const Value& value) {
+    const std::string lowest = value.lowest != nullptr ? m_with.profile.read(*value.lowest) : kLowestLevel;
+    const std::string highest = value.highest != nullptr ? m_with.profile.read(*value.highest) : kHighestLevel;
+    QString answer = toText(m_with.profile.read(value.setting.place));
     do {
         // What was typed stays in the box, so that it can be corrected.
-        answer = m_with.dialogs.input(prompt, title, answer);
+        answer = m_with.dialogs.input(caption({value.prompt}), caption({value.prompt + 1}), answer);
         if (answer.isEmpty()) return;
-    } while (!liesBetween(toBytes(answer), lower, upper));
-    showValue(value, shown, answer);
-    m_with.params.SendParam(value.sendKey, toBytes(answer));
+    } while (!liesBetween(toBytes(answer), lowest, highest));
+    showValue(value, answer);
+    m_with.params.SendParam(value.setting.sendKey, toBytes(answer));
 }
 
-void RfPage::sendStored(const Value& value, ClickableLabel* shown) {
-    // Data set 1 whatever set is current: the generator's own settings are kept once.
-    std::string text = stored(value.profileKey);
-    m_with.params.SendParam(value.sendKey, text);
-    if (!text.empty()) showValue(value, shown, toText(text));
-}
-
-void RfPage::showValue(const Value& value, ClickableLabel* shown, const QString& text) {
-    shown->setText(text);
+void RfPage::showValue(const Value& value, const QString& text) {
+    value.label->setText(text);
     m_with.status.show(value.slot, text);
     label();
 }
 
-std::string RfPage::stored(const char* key) const {
-    return m_with.data.ReadIni(kSection, key, dataSetFile("1"));
+void RfPage::showOutput(bool on) {
+    m_carrier.outputOn = on;
+    HfOnOffState->showState(on);
+}
+
+std::array<RfPage::Value*, 3> RfPage::values() {
+    return {&Input_HF_Freq_Label, &Input_HF_Pegel_Label, &Input_AF_Freq_Label};
 }
 
 }  // namespace kdx

@@ -1,10 +1,9 @@
 #pragma once
 
-#include <QWidget>
+#include <array>
 
-#include <string>
-
-#include "ui/pagecontext.h"
+#include "stereo/settings.h"
+#include "ui/page.h"
 #include "ui/statusrow.h"
 
 class QGroupBox;
@@ -13,59 +12,51 @@ namespace kdx {
 
 class ClickableLabel;
 class PictureSwitch;
+struct Carrier;
 
-/// The page "* * *": RF frequency, RF level, audio frequency and RF output of the generator. The values are entered
-/// by a click on the label that shows them; nothing is stored, limits and presets come from data set 1.
-class RfPage : public QWidget {
+/// The page "* * *": RF frequency, RF level, audio frequency and RF output of the generator. The values are entered by
+/// a click on the label that shows them; they are sent and kept nowhere, limits and presets come from data set 1.
+class RfPage : public Page {
     Q_OBJECT
 public:
-    RfPage(const PageContext& with, QWidget* parent);
+    RfPage(const PageContext& with, Carrier& carrier, QWidget* parent);
 
-    /// Captions the page in the current language; the values stay.
-    void label();
-    /// Sends the RF frequency of data set 1 and shows it. An empty one is sent too, but not shown.
-    void sendFrequency();
-    /// The same for the RF level.
-    void sendLevel();
-    /// Chooses the sine for the audio generator, then the same for the audio frequency.
-    void sendAudioFrequency();
-    /// Turns the RF output over; off at first.
-    void HfOnOffState_Click();
+    void label() override;
+    void stepGoesOut(const Step& step) override;
 
 private:
-    /// One value of the generator and where it comes from, goes to and is shown.
+    /// One value of the generator: where it comes from, goes to and is shown.
     struct Value {
-        const char* profileKey;
-        const char* lowerKey;  ///< key of the limit, or the empty text for a fixed one
-        const char* upperKey;
-        const char* fixedLower;
-        const char* fixedUpper;
+        const Setting& setting;
         int prompt;  ///< caption number of the box's text; the title has the next one
-        const char* sendKey;
         StatusSlot slot;
+        const Place* lowest = nullptr;  ///< where the limits are kept; nullptr for fixed ones
+        const Place* highest = nullptr;
+        ClickableLabel* label = nullptr;
+        QGroupBox* frame = nullptr;
     };
-    static const Value kFrequency;
-    static const Value kLevel;
-    static const Value kAudioFrequency;
 
-    void Input_HF_Freq_Label_Click();
-    void Input_HF_Pegel_Label_Click();
-    void Input_AF_Freq_Label_Click();
+    void Input_HF_Freq_Label_Click() { enter(Input_HF_Freq_Label); }
+    void Input_HF_Pegel_Label_Click() { enter(Input_HF_Pegel_Label); }
+    void Input_AF_Freq_Label_Click() { enter(Input_AF_Freq_Label); }
+    void HfOnOffState_Click();
 
-    QGroupBox* makeValue(const char* frame, const char* name, ClickableLabel*& shown);
-    void enter(const Value& value, ClickableLabel* shown);
-    void sendStored(const Value& value, ClickableLabel* shown);
-    void showValue(const Value& value, ClickableLabel* shown, const QString& text);
-    [[nodiscard]] std::string stored(const char* key) const;
+    void create();
+    void createValue(Value& value, const char* name, const char* frame, const Caption& title,
+                     void (RfPage::*handler)());
+    void arrange();
+    void enter(const Value& value);
+    void showValue(const Value& value, const QString& text);
+    void showOutput(bool on);
+    [[nodiscard]] std::array<Value*, 3> values();
 
-    PageContext m_with;
+    Carrier& m_carrier;
 
-    QGroupBox* RF_Freq_Frame = nullptr;
-    ClickableLabel* Input_HF_Freq_Label = nullptr;
-    QGroupBox* RF_Level_Frame = nullptr;
-    ClickableLabel* Input_HF_Pegel_Label = nullptr;
-    QGroupBox* AF_Freq_Frame = nullptr;
-    ClickableLabel* Input_AF_Freq_Label = nullptr;
+    Value Input_HF_Freq_Label{setting::kRfFrequency, 210, StatusSlot::RfFrequency, &setting::kRfLowest,
+                              &setting::kRfHighest};
+    Value Input_HF_Pegel_Label{setting::kRfLevel, 216, StatusSlot::RfLevel};
+    Value Input_AF_Freq_Label{setting::kAudioFrequency, 213, StatusSlot::AudioFrequency, &setting::kAudioLowest,
+                              &setting::kAudioHighest};
     QGroupBox* m_outputFrame = nullptr;
     PictureSwitch* HfOnOffState = nullptr;
 };

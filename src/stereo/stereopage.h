@@ -1,122 +1,98 @@
 #pragma once
 
-#include <QWidget>
-
+#include <array>
 #include <string>
 
-#include "stereo/deviation.h"
-#include "stereo/settingscrollbar.h"
-#include "ui/controls.h"
-#include "ui/pagecontext.h"
+#include "stereo/multiplexcontrols.h"
+#include "stereo/settings.h"
+#include "ui/page.h"
 
 class QGroupBox;
-class QLabel;
 class QPushButton;
 
 namespace kdx {
 
-class PictureSwitch;
-
 /// The page "FM / Stereo": the multiplex signal with its source, pilot tone, RDS subcarrier and ARI. Every control acts
-/// at once: its handler sends the new value and stores it in section "FM" of the general settings.
-class StereoPage : public QWidget {
+/// at once: its handler keeps the new value in the multiplex, sends it and stores it in the general settings.
+class StereoPage : public Page {
     Q_OBJECT
 public:
-    /// @param testMode the frame of the test mode, made without a parent: it gets its place on this page.
-    StereoPage(const PageContext& with, QWidget* testMode, QWidget* parent);
+    /// @param testMode the frame of the test mode, made without a parent: it gets its place on this page and hears
+    /// through it.
+    StereoPage(const PageContext& with, Multiplex& multiplex, Page* testMode, QWidget* parent);
 
-    /// Captions every control in the current language; the values stay.
-    void label();
-    /// Sets the controls from the general settings. Nothing is sent or stored but by the handlers of the on/off
-    /// buttons, which run: afterwards flag, picture and stored value are what the file said.
-    void loadSettings();
-    /// Hides the RDS phase, which the program has no command for.
-    void hideRdsPhase();
-    /// Sends all settings of this page that belong to a data set.
-    void sendSettings();
-    static constexpr int kSettingsCommands = 7;  ///< how many commands that sends
-    /// Total deviation as it is sent: five digits, units of 10 Hz.
-    [[nodiscard]] std::string totalDeviation() const;
-    /// Modulation source as it is sent: "0" to "3", or "" when none is chosen.
-    [[nodiscard]] std::string sourceValue() const;
-    /// Selects the first input impedance as a click would: nothing is sent or stored when it is chosen already.
-    void selectFirstImpedance();
-    [[nodiscard]] bool isFirstImpedanceChosen() const;
+    void label() override;
+    /// Shows the multiplex; of the handlers those of the on/off buttons run. Hides the RDS phase, as no command sets
+    /// it.
+    void load() override;
+    void opened() override { m_testMode->opened(); }
+    void stepGoesOut(const Step& step) override;
 
 signals:
     /// `Btn_SetRdsStereo` was pressed: everything is to be sent.
     void setRdsStereoRequested();
 
 private:
-    void FM_Hub_Scroll_Change();
-    void Pilot_Hub_Scroll_Change();
-    void RDS_Hub_Scroll_Change();
-    void Ari_hub_Scroll_Change();
+    void FM_Hub_Scroll_Change() { changeDeviation(FM_Hub_Scroll); }
+    void Pilot_Hub_Scroll_Change() { changeDeviation(Pilot_Hub_Scroll); }
+    void RDS_Hub_Scroll_Change() { changeDeviation(RDS_Hub_Scroll); }
+    void Ari_hub_Scroll_Change() { changeDeviation(Ari_hub_Scroll); }
     void HScroll1_Change();
-    void FM_Source_Opt_Click(int index);
-    void FM_Imp_Opt_Click(int index);
-    void Pre_opt_Click(int index);
-    void Stereo_Opt_Click(int index);
-    void ARI_Mode_Opt_Click(int index);
-    void BK_Opt_Click(int index);
-    void Pilot_OnOff_Click();
-    void RDS_OnOff_Click();
-    void Ari_OnOff_Click();
+    void FM_Source_Opt_Click(int index) { change(FM_Source_Opt, FM_Source_Opt.text(index)); }
+    void FM_Imp_Opt_Click(int index) { change(FM_Imp_Opt, FM_Imp_Opt.text(index)); }
+    void Pre_opt_Click(int index) { change(Pre_opt, Pre_opt.text(index)); }
+    void Stereo_Opt_Click(int index) { change(Stereo_Opt, Stereo_Opt.text(index)); }
+    void ARI_Mode_Opt_Click(int index) { change(ARI_Mode_Opt, ARI_Mode_Opt.text(index)); }
+    void BK_Opt_Click(int index) { change(BK_Opt, BK_Opt.text(index)); }
+    void Pilot_OnOff_Click() { turn(Pilot_OnOff, Pilot_OnOff.value != "1"); }
+    void RDS_OnOff_Click() { turn(RDS_OnOff, RDS_OnOff.value != "1"); }
+    void Ari_OnOff_Click() { turn(Ari_OnOff, Ari_OnOff.value != "1"); }
 
-    QWidget* makeFmFrame();
-    QWidget* makeStereoFrame();
-    QWidget* makeRdsFrame();
-    QWidget* makeAriFrame();
-    /// A scroll bar for a deviation, its label following it while it is dragged.
-    void makeDeviation(const Deviation& deviation, SettingScrollBar* scroll, QLabel* value);
-
-    void showDeviation(const Deviation& deviation, int tensOfHertz, QLabel* value);
+    void change(const Adjustment& what, const std::string& value);
+    void changeDeviation(const DeviationBar& bar);
+    void turn(const FlagSwitch& flag, bool on);
+    void showDeviation(const DeviationBar& bar, int tensOfHertz);
     void showPilotPhase(int degrees);
-    void showValues();
-    void changeDeviation(const Deviation& deviation, const QScrollBar* scroll, QLabel* value);
-    void chooseOption(const char* sendKey, const char* profileKey, const std::string& value);
-    void toggle(PictureSwitch* button, const char* key);
-    /// Sets an on/off button to its stored state by its own handler.
-    void restore(PictureSwitch* button, const char* key, void (StereoPage::*handler)());
-    [[nodiscard]] std::string stored(const char* key) const;
-    void store(const char* key, const std::string& value);
+    [[nodiscard]] std::array<DeviationBar*, 4> deviations();
 
-    PageContext m_with;
+    void create();
+    void createFm();
+    void createStereo();
+    void createSubcarriers();
+    void createDeviation(DeviationBar& bar, const char* scroll, const char* label, const Caption& spoken,
+                         void (StereoPage::*handler)(), QWidget* frame);
+    void createSwitch(FlagSwitch& flag, const char* name, const Caption& spoken, void (StereoPage::*handler)(),
+                      QWidget* frame);
+    template <std::size_t Count>
+    void createOptions(Choice<Count>& choice, const char* name, void (StereoPage::*handler)(int),
+                       const Caption (&captions)[Count], QWidget* frame);
+    void arrange();
+    void arrangeFrames();
 
-    QGroupBox* FM_Frame = nullptr;
-    SettingScrollBar* FM_Hub_Scroll = nullptr;
-    QLabel* FM_Hub_Label2 = nullptr;
-    QGroupBox* FM_Sorce_Frame = nullptr;
-    OptionArray<4> FM_Source_Opt;
-    QGroupBox* FM_Imp_Frame = nullptr;
-    OptionArray<2> FM_Imp_Opt;
-    QGroupBox* Pre_Frame = nullptr;
-    OptionArray<3> Pre_opt;
+    Multiplex& m_multiplex;
+    Page* m_testMode;
 
-    QGroupBox* Frame_stereo = nullptr;
-    OptionArray<5> Stereo_Opt;
-    QLabel* m_pilotHeading = nullptr;
-    PictureSwitch* Pilot_OnOff = nullptr;
-    SettingScrollBar* Pilot_Hub_Scroll = nullptr;
-    QLabel* Pilot_hub_Label = nullptr;
+    QGroupBox *FM_Frame = nullptr, *Frame_stereo = nullptr, *RDS_Frame = nullptr, *Ari_Frame = nullptr;
+    QGroupBox *FM_Sorce_Frame = nullptr, *FM_Imp_Frame = nullptr, *Pre_Frame = nullptr;
+    QLabel *m_pilotHeading = nullptr, *m_areaHeading = nullptr;
+
+    DeviationBar FM_Hub_Scroll{kTotalDeviation, m_multiplex.totalDeviation};     // with FM_Hub_Label2
+    DeviationBar Pilot_Hub_Scroll{kPilotDeviation, m_multiplex.pilotDeviation};  // with Pilot_hub_Label
+    DeviationBar RDS_Hub_Scroll{kRdsDeviation, m_multiplex.rdsDeviation};        // with RDS_Hub_Label
+    DeviationBar Ari_hub_Scroll{kAriDeviation, m_multiplex.ariDeviation};        // with Ari_Label
+    Choice<4> FM_Source_Opt{{setting::kSource, m_multiplex.source}};
+    Choice<2> FM_Imp_Opt{{setting::kImpedance, m_multiplex.impedance}};
+    Choice<3> Pre_opt{{setting::kPreemphasis, m_multiplex.preemphasis}};
+    Choice<5> Stereo_Opt{{setting::kStereoMode, m_multiplex.stereoMode}};
+    Choice<4> ARI_Mode_Opt{{setting::kAriType, m_multiplex.ariType}};
+    Choice<6> BK_Opt{{setting::kAriArea, m_multiplex.ariArea}, areaCode};
+    FlagSwitch Pilot_OnOff{{setting::kPilot, m_multiplex.pilot}};
+    FlagSwitch RDS_OnOff{{setting::kRds, m_multiplex.rds}};
+    FlagSwitch Ari_OnOff{{setting::kAri, m_multiplex.ari}};
+
     SettingScrollBar* HScroll1 = nullptr;  // pilot phase in degrees
-    QLabel* HScroll1_Label = nullptr;
-
-    QGroupBox* RDS_Frame = nullptr;
-    PictureSwitch* RDS_OnOff = nullptr;
-    SettingScrollBar* RDS_Hub_Scroll = nullptr;
-    QLabel* RDS_Hub_Label = nullptr;
-    QLabel* RDS_Phase_Label = nullptr;
     SettingScrollBar* RDS_Phase_Scroll = nullptr;
-
-    QGroupBox* Ari_Frame = nullptr;
-    PictureSwitch* Ari_OnOff = nullptr;
-    SettingScrollBar* Ari_hub_Scroll = nullptr;
-    QLabel* Ari_Label = nullptr;
-    OptionArray<4> ARI_Mode_Opt;
-    QLabel* m_areaHeading = nullptr;
-    OptionArray<6> BK_Opt;  // ARI area code
-
+    QLabel *HScroll1_Label = nullptr, *RDS_Phase_Label = nullptr;
     QPushButton* Btn_SetRdsStereo = nullptr;
 };
 

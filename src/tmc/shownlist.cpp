@@ -1,8 +1,8 @@
 #include "tmc/shownlist.h"
 
-#include "settings/captions.h"
 #include "settings/datafolder.h"
 #include "tmc/tmclist.h"
+#include "ui/caption.h"
 #include "ui/text.h"
 
 #include <stdexcept>
@@ -21,7 +21,7 @@ constexpr std::size_t kLongestShown = 1000;
 QStringList loadShownList(const PageContext& with, const char* fileName) {
     const auto entries = loadTmcList(with.data.file(fileName));
     if (!entries) {
-        const QString text = toText(with.captions.own(593, "%1 kann nicht gelesen werden."));
+        const QString text = captionText(with.captions, {593, "%1 kann nicht gelesen werden."});
         throw std::runtime_error(text.arg(QLatin1String(fileName)).toStdString());
     }
     QStringList shown;

@@ -3,18 +3,11 @@
 #include "base/numbers.h"
 #include "settings/profilefile.h"
 
-#include <system_error>
-
 namespace kdx {
 
 namespace {
 
 constexpr std::string_view kLineEnd = "\r\n";
-
-bool isThere(const std::filesystem::path& file) {
-    std::error_code error;
-    return std::filesystem::status(file, error).type() != std::filesystem::file_type::not_found;
-}
 
 }  // namespace
 
@@ -41,10 +34,9 @@ std::optional<std::vector<std::string>> loadTmcList(const std::filesystem::path&
 }
 
 bool appendToTmcList(const std::filesystem::path& file, std::string_view text, std::string_view code) {
-    std::optional<std::string> content = readFile(file);
-    // A file that is there but cannot be read must not be replaced by the new line alone.
-    if (!content && isThere(file)) return false;
-    std::string bytes = std::move(content).value_or(std::string());
+    const std::optional<std::string> content = readToChange(file);
+    if (!content) return false;
+    std::string bytes = *content;
     if (!bytes.empty() && bytes.back() != '\n') bytes += kLineEnd;
     bytes += text;
     bytes += ';';

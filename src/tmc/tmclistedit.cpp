@@ -1,7 +1,5 @@
 #include "tmc/tmclistedit.h"
 
-#include "base/numbers.h"
-#include "settings/captions.h"
 #include "settings/datafolder.h"
 #include "tmc/shownlist.h"
 #include "tmc/tmclist.h"
@@ -25,35 +23,58 @@ constexpr int kCodeLength = 5;
 
 TMC_Listedit::TMC_Listedit(const PageContext& with, QWidget* parent) : QDialog(parent), m_with(with) {
     setObjectName(QStringLiteral("TMC_Listedit"));
+    m_book.text(this, {610, "Edit TMC List"});
+    create();
+    arrange();
+    label();
+    resize(minimumSizeHint().width(), 24 * List1->fontMetrics().height());
+}
+
+void TMC_Listedit::create() {
+    const Caption add{615, "Add to list"};
     Label1 = named<QLabel>("Label1", this);
     List1 = named<QListWidget>("List1", this);
+    m_book.spoken(List1, {622, "Events"});
     Event_Input_TXT = named<ClickableLabel>("Event_Input_TXT", this);
+    m_book.describe(Event_Input_TXT, {619, "Event Text"});
+    connect(Event_Input_TXT, &ClickableLabel::clicked, this, &TMC_Listedit::Event_Input_TXT_Click);
     Event_Input_Nr = named<ClickableLabel>("Event_Input_Nr", this);
-    Event_Hinzu = named<QPushButton>("Event_Hinzu", this);
+    m_book.describe(Event_Input_Nr, {618, "Event Nr"});
+    connect(Event_Input_Nr, &ClickableLabel::clicked, this, &TMC_Listedit::Event_Input_Nr_Click);
+    Event_Hinzu = m_book.captioned<QPushButton>("Event_Hinzu", add, this);
+    connect(Event_Hinzu, &QPushButton::clicked, this, &TMC_Listedit::Event_Hinzu_Click);
+
     Label2 = named<QLabel>("Label2", this);
     List2 = named<QListWidget>("List2", this);
+    m_book.spoken(List2, {623, "Locations"});
     Loc_INput_TXT1 = named<ClickableLabel>("Loc_INput_TXT1", this);
+    m_book.describe(Loc_INput_TXT1, {621, "Location Text"});
+    connect(Loc_INput_TXT1, &ClickableLabel::clicked, this, &TMC_Listedit::Loc_INput_TXT1_Click);
     Loc_Input_Nr = named<ClickableLabel>("Loc_Input_Nr", this);
-    Loc_Hinzu = named<QPushButton>("Loc_Hinzu", this);
-    Zuruek_Knopf = named<QPushButton>("Zuruek_Knopf", this);
+    m_book.describe(Loc_Input_Nr, {620, "Location Nr"});
+    connect(Loc_Input_Nr, &ClickableLabel::clicked, this, &TMC_Listedit::Loc_Input_Nr_Click);
+    Loc_Hinzu = m_book.captioned<QPushButton>("Loc_Hinzu", add, this);
+    connect(Loc_Hinzu, &QPushButton::clicked, this, &TMC_Listedit::Loc_Hinzu_Click);
 
+    Zuruek_Knopf = m_book.captioned<QPushButton>("Zuruek_Knopf", {616, "Exit"}, this);
+    connect(Zuruek_Knopf, &QPushButton::clicked, this, &TMC_Listedit::Zuruek_Knopf_Click);
+    for (QPushButton* button : {Event_Hinzu, Loc_Hinzu, Zuruek_Knopf}) button->setAutoDefault(false);
+}
+
+void TMC_Listedit::arrange() {
     auto* lists = new QHBoxLayout;
     tighten(lists, 0);
     lists->setSpacing(3 * kGap);
-    lists->addLayout(placeEntry(Label1, List1, Event_Input_TXT, Event_Input_Nr, Event_Hinzu));
-    lists->addLayout(placeEntry(Label2, List2, Loc_INput_TXT1, Loc_Input_Nr, Loc_Hinzu));
+    lists->addLayout(arrangeEntry(Label1, List1, Event_Input_TXT, Event_Input_Nr, Event_Hinzu));
+    lists->addLayout(arrangeEntry(Label2, List2, Loc_INput_TXT1, Loc_Input_Nr, Loc_Hinzu));
     auto* layout = new QVBoxLayout(this);
     tighten(layout, 2 * kGap);
     layout->setSpacing(2 * kGap);
     layout->addLayout(lists, 1);
     layout->addWidget(Zuruek_Knopf, 0, Qt::AlignRight);
-    for (QPushButton* button : {Event_Hinzu, Loc_Hinzu, Zuruek_Knopf}) button->setAutoDefault(false);
-    wire();
-    label();
-    resize(minimumSizeHint().width(), 24 * List1->fontMetrics().height());
 }
 
-QLayout* TMC_Listedit::placeEntry(QLabel* heading, QListWidget* list, QLabel* text, QLabel* code, QPushButton* add) {
+QLayout* TMC_Listedit::arrangeEntry(QLabel* heading, QListWidget* list, QLabel* text, QLabel* code, QPushButton* add) {
     heading->setFont(fixedPitch(QStringLiteral("Courier")));
     list->setFont(fixedPitch(QStringLiteral("Courier New")));
     // The heading's columns stand over the list's: its frame and its entries' own margin come before the text.
@@ -82,37 +103,16 @@ QLayout* TMC_Listedit::placeEntry(QLabel* heading, QListWidget* list, QLabel* te
     return column;
 }
 
-void TMC_Listedit::wire() {
-    connect(Event_Input_TXT, &ClickableLabel::clicked, this, &TMC_Listedit::Event_Input_TXT_Click);
-    connect(Event_Input_Nr, &ClickableLabel::clicked, this, &TMC_Listedit::Event_Input_Nr_Click);
-    connect(Event_Hinzu, &QPushButton::clicked, this, &TMC_Listedit::Event_Hinzu_Click);
-    connect(Loc_INput_TXT1, &ClickableLabel::clicked, this, &TMC_Listedit::Loc_INput_TXT1_Click);
-    connect(Loc_Input_Nr, &ClickableLabel::clicked, this, &TMC_Listedit::Loc_Input_Nr_Click);
-    connect(Loc_Hinzu, &QPushButton::clicked, this, &TMC_Listedit::Loc_Hinzu_Click);
-    connect(Zuruek_Knopf, &QPushButton::clicked, this, &TMC_Listedit::Zuruek_Knopf_Click);
+void TMC_Listedit::label() {
+    m_book.label(m_with.captions);
+    Label1->setText(heading({611, "E v e n t"}, {612, "C o d e"}));
+    Label2->setText(heading({613, "L o c a t i o n"}, {614, "C o d e "}));
 }
 
-void TMC_Listedit::label() {
-    const Captions& captions = m_with.captions;
-    const auto own = [&captions](int number, std::string_view design) { return toText(captions.own(number, design)); };
-    const auto heading = [&captions](int text, std::string_view design, int code, std::string_view codeDesign) {
-        return toText(padRight(captions.own(text, design), kListTextLength) + captions.own(code, codeDesign));
-    };
-    setWindowTitle(own(610, "Edit TMC List"));
-    Label1->setText(heading(611, "E v e n t", 612, "C o d e"));
-    Label2->setText(heading(613, "L o c a t i o n", 614, "C o d e "));
-    Event_Hinzu->setText(own(615, "Add to list"));
-    Loc_Hinzu->setText(own(615, "Add to list"));
-    Zuruek_Knopf->setText(own(616, "Exit"));
-    List1->setAccessibleName(own(622, "Events"));
-    List2->setAccessibleName(own(623, "Locations"));
-    Event_Input_Nr->setAccessibleName(own(618, "Event Nr"));
-    Event_Input_TXT->setAccessibleName(own(619, "Event Text"));
-    Loc_Input_Nr->setAccessibleName(own(620, "Location Nr"));
-    Loc_INput_TXT1->setAccessibleName(own(621, "Location Text"));
-    for (QLabel* input : {Event_Input_Nr, Event_Input_TXT, Loc_Input_Nr, Loc_INput_TXT1}) {
-        input->setToolTip(input->accessibleName());
-    }
+QString TMC_Listedit::heading(const Caption& text, const Caption& code) const {
+    const QString column = captionText(m_with.captions, text);
+    return column.leftJustified(static_cast<int>(kListTextLength), QLatin1Char(' '), true) +
+           captionText(m_with.captions, code);
 }
 
 void TMC_Listedit::showEvent(QShowEvent* event) {
@@ -153,29 +153,30 @@ bool TMC_Listedit::Location_Anhaengen() {
 
 bool TMC_Listedit::append(const QLabel* text, const QLabel* code, const char* fileName) {
     if (appendToTmcList(m_with.data.file(fileName), toBytes(text->text()), toBytes(code->text()))) return true;
-    const QString failure = toText(m_with.captions.own(624, "%1 kann nicht gespeichert werden."));
+    const QString failure = captionText(m_with.captions, {624, "%1 kann nicht gespeichert werden."});
     m_with.dialogs.message(Dialogs::Icon::Exclamation, windowTitle(), failure.arg(QLatin1String(fileName)));
     return false;
 }
 
 void TMC_Listedit::Event_Input_Nr_Click() {
-    ask(Event_Input_Nr, toText(m_with.captions.own(618, "Event Nr")));
+    ask(Event_Input_Nr);
 }
 
 void TMC_Listedit::Event_Input_TXT_Click() {
-    ask(Event_Input_TXT, toText(m_with.captions.own(619, "Event Text")));
+    ask(Event_Input_TXT);
 }
 
 void TMC_Listedit::Loc_Input_Nr_Click() {
-    ask(Loc_Input_Nr, toText(m_with.captions.own(620, "Location Nr")));
+    ask(Loc_Input_Nr);
 }
 
 void TMC_Listedit::Loc_INput_TXT1_Click() {
-    ask(Loc_INput_TXT1, toText(m_with.captions.own(621, "Location Text")));
+    ask(Loc_INput_TXT1);
 }
 
-void TMC_Listedit::ask(QLabel* label, const QString& prompt) {
-    const QString answer = m_with.dialogs.input(prompt, toText(m_with.captions.own(617, "Eingabe")), label->text());
+void TMC_Listedit::ask(QLabel* label) {
+    const QString title = captionText(m_with.captions, {617, "Eingabe"});
+    const QString answer = m_with.dialogs.input(label->accessibleName(), title, label->text());
     if (!answer.isEmpty()) label->setText(answer);
 }
 

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "ui/caption.h"
 #include "ui/clickablelabel.h"
 #include "ui/pagecontext.h"
 
@@ -35,8 +36,10 @@ protected:
     void showEvent(QShowEvent* event) override;
 
 private:
-    QLayout* placeEntry(QLabel* heading, QListWidget* list, QLabel* text, QLabel* code, QPushButton* add);
-    void wire();
+    void create();
+    void arrange();
+    QLayout* arrangeEntry(QLabel* heading, QListWidget* list, QLabel* text, QLabel* code, QPushButton* add);
+    [[nodiscard]] QString heading(const Caption& text, const Caption& code) const;
 
     void Form_Load();
     void Event_Input_Nr_Click();
@@ -47,11 +50,12 @@ private:
     void Loc_Hinzu_Click();
     void Zuruek_Knopf_Click();
 
-    void ask(QLabel* label, const QString& prompt);
+    void ask(QLabel* label);
     void load(QListWidget* list, const char* fileName);
     bool append(const QLabel* text, const QLabel* code, const char* fileName);
 
     PageContext m_with;
+    CaptionBook m_book;
     QLabel* Label1 = nullptr;
     QListWidget* List1 = nullptr;  // events
     ClickableLabel* Event_Input_TXT = nullptr;

@@ -9,7 +9,7 @@
 
 namespace kdx {
 
-TmcPage::TmcPage(const PageContext& with, QWidget* parent) : QWidget(parent) {
+TmcPage::TmcPage(const PageContext& with, QWidget* parent) : Page(with, parent) {
     m_builder = new TmcBuilder(with, this);
     m_transmission = new TmcTransmission(with, *m_builder, this);
     auto* layout = new QVBoxLayout(this);
@@ -24,8 +24,8 @@ void TmcPage::label() {
     m_transmission->label();
 }
 
-void TmcPage::setUp() {
-    m_builder->setUp();
+void TmcPage::load() {
+    m_builder->load();
     reloadLists();
 }
 

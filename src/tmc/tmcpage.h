@@ -1,8 +1,6 @@
 #pragma once
 
-#include "ui/pagecontext.h"
-
-#include <QWidget>
+#include "ui/page.h"
 
 namespace kdx {
 
@@ -10,15 +8,14 @@ class TmcBuilder;
 class TmcTransmission;
 
 /// The page "T M C": composes traffic messages, lists them and sends them.
-class TmcPage : public QWidget {
+class TmcPage : public Page {
     Q_OBJECT
 public:
     TmcPage(const PageContext& with, QWidget* parent);
 
-    /// Captions every control in the current language; what is composed, listed or being sent stays.
-    void label();
-    /// The page's start-up step. @throws std::runtime_error as reloadLists does, after everything else is set up.
-    void setUp();
+    void label() override;
+    /// @throws std::runtime_error as reloadLists does, after everything else is set up.
+    void load() override;
     /// Fills the event and location boxes from the files of the data folder.
     /// @throws std::runtime_error when one is missing; the page goes on with an empty box.
     void reloadLists();

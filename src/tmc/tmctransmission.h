@@ -1,6 +1,6 @@
 #pragma once
 
-#include "ui/pagecontext.h"
+#include "ui/page.h"
 #include "ui/ticker.h"
 
 #include <QLabel>
@@ -8,28 +8,26 @@
 #include <QListWidget>
 #include <QPushButton>
 #include <QRadioButton>
-#include <QWidget>
 
 #include <string>
 
 namespace kdx {
 
 class TmcBuilder;
+struct Setting;
 
 /// Lower part of the TMC page: the list of messages and its transmission, one at a tick of `TMC_Sende_Timer`, each with
 /// the announcement that tells receivers about TMC.
-class TmcTransmission : public QWidget {
+class TmcTransmission : public Page {
     Q_OBJECT
 public:
     /// @param builder composes the message that is added to the list.
     TmcTransmission(const PageContext& with, const TmcBuilder& builder, QWidget* parent);
 
-    /// Captions every control in the current language; list and transmission go on.
-    void label();
-
 private:
-    void place();
-    void wire();
+    void create();
+    void createSending();
+    void arrange();
 
     void TMC_Gr8_apply_Click();
     void TMC_Gr8_Remove_Click();
@@ -41,9 +39,8 @@ private:
 
     [[nodiscard]] bool setInterval();
     void allowChanges(bool allowed);
-    void sendAndStore(const char* key, const std::string& value);
+    void sendAndStore(const Setting& setting, const std::string& value);
 
-    PageContext m_with;
     const TmcBuilder& m_builder;
     int m_sendPosition = 0;
     bool m_otherVariant = false;  ///< which announcement comes next

@@ -42,6 +42,14 @@ public:
             m_group->addButton(m_options[i], static_cast<int>(i));
         }
     }
+    /// Runs the receiver's handler with the option's index at every click on one.
+    template <typename Receiver>
+    void onClick(Receiver* receiver, void (Receiver::*handler)(int)) const {
+        for (std::size_t i = 0; i < Count; ++i) {
+            QObject::connect(m_options[i], &QRadioButton::clicked, receiver,
+                             [receiver, handler, i] { (receiver->*handler)(static_cast<int>(i)); });
+        }
+    }
     [[nodiscard]] QRadioButton* operator[](std::size_t i) const { return m_options.at(i); }
     [[nodiscard]] auto begin() const { return m_options.begin(); }
     [[nodiscard]] auto end() const { return m_options.end(); }

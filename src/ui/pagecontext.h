@@ -8,19 +8,23 @@ class DataFolder;
 class Dialogs;
 class Instrument;
 class ParamSender;
+class Profile;
 class StatusRow;
+class TickerGroup;
 struct ProgramState;
 
 /// What a page works with; everything is borrowed and outlives the page.
 struct PageContext {
     ParamSender& params;
     Instrument& instrument;
+    Profile& profile;
     ProgramState& state;
     StatusRow& status;
-    Captions& captions;
+    const Captions& captions;
     Dialogs& dialogs;
     DataFolder& data;
     Clock& clock;
+    TickerGroup& tickers;
 };
 
 }  // namespace kdx

@@ -7,8 +7,18 @@
 
 namespace kdx {
 
-Ticker::Ticker(QObject* parent) : QTimer(parent) {
+void TickerGroup::setHeld(bool held) {
+    m_held = held;
+    for (Ticker* ticker : m_tickers) ticker->apply();  // letting go starts each interval anew
+}
+
+Ticker::Ticker(TickerGroup& group, QObject* parent) : QTimer(parent), m_group(group) {
+    m_group.m_tickers.push_back(this);
     setTimerType(Qt::PreciseTimer);  // the default timer is up to 50 ms late
+}
+
+Ticker::~Ticker() {
+    std::erase(m_group.m_tickers, this);
 }
 
 void Ticker::setEnabled(bool enabled) {
@@ -23,11 +33,6 @@ void Ticker::setPeriod(double milliseconds) {
     apply();
 }
 
-void Ticker::setHeld(bool held) {
-    m_held = held;
-    apply();
-}
-
 void Ticker::timerEvent(QTimerEvent* event) {
     if (m_ticking) return;
     const QScopedValueRollback ticking(m_ticking, true);
@@ -35,7 +40,7 @@ void Ticker::timerEvent(QTimerEvent* event) {
 }
 
 void Ticker::apply() {
-    if (m_enabled && !m_held && m_period > 0) {
+    if (m_enabled && !m_group.m_held && m_period > 0) {
         start(m_period);
     } else {
         stop();

@@ -2,7 +2,24 @@
 
 #include <QTimer>
 
+#include <vector>
+
 namespace kdx {
+
+class Ticker;
+
+/// The window's timers, to be held all at once: while a box about a broken link waits for the user, and while a closed
+/// session must not be sent to.
+class TickerGroup {
+public:
+    /// Holds all ticks back, or lets them go; timers made later follow.
+    void setHeld(bool held);
+
+private:
+    friend class Ticker;
+    std::vector<Ticker*> m_tickers;
+    bool m_held = false;
+};
 
 /// A timer of the window: it ticks while it is enabled and its interval is above 0, as the window's timers are
 /// described; setting either starts the interval anew. A tick whose handler still runs (it may be showing a box) lets
@@ -13,7 +30,9 @@ public:
     /// Longest interval a timer takes, in milliseconds.
     static constexpr int kLongestInterval = 65535;
 
-    explicit Ticker(QObject* parent);
+    /// @param group may hold the ticks back; it outlives the timer.
+    Ticker(TickerGroup& group, QObject* parent);
+    ~Ticker() override;
 
     void setEnabled(bool enabled);
     [[nodiscard]] bool isEnabled() const { return m_enabled; }
@@ -22,18 +41,15 @@ public:
     void setPeriod(double milliseconds);
     [[nodiscard]] int period() const { return m_period; }
 
-    /// Holds all ticks back, as while a box about a broken link waits for the user; letting go starts the interval
-    /// anew.
-    void setHeld(bool held);
-
 protected:
     void timerEvent(QTimerEvent* event) override;
 
 private:
+    friend class TickerGroup;
     void apply();
 
+    TickerGroup& m_group;
     bool m_enabled = false;
-    bool m_held = false;
     bool m_ticking = false;
     int m_period = 0;
 };

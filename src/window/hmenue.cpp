@@ -3,40 +3,34 @@
 #include <QGroupBox>
 #include <QHBoxLayout>
 #include <QIcon>
-#include <QMenu>
 #include <QMouseEvent>
 #include <QPushButton>
-#include <QScrollBar>
 #include <QShortcut>
 #include <QStackedWidget>
 #include <QTabBar>
 #include <QTabWidget>
 
-#include "af/afpage.h"
-#include "af/eonpage.h"
-#include "base/clock.h"
-#include "groups/grouppage.h"
-#include "rds/querypage.h"
-#include "rds/rdspage.h"
-#include "rds/storepage.h"
-#include "rds/testmode.h"
+#include <filesystem>
+
+#include "base/codepage.h"
+#include "base/numbers.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
+#include "settings/generalsettings.h"
 #include "settings/programstate.h"
-#include "stereo/rfpage.h"
-#include "stereo/stereopage.h"
-#include "tmc/tmcpage.h"
-#include "ui/clickablelabel.h"
+#include "tmc/tmclistedit.h"
 #include "ui/controls.h"
 #include "ui/dialogs.h"
-#include "window/logview.h"
-#include "window/progressline.h"
+#include "ui/page.h"
 #include "ui/statusrow.h"
 #include "ui/text.h"
 #include "ui/ticker.h"
+#include "window/connectionbar.h"
+#include "window/logview.h"
+#include "window/mainmenu.h"
+#include "window/pages.h"
+#include "window/progressline.h"
 #include "window/trafficlog.h"
-
-#include <filesystem>
 
 namespace kdx {
 
@@ -44,6 +38,8 @@ namespace {
 
 constexpr int kGroupPage = 3;
 constexpr int kQueryPage = 5;
+constexpr int kFirstTabCaption = 10;
+constexpr QSize kDesignSize{640, 480};  // pixels at 96 dpi
 
 /// Tells its layout no sizes of its own: the window's size is stated, and asking all nine pages what they need takes a
 /// fifth of the whole start. That every page fits is the tests' concern.
@@ -57,57 +53,34 @@ public:
     [[nodiscard]] QSize minimumSizeHint() const override { return {}; }
 };
 
-// Captions of the pages as designed, in index order; some begin with a line feed to sit in the tab's second row.
-constexpr std::array kPageCaptions = {"FM / Stereo", "\nR D S",   "AF Liste", "Gruppen", "\nE O N",
-                                      "Fragen",      "Speichern", "\nT M C",  "\n* * *"};
-
 }  // namespace
 
 HMenue::HMenue(const Surroundings& surroundings)
-    : m_s(surroundings),
-      m_status(new StatusRow(this)),
-      m_instrument(
-          m_s.visa, m_s.state, m_s.data, m_s.clock,
-          [this](const std::string& text, bool sequenceRuns) { return showInterfaceError(text, sequenceRuns); }),
-      m_params(
-          m_instrument, m_s.state, m_s.clock, [this] { return m_rds->clockText(); }, m_s.endProgram),
-      m_context(new PageContext{m_params, m_instrument, m_s.state, *m_status, m_s.captions, m_s.dialogs, m_s.data,
-                                m_s.clock}) {
+    : m_s(surroundings), m_status(new StatusRow(this)), m_context{m_s.session.params,  m_s.session.instrument,
+                                                                  m_s.session.profile, m_s.state,
+                                                                  *m_status,           m_s.captions,
+                                                                  m_s.dialogs,         m_s.data,
+                                                                  m_s.clock,           m_s.tickers} {
     setObjectName(QStringLiteral("HMenue"));
     setWindowIcon(QIcon(QStringLiteral(":/kdx-rds-64.png")));
-    m_trafficLog = new TrafficLog(this);
-    m_instrument.onTraffic([this](const Traffic& traffic) { watchTraffic(traffic); });
-    m_instrument.setCaptionSource([this](int number) { return m_s.captions.text(number); });
-    createConnection();
+    m_trafficLog = new TrafficLog(m_s.session.instrument, m_s.clock, this);
+    m_connection = new ConnectionBar(m_context, this);
+    connect(m_connection, &ConnectionBar::openRequested, this, &HMenue::INIT_Taste_Click);
+    // Every setting was stored when it changed: nothing is left to do at the end.
+    connect(m_connection, &ConnectionBar::endRequested, this, [this] { m_s.endProgram(); });
     createPages();
     createMenu();
     arrange();
+    m_s.session.transmitter.setWatcher(this);
+    m_s.session.instrument.onFailure(
+        [this](const std::string& text, bool sequenceRuns) { return showInterfaceError(text, sequenceRuns); });
     m_s.data.onUnsavedFileChanged([this] { showNotice(); });
 }
 
 HMenue::~HMenue() {
+    m_s.session.transmitter.setWatcher(nullptr);
+    m_s.session.instrument.onFailure(nullptr);
     m_s.data.onUnsavedFileChanged(nullptr);
-}
-
-void HMenue::createConnection() {
-    Frame8 = named<QGroupBox>("Frame8", this);
-    INIT_Taste = named<QPushButton>("INIT_Taste", QStringLiteral("IEC &Bus INIT"), Frame8);
-    connect(INIT_Taste, &QPushButton::clicked, this, &HMenue::INIT_Taste_Click);
-    Label6 = named<QLabel>("Label6", QStringLiteral("Addr."), Frame8);
-    Adr1_Label = named<ClickableLabel>("Adr1_Label", Frame8);
-    Adr1_Label->setText(QStringLiteral("123.456.789.012"));
-    Adr1_Label->setAlignment(Qt::AlignCenter);
-    Adr1_Label->setMinimumWidth(Adr1_Label->fontMetrics().horizontalAdvance(QStringLiteral("000.000.000.000")) + 8);
-    connect(Adr1_Label, &ClickableLabel::clicked, this, &HMenue::Adr1_Label_Click);
-    Label6->setBuddy(Adr1_Label);
-    Adr1_VScroll = named<QScrollBar>("Adr1_VScroll", Qt::Vertical, Frame8);
-    Adr1_VScroll->hide();  // present without behaviour: the address is typed
-
-    Ende_Taste = named<QPushButton>("Ende_Taste", QStringLiteral("&Ende"), this);
-    connect(Ende_Taste, &QPushButton::clicked, this, &HMenue::Ende_Taste_Click);
-    Image2 = named<QLabel>("Image2", this);
-    Image2->setPixmap(QPixmap(QStringLiteral(":/banner.png")));
-    Image2->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
 }
 
 void HMenue::createPages() {
@@ -124,19 +97,8 @@ void HMenue::createPages() {
     SSTab1->tabBar()->setUsesScrollButtons(false);
     SSTab1->tabBar()->setExpanding(true);
 
-    m_testMode = new TestMode(*m_context, nullptr);
-    m_stereo = new StereoPage(*m_context, m_testMode, this);
-    m_rds = new RdsPage(*m_context, this);
-    m_af = new AfPage(*m_context, this);
-    m_groups = new GroupPage(*m_context, this);
-    m_eon = new EonPage(*m_context, this);
-    m_queries = new QueryPage(*m_context, this);
-    m_store = new StorePage(*m_context, this);
-    m_tmc = new TmcPage(*m_context, this);
-    m_rf = new RfPage(*m_context, this);
-    const std::array<QWidget*, kPageCaptions.size()> pages = {m_stereo,  m_rds,   m_af,  m_groups, m_eon,
-                                                              m_queries, m_store, m_tmc, m_rf};
-    for (std::size_t i = 0; i < pages.size(); ++i) SSTab1->addTab(pages[i], QString::fromLatin1(kPageCaptions[i]));
+    m_pages = makePages(m_context, m_s.session.station, *this);
+    for (Page* page : m_pages) SSTab1->addTab(page, QString());
     connect(SSTab1, &QTabWidget::currentChanged, this, &HMenue::SSTab1_Click);
     // While no session is open the pages can be looked at, though not used.
     SSTab1->tabBar()->installEventFilter(this);
@@ -146,35 +108,27 @@ void HMenue::createPages() {
             SSTab1->setCurrentIndex((SSTab1->currentIndex() + step + SSTab1->count()) % SSTab1->count());
         });
     }
+}
 
-    connect(m_stereo, &StereoPage::setRdsStereoRequested, this, &HMenue::SetRdsStereo);
+void HMenue::createMenu() {
+    m_menu = new MainMenu(m_context, m_s.linkDescription, this);
+    connect(m_menu, &MainMenu::interfaceChosen, m_connection, &ConnectionBar::chooseInterface);
+    connect(m_connection, &ConnectionBar::interfaceShown, m_menu, &MainMenu::showInterface);
+    connect(m_menu, &MainMenu::relabelRequested, this, &HMenue::Beschrifter);
+    connect(m_menu, &MainMenu::listEditorRequested, this, &HMenue::Mnu_TMC_Edit_Click);
+    connect(m_menu, &MainMenu::logRequested, this, &HMenue::Mnu_Info_Log_Click);
 }
 
 void HMenue::arrange() {
-    auto* connection = new QHBoxLayout(Frame8);
-    tighten(connection);
-    connection->addWidget(INIT_Taste);
-    connection->addWidget(Label6);
-    connection->addWidget(Adr1_Label);
-    connection->addWidget(Adr1_VScroll);
-    auto* top = new QHBoxLayout;
-    top->setSpacing(8);
-    top->addWidget(Frame8);
-    top->addWidget(Ende_Taste);
-    top->addStretch();
-    top->addWidget(Image2);
-
     auto* parameters = new QVBoxLayout(Frame7);
     parameters->setContentsMargins(0, 0, 0, 0);
     parameters->addWidget(SSTab1);
-
     m_lowerEdge = new ProgressLine(this);
-
     auto* middle = new QWidget(this);
     auto* column = new QVBoxLayout(middle);
     column->setContentsMargins(6, 2, 6, 2);
     column->setSpacing(3);
-    column->addLayout(top);
+    column->addWidget(m_connection);
     column->addWidget(Frame7, 1);
     column->addWidget(m_status);
     column->addWidget(m_lowerEdge);
@@ -190,61 +144,151 @@ bool HMenue::eventFilter(QObject* watched, QEvent* event) {
     return QMainWindow::eventFilter(watched, event);
 }
 
-void HMenue::Beschrifter() {
-    m_s.state.language = generalSetting("Sprache", "Sprache");
-    // Before a language was ever chosen the window speaks the one it was designed in.
-    if (m_s.state.language.empty()) m_s.state.language = "deutsch";
-    m_s.state.standard = generalSetting("Sprache", "RDS_RBDS");
-    m_s.captions.load(m_s.state.language, m_s.state.standard);
-    const Captions& captions = m_s.captions;
+void HMenue::startUp() {
+    const Profile& profile = m_s.session.profile;
+    // The two blanks before the slash and at the end belong to the title.
+    m_s.state.ProgramTitle = "KDX-RDS V 1.0  / Mar. 2009  ";
+    setWindowTitle(toText(m_s.state.ProgramTitle));
+    // Stated, not left to the layouts: they would still know sizes from before captions were set and parts hidden.
+    setMinimumSize(kDesignSize);
+    resize(kDesignSize);
+    m_s.state.InterfaceKind = profile.read(setting::kInterface);
+    m_connection->Schnittstellen_Toggle();
+    m_s.state.InstrumentOnline = false;
+    m_s.state.LogEnabled = leadingNumber(profile.read(setting::kCommandLogOn)) == 1;
+    showSessionOpen(false);
+    Beschrifter();
+    m_s.state.CurrentDataSet = "1";
+    m_s.session.station.load(profile);
+    loadPages();
+    m_s.session.instrument.emptyLog();
+    if (upperCase(profile.read(setting::kOpenAtStart)) == "AUTO") INIT_Taste_Click();
+}
 
-    labelMenu();
-    Ende_Taste->setText(toText(captions.text(6)));
-    GTL_Taste->setText(toText(captions.own(300, "Local")));
-    Label6->setText(toText(captions.own(308, "Addr.")));
-    Adr1_Label->setAccessibleName(toText(captions.own(319, "Adresse des Ger\xE4ts")));
-    for (int i = 0; i < SSTab1->count(); ++i) SSTab1->setTabText(i, toText(captions.text(10 + i)));
-    SSTab1->setCurrentIndex(0);
-    m_status->label(captions);
-    m_stereo->label();
-    m_testMode->label();
-    m_rds->label();
-    m_af->label();
-    m_groups->label();
-    m_eon->label();
-    m_queries->label();
-    m_store->label();
-    m_tmc->label();
-    m_rf->label();
-    m_trafficLog->label(captions);
-    if (m_logView != nullptr) m_logView->label(captions);
+void HMenue::loadPages() {
+    for (Page* page : m_pages) {
+        try {
+            page->load();
+        } catch (const std::exception& error) {
+            m_startNotice = QString::fromUtf8(error.what());  // the page goes on with what it has
+        }
+    }
     showNotice();
 }
 
-void HMenue::SSTab1_Click(int page) {
-    if (page == kGroupPage) {
-        m_groups->pageOpened();
-        // Not the pages the editor is opened from: its buttons set the kind themselves.
-        m_s.state.afEditorKind = "AF";
-    } else if (page == kQueryPage) {
-        m_s.state.afEditorKind = "EON AF";
+void HMenue::Beschrifter() {
+    m_s.state.language = m_s.session.profile.read(setting::kLanguage);
+    // Before a language was ever chosen the window speaks the one it was designed in.
+    if (m_s.state.language.empty()) m_s.state.language = "deutsch";
+    m_s.state.standard = m_s.session.profile.read(setting::kStandard);
+    m_s.captions.load(m_s.state.language, m_s.state.standard);
+    m_menu->label();
+    m_connection->label();
+    GTL_Taste->setText(captionText(m_s.captions, {300, "Local"}));
+    for (int i = 0; i < SSTab1->count(); ++i) {
+        SSTab1->setTabText(i, captionText(m_s.captions, {kFirstTabCaption + i}));
     }
+    SSTab1->setCurrentIndex(0);
+    m_status->label(m_s.captions);
+    for (Page* page : m_pages) page->label();
+    m_trafficLog->label(m_s.captions);
+    if (m_logView != nullptr) m_logView->label(m_s.captions);
+    showNotice();
 }
 
-void HMenue::Ende_Taste_Click() {
-    m_s.endProgram();  // every setting was stored when it changed
+void HMenue::INIT_Taste_Click() {
+    Session& session = m_s.session;
+    m_s.state.InterfaceKind = session.profile.read(setting::kInterface);
+    const VisaStatus status = session.open(m_s.state.InterfaceKind, m_connection->address());
+    if (status != 0) {
+        m_s.dialogs.message(Dialogs::Icon::Critical, QStringLiteral("Interface Error"),
+                            QStringLiteral("Please Check Device! %1").arg(status));
+        return;
+    }
+    session.sendOpening();
+}
+
+void HMenue::SetRdsStereo() {
+    m_s.session.sendDataSet();
+}
+
+void HMenue::GTL_Taste_Click() {
+    m_s.session.close();
+    // Only the switched-off pages and the resting timers keep commands away from the closed handle.
+    showSessionOpen(false);
+    m_s.tickers.setHeld(true);
+}
+
+void HMenue::stepGoesOut(const Step& step, std::size_t number, std::size_t total) {
+    if (number > 0) {
+        m_lowerEdge->showProgress(captionText(m_s.captions, {324, "Sende Befehl %1 von %2"}), number, total);
+    }
+    for (Page* page : m_pages) page->stepGoesOut(step);
+}
+
+void HMenue::stepAnswered(const Step& step, const std::string& answer) {
+    if (step.kind != Step::Kind::Identify) return;
+    setWindowTitle(toText(answer));
+    m_s.tickers.setHeld(false);
+    showSessionOpen(true);
+}
+
+void HMenue::stepsEnded() {
+    m_lowerEdge->endProgress();
+}
+
+void HMenue::showSessionOpen(bool open) {
+    if (open) emit sessionOpened();
+    SSTab1->setEnabled(open);
+    Frame7->setEnabled(open);
+    m_connection->showSessionOpen(open);
+    m_menu->showSessionOpen(open);
+}
+
+bool HMenue::showInterfaceError(const std::string& text, bool sequenceRuns) {
+    // While the box waits, timers would send more to the same broken link and pile up more boxes.
+    m_s.tickers.setHeld(true);
+    const QString title = QStringLiteral("Interface Error");
+    bool stop = false;
+    if (sequenceRuns) {
+        stop = m_s.dialogs.messageOrStop(title, toText(text));
+    } else {
+        m_s.dialogs.message(Dialogs::Icon::Critical, title, toText(text));
+    }
+    m_s.tickers.setHeld(false);
+    return stop;
+}
+
+void HMenue::SSTab1_Click(int page) {
+    if (page < 0) return;
+    m_pages.at(static_cast<std::size_t>(page))->opened();
+    // Not the pages the editor is opened from: its buttons set the kind themselves.
+    if (page == kGroupPage) m_s.state.afEditorKind = "AF";
+    if (page == kQueryPage) m_s.state.afEditorKind = "EON AF";
+}
+
+void HMenue::Mnu_TMC_Edit_Click() {
+    TMC_Listedit editor(m_context, this);
+    editor.exec();
+    emit listsEdited();
+}
+
+void HMenue::Mnu_Info_Log_Click() {
+    if (m_logView == nullptr) m_logView = new LogView(*m_trafficLog, m_s.captions, this);
+    m_logView->show();
+    m_logView->raise();
+    m_logView->activateWindow();
 }
 
 void HMenue::showNotice() {
-    const Captions& captions = m_s.captions;
     QStringList notes;
     if (const QString missing = missingData(); !missing.isEmpty()) {
-        notes += toText(captions.own(322, "Nicht gefunden: %1")).arg(missing);
+        notes += captionText(m_s.captions, {322, "Nicht gefunden: %1"}).arg(missing);
     } else if (!m_startNotice.isEmpty()) {
         notes += m_startNotice;
     }
     if (const auto unsaved = m_s.data.unsavedFile()) {
-        notes += toText(captions.own(312, "Nicht gespeichert: %1")).arg(toText(*unsaved));
+        notes += captionText(m_s.captions, {312, "Nicht gespeichert: %1"}).arg(toText(*unsaved));
     }
     m_lowerEdge->setNotice(notes.join(QStringLiteral("  -  ")));
 }
@@ -254,41 +298,10 @@ QString HMenue::missingData() const {
     std::error_code error;
     if (!std::filesystem::is_directory(folder, error)) return QString::fromStdU16String(folder.u16string());
     // Missing, unreadable, garbage, or without this language: the captions are empty all the same.
-    if (m_s.captions.isEmpty())
+    if (m_s.captions.isEmpty()) {
         return QStringLiteral("%1 [%2]").arg(QLatin1String(kLanguageFile), toText(m_s.state.language));
-    return {};
-}
-
-bool HMenue::showInterfaceError(const std::string& text, bool sequenceRuns) {
-    // While the box waits, timers would send more to the same broken link and pile up more boxes.
-    holdTimers(true);
-    const QString title = QStringLiteral("Interface Error");
-    bool stop = false;
-    if (sequenceRuns) {
-        stop = m_s.dialogs.messageOrStop(title, toText(text));
-    } else {
-        m_s.dialogs.message(Dialogs::Icon::Critical, title, toText(text));
     }
-    holdTimers(false);
-    return stop;
-}
-
-void HMenue::holdTimers(bool held) {
-    for (Ticker* ticker : findChildren<Ticker*>()) ticker->setHeld(held);
-}
-
-void HMenue::watchTraffic(const Traffic& traffic) {
-    if (traffic.kind == Traffic::Kind::Written) m_lowerEdge->step();
-    m_trafficLog->add(traffic, m_s.clock.secondsSinceMidnight());
-    emit trafficPassed(traffic);
-}
-
-QString HMenue::progressPattern() const {
-    return toText(m_s.captions.own(324, "Sende Befehl %1 von %2"));
-}
-
-std::string HMenue::generalSetting(const char* section, const char* key) const {
-    return m_s.data.ReadIni(section, key, kGeneralSettings);
+    return {};
 }
 
 }  // namespace kdx

@@ -4,8 +4,6 @@
 #include <QLabel>
 #include <QProgressBar>
 
-#include <algorithm>
-
 #include "ui/named.h"
 
 namespace kdx {
@@ -32,39 +30,23 @@ void ProgressLine::setNotice(const QString& notice) {
     if (!m_counting) m_text->setText(notice);
 }
 
-void ProgressLine::begin(const QString& pattern, int total) {
-    m_pattern = pattern;
-    m_counting = true;
-    m_sent = 0;
-    m_total = total;
-    m_bar->show();
-    layout()->activate();  // no event will do it before the end
-    showCount();
+void ProgressLine::showProgress(const QString& pattern, std::size_t number, std::size_t total) {
+    if (!m_counting) {
+        m_counting = true;
+        m_bar->show();
+        layout()->activate();  // no event will do it before the end
+    }
+    m_text->setText(pattern.arg(number).arg(total));
+    m_bar->setRange(0, static_cast<int>(total));
+    m_bar->setValue(static_cast<int>(number));
+    m_text->repaint();
+    m_bar->repaint();
 }
 
-void ProgressLine::step() {
-    if (!m_counting) return;
-    ++m_sent;
-    m_total = std::max(m_total, m_sent);
-    showCount();
-}
-
-void ProgressLine::addToTotal(int commands) {
-    if (m_counting) m_total = std::max(m_total + commands, m_sent);
-}
-
-void ProgressLine::end() {
+void ProgressLine::endProgress() {
     m_counting = false;
     m_bar->hide();
     m_text->setText(m_notice);
-}
-
-void ProgressLine::showCount() {
-    m_text->setText(m_pattern.arg(m_sent).arg(m_total));
-    m_bar->setRange(0, std::max(m_total, 1));
-    m_bar->setValue(m_sent);
-    m_text->repaint();
-    m_bar->repaint();
 }
 
 }  // namespace kdx

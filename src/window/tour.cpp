@@ -6,22 +6,48 @@
 #include <QPushButton>
 #include <QTabWidget>
 
+#include "base/printable.h"
 #include "coder/readback.h"
-#include "window/hmenue.h"
+#include "link/instrument.h"
 #include "ui/text.h"
+#include "window/hmenue.h"
 
 namespace kdx {
 
 namespace {
 
-/// Control characters and trailing blanks of an answer, so that a line stays a line.
-std::string printable(std::string text) {
-    text.erase(text.find_last_not_of(" \n\r") + 1);
-    for (char& c : text) {
-        if (static_cast<unsigned char>(c) < 0x20) c = '.';
-    }
-    return toText(text).toStdString();
+/// Without trailing blanks and with dots for control characters, so that a line stays a line.
+std::string shown(std::string_view text) {
+    return toText(printable(text.substr(0, text.find_last_not_of(" \n\r") + 1), '.')).toStdString();
 }
+
+/// Prints what is written and read while it lives, and counts the answers and what failed.
+class TrafficPrinter final : public TrafficWatcher {
+public:
+    TrafficPrinter(Instrument& instrument, const std::function<void(const std::string&)>& print)
+        : m_instrument(instrument), m_print(print) {
+        m_instrument.addWatcher(*this);
+    }
+    ~TrafficPrinter() override { m_instrument.removeWatcher(*this); }
+    TrafficPrinter(const TrafficPrinter&) = delete;
+    TrafficPrinter& operator=(const TrafficPrinter&) = delete;
+
+    void passed(const Traffic& traffic) override {
+        if (traffic.kind == Traffic::Kind::Logged) return;
+        const bool read = traffic.kind == Traffic::Kind::Read;
+        if (read) ++answers;
+        if (traffic.status < 0) ++failures;
+        m_print((read ? "<- " : "-> ") + shown(traffic.text) +
+                (traffic.status < 0 ? "  [" + std::to_string(traffic.status) + "]" : ""));
+    }
+
+    int answers = 0;
+    int failures = 0;
+
+private:
+    Instrument& m_instrument;
+    const std::function<void(const std::string&)>& m_print;
+};
 
 }  // namespace
 
@@ -51,18 +77,10 @@ void TourDialogs::note(const QString& title, const QString& text) {
     m_print("!! " + title.toStdString() + ": " + text.simplified().toStdString());
 }
 
-int makeTour(HMenue& window, const TourDialogs& dialogs, const QString& folder,
+int makeTour(HMenue& window, Instrument& instrument, const TourDialogs& dialogs, const QString& folder,
              const std::function<void(const std::string&)>& print) {
+    TrafficPrinter traffic(instrument, print);
     int failures = 0;
-    int answers = 0;
-    const auto watch = QObject::connect(&window, &HMenue::trafficPassed, [&](const Traffic& traffic) {
-        if (traffic.kind == Traffic::Kind::Logged) return;
-        const bool read = traffic.kind == Traffic::Kind::Read;
-        if (read) ++answers;
-        if (traffic.status < 0) ++failures;
-        print((read ? "<- " : "-> ") + printable(traffic.text) +
-              (traffic.status < 0 ? "  [" + std::to_string(traffic.status) + "]" : ""));
-    });
     window.show();
     window.INIT_Taste_Click();
 
@@ -84,11 +102,10 @@ int makeTour(HMenue& window, const TourDialogs& dialogs, const QString& folder,
             if (button != nullptr) button->click();
         }
     }
-    QObject::disconnect(watch);
-    if (answers == 0) ++failures;
-    failures += dialogs.count();
-    print(std::to_string(pictures) + " pictures, " + std::to_string(answers) + " answers, " + std::to_string(failures) +
-          " failures");
+    if (traffic.answers == 0) ++failures;
+    failures += traffic.failures + dialogs.count();
+    print(std::to_string(pictures) + " pictures, " + std::to_string(traffic.answers) + " answers, " +
+          std::to_string(failures) + " failures");
     return failures == 0 ? 0 : 1;
 }
 

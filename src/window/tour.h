@@ -10,6 +10,7 @@
 namespace kdx {
 
 class HMenue;
+class Instrument;
 
 /// Boxes during the tour: nobody is there to close them, so each one is printed and counts as a failure.
 class TourDialogs final : public Dialogs {
@@ -33,7 +34,7 @@ private:
 /// Walks through the whole window as a user does: opens the session (which sends the data set), shows each page and
 /// saves a picture of it, presses every read-back button, and prints everything that passed.
 /// @returns 0 when the session opened, every picture was saved, every question was answered and no box showed.
-[[nodiscard]] int makeTour(HMenue& window, const TourDialogs& dialogs, const QString& folder,
+[[nodiscard]] int makeTour(HMenue& window, Instrument& instrument, const TourDialogs& dialogs, const QString& folder,
                            const std::function<void(const std::string& line)>& print);
 
 }  // namespace kdx

@@ -3,6 +3,8 @@
 #include <QBrush>
 #include <QTime>
 
+#include "base/clock.h"
+#include "base/printable.h"
 #include "settings/captions.h"
 #include "ui/text.h"
 
@@ -10,21 +12,24 @@ namespace kdx {
 
 namespace {
 
-/// Control characters become dots and trailing blanks go, so that a line stays a line.
-QString printable(const std::string& bytes) {
-    QString text = toText(bytes);
-    while (text.endsWith(QLatin1Char(' ')) || text.endsWith(QLatin1Char('\n'))) text.chop(1);
-    for (QChar& c : text) {
-        if (c.unicode() < 0x20) c = QChar(0x00B7);
-    }
-    return text;
+/// Trailing blanks go and control characters become dots, so that a line stays a line.
+QString shown(std::string_view bytes) {
+    bytes = bytes.substr(0, bytes.find_last_not_of(" \n") + 1);
+    return toText(printable(bytes, '\xB7'));
 }
 
 }  // namespace
 
-TrafficLog::TrafficLog(QObject* parent) : QAbstractTableModel(parent) {}
+TrafficLog::TrafficLog(Instrument& instrument, const Clock& clock, QObject* parent)
+    : QAbstractTableModel(parent), m_instrument(instrument), m_clock(clock) {
+    m_instrument.addWatcher(*this);
+}
 
-void TrafficLog::add(const Traffic& traffic, double secondsSinceMidnight) {
+TrafficLog::~TrafficLog() {
+    m_instrument.removeWatcher(*this);
+}
+
+void TrafficLog::passed(const Traffic& traffic) {
     if (m_lines.size() == kMostLines) {
         beginRemoveRows({}, 0, 0);
         m_lines.pop_front();
@@ -32,7 +37,8 @@ void TrafficLog::add(const Traffic& traffic, double secondsSinceMidnight) {
     }
     const auto row = static_cast<int>(m_lines.size());
     beginInsertRows({}, row, row);
-    m_lines.push_back({static_cast<int>(secondsSinceMidnight * 1000), traffic.kind, traffic.text, traffic.status});
+    m_lines.push_back(
+        {static_cast<int>(m_clock.secondsSinceMidnight() * 1000), traffic.kind, traffic.text, traffic.status});
     endInsertRows();
 }
 
@@ -91,7 +97,7 @@ QString TrafficLog::cell(const Line& line, int column) const {
             }
             return {};
         case Text:
-            return printable(line.text);
+            return shown(line.text);
         default:
             return line.kind == Traffic::Kind::Logged ? QString() : QString::number(line.status);
     }

@@ -9,19 +9,21 @@
 namespace kdx {
 
 class Captions;
+class Clock;
 
 /// The latest lines of what was written, read and logged, oldest first, as a table of time, direction, text and status.
-class TrafficLog : public QAbstractTableModel {
+class TrafficLog : public QAbstractTableModel, public TrafficWatcher {
     Q_OBJECT
 public:
     enum Column { Time, Direction, Text, Status, ColumnCount };
     /// How many lines are kept; the oldest go first.
     static constexpr std::size_t kMostLines = 4000;
 
-    explicit TrafficLog(QObject* parent);
+    /// Listens to the link from now on. @param clock says when it happened.
+    TrafficLog(Instrument& instrument, const Clock& clock, QObject* parent);
+    ~TrafficLog() override;
 
-    /// @param secondsSinceMidnight when it happened.
-    void add(const Traffic& traffic, double secondsSinceMidnight);
+    void passed(const Traffic& traffic) override;
     void clear();
     /// Headings in the current language.
     void label(const Captions& captions);
@@ -43,6 +45,8 @@ private:
     };
     [[nodiscard]] QString cell(const Line& line, int column) const;
 
+    Instrument& m_instrument;
+    const Clock& m_clock;
     std::deque<Line> m_lines;
     QStringList m_headings{QString(), QString(), QString(), QString()};
 };

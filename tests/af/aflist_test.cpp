@@ -77,11 +77,9 @@ TEST(AfListTest, TheCommasAreTheCountOfAfs) {
     EXPECT_EQ(afCount(listOf(13)), 13U);
 }
 
-TEST(AfListTest, TheKeyGoesByKindAndNumber) {
-    EXPECT_EQ(afListKey("AF", 1), "AF_LISTE1");
-    EXPECT_EQ(afListKey("AF", 5), "AF_LISTE5");
-    EXPECT_EQ(afListKey("EON AF", 3), "EON_AFB3");
-    EXPECT_EQ(afListKey("", 2), "AF_LISTE2");
+TEST(AfListTest, TheFirstListStartsANewSetAndTheOthersAreAdded) {
+    EXPECT_EQ(newOrFurtherList(1), "N,");
+    for (const int number : {2, 3, 4, 5}) EXPECT_EQ(newOrFurtherList(number), "+,") << number;
 }
 
 TEST(AfListTest, AListIsTakenApartAtTheCommas) {

@@ -13,6 +13,7 @@
 namespace kdx {
 namespace {
 
+using test::direct;
 using test::Lines;
 
 constexpr const char* kSet1 = "Datenset1.INI";
@@ -32,7 +33,6 @@ protected:
         }
         return -1;
     }
-    static std::string direct(const std::string& command) { return ":STEREO:DIRECT \"" + command + "\""; }
     /// "98.5" and the given count of AFs.
     static std::string listOf(int count) {
         std::string list = "98.5";
@@ -45,7 +45,14 @@ protected:
         return list;
     }
 
-    AfPage page{context, nullptr};
+    /// Start-up: the data set's lists first, then the page.
+    void load() {
+        lists.load(settings);
+        page.load();
+    }
+
+    AfListSet lists;
+    AfPage page{context, lists, nullptr};
 };
 
 TEST_F(AfPageTest, ChoosingAListShowsItAndStoresItsNumber) {
@@ -89,7 +96,7 @@ TEST_F(AfPageTest, StartUpShowsTheListOfDataSetOneAndChoosesMethodA) {
     setProfile(kSet1, "RDS", "AF_LISTE", "4");
     setList(4, "87.6,90.1");
     const std::string before = folder.read(kSet1);
-    page.loadDataSet();
+    load();
     EXPECT_EQ(chosenList(), 3);
     EXPECT_EQ(text("AF_TN"), "87.6");
     EXPECT_EQ(rows(), Lines{"90.1"});
@@ -101,7 +108,7 @@ TEST_F(AfPageTest, StartUpShowsTheListOfDataSetOneAndChoosesMethodA) {
 
 TEST_F(AfPageTest, WithoutAStoredNumberStartUpShowsListOne) {
     setList(1, "87.6,90.1");
-    page.loadDataSet();
+    load();
     EXPECT_EQ(chosenList(), 0);
     EXPECT_EQ(text("AF_TN"), "87.6");
     EXPECT_EQ(profile(kSet1, "RDS", "AF_LISTE"), "");
@@ -111,14 +118,14 @@ TEST_F(AfPageTest, AStoredNumberThatNoListHasChoosesNone) {
     setList(1, "87.6,90.1");
     for (const char* number : {"0", "6", "-1", "abc", "1.5", "1e999"}) {
         setProfile(kSet1, "RDS", "AF_LISTE", number);
-        page.loadDataSet();
+        load();
         EXPECT_EQ(chosenList(), -1) << number;
         EXPECT_EQ(text("AF_TN"), "") << number;
     }
 }
 
 TEST_F(AfPageTest, SendingWithMethodASendsAllListsInTheirOrder) {
-    page.loadDataSet();
+    load();
     setList(1, "87.6,90.1,94.3");
     setList(2, "99.2,101.5");
     setList(3, "88");
@@ -130,11 +137,11 @@ TEST_F(AfPageTest, SendingWithMethodASendsAllListsInTheirOrder) {
 }
 
 TEST_F(AfPageTest, SendingWithMethodBSendsPairs) {
-    page.loadDataSet();
+    load();
     click("AFMethod_opt_1");
     setList(1, "87.6,90.1,94.3");
     setList(4, "99.2,101.5");
-    page.Taste_AF_Senden_Click();
+    click("Taste_AF_Senden");
     EXPECT_EQ(sent(), Lines({direct("AF=N,87.6,87.6,90.1,87.6,94.3"), direct("AF=+,99.2,99.2,101.5")}));
 }
 
@@ -197,6 +204,28 @@ TEST_F(AfPageTest, TheRefusalIsEnglishInEnglishOnly) {
     EXPECT_EQ(dialogs.shown[1].title, QStringLiteral("Liste Nr.1 ungültig"));
 }
 
+TEST_F(AfPageTest, ARefusedListIsToldWhenItsTurnComesInARunningSequenceToo) {
+    dialogs.expectedMessages = 1;
+    page.stepGoesOut({Step::Kind::Refused, "AF4", listOf(13)});
+    EXPECT_EQ(dialogs.shown.at(0).title, QStringLiteral("Liste Nr.4 ungültig"));
+    page.stepGoesOut({Step::Kind::Parameter, "AF4", "+,87.6"});
+    page.stepGoesOut({Step::Kind::Refused, "TA", "1"});
+    EXPECT_EQ(dialogs.shown.size(), 1U);
+    EXPECT_EQ(sent(), Lines{});
+}
+
+TEST_F(AfPageTest, TheDataSetHoldsTheChosenMethodAndTheListsAsTheyAreShown) {
+    load();
+    EXPECT_EQ(lists.method, AfMethod::A);
+    click("AFMethod_opt_1");
+    EXPECT_EQ(lists.method, AfMethod::B);
+    click("AFMethod_opt_0");
+    EXPECT_EQ(lists.method, AfMethod::A);
+    setList(2, "87.6,90.1");
+    click("AFList_Opt_1");
+    EXPECT_EQ(lists.lists.at(1), "87.6,90.1");
+}
+
 TEST_F(AfPageTest, MethodAHasNoLimit) {
     click("AFMethod_opt_0");
     setList(1, listOf(40));
@@ -207,7 +236,7 @@ TEST_F(AfPageTest, MethodAHasNoLimit) {
 TEST_F(AfPageTest, TheEditorOpensOnTheAfListsAndTheChosenListIsShownAgain) {
     setProfile(kSet1, "RDS", "AF_LISTE", "2");
     setList(2, "87.6,90.1");
-    page.loadDataSet();
+    load();
     state.afEditorKind = "EON AF";
     page.openEditorBy([this] {
         EXPECT_EQ(state.afEditorKind, "AF");
@@ -222,7 +251,7 @@ TEST_F(AfPageTest, TheEditorOpensOnTheAfListsAndTheChosenListIsShownAgain) {
 
 TEST_F(AfPageTest, AListEmptiedInTheEditorStaysInView) {
     setList(1, "87.6,90.1");
-    page.loadDataSet();
+    load();
     page.openEditorBy([this] { setList(1, "100.1"); });
     click("AF_Bearbeiten");
     EXPECT_EQ(text("AF_TN"), "87.6");
@@ -239,7 +268,7 @@ TEST_F(AfPageTest, TheEditorOpensWhenNoListIsChosen) {
 
 TEST_F(AfPageTest, TheEditorIsAWindowOfItsOwnThatBlocksThisOne) {
     setList(1, "87.6,90.1");
-    page.loadDataSet();
+    load();
     page.show();
     bool edited = false;
     QTimer::singleShot(0, [&edited] {
@@ -285,7 +314,7 @@ TEST_F(AfPageTest, TheControlsBearTheirTexts) {
 
 TEST_F(AfPageTest, EveryCaptionFitsInEveryLanguage) {
     setList(1, listOf(25));
-    page.loadDataSet();
+    load();
     for (const char* language : {"deutsch", "english", "english US"}) {
         useLanguage(language);
         page.label();

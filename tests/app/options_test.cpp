@@ -2,9 +2,9 @@
 
 #include <gtest/gtest.h>
 
+#include "app/choosevisa.h"
 #include "base/clock.h"
 #include "sim/virtualinstrument.h"
-#include "app/choosevisa.h"
 
 namespace kdx {
 namespace {
@@ -19,14 +19,16 @@ TEST(OptionsTest, AreReadInBothForms) {
 }
 
 TEST(OptionsTest, AnUnknownOptionIsNamed) {
-    EXPECT_EQ(parseOptions({"--colour"}).error, "unknown option --colour");
-    EXPECT_EQ(parseOptions({"file"}).error, "unknown option file");
+    EXPECT_NE(parseOptions({"--colour"}).error.find("--colour"), std::string::npos);
+    EXPECT_NE(parseOptions({"file"}).error.find("file"), std::string::npos);
+    EXPECT_NE(parseOptions({"-h"}).error, "");
 }
 
 TEST(OptionsTest, AMissingOrSuperfluousValueIsNamed) {
-    EXPECT_EQ(parseOptions({"--tour"}).error, "--tour needs a value");
-    EXPECT_EQ(parseOptions({"--app-folder="}).error, "--app-folder needs a value");
-    EXPECT_EQ(parseOptions({"--simulate=yes"}).error, "--simulate takes no value");
+    for (const char* wrong : {"--tour", "--app-folder=", "--simulate=yes", "--help=1"}) {
+        const std::string name = std::string(wrong).substr(2, std::string(wrong).find('=') - 2);
+        EXPECT_NE(parseOptions({wrong}).error.find(name), std::string::npos) << wrong;
+    }
 }
 
 TEST(OptionsTest, TwoInstrumentsExcludeEachOther) {
@@ -36,8 +38,9 @@ TEST(OptionsTest, TwoInstrumentsExcludeEachOther) {
 TEST(OptionsTest, TheHelpNamesEveryOption) {
     for (const char* option : {"--app-folder", "--visa-library", "--simulate", "--tour", "--version", "--help"}) {
         EXPECT_NE(helpText().find(option), std::string::npos) << option;
-        EXPECT_EQ(parseOptions({std::string(option), "x"}).error.find("unknown option --"), std::string::npos)
-            << option;
+    }
+    for (const char* option : {"--app-folder=x", "--visa-library=x", "--tour=x", "--simulate", "--version", "--help"}) {
+        EXPECT_EQ(parseOptions({option}).error, "") << option;
     }
 }
 

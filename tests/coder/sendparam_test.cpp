@@ -8,18 +8,13 @@
 #include <stdexcept>
 #include <vector>
 
-#include "link/instrument.h"
-#include "settings/datafolder.h"
-#include "settings/programstate.h"
-#include "support/fakeclock.h"
-#include "support/fakevisa.h"
-#include "support/tempfolder.h"
+#include "support/linkfixture.h"
 
 namespace kdx {
 namespace {
 
 using namespace std::string_literals;
-using Lines = std::vector<std::string>;
+using test::Lines;
 
 /// What a key and a value become.
 struct CommandCase {
@@ -216,88 +211,77 @@ TEST_P(DeviationKey, TooLargeANumberOverflows) {
 
 INSTANTIATE_TEST_SUITE_P(All, DeviationKey, ::testing::Values("MPX_HUB", "PILOT_HUB", "RDS_HUB", "ARI-HUB"), keyName);
 
-class ParamSenderTest : public ::testing::Test {
+class ParamSenderTest : public ::testing::Test, protected test::LinkFixture {
 protected:
     ParamSenderTest() {
-        m_state.InstrumentOnline = true;
-        m_state.LogEnabled = true;
+        state.InstrumentOnline = true;
+        state.LogEnabled = true;
+        state.shownClock = "08:15:30";
+        clock.set(100);  // pauses are measured in single precision: exact to the millisecond early in the day only
     }
-    [[nodiscard]] std::string log() const { return m_folder.read(kCommandLog); }
-
-    test::TempFolder m_folder;
-    test::FakeClock m_clock{100};
-    test::FakeVisa m_visa;
-    ProgramState m_state;
-    DataFolder m_data{m_folder.path()};
-    Lines m_errors;
-    Instrument m_instrument{m_visa, m_state, m_data, m_clock, [this](const auto& text, bool) {
-                                m_errors.push_back(text);
-                                return false;
-                            }};
-    int m_ended = 0;
-    ParamSender m_params{m_instrument, m_state, m_clock, [] { return "08:15:30"s; }, [this] { ++m_ended; }};
+    [[nodiscard]] std::string log() const { return folder.read(kCommandLog); }
 };
 
 TEST_F(ParamSenderTest, SendsAndLogsOneCommand) {
-    m_params.SendParam("PS", "RADIO");
-    EXPECT_EQ(m_visa.written, Lines{R"(:STEREO:DIRECT "PS=RADIO   ")"});
+    params.SendParam("PS", "RADIO");
+    EXPECT_EQ(sent(), Lines{R"(:STEREO:DIRECT "PS=RADIO   ")"});
     EXPECT_EQ(log(), "             PS= \":STEREO:DIRECT \"PS=RADIO   \"\"\r\n");
 }
 
 TEST_F(ParamSenderTest, LogsThenPausesThenWrites) {
     Lines events;
-    m_instrument.onTraffic([&](const Traffic& traffic) {
+    const test::TrafficListener listener(instrument, [&](const Traffic& traffic) {
         const bool logged = traffic.kind == Traffic::Kind::Logged;
-        events.push_back((logged ? "log after " : "write after ") + std::to_string(std::lround(m_clock.sleptMs())));
+        events.push_back((logged ? "log after " : "write after ") + std::to_string(std::lround(clock.sleptMs())));
         EXPECT_FALSE(log().empty());
     });
-    m_params.SendParam("TA", "1");
+    params.SendParam("TA", "1");
     EXPECT_EQ(events, (Lines{"log after 0", "write after 50"}));
 }
 
 TEST_F(ParamSenderTest, EveryCommandHasItsOwnPause) {
-    for (int i = 0; i < 10; ++i) m_params.SendParam("TA", "1");
-    EXPECT_NEAR(m_clock.sleptMs(), 500, 1);
-    EXPECT_EQ(m_visa.written.size(), 10U);
+    for (int i = 0; i < 10; ++i) params.SendParam("TA", "1");
+    EXPECT_NEAR(clock.sleptMs(), 500, 1);
+    EXPECT_EQ(visa.written.size(), 10U);
 }
 
 TEST_F(ParamSenderTest, WithoutASessionItLogsButNeitherPausesNorSends) {
-    m_state.InstrumentOnline = false;
-    m_params.SendParam("TP", "1");
-    EXPECT_TRUE(m_visa.written.empty());
-    EXPECT_TRUE(m_clock.sleeps.empty());
+    state.InstrumentOnline = false;
+    params.SendParam("TP", "1");
+    EXPECT_EQ(sent(), Lines{});
+    EXPECT_TRUE(clock.sleeps.empty());
     EXPECT_EQ(log(), "             TP= \":stereo:rds:traffic:program ON\"\r\n");
 }
 
 TEST_F(ParamSenderTest, AValueThatIsNoChoiceLogsAndSendsAnEmptyCommand) {
     // The row exists, so the road is taken to its end: the coder sees an empty write, which it ignores.
-    m_params.SendParam("TP", "2");
-    m_params.SendParam("STEREO_MODE", "0");
-    EXPECT_EQ(m_visa.written, (Lines{"", ""}));
+    params.SendParam("TP", "2");
+    params.SendParam("STEREO_MODE", "0");
+    EXPECT_EQ(sent(), (Lines{"", ""}));
     EXPECT_EQ(log(), "             TP= \r\n    STEREO_MODE= \r\n");
-    EXPECT_NEAR(m_clock.sleptMs(), 100, 1);
+    EXPECT_NEAR(clock.sleptMs(), 100, 1);
 }
 
 TEST_F(ParamSenderTest, UnknownKeysAndTheSineShapeDoNothingAtAll) {
-    for (const char* key : {"NFShape Sinus", "NOKEY", "ps", "ARI_HUB", ""}) m_params.SendParam(key, "1");
-    EXPECT_TRUE(m_visa.written.empty());
-    EXPECT_TRUE(m_clock.sleeps.empty());
+    for (const char* key : {"NFShape Sinus", "NOKEY", "ps", "ARI_HUB", ""}) params.SendParam(key, "1");
+    EXPECT_EQ(sent(), Lines{});
+    EXPECT_TRUE(clock.sleeps.empty());
     EXPECT_EQ(log(), "");
 }
 
 TEST_F(ParamSenderTest, ThePiComesBackInItsFourCharacterForm) {
-    m_state.currentPi = "d3c";
-    m_params.SendParam("PI", m_state.currentPi);
-    EXPECT_EQ(m_visa.written, Lines{R"(:STEREO:DIRECT "PI=d3c ")"});
-    EXPECT_EQ(m_state.currentPi, "d3c ");
+    std::string pi = "d3c";
+    params.SendParam("PI", pi);
+    EXPECT_EQ(sent(), Lines{R"(:STEREO:DIRECT "PI=d3c ")"});
+    EXPECT_EQ(pi, "d3c ");
 }
 
 TEST_F(ParamSenderTest, OtherValuesStayAsTheCallerHasThem) {
     std::string ps = "ABCDEFGHIJ";
-    m_params.SendParam("PS", ps);
+    params.SendParam("PS", ps);
     EXPECT_EQ(ps, "ABCDEFGHIJ");
     std::string eonPi = "e2f";
-    m_params.SendParam("EON_PI", eonPi);
+    params.SendParam("EON_PI", eonPi);
     EXPECT_EQ(eonPi, "e2f");
 }
 
@@ -305,37 +289,36 @@ TEST_F(ParamSenderTest, TheExtrasAndTheModeChangeNothing) {
     const std::string key = "TA";
     std::string value = "1";
     std::int16_t mode = 7;
-    m_params.SendParam(key, value, "extra", "more", mode);
-    EXPECT_EQ(m_visa.written, Lines{R"(:STEREO:DIRECT "TA=1")"});
+    params.SendParam(key, value, "extra", "more", mode);
+    EXPECT_EQ(sent(), Lines{R"(:STEREO:DIRECT "TA=1")"});
     EXPECT_EQ(key, "TA");
     EXPECT_EQ(value, "1");
     EXPECT_EQ(mode, 7);
 }
 
 TEST_F(ParamSenderTest, EonCommandsAreLedByTheCurrentIdentifierAsItStands) {
-    m_params.SendParam("EON_TP", "1");
-    m_state.eonIdentifier = "e2f";
-    m_params.SendParam("EON_TP", "1");
-    EXPECT_EQ(m_visa.written, (Lines{R"(:STEREO:DIRECT "EON-TP=,1")", R"(:STEREO:DIRECT "EON-TP=e2f,1")"}));
+    params.SendParam("EON_TP", "1");
+    state.eonIdentifier = "e2f";
+    params.SendParam("EON_TP", "1");
+    EXPECT_EQ(sent(), (Lines{R"(:STEREO:DIRECT "EON-TP=,1")", R"(:STEREO:DIRECT "EON-TP=e2f,1")"}));
 }
 
 TEST_F(ParamSenderTest, ShownClockAndPcClockGoOutWithTodaysDate) {
-    m_clock.set(7 * 3600 + 5 * 60 + 9.99);
-    m_params.SendParam("UHR", "EIN");
-    m_clock.set(7 * 3600 + 5 * 60 + 9.99);
-    m_params.SendParam("ZEIT", "");
-    EXPECT_EQ(m_visa.written,
-              (Lines{R"(:STEREO:DIRECT "CT=08:15:30,05.03.09")", R"(:STEREO:DIRECT "CT=07:05:09,05.03.09")"}));
+    clock.set(7 * 3600 + 5 * 60 + 9.99);
+    params.SendParam("UHR", "EIN");
+    clock.set(7 * 3600 + 5 * 60 + 9.99);
+    params.SendParam("ZEIT", "");
+    EXPECT_EQ(sent(), (Lines{R"(:STEREO:DIRECT "CT=08:15:30,05.03.09")", R"(:STEREO:DIRECT "CT=07:05:09,05.03.09")"}));
 }
 
 TEST_F(ParamSenderTest, TimeAndDateAlwaysHaveTwoDigitsEach) {
-    m_state.InstrumentOnline = false;  // the command in the log is enough: no pause runs across midnight
-    m_clock.set(0);
-    m_clock.setDate({2000, 1, 1});
-    m_params.SendParam("ZEIT", "");
-    m_clock.set(86399.999);
-    m_clock.setDate({1999, 12, 31});
-    m_params.SendParam("ZEIT", "");
+    state.InstrumentOnline = false;  // the command in the log is enough: no pause runs across midnight
+    clock.set(0);
+    clock.setDate({2000, 1, 1});
+    params.SendParam("ZEIT", "");
+    clock.set(86399.999);
+    clock.setDate({1999, 12, 31});
+    params.SendParam("ZEIT", "");
     EXPECT_EQ(log(),
               "           ZEIT= \":STEREO:DIRECT \"CT=00:00:00,01.01.00\"\"\r\n"
               "           ZEIT= \":STEREO:DIRECT \"CT=23:59:59,31.12.99\"\"\r\n");
@@ -344,36 +327,36 @@ TEST_F(ParamSenderTest, TimeAndDateAlwaysHaveTwoDigitsEach) {
 TEST_F(ParamSenderTest, TheDataSetKeyEndsTheProgramAtOnce) {
     // Kept for data sets that hold the key, although no control uses it.
     std::string value = "1";
-    m_params.SendParam("DS", value, "3", "", m_state.sendMode);
-    EXPECT_EQ(m_ended, 1);
-    EXPECT_TRUE(m_visa.written.empty());
-    EXPECT_TRUE(m_clock.sleeps.empty());
+    params.SendParam("DS", value, "3", "", state.sendMode);
+    EXPECT_EQ(ended, 1);
+    EXPECT_EQ(sent(), Lines{});
+    EXPECT_TRUE(clock.sleeps.empty());
     EXPECT_EQ(log(), "");
 }
 
 TEST_F(ParamSenderTest, NoOtherKeyEndsTheProgram) {
-    m_params.SendParam("ds", "1");
-    m_params.SendParam("PS", "DS");
-    EXPECT_EQ(m_ended, 0);
+    params.SendParam("ds", "1");
+    params.SendParam("PS", "DS");
+    EXPECT_EQ(ended, 0);
 }
 
 TEST_F(ParamSenderTest, AnOverflowReachesTheCallerAndNothingIsLoggedOrSent) {
-    EXPECT_THROW(m_params.SendParam("MPX_HUB", "1e308"), std::overflow_error);
-    EXPECT_TRUE(m_visa.written.empty());
+    EXPECT_THROW(params.SendParam("MPX_HUB", "1e308"), std::overflow_error);
+    EXPECT_EQ(sent(), Lines{});
     EXPECT_EQ(log(), "");
 }
 
 TEST_F(ParamSenderTest, AFailedWriteIsReportedOnceAndNotTriedAgain) {
-    m_visa.writeStatus = visa::kTimeout;
-    m_params.SendParam("TA", "1");
-    EXPECT_EQ(m_errors, Lines{"Fehler: -1073807339"});
-    EXPECT_EQ(m_visa.written.size(), 1U);
+    visa.writeStatus = visa::kTimeout;
+    params.SendParam("TA", "1");
+    EXPECT_EQ(failures, Lines{"Fehler: -1073807339"});
+    EXPECT_EQ(visa.written.size(), 1U);
 }
 
 TEST_F(ParamSenderTest, LoggingOffChangesNothingOnTheWire) {
-    m_state.LogEnabled = false;
-    m_params.SendParam("TA", "1");
-    EXPECT_EQ(m_visa.written, Lines{R"(:STEREO:DIRECT "TA=1")"});
+    state.LogEnabled = false;
+    params.SendParam("TA", "1");
+    EXPECT_EQ(sent(), Lines{R"(:STEREO:DIRECT "TA=1")"});
     EXPECT_EQ(log(), "");
 }
 

@@ -8,6 +8,7 @@
 namespace kdx {
 namespace {
 
+using test::direct;
 using test::Lines;
 
 constexpr const char* kSet1 = "Datenset1.INI";
@@ -20,9 +21,9 @@ protected:
     void press(std::initializer_list<int> groups) {
         for (const int number : groups) click(("Gruppe" + std::to_string(number)).c_str());
     }
-    static std::string direct(const std::string& command) { return ":STEREO:DIRECT \"" + command + "\""; }
 
-    GroupPage page{context, nullptr};
+    GroupSequence part;
+    GroupPage page{context, part, nullptr};
 };
 
 TEST_F(GroupPageTest, EveryButtonAppendsItsGroup) {
@@ -131,7 +132,7 @@ TEST_F(GroupPageTest, OpeningThePageShowsTheSequenceOfDataSetOneWhateverSetIsCur
     setProfile(kSet1, "RDS", "GR_Folge", "0A,2A,");
     setProfile("Datenset3.INI", "RDS", "GR_Folge", "15A,");
     press({7});
-    page.pageOpened();
+    page.opened();
     EXPECT_EQ(text("Label10"), "Gruppenfolge:0A,2A,");
     EXPECT_EQ(state.storedGroupSequence, "0A,2A,");
     EXPECT_EQ(sent(), Lines{});
@@ -139,11 +140,11 @@ TEST_F(GroupPageTest, OpeningThePageShowsTheSequenceOfDataSetOneWhateverSetIsCur
 
 TEST_F(GroupPageTest, EachOpeningReadsTheFileAnewAndDisablesGroup4) {
     EXPECT_TRUE(enabled("Gruppe4"));
-    page.pageOpened();
+    page.opened();
     EXPECT_FALSE(enabled("Gruppe4"));
     EXPECT_EQ(text("Label10"), "Gruppenfolge:");
     setProfile(kSet1, "RDS", "GR_Folge", "0A,");
-    page.pageOpened();
+    page.opened();
     EXPECT_FALSE(enabled("Gruppe4"));
     EXPECT_EQ(text("Label10"), "Gruppenfolge:0A,");
     for (const char* other : {"Gruppe0", "Gruppe3", "Gruppe5", "Gruppe15"}) EXPECT_TRUE(enabled(other)) << other;
@@ -154,7 +155,7 @@ TEST_F(GroupPageTest, StartUpShowsTheStoredSequenceAndCountsFromZero) {
     state.groupCount = 7;
     state.group8ACount = 7;
     const std::string before = folder.read(kSet1);
-    page.loadDataSet();
+    page.load();
     EXPECT_EQ(text("Label10"), "Gruppenfolge:0A,8A,");
     EXPECT_EQ(state.storedGroupSequence, "0A,8A,");
     EXPECT_EQ(state.groupCount, 0);
@@ -166,7 +167,7 @@ TEST_F(GroupPageTest, StartUpShowsTheStoredSequenceAndCountsFromZero) {
 
 TEST_F(GroupPageTest, AStoredSequenceGrowsByTheButtonsPressed) {
     setProfile(kSet1, "RDS", "GR_FOLGE", "0A,");
-    page.loadDataSet();
+    page.load();
     press({2});
     click("GS_Senden");
     EXPECT_EQ(sent(), Lines{direct("GS=0A,2A")});
@@ -174,21 +175,49 @@ TEST_F(GroupPageTest, AStoredSequenceGrowsByTheButtonsPressed) {
     EXPECT_EQ(state.groupCount, 1);
 }
 
-TEST_F(GroupPageTest, TheWholeDataSetSendsTheStoredSequence) {
+TEST_F(GroupPageTest, TheDataSetHoldsWhatIsShownWhateverSetIsAtWork) {
+    state.CurrentDataSet = "3";
     setProfile(kSet1, "RDS", "GR_FOLGE", "0A,8A,");
-    page.loadDataSet();
-    page.Gruppenfolge();
-    EXPECT_EQ(sent(), Lines{direct("GS=0A,8A")});
-    EXPECT_EQ(profile(kSet1, "RDS", "GR_FOLGE"), "0A,8A,");
+    setProfile("Datenset3.INI", "RDS", "GR_FOLGE", "15A,");
+    part.load(settings);
+    page.load();
+    EXPECT_EQ(part.groups, "0A,8A,");
+    press({2});
+    EXPECT_EQ(part.groups, "0A,8A,2A,");
+    click("newList");
+    EXPECT_EQ(part.groups, "");
+    page.opened();
+    EXPECT_EQ(part.groups, "0A,8A,");
+}
+
+TEST_F(GroupPageTest, ASequenceThatGoesOutWithTheWholeDataSetIsStoredInTheSetAtWork) {
+    setProfile(kSet1, "RDS", "GR_FOLGE", "0A,8A,");
+    page.load();
+    state.CurrentDataSet = "2";
+    Steps steps;
+    part.appendSteps(steps);
+    ASSERT_EQ(steps.size(), 1U);
+    page.stepGoesOut(steps.front());
+    EXPECT_EQ(profile("Datenset2.INI", "RDS", "GR_FOLGE"), "0A,8A,");
+    EXPECT_EQ(sent(), Lines{}) << "whoever runs the steps sends them";
     EXPECT_EQ(state.group8ACount, 0);
 }
 
-TEST_F(GroupPageTest, WithoutASequenceNoneIsStoredOrSent) {
-    page.loadDataSet();
-    const std::string before = folder.read(kSet1);
-    page.Gruppenfolge();
-    EXPECT_EQ(sent(), Lines{});
-    EXPECT_EQ(folder.read(kSet1), before);
+TEST_F(GroupPageTest, OtherStepsStoreNothing) {
+    page.load();
+    page.stepGoesOut({Step::Kind::Parameter, "PS", "RADIO"});
+    page.stepGoesOut({Step::Kind::Identify});
+    EXPECT_FALSE(std::filesystem::exists(folder.data() / kSet1));
+}
+
+TEST_F(GroupPageTest, TheSequenceIsStoredBeforeItIsSent) {
+    press({0, 2});
+    std::string stored;
+    const test::TrafficListener listener(instrument, [&](const Traffic& traffic) {
+        if (traffic.kind == Traffic::Kind::Written) stored = profile(kSet1, "RDS", "GR_FOLGE");
+    });
+    click("GS_Senden");
+    EXPECT_EQ(stored, "0A,2A,");
 }
 
 /// The sequence as a reader of the label finds it: after the heading of fixed length, without the last comma.

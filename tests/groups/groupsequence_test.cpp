@@ -4,6 +4,8 @@
 
 #include <limits>
 
+#include "support/linkfixture.h"
+
 namespace kdx {
 namespace {
 
@@ -22,6 +24,33 @@ TEST(GroupSequenceTest, TheCoderGetsTheSequenceWithoutItsLastComma) {
 
 TEST(GroupSequenceTest, TheLastCharacterGoesEvenWhenItIsNoComma) {
     EXPECT_EQ(sequenceToSend("0A,2A"), "0A,2");
+}
+
+/// The sequence as a part of a data set.
+class GroupSequencePart : public ::testing::Test, protected test::Bench {
+protected:
+    [[nodiscard]] Steps steps() const {
+        Steps steps;
+        sequence.appendSteps(steps);
+        return steps;
+    }
+    GroupSequence sequence;
+};
+
+TEST_F(GroupSequencePart, ComesFromTheDataSetAtWorkAndGoesOutWithoutItsLastComma) {
+    setProfile("Datenset1.INI", "RDS", "GR_Folge", "0A,2A,");
+    setProfile("Datenset3.INI", "RDS", "GR_FOLGE", "0A,8A,");
+    state.CurrentDataSet = "3";
+    sequence.load(settings);
+    EXPECT_EQ(sequence.groups, "0A,8A,");
+    EXPECT_EQ(steps(), (Steps{{Step::Kind::Parameter, "GROUPSEQ", "0A,8A"}}));
+}
+
+TEST_F(GroupSequencePart, IsNoStepWithoutAGroup) {
+    sequence.groups = "0A,";
+    sequence.load(settings);
+    EXPECT_EQ(sequence.groups, "");
+    EXPECT_EQ(steps(), Steps{});
 }
 
 TEST(GroupSequenceTest, AFullCounterStaysFull) {

@@ -9,7 +9,7 @@ using namespace std::string_literals;
 
 TEST_F(InstrumentTest, ACoderQueryTakesTheQuotesOffAndWritesThreeLines) {
     EXPECT_EQ(askCoder("\"RADIO\"\n"), "RADIO");
-    EXPECT_EQ(m_visa.written, Lines{R"(:STEREO:DIRECT? "PS?")"});
+    EXPECT_EQ(visa.written, Lines{R"(:STEREO:DIRECT? "PS?")"});
     EXPECT_EQ(log(),
               "             PS= :STEREO:DIRECT? \"PS?\"\r\n"
               "             PS= Answer \"" +
@@ -20,7 +20,7 @@ TEST_F(InstrumentTest, ACoderQueryTakesTheQuotesOffAndWritesThreeLines) {
 
 TEST_F(InstrumentTest, AGeneratorQueryKeepsTheAnswerAndWritesThreeLines) {
     EXPECT_EQ(askGenerator("87600000\n"), "87600000");
-    EXPECT_EQ(m_visa.written, Lines{"FREQ?"});
+    EXPECT_EQ(visa.written, Lines{"FREQ?"});
     EXPECT_EQ(log(),
               "             HF= :? \"FREQ\"\r\n"
               "             HF= Answer \"" +
@@ -31,10 +31,10 @@ TEST_F(InstrumentTest, AGeneratorQueryKeepsTheAnswerAndWritesThreeLines) {
 
 TEST_F(InstrumentTest, BothQueriesLogTheQuestionPauseAndThenRead) {
     Lines events;
-    m_instrument.onTraffic([&](const Traffic& traffic) {
+    const TrafficListener listener(instrument, [&](const Traffic& traffic) {
         const char* what = traffic.kind == Traffic::Kind::Written ? "write " : "read ";
         if (traffic.kind == Traffic::Kind::Logged) what = "log ";
-        events.push_back(what + std::to_string(std::lround(m_clock.sleptMs())));
+        events.push_back(what + std::to_string(std::lround(clock.sleptMs())));
     });
     EXPECT_EQ(askCoder("\"1\"\n"), "1");
     EXPECT_EQ(askGenerator("1\n"), "1");
@@ -88,7 +88,7 @@ TEST_F(InstrumentTest, AnAnswerOf500BytesShowsItsFirst60) {
     const std::string text(498, 'x');
     EXPECT_EQ(askCoder("\"" + text + "\""), std::string(58, 'x'));
     EXPECT_EQ(askGenerator(std::string(500, 'y')), std::string(60, 'y'));
-    EXPECT_TRUE(m_errors.empty());
+    EXPECT_TRUE(failures.empty());
 }
 
 TEST_F(InstrumentTest, ControlCharactersAreTextLikeAnyOther) {
@@ -102,7 +102,7 @@ TEST_F(InstrumentTest, ACarriageReturnBeforeTheLineFeedIsTakenForTheClosingQuote
 }
 
 TEST_F(InstrumentTest, AFailedReadGivesNoTextAndNoDisplayLine) {
-    m_visa.readStatus = visa::kTimeout;
+    visa.readStatus = visa::kTimeout;
     EXPECT_EQ(askCoder("\"RADIO\"\n"), "");
     EXPECT_EQ(askGenerator("67.5\n"), "");
     EXPECT_EQ(log(),
@@ -110,26 +110,26 @@ TEST_F(InstrumentTest, AFailedReadGivesNoTextAndNoDisplayLine) {
               "             PS= Answer \"Error\"\r\n"
               "             HF= :? \"FREQ\"\r\n"
               "             HF= Answer \"Error\"\r\n");
-    EXPECT_EQ(m_errors, (Lines{"Fehler: -1073807339", "Fehler: -1073807339"}));
+    EXPECT_EQ(failures, (Lines{"Fehler: -1073807339", "Fehler: -1073807339"}));
 }
 
 TEST_F(InstrumentTest, AFailedQuestionIsReportedAndTheAnswerReadAllTheSame) {
-    m_visa.writeStatus = visa::kInputOutput;
+    visa.writeStatus = visa::kInputOutput;
     EXPECT_EQ(askCoder("\"RADIO\"\n"), "RADIO");
-    EXPECT_EQ(m_errors, Lines{"Fehler: -1073807298"});
-    EXPECT_EQ(m_visa.reads, 1);
+    EXPECT_EQ(failures, Lines{"Fehler: -1073807298"});
+    EXPECT_EQ(visa.reads, 1);
 }
 
 TEST_F(InstrumentTest, WithoutASessionAQueryReachesNobody) {
-    m_state.InstrumentOnline = false;
+    state.InstrumentOnline = false;
     EXPECT_EQ(askGenerator("67.5\n"), kNoSessionAnswer);
-    EXPECT_TRUE(m_visa.written.empty());
-    EXPECT_EQ(m_visa.reads, 0);
-    EXPECT_TRUE(m_errors.empty());
+    EXPECT_TRUE(visa.written.empty());
+    EXPECT_EQ(visa.reads, 0);
+    EXPECT_TRUE(failures.empty());
 }
 
 TEST_F(InstrumentTest, WithoutCaptionsTheDisplayLineHasAnEmptyKey) {
-    m_instrument.setCaptionSource({});
+    captions.load("another", "RDS");  // which the file does not have
     EXPECT_EQ(askGenerator("\n"), "FREQ ");
     EXPECT_TRUE(log().ends_with("               = FREQ \r\n"));
 }

@@ -1,5 +1,7 @@
 #include "link/libraryvisa.h"
 
+#include "link/sharedlibrary.h"
+
 #include "support/tempfolder.h"
 
 #include <gmock/gmock.h>

@@ -1,31 +1,24 @@
-#include "rds/dynamicps.h"
-
 #include <QCheckBox>
 
-#include <stdexcept>
-
-#include "rds/rdspage.h"
-#include "support/pagetest.h"
+#include "rdspagetest.h"
 #include "ui/application.h"
 
 namespace kdx::test {
 namespace {
 
 std::string ps(const std::string& eight) {
-    return ":STEREO:DIRECT \"PS=" + eight + "\"";
+    return direct("PS=" + eight);
 }
 
-class DynamicPsTest : public PageTest {
+class DynamicPsTest : public RdsPageTest {
 protected:
     DynamicPsTest() {
         setProfile("Datenset1.INI", "RDS", "PS", "RADIO");
         setProfile("Datenset1.INI", "RDS", "RTA", "ABC");
         setProfile(kGeneralSettings, "RDS", "PS_Dyn", "1500");
-        page.label();
-        page.loadDataSet();
+        load();
     }
     ~DynamicPsTest() override { application().onFailure({}); }
-    QWidget& root() override { return page; }
 
     static Application& application() { return *static_cast<Application*>(QCoreApplication::instance()); }
     void setMode(Qt::CheckState mode) { find<QCheckBox>("PS_dyn_Check")->setCheckState(mode); }
@@ -39,8 +32,6 @@ protected:
         for (int i = 0; i < count; ++i) tick("PS_Timer");
         return sent();
     }
-
-    RdsPage page{context, nullptr};
 };
 
 TEST_F(DynamicPsTest, TheFirstTickAfterTheStartMakesOneStepAndPutsTheNameBack) {
@@ -126,14 +117,6 @@ TEST_F(DynamicPsTest, PageModeBlanksTheNameAndLeavesTheIndicator) {
     EXPECT_EQ(status(StatusSlot::Ps), before);
 }
 
-TEST_F(DynamicPsTest, PageModeTakesUpTo71Characters) {
-    DynamicPsRecord record;
-    EXPECT_EQ(nextPagePs(record, std::string(71, 'x')), "");
-    EXPECT_EQ(record.length, 8);
-    EXPECT_THROW(nextPagePs(record, std::string(72, 'x')), std::out_of_range);
-    EXPECT_THROW(nextPagePs(record, std::string(200, 'x')), std::out_of_range);
-}
-
 class TooLongRadiotext : public DynamicPsTest {
 protected:
     TooLongRadiotext() {
@@ -151,8 +134,6 @@ protected:
         EXPECT_EQ(ticks(10), Lines{});
         EXPECT_EQ(failures.size(), 1U);
     }
-
-    Lines failures;
 };
 
 TEST_F(TooLongRadiotext, IsToldOnceHoweverOftenTheTimerTicks) {

@@ -4,7 +4,9 @@
 
 #include <cstdlib>
 #include <memory>
+#include <type_traits>
 
+#include "rds/programme.h"
 #include "rds/querypage.h"
 #include "rds/rdspage.h"
 #include "rds/storepage.h"
@@ -21,13 +23,13 @@ class PageLayout : public PageTest, public ::testing::WithParamInterface<const c
 protected:
     QWidget& root() override { return *m_page; }
 
-    template <typename Page>
+    template <typename Shown>
     void show(const char* name) {
         folder.copyShipped();
         useLanguage(GetParam());
-        auto page = std::make_unique<Page>(context, nullptr);
+        auto page = make<Shown>();
         page->label();
-        fill(*page);
+        page->load();
         m_page = std::move(page);
         m_page->resize(kPageSize);
         m_page->show();
@@ -57,13 +59,15 @@ protected:
     }
 
 private:
-    static void fill(RdsPage& page) {
-        page.loadTaSettings();
-        page.loadDataSet();
-        page.loadProgrammeType();
-        page.Zeit_Taste_Click();
+    template <typename Shown>
+    std::unique_ptr<Shown> make() {
+        if constexpr (std::is_same_v<Shown, RdsPage>) {
+            m_programme.load(settings);
+            return std::make_unique<RdsPage>(context, m_programme, nullptr);
+        } else {
+            return std::make_unique<Shown>(context, nullptr);
+        }
     }
-    static void fill(QWidget& /*page*/) {}
 
     void expectNoOverlaps() {
         const auto parents = m_page->findChildren<QWidget*>() << m_page.get();
@@ -103,6 +107,7 @@ private:
         }
     }
 
+    Programme m_programme;
     std::unique_ptr<QWidget> m_page;
 };
 

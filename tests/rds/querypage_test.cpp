@@ -17,7 +17,6 @@ class QueryPageTest : public PageTest {
 protected:
     QueryPageTest() { page.label(); }
     QWidget& root() override { return page; }
-    static std::string coder(const std::string& key) { return ":STEREO:DIRECT? \"" + key + "\""; }
 
     QueryPage page{context, nullptr};
 };
@@ -85,7 +84,7 @@ protected:
     std::string words(const std::vector<std::string>& answers) const {
         const auto own = std::find_if(readBacks().begin(), readBacks().end(),
                                       [](const ReadBack& one) { return std::string(one.button) == GetParam().name; });
-        return toText(own->words(answers, [this](int n) { return captions.text(n); })).toStdString();
+        return toText(own->words(answers, captions)).toStdString();
     }
 };
 

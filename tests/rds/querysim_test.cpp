@@ -17,7 +17,10 @@ const std::string kNoAnswer = "keine Antwort";
 class QuerySimTest : public PageTest {
 protected:
     QuerySimTest() {
-        link.setCaptionSource([this](int number) { return captions.text(number); });
+        link.onFailure([this](const std::string& text, bool) {
+            failures.push_back(text);
+            return false;
+        });
         page.label();
         EXPECT_EQ(library.viOpenDefaultRM(link.DefaultRm), visa::kSuccess);
         openSession();
@@ -42,15 +45,11 @@ protected:
     }
     void expectNoError() { EXPECT_EQ(error(), "0,\"No error\""); }
 
-    std::vector<std::string> failures;
     sim::VirtualInstrument device{clock};
     sim::SimVisa library{device};
-    Instrument link{library, state, data, clock, [this](const std::string& text, bool) {
-                        failures.push_back(text);
-                        return false;
-                    }};
-    ParamSender dispatcher{link, state, clock, [this] { return clockText(); }, [] {}};
-    PageContext simulated{dispatcher, link, state, statusRow, captions, dialogs, data, clock};
+    Instrument link{library, state, data, captions, clock};
+    ParamSender dispatcher{link, state, clock, [] {}};
+    PageContext simulated{dispatcher, link, settings, state, statusRow, captions, dialogs, data, clock, tickers};
     QueryPage page{simulated, nullptr};
 };
 

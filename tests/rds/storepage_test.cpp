@@ -14,13 +14,13 @@ protected:
 
 TEST_F(StorePageTest, TheThirdButtonStoresInTheThirdMemory) {
     click("Store_Taste_2");
-    EXPECT_EQ(sent(), Lines{R"(:STEREO:DIRECT "STORE=3")"});
+    EXPECT_EQ(sent(), Lines{direct("STORE=3")});
 }
 
 TEST_F(StorePageTest, EachButtonStandsForItsOwnMemory) {
     for (int i = 0; i < 5; ++i) {
         click(("Store_Taste_" + std::to_string(i)).c_str());
-        EXPECT_EQ(sent(), Lines{":STEREO:DIRECT \"STORE=" + std::to_string(i + 1) + "\""});
+        EXPECT_EQ(sent(), Lines{direct("STORE=" + std::to_string(i + 1))});
     }
 }
 

@@ -1,27 +1,24 @@
-#include "rds/taframe.h"
+#include <QGroupBox>
 
-#include "rds/rdspage.h"
-#include "support/pagetest.h"
+#include "rdspagetest.h"
 
 namespace kdx::test {
 namespace {
 
-constexpr const char* kOn = R"(:STEREO:DIRECT "TA=1")";
-constexpr const char* kOff = R"(:STEREO:DIRECT "TA=0")";
+const std::string kOn = direct("TA=1");
+const std::string kOff = direct("TA=0");
 constexpr double kNoon = 12 * 3600.0;
 
 /// The frame on its page, with the traffic programme on and an announcement of 10 s every 60 s.
-class TaFrameTest : public PageTest {
+class TaFrameTest : public RdsPageTest {
 protected:
     TaFrameTest() {
         setProfile(kGeneralSettings, "RDS", "TA_ON", "10");
         setProfile(kGeneralSettings, "RDS", "TA_REP", "60");
-        page.label();
-        page.loadTaSettings();
+        load();
         click("Check1");
         sent();
     }
-    QWidget& root() override { return page; }
 
     /// The timers' ticks of the seconds `from` to `to` after the clock read `start`.
     void runSeconds(int from, int to, double start = kNoon) {
@@ -41,8 +38,6 @@ protected:
     }
     QColor buttonFace() { return statusRow.palette().color(QPalette::Button); }
     int interval(const char* timer) { return find<QTimer>(timer)->interval(); }
-
-    RdsPage page{context, nullptr};
 };
 
 TEST_F(TaFrameTest, TickingTheBoxStartsAnAnnouncementByHand) {
@@ -50,6 +45,7 @@ TEST_F(TaFrameTest, TickingTheBoxStartsAnAnnouncementByHand) {
     EXPECT_EQ(sent(), Lines{kOn});
     EXPECT_EQ(status(StatusSlot::Ta), "ein");
     EXPECT_EQ(indicator(), QColor(0, 255, 0));
+    EXPECT_EQ(programme.announcement, "1");
     EXPECT_FALSE(enabled("TA_Option_1"));
 }
 
@@ -59,6 +55,7 @@ TEST_F(TaFrameTest, UntickingTheBoxEndsIt) {
     EXPECT_EQ(sent(), (Lines{kOn, kOff}));
     EXPECT_EQ(status(StatusSlot::Ta), "aus");
     EXPECT_EQ(indicator(), buttonFace());
+    EXPECT_EQ(programme.announcement, "0");
     EXPECT_TRUE(enabled("TA_Option_1"));
 }
 
@@ -92,6 +89,7 @@ TEST_F(TaFrameTest, AnAnnouncementIsSentEverySecondAndItsEndOnce) {
     EXPECT_EQ(sent(), Lines(10, kOn));
     EXPECT_EQ(status(StatusSlot::Ta), "ein");
     EXPECT_EQ(indicator(), QColor(0, 255, 0));
+    EXPECT_EQ(programme.announcement, "0");  // a data set that is sent meanwhile ends it: the box is not ticked
     EXPECT_FALSE(enabled("TA_Option_0"));
     EXPECT_FALSE(find<QTimer>("TA_Rep_Timer")->isActive());
 
@@ -279,7 +277,7 @@ TEST_F(TaFrameTest, ADraggedBarIsShownOnTheWayAndActsWhereItComesToRest) {
 
 TEST_F(TaFrameTest, ADurationStoredAboveThePeriodComesDownToIt) {
     setProfile(kGeneralSettings, "RDS", "TA_ON", "90");
-    page.loadTaSettings();
+    load();
     EXPECT_EQ(text("TA_Zeit_Label"), " 60 s");
     EXPECT_EQ(text("TA_Rep_Label"), "60 s");
     EXPECT_EQ(profile(kGeneralSettings, "RDS", "TA_ON"), "90");  // start-up stores nothing
@@ -288,12 +286,12 @@ TEST_F(TaFrameTest, ADurationStoredAboveThePeriodComesDownToIt) {
 TEST_F(TaFrameTest, MissingOrAbsurdTimesStayWithinTheBars) {
     setProfile(kGeneralSettings, "RDS", "TA_ON", "");
     setProfile(kGeneralSettings, "RDS", "TA_REP", "");
-    page.loadTaSettings();
+    load();
     EXPECT_EQ(text("TA_Zeit_Label"), " 1 s");
     EXPECT_EQ(text("TA_Rep_Label"), "2 s");
     setProfile(kGeneralSettings, "RDS", "TA_ON", "1e300");
     setProfile(kGeneralSettings, "RDS", "TA_REP", "99999999999");
-    page.loadTaSettings();
+    load();
     EXPECT_EQ(text("TA_Zeit_Label"), " 600 s");
     EXPECT_EQ(text("TA_Rep_Label"), "3600 s");
 }
@@ -321,6 +319,7 @@ TEST_F(TaFrameTest, AnotherLanguageKeepsTimesAndStateAndChangesTheWords) {
     EXPECT_EQ(text("TA_Option_1"), "&Automatic");
     EXPECT_EQ(find<QGroupBox>("Frame1")->title(), QStringLiteral("TA function"));
     EXPECT_TRUE(checked("TA_Option_1"));
+    EXPECT_FALSE(enabled("TA_Check"));
     EXPECT_EQ(sent(), Lines{});
     runSeconds(2, 10);
     EXPECT_EQ(sent(), Lines(9, kOn));

@@ -1,6 +1,6 @@
 #include "rds/testmode.h"
 
-#include <gtest/gtest.h>
+#include <QGroupBox>
 
 #include "support/pagetest.h"
 
@@ -9,7 +9,9 @@ namespace {
 
 class TestModeTest : public PageTest {
 protected:
+    TestModeTest() { frame.label(); }
     QWidget& root() override { return frame; }
+    QString title() { return find<QGroupBox>("Frame11")->title(); }
 
     void expectPatternsEnabled(bool expected) {
         for (const char* pattern : {"TestDat_Opt_0", "TestDat_Opt_1", "TestDat_Opt_2", "TestDat_Opt_3"}) {
@@ -20,12 +22,11 @@ protected:
     TestMode frame{context, nullptr};
 };
 
-const std::string kBin0 = R"(:STEREO:DIRECT "BIN=0")";
-const std::string kBin1 = R"(:STEREO:DIRECT "BIN=1")";
+const std::string kBin0 = direct("BIN=0");
+const std::string kBin1 = direct("BIN=1");
 
 TEST_F(TestModeTest, BearsTheSystemsNameAndItsTexts) {
-    EXPECT_EQ(frame.objectName(), QStringLiteral("Frame11"));
-    EXPECT_EQ(frame.title(), QStringLiteral("Test Mode"));
+    EXPECT_EQ(title(), QStringLiteral("Test Mode"));
     EXPECT_EQ(text("Taste_DATA_MODE"), "RDS_Mode");
     EXPECT_EQ(text("TestDat_Opt_0"), "0 0 0 0 0 0 0 0");
     EXPECT_EQ(text("TestDat_Opt_1"), "1 1 1 1 1 1 1 1");
@@ -58,8 +59,7 @@ TEST_F(TestModeTest, ThePatternsAreNumberedFromOne) {
     click("Taste_DATA_MODE");
     sent();
     for (const char* pattern : {"TestDat_Opt_0", "TestDat_Opt_1", "TestDat_Opt_2", "TestDat_Opt_3"}) click(pattern);
-    EXPECT_EQ(sent(),
-              (Lines{kBin1, R"(:STEREO:DIRECT "BIN=2")", R"(:STEREO:DIRECT "BIN=3")", R"(:STEREO:DIRECT "BIN=4")"}));
+    EXPECT_EQ(sent(), (Lines{kBin1, direct("BIN=2"), direct("BIN=3"), direct("BIN=4")}));
 }
 
 // Both keys share one coder command; only the log tells them apart.
@@ -81,25 +81,28 @@ TEST_F(TestModeTest, APatternCannotBeSentOutsideTheTest) {
 
 TEST_F(TestModeTest, SelectingTheFirstPatternAtTheStartSendsAndLogsNothing) {
     state.LogEnabled = true;
-    frame.selectFirstPattern();
+    frame.load();
     EXPECT_TRUE(checked("TestDat_Opt_0"));
     EXPECT_TRUE(sent().empty());
     EXPECT_EQ(folder.read("RDS_log.txt"), "");
 }
 
 TEST_F(TestModeTest, SendingADataSetReturnsToRdsModeFromEveryState) {
-    frame.toRdsMode();
-    EXPECT_EQ(sent(), Lines{kBin0});
+    const Step toRdsMode{.key = "TEST_M", .value = "0"};
+    frame.stepGoesOut(toRdsMode);
     EXPECT_EQ(text("Taste_DATA_MODE"), "&RDS_Mode");
-    frame.toRdsMode();
-    EXPECT_EQ(sent(), Lines{kBin0});
+    frame.stepGoesOut(toRdsMode);
+    EXPECT_EQ(text("Taste_DATA_MODE"), "&RDS_Mode");
+    EXPECT_TRUE(sent().empty());  // sending is for whoever runs the sequence
     click("Taste_DATA_MODE");
     EXPECT_EQ(text("Taste_DATA_MODE"), "&Test_Mode");
-    sent();
-    frame.toRdsMode();
-    EXPECT_EQ(sent(), Lines{kBin0});
+    expectPatternsEnabled(true);
+    frame.stepGoesOut({.key = "TEST_D", .value = "0"});  // not the mode
+    EXPECT_EQ(text("Taste_DATA_MODE"), "&Test_Mode");
+    frame.stepGoesOut(toRdsMode);
     EXPECT_EQ(text("Taste_DATA_MODE"), "&RDS_Mode");
     expectPatternsEnabled(false);
+    EXPECT_EQ(sent(), Lines{kBin1});
 }
 
 TEST_F(TestModeTest, RelabellingKeepsTheMode) {
@@ -108,7 +111,7 @@ TEST_F(TestModeTest, RelabellingKeepsTheMode) {
     sent();
     useLanguage("english");
     frame.label();
-    EXPECT_EQ(frame.title(), QStringLiteral("Test mode"));
+    EXPECT_EQ(title(), QStringLiteral("Test mode"));
     EXPECT_EQ(text("Taste_DATA_MODE"), "&Test_Mode");
     expectPatternsEnabled(true);
     EXPECT_TRUE(sent().empty());

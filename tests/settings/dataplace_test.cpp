@@ -149,38 +149,5 @@ TEST_F(DataPlaceTest, ShippedFilesThatAreMarkedReadOnlyCanBeWrittenInTheUsersFol
     EXPECT_TRUE(replaceFile(user / "Daten" / "Datenset1.INI", "mine"));
 }
 
-class UserFolder : public ::testing::Test {
-protected:
-    ~UserFolder() override {
-        for (const auto& [name, value] : m_before) {
-            if (value) {
-                setenv(name, value->c_str(), 1);
-            } else {
-                unsetenv(name);
-            }
-        }
-    }
-
-private:
-    static std::optional<std::string> now(const char* name) {
-        const char* value = std::getenv(name);
-        return value == nullptr ? std::nullopt : std::optional<std::string>(value);
-    }
-    std::vector<std::pair<const char*, std::optional<std::string>>> m_before = {{"XDG_DATA_HOME", now("XDG_DATA_HOME")},
-                                                                                {"HOME", now("HOME")}};
-};
-
-TEST_F(UserFolder, FollowsTheXdgStandard) {
-    setenv("HOME", "/home/someone", 1);
-    setenv("XDG_DATA_HOME", "/data", 1);
-    EXPECT_EQ(userFolder(), fs::path("/data/kdx-rds"));
-    unsetenv("XDG_DATA_HOME");
-    EXPECT_EQ(userFolder(), fs::path("/home/someone/.local/share/kdx-rds"));
-    setenv("XDG_DATA_HOME", "", 1);
-    EXPECT_EQ(userFolder(), fs::path("/home/someone/.local/share/kdx-rds"));
-    setenv("XDG_DATA_HOME", "relative", 1);
-    EXPECT_EQ(userFolder(), fs::path("/home/someone/.local/share/kdx-rds"));
-}
-
 }  // namespace
 }  // namespace kdx::test

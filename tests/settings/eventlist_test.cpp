@@ -1,6 +1,7 @@
 #include "base/codepage.h"
 #include "settings/datafolder.h"
 #include "settings/profilefile.h"
+#include "support/sourcefolder.h"
 
 #include <algorithm>
 #include <filesystem>
@@ -45,7 +46,7 @@ std::string contentOf(const std::filesystem::path& file) {
 /// The shipped list, a half that is missing being empty.
 std::vector<Event> shippedEvents() {
     std::vector<Event> events;
-    for (const std::string& line : pieces(contentOf(DataFolder{KDX_SOURCE_DIR}.file(kEventList)), "\r\n")) {
+    for (const std::string& line : pieces(contentOf(DataFolder(test::sourceFolder()).file(kEventList)), "\r\n")) {
         const std::size_t semicolon = line.find(';');
         if (semicolon == std::string::npos) {
             ADD_FAILURE() << "no code: " << line;
@@ -62,7 +63,7 @@ std::vector<Event> shippedEvents() {
 /// What every shipped code says in English, kept apart from the list: a receiver shows its own text for the code, so
 /// a line whose code and text do not belong together sends something else than the user chose.
 std::map<std::string, std::string> meanings() {
-    const std::filesystem::path file = std::filesystem::path{KDX_SOURCE_DIR} / "tests/settings/event_meanings.tsv";
+    const std::filesystem::path file = test::sourceFolder() / "tests/settings/event_meanings.tsv";
     std::map<std::string, std::string> byCode;
     for (const std::string& line : pieces(contentOf(file), "\n")) {
         const std::vector<std::string> fields = pieces(line, "\t");

@@ -11,6 +11,7 @@
 #include "base/codepage.h"
 #include "settings/datafolder.h"
 #include "settings/profilefile.h"
+#include "support/sourcefolder.h"
 #include "support/tempfolder.h"
 
 namespace kdx {
@@ -18,7 +19,7 @@ namespace {
 
 using nlohmann::json;
 
-const char* const kCaseFile = KDX_SOURCE_DIR "/tests/settings/profile_cases.json";
+const std::filesystem::path kCaseFile = test::sourceFolder() / "tests" / "settings" / "profile_cases.json";
 const char* const kDefaultFile = "test.ini";  // for cases in which the name does not matter
 
 struct ProfileCase {

@@ -1,4 +1,5 @@
 #include "settings/datafolder.h"
+#include "support/sourcefolder.h"
 
 #include "base/codepage.h"
 #include "base/numbers.h"
@@ -101,7 +102,7 @@ protected:
         return m_data.ReadIni(language, std::to_string(number), kLanguageFile);
     }
 
-    DataFolder m_data{KDX_SOURCE_DIR};
+    DataFolder m_data{test::sourceFolder()};
 };
 
 TEST_F(ShippedData, EveryNumberHasATextInEveryLanguage) {

@@ -3,8 +3,9 @@
 #include <ostream>
 #include <vector>
 
-#include "link/instrument.h"
 #include "coder/sendparam.h"
+#include "link/instrument.h"
+#include "settings/captions.h"
 #include "settings/datafolder.h"
 #include "settings/programstate.h"
 #include "sim/simtest.h"
@@ -21,6 +22,10 @@ protected:
         ASSERT_EQ(library.viOpenDefaultRM(link.DefaultRm), visa::kSuccess);
         ASSERT_EQ(library.viOpen(link.DefaultRm, "TCPIP::simulated::INSTR", 0, 0, link.InstrSession), visa::kSuccess);
         state.InstrumentOnline = true;
+        link.onFailure([this](const std::string& text, bool) {
+            failures.push_back(text);
+            return false;
+        });
     }
     std::string networks() { return link.X4_Abfrage("EON-PI", "EON PI?"); }
 
@@ -29,10 +34,8 @@ protected:
     ProgramState state;
     SimVisa library{instrument};
     std::vector<std::string> failures;
-    Instrument link{library, state, data, clock, [this](const std::string& text, bool) {
-                        failures.push_back(text);
-                        return false;
-                    }};
+    Captions captions{data};
+    Instrument link{library, state, data, captions, clock};
 };
 
 // Cuts the answer at its commas, as sending a data set does to remove what the coder holds.
@@ -237,7 +240,8 @@ TEST_F(ReadbackTest, EveryCommandOfTheDispatcherIsCarriedOutWithoutAnError) {
 }
 
 TEST_F(ReadbackTest, AnEmptyTextIsShownAsEmpty) {
-    link.setCaptionSource([](int number) { return number == 144 ? "empty" : ""; });
+    folder.write(kLanguageFile, "[test]\r\n144=empty\r\n");
+    captions.load("test", "RDS");
     EXPECT_EQ(link.X4_Abfrage("RT?", "RT"), "RT: empty | ");
 }
 

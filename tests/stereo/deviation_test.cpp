@@ -61,10 +61,10 @@ TEST(PilotPhaseTest, IsTheLastTwoCharactersWithZerosInFront) {
 }
 
 TEST(DeviationTest, TheStoredNamesAndTheSentNamesDifferWhereTheyAlwaysDid) {
-    EXPECT_STREQ(kTotalDeviation.sendKey, "MPX_HUB");
-    EXPECT_STREQ(kTotalDeviation.profileKey, "MPX_DEV");
-    EXPECT_STREQ(kAriDeviation.sendKey, "ARI-HUB");
-    EXPECT_STREQ(kAriDeviation.profileKey, "ARI_HUB");
+    EXPECT_STREQ(kTotalDeviation.setting.sendKey, "MPX_HUB");
+    EXPECT_STREQ(kTotalDeviation.setting.place.key, "MPX_DEV");
+    EXPECT_STREQ(kAriDeviation.setting.sendKey, "ARI-HUB");
+    EXPECT_STREQ(kAriDeviation.setting.place.key, "ARI_HUB");
 }
 
 }  // namespace

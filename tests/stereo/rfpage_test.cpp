@@ -5,6 +5,7 @@
 #include <QGroupBox>
 #include <QMouseEvent>
 
+#include "stereo/carrier.h"
 #include "support/layoutcheck.h"
 #include "support/pagetest.h"
 
@@ -37,8 +38,21 @@ protected:
         for (const char* text : answers) dialogs.inputs.push_back(QString::fromUtf8(text));
     }
 
+    /// Sends what goes out with the data set and at the opening, as a running sequence does.
+    void sendSequence() {
+        carrier.load(settings);
+        Steps steps;
+        carrier.appendSteps(steps);
+        carrier.appendOpeningSteps(steps);
+        for (const Step& step : steps) {
+            page.stepGoesOut(step);
+            params.SendParam(step.key, std::string(step.value));
+        }
+    }
+
     static constexpr const char* kSet1 = "Datenset1.INI";
-    RfPage page{context, nullptr};
+    Carrier carrier;
+    RfPage page{context, carrier, nullptr};
 };
 
 TEST_F(RfPageTest, ShowsDashesAndTheOutputOffAtFirst) {
@@ -135,6 +149,7 @@ TEST_F(RfPageTest, NothingEnteredIsStoredAndTheNextBoxOffersTheStoredValueAgain)
     clickLabel("Input_HF_Freq_Label");
     clickLabel("Input_HF_Freq_Label");
     EXPECT_EQ(profile(kSet1, "VRN", "HF_Frequenz"), "98.5");
+    EXPECT_EQ(carrier.rfFrequency, "");
     EXPECT_EQ(dialogs.shown[1].preset, QStringLiteral("98.5"));
 }
 
@@ -145,8 +160,10 @@ TEST_F(RfPageTest, LimitsAndValuesComeFromDataSetOneWhateverSetIsCurrent) {
     answer({"101.2"});
     clickLabel("Input_HF_Freq_Label");
     EXPECT_EQ(dialogs.shown[0].preset, QStringLiteral("98.5"));
-    page.sendFrequency();
-    EXPECT_EQ(sent(), (Lines{"FREQ 101.2MHZ", "FREQ 98.5MHZ"}));
+    EXPECT_EQ(sent(), Lines{"FREQ 101.2MHZ"});
+    sendSequence();
+    EXPECT_EQ(text("Input_HF_Freq_Label"), "98.5");
+    EXPECT_EQ(sent()[0], "FREQ 98.5MHZ");
 }
 
 TEST_F(RfPageTest, WithoutStoredLimitsNoFrequencyFits) {
@@ -165,20 +182,23 @@ TEST_F(RfPageTest, TheFirstClickSwitchesTheOutputOnTheSecondOff) {
     EXPECT_EQ(sent(), (Lines{":OUTPUT:STAT ON", ":OUTPUT:STAT OFF"}));
 }
 
-TEST_F(RfPageTest, OpeningTheSessionRunsTheOutputsHandler) {
-    page.HfOnOffState_Click();
+TEST_F(RfPageTest, OpeningTheSessionTurnsTheOutputOver) {
+    sendSequence();
     EXPECT_TRUE(checked("HfOnOffState"));
-    EXPECT_EQ(sent(), Lines{":OUTPUT:STAT ON"});
-    page.HfOnOffState_Click();
+    EXPECT_TRUE(carrier.outputOn);
+    EXPECT_EQ(sent()[2], ":OUTPUT:STAT ON");
+    sendSequence();
     EXPECT_FALSE(checked("HfOnOffState"));
-    EXPECT_EQ(sent(), Lines{":OUTPUT:STAT OFF"});
+    EXPECT_FALSE(carrier.outputOn);
+    EXPECT_EQ(sent()[2], ":OUTPUT:STAT OFF");
+    click("HfOnOffState");
+    EXPECT_TRUE(carrier.outputOn);
+    EXPECT_EQ(sent(), Lines{":OUTPUT:STAT ON"});
 }
 
 TEST_F(RfPageTest, TheStoredValuesAreSentAndShown) {
-    page.sendFrequency();
-    page.sendLevel();
-    page.sendAudioFrequency();
-    EXPECT_EQ(sent(), (Lines{"FREQ 98.5MHZ", ":POW 80DBUV", ":STEREO:AUDIO:FREQ 1KHZ"}));
+    sendSequence();
+    EXPECT_EQ(sent(), (Lines{"FREQ 98.5MHZ", ":POW 80DBUV", ":OUTPUT:STAT ON", ":STEREO:AUDIO:FREQ 1KHZ"}));
     EXPECT_EQ(text("Input_HF_Freq_Label"), "98.5");
     EXPECT_EQ(text("Input_HF_Pegel_Label"), "80");
     EXPECT_EQ(text("Input_AF_Freq_Label"), "1");
@@ -187,24 +207,44 @@ TEST_F(RfPageTest, TheStoredValuesAreSentAndShown) {
     EXPECT_EQ(status(StatusSlot::AudioFrequency), "1");
 }
 
-TEST_F(RfPageTest, ChoosingTheSineLeavesNoTrace) {
-    state.LogEnabled = true;
-    page.sendAudioFrequency();
-    EXPECT_EQ(sent(), Lines{":STEREO:AUDIO:FREQ 1KHZ"});
-    EXPECT_EQ(folder.read("RDS_log.txt").find("NFShape"), std::string::npos);
+TEST_F(RfPageTest, AMissingValueIsSentAndShownEmpty) {
+    answer({"101.2"});
+    clickLabel("Input_HF_Freq_Label");
+    sent();
+    setProfile(kSet1, "VRN", "HF_Frequenz", "");
+    sendSequence();
+    EXPECT_EQ(sent()[0], "FREQ MHZ");
+    EXPECT_EQ(text("Input_HF_Freq_Label"), "");
+    EXPECT_EQ(status(StatusSlot::RfFrequency), "");
+    EXPECT_EQ(text("Input_HF_Pegel_Label"), "80");
 }
 
-// The instrument refuses the empty value, so what is shown stays true.
-TEST_F(RfPageTest, AMissingValueIsSentButNotShown) {
-    setProfile(kSet1, "VRN", "HF_Frequenz", "");
-    page.sendFrequency();
-    EXPECT_EQ(sent(), Lines{"FREQ MHZ"});
+TEST_F(RfPageTest, StepsOfOtherPagesChangeNothing) {
+    for (const char* key : {"RDS", "MPX_HUB", "NFShape Sinus", ""}) {
+        page.stepGoesOut({Step::Kind::Parameter, key, "1"});
+    }
     EXPECT_EQ(text("Input_HF_Freq_Label"), "-");
-    EXPECT_EQ(status(StatusSlot::RfFrequency), "--");
+    EXPECT_EQ(text("Input_HF_Pegel_Label"), "-");
+    EXPECT_EQ(text("Input_AF_Freq_Label"), "-");
+    EXPECT_FALSE(checked("HfOnOffState"));
+    EXPECT_TRUE(sent().empty());
+}
+
+TEST_F(RfPageTest, AnEmptyValueLeavesTheFramesWhereTheyAre) {
+    page.resize(620, 322);
+    page.show();
+    QApplication::processEvents();
+    const QRect before = find("AF_Freq_Frame")->geometry();
+    setProfile(kSet1, "VRN", "HF_Frequenz", "");
+    setProfile(kSet1, "VRN", "HF_Pegel", "");
+    sendSequence();
+    QApplication::processEvents();
+    EXPECT_EQ(text("Input_HF_Pegel_Label"), "");
+    EXPECT_EQ(find("AF_Freq_Frame")->geometry(), before);
 }
 
 TEST_F(RfPageTest, RelabellingKeepsTheValues) {
-    page.sendFrequency();
+    sendSequence();
     sent();
     useLanguage("english");
     page.label();
@@ -214,7 +254,7 @@ TEST_F(RfPageTest, RelabellingKeepsTheValues) {
 }
 
 TEST_F(RfPageTest, EveryControlHasAnAccessibleName) {
-    page.sendFrequency();
+    sendSequence();
     EXPECT_EQ(find("Input_HF_Freq_Label")->accessibleName(), toText(captions.text(212)) + QStringLiteral(": 98.5"));
     EXPECT_FALSE(find("Input_HF_Pegel_Label")->accessibleName().isEmpty());
     EXPECT_FALSE(find("Input_AF_Freq_Label")->accessibleName().isEmpty());

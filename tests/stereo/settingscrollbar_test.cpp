@@ -69,7 +69,7 @@ TEST_F(SettingScrollBarTest, ADragIsFollowedByTheLabelAndSentOnceAtItsEnd) {
     EXPECT_EQ(general("MPX_DEV"), "04000");
     mouse(QEvent::MouseButtonRelease, start + QPoint(40, 0));
     EXPECT_EQ(sent(), Lines{":STEREO:DEVIATION " + std::to_string(bar->value() * 10) + "HZ"});
-    EXPECT_EQ(general("MPX_DEV"), page.totalDeviation());
+    EXPECT_EQ(general("MPX_DEV"), multiplex.totalDeviation);
     EXPECT_GT(bar->value(), 4000);
     EXPECT_EQ(text("FM_Hub_Label2"), last);
 }

@@ -1,6 +1,5 @@
 #include <gtest/gtest.h>
 
-#include "stereo/stereopage.h"
 #include "stereopagetest.h"
 
 namespace kdx::test {
@@ -30,7 +29,7 @@ protected:
 
 TEST_F(StereoPageStart, TheStoredSettingsStandInTheControls) {
     storeEverything();
-    page.loadSettings();
+    start();
     EXPECT_EQ(position("FM_Hub_Scroll"), 7500);
     EXPECT_EQ(text("FM_Hub_Label2"), "Hub 75.0 kHz");
     EXPECT_EQ(chosen("FM_Source_Opt", 4), 3);
@@ -52,14 +51,14 @@ TEST_F(StereoPageStart, TheStoredSettingsStandInTheControls) {
 
 TEST_F(StereoPageStart, OnlyTheHandlersOfTheOnOffButtonsRun) {
     storeEverything();
-    page.loadSettings();
+    start();
     EXPECT_EQ(sent(), (Lines{":stereo:pilot:state ON", ":stereo:ari:state OFF", ":stereo:rds:state ON"}));
 }
 
 TEST_F(StereoPageStart, NothingIsSentBeforeASessionIsOpen) {
     storeEverything();
     state.InstrumentOnline = false;
-    page.loadSettings();
+    start();
     EXPECT_TRUE(sent().empty());
     EXPECT_TRUE(checked("Pilot_OnOff"));
 }
@@ -67,8 +66,8 @@ TEST_F(StereoPageStart, NothingIsSentBeforeASessionIsOpen) {
 TEST_F(StereoPageStart, NothingFlipsFromStartToStart) {
     storeEverything();
     const std::string before = folder.read("RDS_Allg.INI");
-    for (int start = 0; start < 3; ++start) {
-        page.loadSettings();
+    for (int again = 0; again < 3; ++again) {
+        start();
         EXPECT_TRUE(checked("Pilot_OnOff"));
         EXPECT_FALSE(checked("Ari_OnOff"));
         EXPECT_TRUE(checked("RDS_OnOff"));
@@ -77,7 +76,7 @@ TEST_F(StereoPageStart, NothingFlipsFromStartToStart) {
 }
 
 TEST_F(StereoPageStart, MissingSettingsReadAsZeroAndChooseNothing) {
-    page.loadSettings();
+    start();
     EXPECT_EQ(text("FM_Hub_Label2"), "Hub 0.0 kHz");
     EXPECT_EQ(text("Pilot_hub_Label"), "Hub 0.00 kHz");
     EXPECT_EQ(text("HScroll1_Label"), "Phase 0 °");
@@ -90,8 +89,8 @@ TEST_F(StereoPageStart, MissingSettingsReadAsZeroAndChooseNothing) {
     EXPECT_FALSE(checked("Pilot_OnOff"));
     EXPECT_FALSE(checked("RDS_OnOff"));
     EXPECT_FALSE(checked("Ari_OnOff"));
-    EXPECT_EQ(page.sourceValue(), "");
-    EXPECT_EQ(page.totalDeviation(), "00000");
+    EXPECT_EQ(multiplex.source, "");
+    EXPECT_EQ(multiplex.totalDeviation, "00000");
 }
 
 TEST_F(StereoPageStart, GarbageIsReadLeniently) {
@@ -101,8 +100,8 @@ TEST_F(StereoPageStart, GarbageIsReadLeniently) {
     setGeneral("RDS_HUB", "200 kHz");
     setGeneral("MPX_SOURCE", "4");
     setGeneral("PILOT", "yes");
-    page.loadSettings();
-    EXPECT_EQ(page.totalDeviation(), "08000");
+    start();
+    EXPECT_EQ(multiplex.totalDeviation, "08000");
     EXPECT_EQ(position("Pilot_Hub_Scroll"), 0);
     EXPECT_EQ(position("HScroll1"), 0);
     EXPECT_EQ(position("RDS_Hub_Scroll"), 200);
@@ -114,7 +113,7 @@ TEST_F(StereoPageStart, GarbageIsReadLeniently) {
 TEST_F(StereoPageStart, AStoredOneIsTheFirstImpedanceAndTwoTheSecond) {
     for (const auto& [stored, option] : {std::pair{"1", 0}, {"2", 1}, {"0", -1}, {"3", -1}, {"", -1}}) {
         setGeneral("MPX_IMPEDANZ", stored);
-        page.loadSettings();
+        start();
         EXPECT_EQ(chosen("FM_Imp_Opt", 2), option) << stored;
     }
 }
@@ -125,83 +124,72 @@ TEST_F(StereoPageStart, AnAreaChosenInTheWindowIsNotRestored) {
     click("BK_Opt_3");
     EXPECT_EQ(general("ARI-BK"), "D");
     EXPECT_EQ(general("ARI_BK"), "1");
-    page.loadSettings();
+    start();
     EXPECT_EQ(chosen("BK_Opt", 6), 1);
 }
 
 TEST_F(StereoPageStart, AStoredAreaIsOneOfTheFirstFourByNumber) {
     for (const auto& [stored, option] : {std::pair{"0", 0}, {"3", 3}, {"4", -1}, {"5", -1}, {"D", -1}}) {
         setGeneral("ARI_BK", stored);
-        page.loadSettings();
+        start();
         EXPECT_EQ(chosen("BK_Opt", 6), option) << stored;
     }
 }
 
-TEST_F(StereoPageStart, TheSettingsAreSentInTheirOrder) {
+TEST_F(StereoPageStart, TheMultiplexStaysAsTheControlsAre) {
     storeEverything();
-    page.loadSettings();
-    sent();
-    page.sendSettings();
-    EXPECT_EQ(sent(), (Lines{":stereo:audio:preemphasis:state ON;:stereo:audio:preemphasis 50us",
-                             ":stereo:pilot:state ON", ":STEREO:PILOT:DEVIATION 6750HZ", ":STEREO:PILOT:PHASE -4DEG",
-                             ":stereo:ari:state OFF", ":stereo:rds:state ON", ":STEREO:RDS:DEVIATION 2000HZ"}));
-}
-
-// "ARI_HUB", "ARI_ID" and "AR_BK" are spelled otherwise than the instrument's parameters: they leave no trace.
-TEST_F(StereoPageStart, TheDetailsOfAriAreNeitherSentNorLoggedWithTheSettings) {
-    storeEverything();
-    page.loadSettings();
-    state.LogEnabled = true;
-    page.sendSettings();
-    const std::string log = folder.read("RDS_log.txt");
-    EXPECT_NE(log.find("ARI="), std::string::npos) << log;
-    EXPECT_EQ(log.find("ARI_HUB"), std::string::npos);
-    EXPECT_EQ(log.find("ARI_ID"), std::string::npos);
-    EXPECT_EQ(log.find("AR_BK"), std::string::npos);
-}
-
-TEST_F(StereoPageStart, ADataSetWithoutPreemphasisSendsAnEmptyCommandInItsPlace) {
-    page.loadSettings();
-    sent();
-    page.sendSettings();
-    EXPECT_EQ(sent(), (Lines{"", ":stereo:pilot:state OFF", ":STEREO:PILOT:DEVIATION 0HZ", ":STEREO:PILOT:PHASE 00DEG",
-                             ":stereo:ari:state OFF", ":stereo:rds:state OFF", ":STEREO:RDS:DEVIATION 0HZ"}));
-}
-
-TEST_F(StereoPageStart, TheBaseStateIsGivenAsItIsSent) {
-    storeEverything();
-    page.loadSettings();
-    EXPECT_EQ(page.totalDeviation(), "07500");
-    EXPECT_EQ(page.sourceValue(), "3");
+    start();
+    EXPECT_EQ(multiplex.totalDeviation, "07500");
+    EXPECT_EQ(multiplex.source, "3");
+    EXPECT_EQ(multiplex.pilot, "1");
     scroll("FM_Hub_Scroll", 10);
     click("FM_Source_Opt_0");
-    EXPECT_EQ(page.totalDeviation(), "00010");
-    EXPECT_EQ(page.sourceValue(), "0");
+    click("Pilot_OnOff");
+    EXPECT_EQ(multiplex.totalDeviation, "00010");
+    EXPECT_EQ(multiplex.source, "0");
+    EXPECT_EQ(multiplex.pilot, "0");
 }
 
-TEST_F(StereoPageStart, TheFirstImpedanceIsSelectedAsByAClick) {
+TEST_F(StereoPageStart, TheImpedanceThatTheOpeningSendsIsChosenAndStored) {
     setGeneral("MPX_IMPEDANZ", "2");
-    page.loadSettings();
+    start();
     sent();
-    page.selectFirstImpedance();
+    page.stepGoesOut({Step::Kind::Parameter, "MPX_IMPEDANZ", "0"});
     EXPECT_EQ(chosen("FM_Imp_Opt", 2), 0);
-    EXPECT_EQ(sent(), Lines{""});
+    EXPECT_EQ(multiplex.impedance, "0");
     EXPECT_EQ(general("MPX_IMPEDANZ"), "0");
+    EXPECT_TRUE(sent().empty());
 }
 
-TEST_F(StereoPageStart, TheFirstImpedanceIsLeftAloneWhenItIsChosenAlready) {
-    setGeneral("MPX_IMPEDANZ", "1");
-    page.loadSettings();
+TEST_F(StereoPageStart, OtherStepsChangeNothingHere) {
+    storeEverything();
+    start();
     sent();
-    page.selectFirstImpedance();
-    EXPECT_EQ(chosen("FM_Imp_Opt", 2), 0);
+    const std::string before = folder.read("RDS_Allg.INI");
+    for (const char* key : {"MPX_HUB", "MPX_SOURCE", "PILOT", "RDS", "TEST_M"}) {
+        page.stepGoesOut({Step::Kind::Parameter, key, "0"});
+    }
+    EXPECT_EQ(position("FM_Hub_Scroll"), 7500);
+    EXPECT_EQ(chosen("FM_Source_Opt", 4), 3);
+    EXPECT_EQ(chosen("FM_Imp_Opt", 2), 1);
+    EXPECT_TRUE(checked("Pilot_OnOff"));
+    EXPECT_EQ(multiplex.source, "3");
+    EXPECT_EQ(folder.read("RDS_Allg.INI"), before);
     EXPECT_TRUE(sent().empty());
-    EXPECT_EQ(general("MPX_IMPEDANZ"), "1");
+}
+
+TEST_F(StereoPageStart, TheFrameOfTheTestModeHearsWhatThePageHears) {
+    testMode->heard.clear();
+    page.label();
+    page.load();
+    page.opened();
+    page.stepGoesOut({Step::Kind::Parameter, "TEST_M", "0"});
+    EXPECT_EQ(testMode->heard, (Lines{"label", "load", "opened", "TEST_M=0"}));
 }
 
 TEST_F(StereoPageStart, TheRdsPhaseIsHidden) {
     EXPECT_FALSE(find("RDS_Phase_Scroll")->isHidden());
-    page.hideRdsPhase();
+    start();
     EXPECT_TRUE(find("RDS_Phase_Label")->isHidden());
     EXPECT_TRUE(find("RDS_Phase_Scroll")->isHidden());
 }

@@ -23,39 +23,44 @@ struct ScrollCase {
     const char* command;
     const char* key;
     const char* stored;
+    std::string Multiplex::*member;
     friend void PrintTo(const ScrollCase& value, std::ostream* out) { *out << value.scroll << " at " << value.value; }
 };
 
 class StereoScroll : public StereoPageTest, public ::testing::WithParamInterface<ScrollCase> {};
 
-TEST_P(StereoScroll, IsShownSentAndStored) {
+TEST_P(StereoScroll, IsShownSentKeptAndStored) {
     scroll(GetParam().scroll, GetParam().value);
     EXPECT_EQ(text(GetParam().label), GetParam().shown);
     EXPECT_EQ(sent(), Lines{GetParam().command});
     EXPECT_EQ(general(GetParam().key), GetParam().stored);
+    EXPECT_EQ(multiplex.*GetParam().member, GetParam().stored);
 }
 
 INSTANTIATE_TEST_SUITE_P(
     Values, StereoScroll,
-    ::testing::Values(
-        ScrollCase{"FM_Hub_Scroll", "FM_Hub_Label2", 8000, "Hub 80.0 kHz", ":STEREO:DEVIATION 80000HZ", "MPX_DEV",
-                   "08000"},
-        ScrollCase{"FM_Hub_Scroll", "FM_Hub_Label2", 10, "Hub 0.1 kHz", ":STEREO:DEVIATION 100HZ", "MPX_DEV", "00010"},
-        ScrollCase{"Pilot_Hub_Scroll", "Pilot_hub_Label", 1500, "Hub 15.00 kHz", ":STEREO:PILOT:DEVIATION 15000HZ",
-                   "PILOT_HUB", "1500"},
-        ScrollCase{"Pilot_Hub_Scroll", "Pilot_hub_Label", 675, "Hub 6.75 kHz", ":STEREO:PILOT:DEVIATION 6750HZ",
-                   "PILOT_HUB", "0675"},
-        ScrollCase{"RDS_Hub_Scroll", "RDS_Hub_Label", 400, "Hub 4.00 kHz", ":STEREO:RDS:DEVIATION 4000HZ", "RDS_HUB",
-                   "0400"},
-        ScrollCase{"RDS_Hub_Scroll", "RDS_Hub_Label", 5, "Hub 0.05 kHz", ":STEREO:RDS:DEVIATION 50HZ", "RDS_HUB",
-                   "0005"},
-        ScrollCase{"Ari_hub_Scroll", "Ari_Label", 800, "Hub 8.00 kHz", ":stereo:ari:deviation 8000HZ", "ARI_HUB",
-                   "0800"},
-        ScrollCase{"Ari_hub_Scroll", "Ari_Label", 350, "Hub 3.50 kHz", ":stereo:ari:deviation 3500HZ", "ARI_HUB",
-                   "0350"},
-        ScrollCase{"HScroll1", "HScroll1_Label", -4, "Phase -4 °", ":STEREO:PILOT:PHASE -4DEG", "PILOT_PHASE", "-4"},
-        ScrollCase{"HScroll1", "HScroll1_Label", 0, "Phase 0 °", ":STEREO:PILOT:PHASE 00DEG", "PILOT_PHASE", "00"},
-        ScrollCase{"HScroll1", "HScroll1_Label", 5, "Phase 5 °", ":STEREO:PILOT:PHASE 05DEG", "PILOT_PHASE", "05"}));
+    ::testing::Values(ScrollCase{"FM_Hub_Scroll", "FM_Hub_Label2", 8000, "Hub 80.0 kHz", ":STEREO:DEVIATION 80000HZ",
+                                 "MPX_DEV", "08000", &Multiplex::totalDeviation},
+                      ScrollCase{"FM_Hub_Scroll", "FM_Hub_Label2", 10, "Hub 0.1 kHz", ":STEREO:DEVIATION 100HZ",
+                                 "MPX_DEV", "00010", &Multiplex::totalDeviation},
+                      ScrollCase{"Pilot_Hub_Scroll", "Pilot_hub_Label", 1500, "Hub 15.00 kHz",
+                                 ":STEREO:PILOT:DEVIATION 15000HZ", "PILOT_HUB", "1500", &Multiplex::pilotDeviation},
+                      ScrollCase{"Pilot_Hub_Scroll", "Pilot_hub_Label", 675, "Hub 6.75 kHz",
+                                 ":STEREO:PILOT:DEVIATION 6750HZ", "PILOT_HUB", "0675", &Multiplex::pilotDeviation},
+                      ScrollCase{"RDS_Hub_Scroll", "RDS_Hub_Label", 400, "Hub 4.00 kHz", ":STEREO:RDS:DEVIATION 4000HZ",
+                                 "RDS_HUB", "0400", &Multiplex::rdsDeviation},
+                      ScrollCase{"RDS_Hub_Scroll", "RDS_Hub_Label", 5, "Hub 0.05 kHz", ":STEREO:RDS:DEVIATION 50HZ",
+                                 "RDS_HUB", "0005", &Multiplex::rdsDeviation},
+                      ScrollCase{"Ari_hub_Scroll", "Ari_Label", 800, "Hub 8.00 kHz", ":stereo:ari:deviation 8000HZ",
+                                 "ARI_HUB", "0800", &Multiplex::ariDeviation},
+                      ScrollCase{"Ari_hub_Scroll", "Ari_Label", 350, "Hub 3.50 kHz", ":stereo:ari:deviation 3500HZ",
+                                 "ARI_HUB", "0350", &Multiplex::ariDeviation},
+                      ScrollCase{"HScroll1", "HScroll1_Label", -4, "Phase -4 °", ":STEREO:PILOT:PHASE -4DEG",
+                                 "PILOT_PHASE", "-4", &Multiplex::pilotPhase},
+                      ScrollCase{"HScroll1", "HScroll1_Label", 0, "Phase 0 °", ":STEREO:PILOT:PHASE 00DEG",
+                                 "PILOT_PHASE", "00", &Multiplex::pilotPhase},
+                      ScrollCase{"HScroll1", "HScroll1_Label", 5, "Phase 5 °", ":STEREO:PILOT:PHASE 05DEG",
+                                 "PILOT_PHASE", "05", &Multiplex::pilotPhase}));
 
 struct RangeCase {
     const char* scroll;
@@ -91,67 +96,79 @@ struct OptionCase {
     const char* option;
     const char* command;
     const char* entry;  ///< the stored line, its key spelled as in the file
+    std::string Multiplex::*member;
     friend void PrintTo(const OptionCase& value, std::ostream* out) { *out << value.option; }
 };
 
 class StereoOption : public StereoPageTest, public ::testing::WithParamInterface<OptionCase> {};
 
-TEST_P(StereoOption, IsSentAndStored) {
+TEST_P(StereoOption, IsSentKeptAndStored) {
     click(GetParam().option);
     EXPECT_TRUE(checked(GetParam().option));
     EXPECT_EQ(sent(), Lines{GetParam().command});
-    EXPECT_NE(folder.read("RDS_Allg.INI").find(std::string("\n") + GetParam().entry + "\r\n"), std::string::npos)
+    const std::string entry = GetParam().entry;
+    EXPECT_NE(folder.read("RDS_Allg.INI").find("\n" + entry + "\r\n"), std::string::npos)
         << folder.read("RDS_Allg.INI");
+    EXPECT_EQ(multiplex.*GetParam().member, entry.substr(entry.find('=') + 1));
 }
 
 INSTANTIATE_TEST_SUITE_P(
     Sources, StereoOption,
-    ::testing::Values(OptionCase{"FM_Source_Opt_0", "STEREO:STAT OFF", "MPX_SOURCE=0"},
-                      OptionCase{"FM_Source_Opt_1", "STEREO:STAT ON;:stereo:source LREXT", "MPX_SOURCE=1"},
-                      OptionCase{"FM_Source_Opt_2", "STEREO:STAT ON;:stereo:source SPEXT", "MPX_SOURCE=2"},
-                      OptionCase{"FM_Source_Opt_3", "STEREO:STAT ON;:stereo:source LFGEN", "MPX_SOURCE=3"}));
+    ::testing::Values(
+        OptionCase{"FM_Source_Opt_0", "STEREO:STAT OFF", "MPX_SOURCE=0", &Multiplex::source},
+        OptionCase{"FM_Source_Opt_1", "STEREO:STAT ON;:stereo:source LREXT", "MPX_SOURCE=1", &Multiplex::source},
+        OptionCase{"FM_Source_Opt_2", "STEREO:STAT ON;:stereo:source SPEXT", "MPX_SOURCE=2", &Multiplex::source},
+        OptionCase{"FM_Source_Opt_3", "STEREO:STAT ON;:stereo:source LFGEN", "MPX_SOURCE=3", &Multiplex::source}));
 
 // The dispatcher knows the impedances as 1 and 2, the options count from 0: the first one sends an empty command and
 // the second one the first impedance.
 INSTANTIATE_TEST_SUITE_P(Impedances, StereoOption,
-                         ::testing::Values(OptionCase{"FM_Imp_Opt_0", "", "MPX_IMPEDANZ=0"},
-                                           OptionCase{"FM_Imp_Opt_1", ":STEREO:EXTERNAL:IMP 600", "MPX_IMPEDANZ=1"}));
+                         ::testing::Values(OptionCase{"FM_Imp_Opt_0", "", "MPX_IMPEDANZ=0", &Multiplex::impedance},
+                                           OptionCase{"FM_Imp_Opt_1", ":STEREO:EXTERNAL:IMP 600", "MPX_IMPEDANZ=1",
+                                                      &Multiplex::impedance}));
 
 INSTANTIATE_TEST_SUITE_P(
     Preemphases, StereoOption,
-    ::testing::Values(
-        OptionCase{"Pre_opt_0", ":stereo:audio:preemphasis:state OFF", "PREEMPHASIS=0"},
-        OptionCase{"Pre_opt_1", ":stereo:audio:preemphasis:state ON;:stereo:audio:preemphasis 50us", "PREEMPHASIS=1"},
-        OptionCase{"Pre_opt_2", ":stereo:audio:preemphasis:state ON;:stereo:audio:preemphasis 75us", "PREEMPHASIS=2"}));
+    ::testing::Values(OptionCase{"Pre_opt_0", ":stereo:audio:preemphasis:state OFF", "PREEMPHASIS=0",
+                                 &Multiplex::preemphasis},
+                      OptionCase{"Pre_opt_1", ":stereo:audio:preemphasis:state ON;:stereo:audio:preemphasis 50us",
+                                 "PREEMPHASIS=1", &Multiplex::preemphasis},
+                      OptionCase{"Pre_opt_2", ":stereo:audio:preemphasis:state ON;:stereo:audio:preemphasis 75us",
+                                 "PREEMPHASIS=2", &Multiplex::preemphasis}));
 
 // Here too the dispatcher counts from 1 and the options from 0.
-INSTANTIATE_TEST_SUITE_P(StereoModes, StereoOption,
-                         ::testing::Values(OptionCase{"Stereo_Opt_0", "", "Stereo_Mode=0"},
-                                           OptionCase{"Stereo_Opt_1", ":stereo:audio:mode LEFT", "Stereo_Mode=1"},
-                                           OptionCase{"Stereo_Opt_2", ":stereo:audio:mode RIGHT", "Stereo_Mode=2"},
-                                           OptionCase{"Stereo_Opt_3", ":stereo:audio:mode REL", "Stereo_Mode=3"},
-                                           OptionCase{"Stereo_Opt_4", ":stereo:audio:mode REML", "Stereo_Mode=4"}));
+INSTANTIATE_TEST_SUITE_P(
+    StereoModes, StereoOption,
+    ::testing::Values(OptionCase{"Stereo_Opt_0", "", "Stereo_Mode=0", &Multiplex::stereoMode},
+                      OptionCase{"Stereo_Opt_1", ":stereo:audio:mode LEFT", "Stereo_Mode=1", &Multiplex::stereoMode},
+                      OptionCase{"Stereo_Opt_2", ":stereo:audio:mode RIGHT", "Stereo_Mode=2", &Multiplex::stereoMode},
+                      OptionCase{"Stereo_Opt_3", ":stereo:audio:mode REL", "Stereo_Mode=3", &Multiplex::stereoMode},
+                      OptionCase{"Stereo_Opt_4", ":stereo:audio:mode REML", "Stereo_Mode=4", &Multiplex::stereoMode}));
 
 INSTANTIATE_TEST_SUITE_P(
     AriModes, StereoOption,
-    ::testing::Values(OptionCase{"ARI_Mode_Opt_0", ":stereo:ari:type:state OFF", "ARI_ID=0"},
-                      OptionCase{"ARI_Mode_Opt_1", ":stereo:ari:type:state ON;:stereo:ari:type DK", "ARI_ID=1"},
-                      OptionCase{"ARI_Mode_Opt_2", ":stereo:ari:type:state ON;:stereo:ari:type BK", "ARI_ID=2"},
-                      OptionCase{"ARI_Mode_Opt_3", ":stereo:ari:type:state ON;:stereo:ari:type BKDK", "ARI_ID=3"}));
+    ::testing::Values(
+        OptionCase{"ARI_Mode_Opt_0", ":stereo:ari:type:state OFF", "ARI_ID=0", &Multiplex::ariType},
+        OptionCase{"ARI_Mode_Opt_1", ":stereo:ari:type:state ON;:stereo:ari:type DK", "ARI_ID=1", &Multiplex::ariType},
+        OptionCase{"ARI_Mode_Opt_2", ":stereo:ari:type:state ON;:stereo:ari:type BK", "ARI_ID=2", &Multiplex::ariType},
+        OptionCase{"ARI_Mode_Opt_3", ":stereo:ari:type:state ON;:stereo:ari:type BKDK", "ARI_ID=3",
+                   &Multiplex::ariType}));
 
 INSTANTIATE_TEST_SUITE_P(AriAreas, StereoOption,
-                         ::testing::Values(OptionCase{"BK_Opt_0", ":stereo:ari:bk A", "ARI-BK=A"},
-                                           OptionCase{"BK_Opt_1", ":stereo:ari:bk B", "ARI-BK=B"},
-                                           OptionCase{"BK_Opt_2", ":stereo:ari:bk C", "ARI-BK=C"},
-                                           OptionCase{"BK_Opt_3", ":stereo:ari:bk D", "ARI-BK=D"},
-                                           OptionCase{"BK_Opt_4", ":stereo:ari:bk E", "ARI-BK=E"},
-                                           OptionCase{"BK_Opt_5", ":stereo:ari:bk F", "ARI-BK=F"}));
+                         ::testing::Values(OptionCase{"BK_Opt_0", ":stereo:ari:bk A", "ARI-BK=A", &Multiplex::ariArea},
+                                           OptionCase{"BK_Opt_1", ":stereo:ari:bk B", "ARI-BK=B", &Multiplex::ariArea},
+                                           OptionCase{"BK_Opt_2", ":stereo:ari:bk C", "ARI-BK=C", &Multiplex::ariArea},
+                                           OptionCase{"BK_Opt_3", ":stereo:ari:bk D", "ARI-BK=D", &Multiplex::ariArea},
+                                           OptionCase{"BK_Opt_4", ":stereo:ari:bk E", "ARI-BK=E", &Multiplex::ariArea},
+                                           OptionCase{"BK_Opt_5", ":stereo:ari:bk F", "ARI-BK=F",
+                                                      &Multiplex::ariArea}));
 
 struct SwitchCase {
     const char* button;
     const char* key;
     const char* on;
     const char* off;
+    std::string Multiplex::*member;
     friend void PrintTo(const SwitchCase& value, std::ostream* out) { *out << value.button; }
 };
 
@@ -163,17 +180,21 @@ TEST_P(StereoSwitch, TwoClicksReturnToWhereItWas) {
     EXPECT_TRUE(checked(GetParam().button));
     EXPECT_EQ(sent(), Lines{GetParam().on});
     EXPECT_EQ(general(GetParam().key), "1");
+    EXPECT_EQ(multiplex.*GetParam().member, "1");
     click(GetParam().button);
     EXPECT_FALSE(checked(GetParam().button));
     EXPECT_EQ(sent(), Lines{GetParam().off});
     EXPECT_EQ(general(GetParam().key), "0");
+    EXPECT_EQ(multiplex.*GetParam().member, "0");
 }
 
-INSTANTIATE_TEST_SUITE_P(
-    Values, StereoSwitch,
-    ::testing::Values(SwitchCase{"Pilot_OnOff", "PILOT", ":stereo:pilot:state ON", ":stereo:pilot:state OFF"},
-                      SwitchCase{"RDS_OnOff", "RDS", ":stereo:rds:state ON", ":stereo:rds:state OFF"},
-                      SwitchCase{"Ari_OnOff", "ARI", ":stereo:ari:state ON", ":stereo:ari:state OFF"}));
+INSTANTIATE_TEST_SUITE_P(Values, StereoSwitch,
+                         ::testing::Values(SwitchCase{"Pilot_OnOff", "PILOT", ":stereo:pilot:state ON",
+                                                      ":stereo:pilot:state OFF", &Multiplex::pilot},
+                                           SwitchCase{"RDS_OnOff", "RDS", ":stereo:rds:state ON",
+                                                      ":stereo:rds:state OFF", &Multiplex::rds},
+                                           SwitchCase{"Ari_OnOff", "ARI", ":stereo:ari:state ON",
+                                                      ":stereo:ari:state OFF", &Multiplex::ari}));
 
 TEST_F(StereoPageTest, TheOptionsBearTheirTexts) {
     const auto caption = [this](int number) { return toText(captions.text(number)).toStdString(); };
@@ -262,12 +283,12 @@ TEST_F(StereoPageTest, EveryControlWithoutATextHasAnAccessibleName) {
     }
 }
 
-TEST_F(StereoPageTest, MnemonicsAreUniqueInEveryLanguageAndMode) {
-    click("Taste_DATA_MODE");
+TEST_F(StereoPageTest, NoLanguageTakesTheMnemonicsOfTheTestMode) {
     for (const char* language : {"deutsch", "english", "english US"}) {
         useLanguage(language);
         page.label();
-        for (int mode = 0; mode < 2; ++mode) {
+        for (const char16_t* mode : {u"&RDS_Mode", u"&Test_Mode"}) {
+            testMode->button->setText(QString::fromUtf16(mode));
             std::multiset<QString> keys;
             for (const auto* button : page.findChildren<QAbstractButton*>()) {
                 const QString key = QKeySequence::mnemonic(button->text()).toString();
@@ -275,7 +296,6 @@ TEST_F(StereoPageTest, MnemonicsAreUniqueInEveryLanguageAndMode) {
             }
             EXPECT_EQ(keys.size(), 2U) << language;
             EXPECT_EQ(keys.size(), std::set<QString>(keys.begin(), keys.end()).size()) << language;
-            click("Taste_DATA_MODE");
         }
     }
 }
@@ -295,7 +315,7 @@ TEST_F(StereoPageTest, TheTabKeyFollowsTheColumns) {
 }
 
 TEST_F(StereoPageTest, NothingIsCutOffInAnyLanguage) {
-    page.hideRdsPhase();
+    start();
     page.resize(620, 322);
     page.show();
     scroll("FM_Hub_Scroll", 8000);

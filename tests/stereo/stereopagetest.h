@@ -1,19 +1,40 @@
 #pragma once
 
 #include <QGroupBox>
+#include <QPushButton>
 #include <QRadioButton>
 
-#include "rds/testmode.h"
 #include "stereo/stereopage.h"
 #include "support/pagetest.h"
 
 namespace kdx::test {
 
-/// The page "FM / Stereo" with the frame of the test mode on it.
+/// Stands where the frame of the test mode does, with a button like its own; notes what it hears.
+class FrameBelow : public Page {
+public:
+    explicit FrameBelow(const PageContext& with)
+        : Page(with, nullptr), button(named<QPushButton>("Taste_DATA_MODE", this)) {
+        setMinimumSize(button->sizeHint());
+    }
+    void label() override { heard.emplace_back("label"); }
+    void load() override { heard.emplace_back("load"); }
+    void opened() override { heard.emplace_back("opened"); }
+    void stepGoesOut(const Step& step) override { heard.push_back(step.key + "=" + step.value); }
+
+    QPushButton* button;
+    Lines heard;
+};
+
+/// The page "FM / Stereo" with a frame on it where the test mode stands.
 class StereoPageTest : public PageTest {
 protected:
     QWidget& root() override { return page; }
 
+    /// Does with the page what start-up does.
+    void start() {
+        multiplex.load(settings);
+        page.load();
+    }
     std::string general(const char* key) const { return profile("RDS_Allg.INI", "FM", key); }
     void setGeneral(const char* key, const char* value) { setProfile("RDS_Allg.INI", "FM", key, value); }
     int position(const char* name) { return find<QScrollBar>(name)->value(); }
@@ -25,7 +46,9 @@ protected:
         return -1;
     }
 
-    StereoPage page{context, new TestMode(context, nullptr), nullptr};
+    Multiplex multiplex;
+    FrameBelow* testMode = new FrameBelow(context);  // the page's
+    StereoPage page{context, multiplex, testMode, nullptr};
 };
 
 }  // namespace kdx::test

@@ -30,18 +30,18 @@ protected:
         lan = std::make_unique<LanVisa>(options);
         watched = std::make_unique<WatchedVisa>(*lan);
         start();
-        QObject::connect(window.get(), &HMenue::trafficPassed, [this](const Traffic& t) { traffic.push_back(t); });
+        heard = [this](const Traffic& t) { traffic.push_back(t); };
         time = std::make_unique<VirtualTime>(clock, *window);
     }
     Visa& instrumentLink() override { return *watched; }
 
     /// What the coder answers to a query over the window's own session, without its quotes; "" when it does not.
     std::string ask(const std::string& key) {
-        const VisaHandle session = window->instrument().InstrSession;
+        const VisaHandle handle = session->instrument.InstrSession;
         std::int32_t count = 0;
-        instrumentLink().viWrite(session, ":STEREO:DIRECT? \"" + key + '"', count);
+        instrumentLink().viWrite(handle, ":STEREO:DIRECT? \"" + key + '"', count);
         std::string answer(100, ' ');
-        if (instrumentLink().viRead(session, answer, count) < 0 || count < 3) return {};
+        if (instrumentLink().viRead(handle, answer, count) < 0 || count < 3) return {};
         return answer.substr(1, static_cast<std::size_t>(count) - 3);
     }
     /// What passed since the last call.

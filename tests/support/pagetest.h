@@ -12,28 +12,17 @@
 #include <QTimer>
 #include <QTimerEvent>
 
-#include <functional>
 #include <string>
-#include <utility>
-#include <vector>
 
-#include "link/instrument.h"
-#include "coder/sendparam.h"
-#include "settings/captions.h"
-#include "settings/datafolder.h"
 #include "settings/profilefile.h"
-#include "settings/programstate.h"
-#include "support/fakeclock.h"
-#include "support/fakevisa.h"
+#include "support/linkfixture.h"
 #include "support/scripteddialogs.h"
-#include "support/tempfolder.h"
 #include "ui/pagecontext.h"
 #include "ui/statusrow.h"
 #include "ui/text.h"
+#include "ui/ticker.h"
 
 namespace kdx::test {
-
-using Lines = std::vector<std::string>;
 
 /// Looks for controls by the system's names and does with them what a user does.
 class ControlTest : public ::testing::Test {
@@ -91,13 +80,19 @@ protected:
 
 /// A page on its own with everything it works with: scripted instrument and boxes, a clock that stands still, a data
 /// folder with the shipped texts and otherwise empty profile files. The session counts as open.
-class PageTest : public ControlTest {
+class PageTest : public ControlTest, protected LinkFixture {
 protected:
     PageTest() {
-        const auto languages = std::filesystem::path(KDX_SOURCE_DIR) / "Daten" / kLanguageFile;
+        const auto languages = sourceFolder() / "Daten" / kLanguageFile;
         std::filesystem::copy_file(languages, folder.data() / kLanguageFile);
-        instrument.setCaptionSource([this](int number) { return captions.text(number); });
+        instrument.onFailure([this](const std::string& text, bool sequenceRuns) {
+            const QString title = QStringLiteral("Interface Error");
+            if (sequenceRuns) return dialogs.messageOrStop(title, toText(text));
+            dialogs.message(Dialogs::Icon::Critical, title, toText(text));
+            return false;
+        });
         state.InstrumentOnline = true;
+        state.shownClock = "12:00:00";
         useLanguage("deutsch");
     }
 
@@ -106,35 +101,12 @@ protected:
         state.standard = standard;
         captions.load(language, standard);
     }
-    /// Every command sent since the last call, in order.
-    Lines sent() { return std::exchange(visa.written, {}); }
-    std::string profile(const std::string& file, const std::string& section, const std::string& key) const {
-        return data.ReadIni(section, key, file);
-    }
-    void setProfile(const std::string& file, const std::string& section, const std::string& key,
-                    const std::string& value) {
-        data.WriteIni(section, key, value, file);
-    }
     std::string status(StatusSlot slot) const { return statusRow.text(slot).toStdString(); }
 
-    TempFolder folder;
-    DataFolder data{folder.path()};
-    FakeVisa visa;
-    FakeClock clock;
-    ProgramState state;
-    Captions captions{data};
     StatusRow statusRow{nullptr};
     ScriptedDialogs dialogs;
-    /// What `Uhr_Zeit` reads; the page that shows it is asked where there is one.
-    std::function<std::string()> clockText = [] { return "12:00:00"; };
-    Instrument instrument{visa, state, data, clock, [this](const std::string& text, bool sequenceRuns) {
-                              const QString title = QStringLiteral("Interface Error");
-                              if (sequenceRuns) return dialogs.messageOrStop(title, toText(text));
-                              dialogs.message(Dialogs::Icon::Critical, title, toText(text));
-                              return false;
-                          }};
-    ParamSender params{instrument, state, clock, [this] { return clockText(); }, [] {}};
-    PageContext context{params, instrument, state, statusRow, captions, dialogs, data, clock};
+    TickerGroup tickers;
+    PageContext context{params, instrument, settings, state, statusRow, captions, dialogs, data, clock, tickers};
 };
 
 }  // namespace kdx::test

@@ -9,6 +9,8 @@
 
 #include <unistd.h>
 
+#include "support/sourcefolder.h"
+
 namespace kdx::test {
 
 /// A program folder with an empty "Daten" of its own, gone with the test.
@@ -40,7 +42,7 @@ public:
     /// Copies the shipped data folder.
     void copyShipped() const {
         std::filesystem::copy(
-            std::filesystem::path(KDX_SOURCE_DIR) / "Daten", data(),
+            sourceFolder() / "Daten", data(),
             std::filesystem::copy_options::recursive | std::filesystem::copy_options::overwrite_existing);
     }
 

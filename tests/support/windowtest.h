@@ -11,7 +11,7 @@
 namespace kdx::test {
 
 /// The whole window on a data folder of its own, with a scripted instrument and boxes and a clock that stands still.
-class WindowTest : public ControlTest {
+class WindowTest : public ControlTest, protected Bench {
 protected:
     WindowTest() {
         visa.answersTo["*IDN?"] = "KDX,TEST\n";
@@ -21,9 +21,16 @@ protected:
     /// Makes the window and runs its start-up; a second call is a second start of the program.
     void start() {
         window.reset();
+        m_listener.reset();
         state = ProgramState();
-        window = std::make_unique<HMenue>(Surroundings{instrumentLink(), state, data, captions, clock, dialogs,
-                                                       QStringLiteral("scripted"), [this] { ++ended; }});
+        const auto end = [this] { ++ended; };
+        session = std::make_unique<Session>(instrumentLink(), state, data, captions, clock, end);
+        tickers.setHeld(false);
+        window = std::make_unique<HMenue>(Surroundings{*session, state, data, captions, clock, boxesOfWindow(), tickers,
+                                                       QStringLiteral("scripted"), end});
+        m_listener = std::make_unique<TrafficListener>(session->instrument, [this](const Traffic& traffic) {
+            if (heard) heard(traffic);
+        });
         window->startUp();
         window->show();
         QCoreApplication::processEvents();
@@ -37,6 +44,8 @@ protected:
 
     /// What the window sends through: the scripted instrument unless a test brings a link of its own.
     virtual Visa& instrumentLink() { return visa; }
+    /// What its boxes go through: the scripted ones unless a test brings its own.
+    virtual Dialogs& boxesOfWindow() { return dialogs; }
     QWidget& root() override { return *window; }
     QAction* action(const char* name) {
         auto* found = window->findChild<QAction*>(QString::fromLatin1(name));
@@ -44,7 +53,6 @@ protected:
         return found;
     }
     void showPage(int index) { find<QTabWidget>("SSTab1")->setCurrentIndex(index); }
-    Lines sent() { return std::exchange(visa.written, {}); }
     std::string general(const std::string& section, const std::string& key) const {
         return data.ReadIni(section, key, kGeneralSettings);
     }
@@ -55,15 +63,15 @@ protected:
         data.WriteIni(section, key, value, dataSetFile("1"));
     }
 
-    TempFolder folder;
-    DataFolder data{folder.path()};
-    FakeVisa visa;
-    FakeClock clock;
-    ProgramState state;
-    Captions captions{data};
     ScriptedDialogs dialogs;
     int ended = 0;  ///< how often the end of the program was asked for
+    TickerGroup tickers;
+    std::unique_ptr<Session> session;
     std::unique_ptr<HMenue> window;
+    std::function<void(const Traffic&)> heard;  ///< hears everything that passes, from the next start on
+
+private:
+    std::unique_ptr<TrafficListener> m_listener;
 };
 
 }  // namespace kdx::test

@@ -25,7 +25,7 @@ TEST_F(TmcPageTest, AMissingListIsToldAndTheRestIsSetUp) {
     std::filesystem::remove(folder.data() / "Event.txt");
     page = std::make_unique<TmcPage>(context, nullptr);
     try {
-        page->setUp();
+        page->load();
         FAIL() << "no error";
     } catch (const std::runtime_error& error) {
         EXPECT_STREQ(error.what(), "Event.txt kann nicht gelesen werden.");

@@ -17,8 +17,8 @@ protected:
         folder.write("Event.txt",
                      "Verkehrsproblem;00001\r\nStau;00101\r\nTest;00026\r\nkein Code;abcde\r\nzu viel;04097\r\n");
         folder.write("Location.txt", "Musterstadt;12345\r\nBeispielheim;00007\r\nzu weit;65541\r\n");
-        page = std::make_unique<TmcPage>(context, nullptr);
-        page->setUp();
+        page->label();
+        page->load();
     }
     QWidget& root() override { return *page; }
 
@@ -47,7 +47,7 @@ protected:
     }
     QListWidget& list() { return *find<QListWidget>("TMC_List"); }
 
-    std::unique_ptr<TmcPage> page;
+    std::unique_ptr<TmcPage> page = std::make_unique<TmcPage>(context, nullptr);
 };
 
 }  // namespace kdx::test

@@ -4,11 +4,11 @@
 namespace kdx::test {
 namespace {
 
-const std::string kFirstVariant = R"(:STEREO:DIRECT "3A=01,106100CD46")";
-const std::string kSecondVariant = R"(:STEREO:DIRECT "3A=01,100066CD46")";
+const std::string kFirstVariant = direct("3A=01,106100CD46");
+const std::string kSecondVariant = direct("3A=01,100066CD46");
 
 std::string message(const std::string& code) {
-    return ":STEREO:DIRECT \"8A=02," + code + '"';
+    return direct("8A=02," + code);
 }
 
 class TmcTransmissionTest : public TmcPageTest {
@@ -201,7 +201,7 @@ TEST_F(TmcTransmissionTest, TheCurrentDataSetKeepsTheLastMessage) {
 TEST_F(TmcTransmissionTest, TheAnnouncementIsStoredBeforeTheMessageReplacesIt) {
     startCycling(2);
     Lines stored;
-    instrument.onTraffic([&](const Traffic& traffic) {
+    const TrafficListener listener(instrument, [&](const Traffic& traffic) {
         if (traffic.kind == Traffic::Kind::Written) stored.push_back(profile("Datenset1.INI", "RDS", "TMC"));
     });
     EXPECT_TRUE(tick("TMC_Sende_Timer"));
@@ -298,37 +298,17 @@ TEST_F(TmcTransmissionTest, TheBoxesSpeakTheCurrentLanguage) {
 
 TEST_F(TmcTransmissionTest, TicksWaitWhileTheBoxOfAFailedWriteIsOpen) {
     // A box that keeps the window's timers going, as a real one does.
-    class TickingDialogs final : public Dialogs {
-    public:
-        explicit TickingDialogs(std::function<void()> whileOpen) : m_whileOpen(std::move(whileOpen)) {}
-        void message(Icon, const QString&, const QString&, const QString&) override {
-            ++boxes;
-            m_whileOpen();
-        }
-        bool messageOrStop(const QString&, const QString&) override { return false; }
-        bool confirm(const QString&, const QString&) override { return false; }
-        QString input(const QString&, const QString&, const QString&) override { return {}; }
-        int boxes = 0;
-
-    private:
-        std::function<void()> m_whileOpen;
-    };
-    startCycling(2);
-    TickingDialogs box([this] { tick("TMC_Sende_Timer"); });
-    Instrument failing{visa, state, data, clock, [&box](const std::string& text, bool) {
-                           box.message(Dialogs::Icon::Critical, {}, toText(text), {});
-                           return false;
-                       }};
-    ParamSender sender{failing, state, clock, [] { return std::string(); }, [] {}};
-    const PageContext failingContext{sender, failing, state, statusRow, captions, dialogs, data, clock};
-    page = std::make_unique<TmcPage>(failingContext, nullptr);
-    page->setUp();
+    int boxes = 0;
+    instrument.onFailure([&](const std::string&, bool) {
+        ++boxes;
+        tick("TMC_Sende_Timer");
+        return false;
+    });
     startCycling(2);
     visa.writeStatus = visa::kTimeout;
-    sent();
     EXPECT_TRUE(tick("TMC_Sende_Timer"));
     EXPECT_EQ(sent(), (Lines{kFirstVariant, message(code(1))}));
-    EXPECT_EQ(box.boxes, 2);
+    EXPECT_EQ(boxes, 2);
 }
 
 }  // namespace

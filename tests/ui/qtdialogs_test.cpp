@@ -1,4 +1,5 @@
 #include "ui/qtdialogs.h"
+#include "support/sourcefolder.h"
 
 #include <gtest/gtest.h>
 
@@ -39,7 +40,7 @@ protected:
         throw std::runtime_error(std::string("no button ") + caption);
     }
 
-    DataFolder data{KDX_SOURCE_DIR};
+    DataFolder data{test::sourceFolder()};
     Captions captions{data};
     QtDialogs dialogs{captions};
     bool met = false;

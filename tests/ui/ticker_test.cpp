@@ -11,8 +11,13 @@
 namespace kdx {
 namespace {
 
-TEST(TickerTest, RunsOnlyWhileEnabledWithAnInterval) {
-    Ticker ticker(nullptr);
+class TickerTest : public ::testing::Test {
+protected:
+    TickerGroup group;
+};
+
+TEST_F(TickerTest, RunsOnlyWhileEnabledWithAnInterval) {
+    Ticker ticker(group, nullptr);
     ticker.setEnabled(true);
     EXPECT_FALSE(ticker.isActive());
     ticker.setPeriod(500);
@@ -25,19 +30,19 @@ TEST(TickerTest, RunsOnlyWhileEnabledWithAnInterval) {
     EXPECT_FALSE(ticker.isActive());
 }
 
-TEST(TickerTest, IsPrecise) {
-    const Ticker ticker(nullptr);
+TEST_F(TickerTest, IsPrecise) {
+    const Ticker ticker(group, nullptr);
     EXPECT_EQ(ticker.timerType(), Qt::PreciseTimer);
 }
 
-TEST(TickerTest, RoundsToWholeMilliseconds) {
-    Ticker ticker(nullptr);
+TEST_F(TickerTest, RoundsToWholeMilliseconds) {
+    Ticker ticker(group, nullptr);
     ticker.setPeriod(1.6);
     EXPECT_EQ(ticker.period(), 2);
 }
 
-TEST(TickerTest, ATickWhoseHandlerStillRunsLetsNoFurtherTickIn) {
-    Ticker ticker(nullptr);
+TEST_F(TickerTest, ATickWhoseHandlerStillRunsLetsNoFurtherTickIn) {
+    Ticker ticker(group, nullptr);
     ticker.setPeriod(10000);
     ticker.setEnabled(true);
     const auto tick = [&ticker] {
@@ -54,21 +59,37 @@ TEST(TickerTest, ATickWhoseHandlerStillRunsLetsNoFurtherTickIn) {
     EXPECT_EQ(ticks, 2);
 }
 
-TEST(TickerTest, HoldsItsTicksBackAndGoesOn) {
-    Ticker ticker(nullptr);
+TEST_F(TickerTest, HoldsItsTicksBackAndGoesOn) {
+    Ticker ticker(group, nullptr);
     ticker.setPeriod(500);
     ticker.setEnabled(true);
-    ticker.setHeld(true);
+    group.setHeld(true);
     EXPECT_FALSE(ticker.isActive());
     ticker.setPeriod(600);
     EXPECT_FALSE(ticker.isActive());
-    ticker.setHeld(false);
+    group.setHeld(false);
     EXPECT_TRUE(ticker.isActive());
     EXPECT_EQ(ticker.interval(), 600);
 }
 
-TEST(TickerTest, RefusesIntervalsATimerDoesNotTake) {
-    Ticker ticker(nullptr);
+TEST_F(TickerTest, AGroupHoldsAllItsTimersAndThoseThatAreMadeMeanwhile) {
+    Ticker first(group, nullptr);
+    {
+        const Ticker gone(group, nullptr);  // leaves the group with its end
+    }
+    group.setHeld(true);
+    Ticker second(group, nullptr);
+    for (Ticker* ticker : {&first, &second}) {
+        ticker->setPeriod(500);
+        ticker->setEnabled(true);
+        EXPECT_FALSE(ticker->isActive());
+    }
+    group.setHeld(false);
+    EXPECT_TRUE(first.isActive() && second.isActive());
+}
+
+TEST_F(TickerTest, RefusesIntervalsATimerDoesNotTake) {
+    Ticker ticker(group, nullptr);
     ticker.setPeriod(65535);
     for (const double interval : {65536.0, -1.0, 1e300, std::numeric_limits<double>::quiet_NaN()}) {
         EXPECT_THROW(ticker.setPeriod(interval), std::out_of_range) << interval;

@@ -256,14 +256,16 @@ TEST_F(BrokenLinkTest, NoTimerTicksWhileTheBoxIsOpen) {
     };
     startAndOpen();
     LookingDialogs box;
-    HMenue other({*watched, state, data, captions, clock, box, QString(), [] {}});
+    Session otherSession(*watched, state, data, captions, clock, [] {});
+    TickerGroup otherTickers;
+    HMenue other({otherSession, state, data, captions, clock, box, otherTickers, QString(), [] {}});
     other.startUp();
     other.INIT_Taste_Click();
     std::vector<int> active;
     box.look = [&] {
-        const auto tickers = other.findChildren<Ticker*>();
+        const auto timers = other.findChildren<Ticker*>();
         active.push_back(static_cast<int>(
-            std::count_if(tickers.begin(), tickers.end(), [](const Ticker* ticker) { return ticker->isActive(); })));
+            std::count_if(timers.begin(), timers.end(), [](const Ticker* ticker) { return ticker->isActive(); })));
     };
     const auto running = [&] {
         box.look();

@@ -93,8 +93,9 @@ TEST_F(LogViewTest, CopiesTheSelectedLinesOrAllThatAreShown) {
 }
 
 TEST_F(LogViewTest, KeepsSomeThousandsOfLinesAndForgetsTheOldest) {
-    TrafficLog log(nullptr);
-    for (int i = 0; i < 5000; ++i) log.add({Traffic::Kind::Written, std::to_string(i), 0}, 1);
+    start();
+    TrafficLog log(session->instrument, clock, nullptr);
+    for (int i = 0; i < 5000; ++i) log.passed({Traffic::Kind::Written, std::to_string(i), 0});
     EXPECT_EQ(log.rowCount(), static_cast<int>(TrafficLog::kMostLines));
     EXPECT_EQ(log.index(0, TrafficLog::Text).data().toString(), QStringLiteral("1000"));
 }

@@ -48,7 +48,7 @@ TEST_F(SessionTest, TheStatusOfTheDescriptionReplacesTheManagersStatus) {
     useLan();
     openSession();
     EXPECT_EQ(visa.calls[1], "viStatusDesc -1073807202");
-    EXPECT_EQ(window->instrument().LastVisaStatus, -1073807343);
+    EXPECT_EQ(session->instrument.LastVisaStatus, -1073807343);
 }
 
 TEST_F(SessionTest, AFailedOpenShowsTheStatusAndChangesNothingElse) {
@@ -104,13 +104,13 @@ TEST_F(SessionTest, ClosingSwitchesThemBackExceptTheSerialEntry) {
     openSession();
     sent();
     click("GTL_Taste");
-    EXPECT_EQ(visa.calls.back(), "viClose " + std::to_string(window->instrument().InstrSession));
+    EXPECT_EQ(visa.calls.back(), "viClose " + std::to_string(session->instrument.InstrSession));
     for (const char* on : {"Frame8", "INIT_Taste", "Ende_Taste"}) EXPECT_TRUE(find(on)->isEnabled()) << on;
     for (const char* off : {"SSTab1", "Frame7"}) EXPECT_FALSE(find(off)->isEnabled()) << off;
     EXPECT_FALSE(action("Mnu_Info_RS232")->isEnabled());
     EXPECT_TRUE(window->findChild<QMenu*>(QStringLiteral("Mnu_Info_Interface"))->isEnabled());
     EXPECT_TRUE(state.InstrumentOnline);
-    EXPECT_NE(window->instrument().InstrSession, 0);
+    EXPECT_NE(session->instrument.InstrSession, 0);
     click("Store_Taste_0");  // the switched-off page keeps it away from the closed handle
     EXPECT_EQ(sent(), Lines{});
 }
@@ -142,7 +142,7 @@ TEST_F(SessionTest, AFailingCloseIsSilent) {
     useLan();
     openSession();
     click("GTL_Taste");
-    EXPECT_EQ(window->instrument().LastVisaStatus, -1073807346);
+    EXPECT_EQ(session->instrument.LastVisaStatus, -1073807346);
 }
 
 TEST_F(SessionTest, ANewOpeningRunsAllStepsAgain) {

@@ -8,14 +8,10 @@
 #include <filesystem>
 #include <fstream>
 #include <map>
-#include <mutex>
 #include <random>
 #include <set>
-#include <thread>
 
-#include "link/lanvisa.h"
-#include "sim/virtualinstrument.h"
-#include "simserver/vxi11server.h"
+#include "support/networkinstrument.h"
 #include "support/virtualtime.h"
 #include "support/windowtest.h"
 #include "ui/application.h"
@@ -43,49 +39,6 @@ protected:
 private:
     static constexpr const char* kMemory = "/dev/shm";
     QByteArray m_before = qgetenv("TMPDIR");
-};
-
-/// The virtual instrument, which writes down what it was told.
-class WritingDevice final : public sim::MessageDevice {
-public:
-    std::string execute(std::string_view message) override {
-        const std::lock_guard guard(m_mutex);
-        m_received.emplace_back(message);
-        return m_instrument.execute(message);
-    }
-    void clear() override {}
-    unsigned char statusByte() override { return 0; }
-    void unansweredRead() override {
-        const std::lock_guard guard(m_mutex);
-        m_received.emplace_back("(unanswered read)");
-    }
-    Lines takeReceived() {
-        const std::lock_guard guard(m_mutex);
-        return std::exchange(m_received, {});
-    }
-
-private:
-    SystemClock m_clock;
-    sim::VirtualInstrument m_instrument{m_clock};
-    std::mutex m_mutex;
-    Lines m_received;
-};
-
-/// Serves the device over VXI-11 in a thread of its own.
-class ServerThread {
-public:
-    explicit ServerThread(sim::MessageDevice& device) : m_server(device), m_thread([this] { m_server.run(); }) {}
-    ~ServerThread() {
-        m_server.stop();
-        m_thread.join();
-    }
-    ServerThread(const ServerThread&) = delete;
-    ServerThread& operator=(const ServerThread&) = delete;
-    [[nodiscard]] unsigned short port() const { return m_server.corePort(); }
-
-private:
-    simserver::Vxi11Server m_server;
-    std::thread m_thread;
 };
 
 /// Cancels every input; a failure box fails the test, a word about what cannot be done does not.
@@ -185,17 +138,13 @@ protected:
         application.onFailure([](const QString& where, const QString& error) {
             ADD_FAILURE() << where.toStdString() << ": " << error.toStdString();
         });
-        LanOptions options;
-        options.corePort = server.port();
+        LanOptions options = instrument.reachedBy();
         // A machine with much else to do is no failure here.
         options.ioTimeout = std::chrono::seconds(20);
         lan = std::make_unique<LanVisa>(options);
-        window = std::make_unique<HMenue>(
-            Surroundings{*lan, state, data, captions, clock, boxes, QStringLiteral("VXI-11"), [] {}});
-        window->startUp();
-        window->show();
+        heard = [this](const Traffic& traffic) { hear(traffic); };
+        start();
         time = std::make_unique<VirtualTime>(clock, *window);
-        QObject::connect(window.get(), &HMenue::trafficPassed, [this](const Traffic& traffic) { hear(traffic); });
     }
     ~SoakTest() override {
         window.reset();  // before what it works with
@@ -234,7 +183,7 @@ protected:
     /// What the instrument received since the last look is what the program wrote, in this order.
     void compare() {
         commands += written.size();
-        const Lines received = device.takeReceived();
+        const Lines received = instrument.takeReceived();
         const auto [sent, arrived] = std::mismatch(written.begin(), written.end(), received.begin(), received.end());
         const bool same = sent == written.end() && arrived == received.end();
         ASSERT_TRUE(same) << "written: " << (sent == written.end() ? "nothing more" : *sent)
@@ -252,8 +201,11 @@ protected:
         }
     }
 
-    WritingDevice device;
-    ServerThread server{device};
+    Visa& instrumentLink() override { return *lan; }
+    Dialogs& boxesOfWindow() override { return boxes; }
+
+    SystemClock coderClock;
+    NetworkInstrument instrument{coderClock};
     SoakDialogs boxes;
     std::unique_ptr<LanVisa> lan;
     std::unique_ptr<VirtualTime> time;

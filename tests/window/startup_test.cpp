@@ -198,11 +198,12 @@ class SettingsThatMakeNoSense : public StartUpTest, public ::testing::WithParamI
 TEST_P(SettingsThatMakeNoSense, StopNothing) {
     folder.copyShipped();
     for (const char* file : {"RDS_Allg.INI", "Datenset1.INI"}) {
-        ProfileText settings(folder.read(file));
+        ProfileText profileFile(folder.read(file));
         for (const char* section : {"FM", "RDS", "VRN"}) {
-            for (const auto& [key, value] : settings.section(section)) settings.setValue(section, key, GetParam());
+            for (const auto& [key, value] : profileFile.section(section))
+                profileFile.setValue(section, key, GetParam());
         }
-        folder.write(file, settings.bytes());
+        folder.write(file, profileFile.bytes());
     }
     start();
     expectToWork();

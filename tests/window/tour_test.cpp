@@ -17,9 +17,11 @@ protected:
     TourTest() { folder.copyShipped(); }
 
     int tour(Visa& visa) {
-        HMenue window({visa, state, data, captions, clock, dialogs, QString(), [] {}});
+        Session session(visa, state, data, captions, clock, [] {});
+        TickerGroup tickers;
+        HMenue window({session, state, data, captions, clock, dialogs, tickers, QString(), [] {}});
         window.startUp();
-        return makeTour(window, dialogs, QString::fromStdString(pictures.string()), print);
+        return makeTour(window, session.instrument, dialogs, QString::fromStdString(pictures.string()), print);
     }
 
     TempFolder folder;

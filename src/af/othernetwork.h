@@ -1,10 +1,34 @@
 #pragma once
 
+#include <array>
 #include <string>
 #include <string_view>
 #include <vector>
 
+#include "af/aflist.h"
+#include "coder/step.h"
+
 namespace kdx {
+
+class Profile;
+
+/// The other network (EON) of a data set, each value as it is sent.
+struct OtherNetwork {
+    std::string pi;  ///< leads every command about the network
+    std::string ps;
+    std::string pty;       ///< as stored: a number, or the chosen type's name
+    std::string tp = "0";  ///< "1" or "0"
+    std::string ta = "0";  ///< "1" or "0"
+    std::array<std::string, kAfLists> lists;
+
+    void load(const Profile& profile);
+    /// Only the lists, which are kept in the file and read anew whenever they go out.
+    void loadLists(const Profile& profile);
+    /// Adds the removal of the networks that the coder holds, then PI, TA, TP, PS and the lists.
+    void appendSteps(Steps& steps) const;
+    /// Adds the lists that are not empty.
+    void appendListSteps(Steps& steps) const;
+};
 
 // The coder answers "EON PI?" with the identifiers (PI codes, 4 characters each) of the other networks it holds,
 // separated by commas; what leads and ends the list differs between coders. All texts are 8-bit Windows-1252.
@@ -16,9 +40,5 @@ namespace kdx {
 
 /// The identifier the coder reports first: characters 2 to 5 of the answer, fewer when it is shorter.
 [[nodiscard]] std::string firstNetwork(std::string_view answer);
-
-/// What is sent for AF list `number` (1 to 5) of the other network: "N," starts a new set with list 1, "+," adds the
-/// others to it. However long the list is, it goes as it stands.
-[[nodiscard]] std::string eonAfValue(std::string_view list, int number);
 
 }  // namespace kdx

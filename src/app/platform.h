@@ -1,0 +1,19 @@
+#pragma once
+
+#include <filesystem>
+
+namespace kdx {
+
+// What the programs ask of the operating system at their beginning.
+
+/// The folder of the program file. @param program the program's name as it was called, where nothing better is known.
+[[nodiscard]] std::filesystem::path programFolder(const char* program);
+
+/// The user's folder for this program's data: XDG_DATA_HOME or ~/.local/share (XDG base directory standard), %APPDATA%
+/// on Windows.
+[[nodiscard]] std::filesystem::path userFolder();
+
+/// Whether a window can be shown.
+[[nodiscard]] bool hasDisplay();
+
+}  // namespace kdx

@@ -1,0 +1,51 @@
+#pragma once
+
+#include <filesystem>
+#include <string>
+#include <string_view>
+
+namespace kdx {
+
+class DataFolder;
+
+/// Which of the data folder's files a setting is kept in.
+enum class KeptIn {
+    General,   ///< the general settings
+    DataSet,   ///< the file of the data set at work
+    DataSet1,  ///< the file of data set 1, whatever set is at work
+};
+
+/// Where a setting is kept.
+struct Place {
+    KeptIn file;
+    const char* section;
+    const char* key;
+};
+
+/// How a setting is sent and where it is kept.
+struct Setting {
+    const char* sendKey;  ///< key for the dispatcher; "" for what is never sent by itself
+    Place place;
+};
+
+/// Reads and writes settings by their places. Texts are 8-bit Windows-1252; everything else is as DataFolder has it.
+class Profile {
+public:
+    /// @param dataSet number of the data set at work, "1" to "5"; lent, its changes are followed.
+    Profile(DataFolder& data, const std::string& dataSet) : m_data(data), m_dataSet(&dataSet) {}
+    /// The same with any file in the place of a data set's. @param file absolute, or relative to the data folder.
+    Profile(DataFolder& data, const std::filesystem::path& file) : m_data(data), m_file(file.string()) {}
+
+    /// "" when nothing is there.
+    [[nodiscard]] std::string read(const Place& place) const;
+    void write(const Place& place, std::string_view value);
+
+private:
+    [[nodiscard]] std::string fileOf(const Place& place) const;
+
+    DataFolder& m_data;
+    const std::string* m_dataSet = nullptr;
+    std::string m_file;
+};
+
+}  // namespace kdx

@@ -1,0 +1,34 @@
+#include "station/session.h"
+
+#include "settings/programstate.h"
+
+namespace kdx {
+
+Session::Session(Visa& visa, ProgramState& state, DataFolder& data, const Captions& captions, Clock& clock,
+                 std::function<void()> endProgram)
+    : instrument(visa, state, data, captions, clock),
+      params(instrument, state, clock, std::move(endProgram)),
+      transmitter(instrument, params),
+      profile(data, state.CurrentDataSet),
+      m_state(state) {}
+
+bool Session::sendOpening() {
+    lookUp();
+    return transmitter.run(openingSteps(station));
+}
+
+bool Session::sendDataSet() {
+    lookUp();
+    return transmitter.run(dataSetSteps(station));
+}
+
+void Session::close() {
+    transmitter.run(closingSteps());
+}
+
+void Session::lookUp() {
+    station.reload(profile);
+    m_state.eonIdentifier = station.otherNetwork.pi;  // leads every command about the network
+}
+
+}  // namespace kdx

@@ -1,0 +1,41 @@
+#pragma once
+
+#include <functional>
+#include <string>
+
+#include "coder/sendparam.h"
+#include "link/instrument.h"
+#include "settings/profile.h"
+#include "station/station.h"
+#include "station/transmitter.h"
+
+namespace kdx {
+
+/// What a program that works with one instrument is made of, window or not: the link, what goes over it, and the data
+/// set at work. Everything else is lent and outlives it.
+struct Session {
+    Session(Visa& visa, ProgramState& state, DataFolder& data, const Captions& captions, Clock& clock,
+            std::function<void()> endProgram);
+
+    /// Opens the session to the address; see Instrument::open.
+    VisaStatus open(const std::string& kind, const std::string& address) { return instrument.open(kind, address); }
+    /// Sends what belongs to the opening, the whole data set among it. @returns false when it was stopped.
+    bool sendOpening();
+    /// Sends the whole data set. @returns false when it was stopped.
+    bool sendDataSet();
+    /// Closes the session.
+    void close();
+
+    Instrument instrument;
+    ParamSender params;
+    Transmitter transmitter;
+    Profile profile;  ///< with the current data set
+    Station station;
+
+private:
+    void lookUp();
+
+    ProgramState& m_state;
+};
+
+}  // namespace kdx

@@ -1,0 +1,61 @@
+#include "station/station.h"
+
+#include "settings/profile.h"
+
+namespace kdx {
+
+namespace {
+
+void appendDataSet(Steps& steps, const Station& station) {
+    station.multiplex.appendSteps(steps);
+    station.programme.appendSteps(steps);
+    station.af.appendSteps(steps);
+    station.programme.appendPtySteps(steps);
+    station.otherNetwork.appendSteps(steps);
+    station.groups.appendSteps(steps);
+    station.carrier.appendSteps(steps);
+}
+
+}  // namespace
+
+void Station::load(const Profile& profile) {
+    multiplex.load(profile);
+    programme.load(profile);
+    af.load(profile);
+    otherNetwork.load(profile);
+    groups.load(profile);
+    carrier.load(profile);
+}
+
+void Station::reload(const Profile& profile) {
+    af.load(profile);
+    otherNetwork.loadLists(profile);
+    carrier.load(profile);
+}
+
+Station loadStation(DataFolder& data, const std::string& number) {
+    Station station;
+    station.load(Profile(data, number));
+    return station;
+}
+
+Steps openingSteps(const Station& station) {
+    Steps steps{{Step::Kind::Identify}};
+    for (const char* key : {"AM_AUS", "FM_AUS", "STEREO_EIN"}) appendStep(steps, key, "");
+    station.multiplex.appendOpeningSteps(steps);
+    appendDataSet(steps, station);
+    station.carrier.appendOpeningSteps(steps);
+    return steps;
+}
+
+Steps dataSetSteps(const Station& station) {
+    Steps steps;
+    appendDataSet(steps, station);
+    return steps;
+}
+
+Steps closingSteps() {
+    return {{Step::Kind::Close}};
+}
+
+}  // namespace kdx

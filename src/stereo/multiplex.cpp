@@ -1,0 +1,68 @@
+#include "stereo/multiplex.h"
+
+#include "settings/storedvalue.h"
+#include "stereo/deviation.h"
+#include "stereo/settings.h"
+
+namespace kdx {
+
+namespace {
+
+std::string storedDeviation(const Profile& profile, const Deviation& deviation) {
+    const std::string stored = profile.read(deviation.setting.place);
+    return deviationSetting(deviation, storedPosition(stored, 0, deviation.highest));
+}
+
+}  // namespace
+
+std::string optionText(int index) {
+    return index < 0 ? std::string() : std::to_string(index);
+}
+
+std::string areaCode(int index) {
+    return index < 0 ? std::string() : std::string(1, static_cast<char>('A' + index));
+}
+
+void Multiplex::load(const Profile& profile) {
+    const auto option = [&profile](const Place& place, int first, int last) {
+        return optionText(storedOption(profile.read(place), first, last));
+    };
+    totalDeviation = storedDeviation(profile, kTotalDeviation);
+    source = option(setting::kSource.place, 0, 3);
+    impedance = option(setting::kImpedance.place, 1, 2);
+    stereoMode = option(setting::kStereoMode.place, 0, 4);
+    preemphasis = option(setting::kPreemphasis.place, 0, 2);
+    pilot = storedFlag(profile.read(setting::kPilot.place));
+    pilotDeviation = storedDeviation(profile, kPilotDeviation);
+    pilotPhase = pilotPhaseSetting(
+        storedPosition(profile.read(setting::kPilotPhase.place), kLowestPilotPhase, kHighestPilotPhase));
+    ari = storedFlag(profile.read(setting::kAri.place));
+    ariDeviation = storedDeviation(profile, kAriDeviation);
+    ariType = option(setting::kAriType.place, 0, 3);
+    ariArea = areaCode(storedOption(profile.read(setting::kAriAreaAtStart), 0, 3));  // four of the six areas only
+    rds = storedFlag(profile.read(setting::kRds.place));
+    rdsDeviation = storedDeviation(profile, kRdsDeviation);
+}
+
+void Multiplex::appendOpeningSteps(Steps& steps) const {
+    appendStep(steps, setting::kTotalDeviation.sendKey, totalDeviation);
+    appendStep(steps, setting::kSource.sendKey, source);
+    if (impedance != kFirstImpedance) appendStep(steps, setting::kImpedance.sendKey, kFirstImpedance);
+}
+
+void Multiplex::appendSteps(Steps& steps) const {
+    appendStep(steps, setting::kPreemphasis.sendKey, preemphasis);
+    appendStep(steps, setting::kPilot.sendKey, pilot);
+    appendStep(steps, setting::kPilotDeviation.sendKey, pilotDeviation);
+    appendStep(steps, setting::kPilotPhase.sendKey, pilotPhase);
+    appendStep(steps, setting::kAri.sendKey, ari);
+    // These three are spelled otherwise than the dispatcher's keys ("ARI-HUB", "ARI-ID", "ARI-BK"), so none becomes a
+    // step: a whole data set leaves the ARI details of the instrument as they are.
+    appendStep(steps, "ARI_HUB", ariDeviation);
+    appendStep(steps, "ARI_ID", ariType);
+    appendStep(steps, "AR_BK", ariArea);
+    appendStep(steps, setting::kRds.sendKey, rds);
+    appendStep(steps, setting::kRdsDeviation.sendKey, rdsDeviation);
+}
+
+}  // namespace kdx

@@ -1,0 +1,94 @@
+#include "window/connectionbar.h"
+
+#include <QGroupBox>
+#include <QHBoxLayout>
+#include <QLabel>
+#include <QPushButton>
+#include <QScrollBar>
+
+#include "base/numbers.h"
+#include "settings/generalsettings.h"
+#include "settings/programstate.h"
+#include "ui/clickablelabel.h"
+#include "ui/controls.h"
+#include "ui/dialogs.h"
+#include "ui/text.h"
+
+namespace kdx {
+
+ConnectionBar::ConnectionBar(const PageContext& with, QWidget* parent) : QWidget(parent), m_with(with) {
+    Frame8 = named<QGroupBox>("Frame8", this);
+    INIT_Taste = named<QPushButton>("INIT_Taste", QStringLiteral("IEC &Bus INIT"), Frame8);
+    connect(INIT_Taste, &QPushButton::clicked, this, &ConnectionBar::openRequested);
+    Label6 = m_book.captioned<QLabel>("Label6", {308, "Addr."}, Frame8);
+    Adr1_Label = named<ClickableLabel>("Adr1_Label", Frame8);
+    m_book.spoken(Adr1_Label, {319, "Adresse des Geräts"});
+    Adr1_Label->setText(QStringLiteral("123.456.789.012"));
+    Adr1_Label->setAlignment(Qt::AlignCenter);
+    Adr1_Label->setMinimumWidth(Adr1_Label->fontMetrics().horizontalAdvance(QStringLiteral("000.000.000.000")) + 8);
+    connect(Adr1_Label, &ClickableLabel::clicked, this, &ConnectionBar::Adr1_Label_Click);
+    Label6->setBuddy(Adr1_Label);
+    Adr1_VScroll = named<QScrollBar>("Adr1_VScroll", Qt::Vertical, Frame8);
+    Ende_Taste = m_book.captioned<QPushButton>("Ende_Taste", {6}, this);
+    connect(Ende_Taste, &QPushButton::clicked, this, &ConnectionBar::endRequested);
+    Image2 = named<QLabel>("Image2", this);
+    Image2->setPixmap(QPixmap(QStringLiteral(":/banner.png")));
+    Image2->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
+
+    auto* connection = new QHBoxLayout(Frame8);
+    tighten(connection);
+    for (QWidget* control : std::initializer_list<QWidget*>{INIT_Taste, Label6, Adr1_Label, Adr1_VScroll}) {
+        connection->addWidget(control);
+    }
+    auto* row = new QHBoxLayout(this);
+    row->setContentsMargins(0, 0, 0, 0);
+    row->setSpacing(8);
+    row->addWidget(Frame8);
+    row->addWidget(Ende_Taste);
+    row->addStretch();
+    row->addWidget(Image2);
+}
+
+bool ConnectionBar::isLan() const {
+    return m_with.state.InterfaceKind == "TCPIP";
+}
+
+void ConnectionBar::Schnittstellen_Toggle() {
+    Adr1_VScroll->hide();
+    Adr1_Label->setText(toText(m_with.profile.read(isLan() ? setting::kLanAddress : setting::kGpibAddress)));
+    Adr1_Label->show();
+    Label6->setVisible(!isLan());
+    INIT_Taste->setText(isLan() ? QStringLiteral("Init TCPIP") : QStringLiteral("Init IEEE"));
+    emit interfaceShown(isLan());
+}
+
+void ConnectionBar::chooseInterface(const char* kind) {
+    m_with.state.InterfaceKind = kind;
+    m_with.profile.write(setting::kInterface, kind);
+    Schnittstellen_Toggle();
+}
+
+std::string ConnectionBar::address() const {
+    return toBytes(Adr1_Label->text());
+}
+
+void ConnectionBar::Adr1_Label_Click() {
+    const bool gpib = m_with.state.InterfaceKind == "IEC";
+    if (!gpib && !isLan()) return;
+    const QString title = toText(m_with.state.InterfaceKind + " Adress.");
+    QString typed = Adr1_Label->text();
+    double number = 0;
+    do {
+        typed = m_with.dialogs.input(QStringLiteral("Please enter here: "), title, typed);
+        if (typed.isEmpty()) return;
+        number = leadingNumber(toBytes(typed));
+    } while (gpib && (number <= 1 || number >= 31));  // 0, 1 and 31 cannot be entered: the program's own limit
+    Adr1_Label->setText(typed);
+    m_with.profile.write(gpib ? setting::kGpibAddress : setting::kLanAddress, toBytes(typed));
+}
+
+void ConnectionBar::showSessionOpen(bool open) {
+    for (QWidget* control : std::initializer_list<QWidget*>{Frame8, INIT_Taste, Ende_Taste}) control->setEnabled(!open);
+}
+
+}  // namespace kdx

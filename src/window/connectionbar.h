@@ -1,0 +1,54 @@
+#pragma once
+
+#include <QWidget>
+
+#include <string>
+
+#include "ui/caption.h"
+#include "ui/pagecontext.h"
+
+class QGroupBox;
+class QLabel;
+class QPushButton;
+class QScrollBar;
+
+namespace kdx {
+
+class ClickableLabel;
+
+/// The upper edge of the window: which instrument, opening its session, the program's end, the banner.
+class ConnectionBar : public QWidget {
+    Q_OBJECT
+public:
+    ConnectionBar(const PageContext& with, QWidget* parent);
+
+    void label() { m_book.label(m_with.captions); }
+    /// Shows the interface in force and its stored address.
+    void Schnittstellen_Toggle();
+    /// Puts an interface ("IEC" or "TCPIP") in force and keeps it.
+    void chooseInterface(const char* kind);
+    /// The address as it stands in the window.
+    [[nodiscard]] std::string address() const;
+    void showSessionOpen(bool open);
+
+signals:
+    void openRequested();
+    void endRequested();
+    void interfaceShown(bool lan);
+
+private:
+    void Adr1_Label_Click();
+    [[nodiscard]] bool isLan() const;
+
+    PageContext m_with;
+    CaptionBook m_book;
+    QGroupBox* Frame8 = nullptr;  // connection
+    QPushButton* INIT_Taste = nullptr;
+    QScrollBar* Adr1_VScroll = nullptr;  // present without behaviour: the address is typed
+    ClickableLabel* Adr1_Label = nullptr;
+    QLabel* Label6 = nullptr;  // heading of a GPIB address
+    QPushButton* Ende_Taste = nullptr;
+    QLabel* Image2 = nullptr;  // banner
+};
+
+}  // namespace kdx

@@ -1,0 +1,1 @@
+// Empty: the headers that most tests include are precompiled with this file.
