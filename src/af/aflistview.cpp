@@ -1,7 +1,7 @@
 #include "af/aflistview.h"
 
 #include "af/modul2.h"
-#include "base/numbers.h"
+#include "settings/storedvalue.h"
 
 #include <QBoxLayout>
 #include <QListWidget>
@@ -44,11 +44,7 @@ void AfListView::arrangeContent(QBoxLayout* column) const {
 }
 
 void AfListView::chooseStored(std::string_view number) {
-    const double stored = leadingNumber(number);
-    m_options.choose(-1);
-    for (int i = 0; i < kAfLists; ++i) {
-        if (stored == i + 1) m_options.choose(i);
-    }
+    m_options.choose(storedNumber(number, 1, kAfLists));
 }
 
 void AfListView::show(std::string_view listText) {

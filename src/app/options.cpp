@@ -15,17 +15,20 @@ std::unique_ptr<CLI::App> commandLine(Options& options) {
         std::make_unique<CLI::App>("Sets up what a KDX signal generator with stereo/RDS coder transmits.", "kdx-rds");
     app->set_help_flag();  // a flag like the others: without a short form, and it takes no value
     app->add_option("--app-folder", options.appFolder, "the program's folder; settings and texts are in DIR/Daten")
-        ->type_name("DIR");
+        ->type_name("DIR")
+        ->take_last();
     auto* library =
         app->add_option("--visa-library", options.visaLibrary, "use this VISA library to reach the instrument")
-            ->type_name("FILE");
+            ->type_name("FILE")
+            ->take_last();
     app->add_flag("--simulate", options.simulate, "use the virtual instrument inside the program")
         ->disable_flag_override()
         ->excludes(library);
     app->add_option("--tour", options.tourFolder,
                     "open the session, show every page, leave a picture of each in DIR, ask every value back, print "
                     "the traffic and end; needs no display")
-        ->type_name("DIR");
+        ->type_name("DIR")
+        ->take_last();
     app->add_flag("--version", options.version, "print the version and how instruments are reached")
         ->disable_flag_override();
     app->add_flag("--help", options.help, "print this text")->disable_flag_override();

@@ -1,5 +1,6 @@
 #include "coder/readback.h"
 
+#include "base/codepage.h"
 #include "base/numbers.h"
 #include "settings/captions.h"
 
@@ -27,8 +28,8 @@ std::string musicSpeech(const std::string& answer, const Captions& captions) {
 
 std::string preemphasis(const std::string& answer, const Captions& captions) {
     if (answer == "0") return captions.text(22);
-    if (answer == "1") return "50\xB5s";
-    if (answer == "2") return "75\xB5s";
+    if (answer == "1") return fromUtf8("50µs");
+    if (answer == "2") return fromUtf8("75µs");
     return answer.empty() ? captions.text(143) : answer;
 }
 
@@ -88,7 +89,7 @@ std::string fmDeviation(const Answers& answers, const Captions& captions) {
 
 std::string pilot(const Answers& answers, const Captions& captions) {
     return "Pilot " + readback::onOff(answers[0], captions) + "\n" + readback::deviation(answers[1], captions) +
-           "\nPhase: " + answers[2] + "\xB0";
+           "\nPhase: " + answers[2] + fromUtf8("°");
 }
 
 std::string rds(const Answers& answers, const Captions& captions) {

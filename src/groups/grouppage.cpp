@@ -70,7 +70,8 @@ void GroupPage::label() {
 
 void GroupPage::load() {
     countAnew();
-    showStored();
+    m_with.state.storedGroupSequence = m_sequence.groups;
+    showSequence();
 }
 
 void GroupPage::opened() {

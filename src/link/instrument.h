@@ -16,11 +16,8 @@ class Clock;
 class DataFolder;
 struct ProgramState;
 
-/// Length of the receive buffer: an answer is read in pieces of at most this many bytes.
-inline constexpr std::size_t kAnswerLength = 60;
-/// Pause before every command and between a question and its answer.
-inline constexpr std::int16_t kCommandPauseMs = 50;
-
+inline constexpr std::size_t kAnswerLength = 60;     ///< receive buffer: an answer is read in pieces of at most this
+inline constexpr std::int16_t kCommandPauseMs = 50;  ///< before every command, between a question and its answer
 inline constexpr const char* kNoSessionAnswer = "Offline";  ///< of ReadFromGen while no session has been opened
 inline constexpr const char* kReadError = "Error";          ///< of ReadFromGen after a failed read; callers compare
 

@@ -45,8 +45,13 @@ void RdsPage::fillProgrammeTypes() {
     for (std::size_t type = 0; type < kProgrammeTypes; ++type) {
         PTY_Combo1->addItem(toText(m_with.captions.programmeType(type)));
     }
-    PTY_Combo1->setCurrentIndex(storedEntry(m_with.profile.read(setting::kPty.place), kProgrammeTypes));
-    m_programme.pty = std::to_string(PTY_Combo1->currentIndex());
+    // A relabelling chooses what data set 1 holds, whatever set is at work.
+    m_programme.pty = std::to_string(storedEntry(m_with.profile.read(setting::kPty.place), kProgrammeTypes));
+    showProgrammeType();
+}
+
+void RdsPage::showProgrammeType() {
+    PTY_Combo1->setCurrentIndex(storedEntry(m_programme.pty, kProgrammeTypes));
     if (PTY_Combo1->currentIndex() >= 0) m_with.status.show(StatusSlot::Pty, PTY_Combo1->currentText());
 }
 
@@ -65,7 +70,7 @@ void RdsPage::load() {
     MS_opt.choose(chosen ? (m_programme.musicSpeech == "M" ? 0 : 1) : -1);
     if (chosen) showMusicSpeech();
     DI_Opt.choose(storedOption(m_programme.decoderInfo, 0, static_cast<int>(DI_Opt.size()) - 1));
-    fillProgrammeTypes();
+    showProgrammeType();
     if (!std::exchange(m_loaded, true)) Zeit_Taste_Click();
 }
 

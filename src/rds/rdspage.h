@@ -56,6 +56,7 @@ private:
     void Uhr_Zeit_DblClick();
 
     void fillProgrammeTypes();
+    void showProgrammeType();
     void showMusicSpeech();
     void setTrafficProgramme(bool on);
     void showTrafficProgramme(bool on);

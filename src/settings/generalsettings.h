@@ -5,7 +5,8 @@
 namespace kdx::setting {
 
 // Where the settings of the program itself are kept; none of them is sent.
-inline constexpr Place kInterface{KeptIn::General, "BUS", "INTERFACE"};  // "IEC" or "TCPIP"
+// Spelled so when it is written anew; reading is blind to letter case.
+inline constexpr Place kInterface{KeptIn::General, "BUS", "Interface"};  // "IEC" or "TCPIP"
 inline constexpr Place kOpenAtStart{KeptIn::General, "BUS", "IECBUS"};   // "AUTO" in any letter case
 inline constexpr Place kGpibAddress{KeptIn::General, "ADRESSEN", "KDX_IEEE"};
 inline constexpr Place kLanAddress{KeptIn::General, "ADRESSEN", "KDX_TCPIP"};

@@ -5,11 +5,11 @@
 namespace kdx {
 
 std::string Profile::read(const Place& place) const {
-    return m_data.ReadIni(place.section, place.key, fileOf(place));
+    return m_data->ReadIni(place.section, place.key, fileOf(place));
 }
 
 void Profile::write(const Place& place, std::string_view value) {
-    m_data.WriteIni(place.section, place.key, value, fileOf(place));
+    m_data->WriteIni(place.section, place.key, value, fileOf(place));
 }
 
 std::string Profile::fileOf(const Place& place) const {

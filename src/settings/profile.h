@@ -3,6 +3,7 @@
 #include <filesystem>
 #include <string>
 #include <string_view>
+#include <utility>
 
 namespace kdx {
 
@@ -31,20 +32,26 @@ struct Setting {
 /// Reads and writes settings by their places. Texts are 8-bit Windows-1252; everything else is as DataFolder has it.
 class Profile {
 public:
-    /// @param dataSet number of the data set at work, "1" to "5"; lent, its changes are followed.
-    Profile(DataFolder& data, const std::string& dataSet) : m_data(data), m_dataSet(&dataSet) {}
+    /// @param number of the data set at work, "1" to "5"; lent and outliving the profile, its changes are followed.
+    [[nodiscard]] static Profile followingDataSet(DataFolder& data, const std::string& number) {
+        return {data, &number, {}};
+    }
     /// The same with any file in the place of a data set's. @param file absolute, or relative to the data folder.
-    Profile(DataFolder& data, const std::filesystem::path& file) : m_data(data), m_file(file.string()) {}
+    [[nodiscard]] static Profile ofFile(DataFolder& data, const std::filesystem::path& file) {
+        return {data, nullptr, file.string()};
+    }
 
     /// "" when nothing is there.
     [[nodiscard]] std::string read(const Place& place) const;
     void write(const Place& place, std::string_view value);
 
 private:
+    Profile(DataFolder& data, const std::string* number, std::string file)
+        : m_data(&data), m_dataSet(number), m_file(std::move(file)) {}
     [[nodiscard]] std::string fileOf(const Place& place) const;
 
-    DataFolder& m_data;
-    const std::string* m_dataSet = nullptr;
+    DataFolder* m_data;
+    const std::string* m_dataSet;
     std::string m_file;
 };
 

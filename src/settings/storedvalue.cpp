@@ -29,6 +29,14 @@ int storedOption(std::string_view text, int first, int last) {
     return -1;
 }
 
+int storedNumber(std::string_view text, int first, int last) {
+    const double number = leadingNumber(text);
+    for (int option = first; option <= last; ++option) {
+        if (number == option) return option - first;
+    }
+    return -1;
+}
+
 int storedEntry(std::string_view text, int count) {
     const double number = leadingNumber(text);
     return number >= 0 && number < count ? static_cast<int>(number) : -1;

@@ -9,6 +9,10 @@ namespace kdx {
 /// every other text, an empty one included.
 [[nodiscard]] int storedOption(std::string_view text, int first, int last);
 
+/// The option that a stored number names: 0 for the number `first`, up to `last`; -1 (none) for every other one. A text
+/// counts with the number it begins with.
+[[nodiscard]] int storedNumber(std::string_view text, int first, int last);
+
 /// The entry of a list of `count` that a stored number means, counted from 0; -1 when the list has none such. A text
 /// without a number means the first one.
 [[nodiscard]] int storedEntry(std::string_view text, int count);

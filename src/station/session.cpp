@@ -9,8 +9,14 @@ Session::Session(Visa& visa, ProgramState& state, DataFolder& data, const Captio
     : instrument(visa, state, data, captions, clock),
       params(instrument, state, clock, std::move(endProgram)),
       transmitter(instrument, params),
-      profile(data, state.CurrentDataSet),
-      m_state(state) {}
+      profile(Profile::followingDataSet(data, state.CurrentDataSet)),
+      m_state(state),
+      m_source(profile) {}
+
+void Session::load(const Profile& source) {
+    m_source = source;
+    station.load(source);
+}
 
 bool Session::sendOpening() {
     lookUp();
@@ -27,7 +33,7 @@ void Session::close() {
 }
 
 void Session::lookUp() {
-    station.reload(profile);
+    station.reload(m_source);
     m_state.eonIdentifier = station.otherNetwork.pi;  // leads every command about the network
 }
 

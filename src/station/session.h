@@ -17,6 +17,9 @@ struct Session {
     Session(Visa& visa, ProgramState& state, DataFolder& data, const Captions& captions, Clock& clock,
             std::function<void()> endProgram);
 
+    /// Loads the data set of the profile, or of any other source; whatever is looked up at sending comes from there.
+    void load() { load(profile); }
+    void load(const Profile& source);
     /// Opens the session to the address; see Instrument::open.
     VisaStatus open(const std::string& kind, const std::string& address) { return instrument.open(kind, address); }
     /// Sends what belongs to the opening, the whole data set among it. @returns false when it was stopped.
@@ -36,6 +39,7 @@ private:
     void lookUp();
 
     ProgramState& m_state;
+    Profile m_source;
 };
 
 }  // namespace kdx

@@ -1,5 +1,6 @@
 #include "station/station.h"
 
+#include "settings/datafolder.h"
 #include "settings/profile.h"
 
 namespace kdx {
@@ -35,7 +36,7 @@ void Station::reload(const Profile& profile) {
 
 Station loadStation(DataFolder& data, const std::string& number) {
     Station station;
-    station.load(Profile(data, number));
+    station.load(Profile::ofFile(data, dataSetFile(number)));
     return station;
 }
 

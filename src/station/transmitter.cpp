@@ -20,8 +20,23 @@ std::size_t countSent(const Steps& steps) {
 
 }  // namespace
 
+/// Says the end of the outermost sequence, however it comes.
+class Transmitter::Run {
+public:
+    explicit Run(Transmitter& transmitter) : m_transmitter(transmitter) { ++m_transmitter.m_depth; }
+    ~Run() {
+        if (--m_transmitter.m_depth == 0 && m_transmitter.m_watcher != nullptr) m_transmitter.m_watcher->stepsEnded();
+    }
+    Run(const Run&) = delete;
+    Run& operator=(const Run&) = delete;
+
+private:
+    Transmitter& m_transmitter;
+};
+
 bool Transmitter::run(Steps steps) {
     const CommandSequence sequence(m_instrument);
+    const Run running(*this);
     std::size_t number = 0;
     for (std::size_t at = 0; at < steps.size() && !m_instrument.isSequenceStopped(); ++at) {
         const Step step = steps[at];
@@ -34,9 +49,7 @@ bool Transmitter::run(Steps steps) {
             runStep(step);
         }
     }
-    const bool finished = !m_instrument.isSequenceStopped();
-    if (m_watcher != nullptr) m_watcher->stepsEnded();
-    return finished;
+    return !m_instrument.isSequenceStopped();
 }
 
 void Transmitter::stop() {

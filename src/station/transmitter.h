@@ -18,7 +18,7 @@ public:
     virtual void stepGoesOut(const Step& step, std::size_t number, std::size_t total) = 0;
     /// A question was answered: with the buffer as read, "Error" when the read failed.
     virtual void stepAnswered(const Step& step, const std::string& answer) = 0;
-    /// The sequence is over, stopped or not.
+    /// The outermost sequence is over: sent, stopped, or ended by an exception.
     virtual void stepsEnded() = 0;
 };
 
@@ -37,12 +37,15 @@ public:
     void stop();
 
 private:
+    class Run;
+
     void runStep(const Step& step);
     void askNetworks(Steps& steps, std::size_t at);
 
     Instrument& m_instrument;
     ParamSender& m_params;
     StepWatcher* m_watcher = nullptr;
+    int m_depth = 0;  ///< how many sequences run within each other
 };
 
 }  // namespace kdx

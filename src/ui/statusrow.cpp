@@ -19,11 +19,11 @@ struct Pair {
     int widest;  ///< characters of the widest value: its share of the row
 };
 
-// From left to right on the screen; captions 8-bit.
+// From left to right on the screen.
 constexpr std::array kPairs = {
-    Pair{16, "RF [MHz]", 17, "--", 8}, Pair{12, "RF [dB\xB5V]", 13, "--", 6}, Pair{15, "AF [kHz]", 14, "--", 6},
-    Pair{7, "PI", 2, "Label1", 4},     Pair{6, "PS", 3, "Label1", 8},         Pair{11, "TP", 10, "Label1", 3},
-    Pair{9, "TA", 0, "TA", 3},         Pair{8, "M / S", 1, "Label1", 7},      Pair{5, "PTY", 4, "Label1", 16},
+    Pair{16, "RF [MHz]", 17, "--", 8}, Pair{12, "RF [dBµV]", 13, "--", 6}, Pair{15, "AF [kHz]", 14, "--", 6},
+    Pair{7, "PI", 2, "Label1", 4},     Pair{6, "PS", 3, "Label1", 8},      Pair{11, "TP", 10, "Label1", 3},
+    Pair{9, "TA", 0, "TA", 3},         Pair{8, "M / S", 1, "Label1", 7},   Pair{5, "PTY", 4, "Label1", 16},
 };
 
 QFont arial(const QFont& base) {
@@ -44,8 +44,8 @@ StatusRow::StatusRow(QWidget* parent) : QWidget(parent) {
     grid->addWidget(Gen1_Label, 0, 0, 2, 1);
     int column = 1;
     for (const Pair& pair : kPairs) {
-        Status[pair.heading] = element<QLabel>("Status", pair.heading, toText(pair.caption), this);
-        Status[pair.value] = element<QLabel>("Status", pair.value, toText(pair.design), this);
+        Status[pair.heading] = element<QLabel>("Status", pair.heading, QString::fromUtf8(pair.caption), this);
+        Status[pair.value] = element<QLabel>("Status", pair.value, QString::fromUtf8(pair.design), this);
         for (QLabel* label : {Status[pair.heading], Status[pair.value]}) {
             label->setFont(arial(font()));
             label->setTextFormat(Qt::PlainText);
@@ -54,7 +54,7 @@ StatusRow::StatusRow(QWidget* parent) : QWidget(parent) {
         QLabel* value = Status[pair.value];
         value->setFrameStyle(QFrame::Panel | QFrame::Sunken);
         value->setAutoFillBackground(true);
-        value->setAccessibleName(toText(pair.caption));
+        value->setAccessibleName(QString::fromUtf8(pair.caption));
         const QString sample(pair.widest, pair.widest > 8 ? QLatin1Char('e') : QLatin1Char('0'));
         value->setMinimumWidth(value->fontMetrics().horizontalAdvance(sample) + 6);
         value->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Fixed);

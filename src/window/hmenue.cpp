@@ -159,7 +159,7 @@ void HMenue::startUp() {
     showSessionOpen(false);
     Beschrifter();
     m_s.state.CurrentDataSet = "1";
-    m_s.session.station.load(profile);
+    m_s.session.load();
     loadPages();
     m_s.session.instrument.emptyLog();
     if (upperCase(profile.read(setting::kOpenAtStart)) == "AUTO") INIT_Taste_Click();
@@ -223,7 +223,10 @@ void HMenue::stepGoesOut(const Step& step, std::size_t number, std::size_t total
     if (number > 0) {
         m_lowerEdge->showProgress(captionText(m_s.captions, {324, "Sende Befehl %1 von %2"}), number, total);
     }
+    // A refused step shows a box: no timer may change meanwhile what the steps after it were made of.
+    if (step.kind == Step::Kind::Refused) m_s.tickers.setHeld(true);
     for (Page* page : m_pages) page->stepGoesOut(step);
+    if (step.kind == Step::Kind::Refused) m_s.tickers.setHeld(false);
 }
 
 void HMenue::stepAnswered(const Step& step, const std::string& answer) {

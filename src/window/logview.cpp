@@ -80,9 +80,7 @@ void LogView::label(const Captions& captions) {
     m_table->setAccessibleName(windowTitle());
     m_copy->setText(toText(captions.own(686, "&Kopieren")));
     m_clear->setText(toText(captions.own(687, "&Leeren")));
-    m_close->setText(toText(captions.own(688,
-                                         "&Schlie\xDF"
-                                         "en")));
+    m_close->setText(toText(captions.own(688, "&Schließen")));
 }
 
 void LogView::copy() {

@@ -22,6 +22,12 @@ protected:
         for (const int number : groups) click(("Gruppe" + std::to_string(number)).c_str());
     }
 
+    /// Start-up: the data set at work is read, then shown.
+    void load() {
+        part.load(settings);
+        page.load();
+    }
+
     GroupSequence part;
     GroupPage page{context, part, nullptr};
 };
@@ -155,7 +161,7 @@ TEST_F(GroupPageTest, StartUpShowsTheStoredSequenceAndCountsFromZero) {
     state.groupCount = 7;
     state.group8ACount = 7;
     const std::string before = folder.read(kSet1);
-    page.load();
+    load();
     EXPECT_EQ(text("Label10"), "Gruppenfolge:0A,8A,");
     EXPECT_EQ(state.storedGroupSequence, "0A,8A,");
     EXPECT_EQ(state.groupCount, 0);
@@ -167,7 +173,7 @@ TEST_F(GroupPageTest, StartUpShowsTheStoredSequenceAndCountsFromZero) {
 
 TEST_F(GroupPageTest, AStoredSequenceGrowsByTheButtonsPressed) {
     setProfile(kSet1, "RDS", "GR_FOLGE", "0A,");
-    page.load();
+    load();
     press({2});
     click("GS_Senden");
     EXPECT_EQ(sent(), Lines{direct("GS=0A,2A")});
@@ -179,11 +185,10 @@ TEST_F(GroupPageTest, TheDataSetHoldsWhatIsShownWhateverSetIsAtWork) {
     state.CurrentDataSet = "3";
     setProfile(kSet1, "RDS", "GR_FOLGE", "0A,8A,");
     setProfile("Datenset3.INI", "RDS", "GR_FOLGE", "15A,");
-    part.load(settings);
-    page.load();
-    EXPECT_EQ(part.groups, "0A,8A,");
+    load();
+    EXPECT_EQ(text("Label10"), "Gruppenfolge:15A,");
     press({2});
-    EXPECT_EQ(part.groups, "0A,8A,2A,");
+    EXPECT_EQ(part.groups, "15A,2A,");
     click("newList");
     EXPECT_EQ(part.groups, "");
     page.opened();
@@ -192,7 +197,7 @@ TEST_F(GroupPageTest, TheDataSetHoldsWhatIsShownWhateverSetIsAtWork) {
 
 TEST_F(GroupPageTest, ASequenceThatGoesOutWithTheWholeDataSetIsStoredInTheSetAtWork) {
     setProfile(kSet1, "RDS", "GR_FOLGE", "0A,8A,");
-    page.load();
+    load();
     state.CurrentDataSet = "2";
     Steps steps;
     part.appendSteps(steps);
@@ -204,7 +209,7 @@ TEST_F(GroupPageTest, ASequenceThatGoesOutWithTheWholeDataSetIsStoredInTheSetAtW
 }
 
 TEST_F(GroupPageTest, OtherStepsStoreNothing) {
-    page.load();
+    load();
     page.stepGoesOut({Step::Kind::Parameter, "PS", "RADIO"});
     page.stepGoesOut({Step::Kind::Identify});
     EXPECT_FALSE(std::filesystem::exists(folder.data() / kSet1));

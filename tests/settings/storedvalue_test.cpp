@@ -38,6 +38,26 @@ INSTANTIATE_TEST_SUITE_P(Values, StoredPosition,
                                            PositionCase{"350 kHz", 350}, PositionCase{"99999999999999999999", 500},
                                            PositionCase{"-1e999", -4}, PositionCase{"1e999", 500}));
 
+TEST(StoredNumber, NamesTheOptionOfThatNumberWhateverFollowsIt) {
+    EXPECT_EQ(storedNumber("1", 1, 5), 0);
+    EXPECT_EQ(storedNumber("5 x", 1, 5), 4);
+    EXPECT_EQ(storedNumber("2.0", 1, 5), 1);
+    for (const char* none : {"", "0", "6", "1.5", "-1", "x"}) EXPECT_EQ(storedNumber(none, 1, 5), -1) << none;
+}
+
+TEST(StoredEntry, CountsFromZeroAndTakesNoNumberForTheFirst) {
+    EXPECT_EQ(storedEntry("0", 32), 0);
+    EXPECT_EQ(storedEntry("31", 32), 31);
+    EXPECT_EQ(storedEntry("", 32), 0);
+    EXPECT_EQ(storedEntry("Nachrichten", 32), 0);
+    for (const char* none : {"32", "-1", "1e300"}) EXPECT_EQ(storedEntry(none, 32), -1) << none;
+}
+
+TEST(StoredFlag, IsOnForAPlainOneOnly) {
+    EXPECT_EQ(storedFlag("1"), "1");
+    for (const char* off : {"", "0", "1.0", " 1", "x"}) EXPECT_EQ(storedFlag(off), "0") << off;
+}
+
 struct LimitCase {
     const char* entered;
     const char* lower;

@@ -72,7 +72,7 @@ TEST_F(StationTest, DataSet2GivesItsStepsWithTheCarrierOfDataSet1) {
 TEST_F(StationTest, AnyFileCanTakeThePlaceOfADataSet) {
     folder.write("Anderswo.INI", kDataSet2);
     Station station;
-    station.load(Profile(data, folder.data() / "Anderswo.INI"));
+    station.load(Profile::ofFile(data, folder.data() / "Anderswo.INI"));
     EXPECT_EQ(lines(dataSetSteps(station)), kStepsOfDataSet2);
 }
 

@@ -102,6 +102,22 @@ TEST_F(TransmitterTest, ClosingClosesTheSessionAndCountsAsNoCommand) {
     EXPECT_EQ(recorder.heard, (Lines{" 0/0 after 0", "end"}));
 }
 
+TEST_F(TransmitterTest, ASequenceWithinAnotherEndsWithTheOuterOne) {
+    recorder.onStep = [this](const Step& step) {
+        if (step.value == "1") transmitter.run({parameter("PTY", "5")});
+    };
+    transmitter.run({parameter("TA", "1"), parameter("TA", "0")});
+    EXPECT_EQ(sent(), (Lines{direct("PTY=05"), direct("TA=1"), direct("TA=0")}));
+    EXPECT_EQ(std::count(recorder.heard.begin(), recorder.heard.end(), "end"), 1);
+    EXPECT_EQ(recorder.heard.back(), "end");
+}
+
+TEST_F(TransmitterTest, AnExceptionEndsTheSequenceToo) {
+    recorder.onStep = [](const Step&) { throw std::runtime_error("no"); };
+    EXPECT_THROW(transmitter.run({parameter("TA", "1")}), std::runtime_error);
+    EXPECT_EQ(recorder.heard.back(), "end");
+}
+
 TEST_F(TransmitterTest, RunsWithoutAnybodyListening) {
     transmitter.setWatcher(nullptr);
     EXPECT_TRUE(transmitter.run({parameter("TA", "1")}));
@@ -114,7 +130,7 @@ TEST(SessionTest, SendsADataSetWithoutAWindow) {
     bench.visa.answersTo["*IDN?"] = "KDX,TEST\n";
     Session session(bench.visa, bench.state, bench.data, bench.captions, bench.clock, [] {});
     bench.state.CurrentDataSet = "2";
-    session.station.load(session.profile);
+    session.load();
     EXPECT_EQ(session.open("TCPIP", "10.0.0.1"), 0);
     EXPECT_TRUE(session.sendOpening());
     session.close();

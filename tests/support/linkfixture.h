@@ -53,7 +53,7 @@ struct Bench {
     FakeClock clock;
     ProgramState state;
     Captions captions{data};
-    Profile settings{data, state.CurrentDataSet};
+    Profile settings = Profile::followingDataSet(data, state.CurrentDataSet);
 
     /// Every command sent since the last call, in order.
     Lines sent() { return std::exchange(visa.written, {}); }

@@ -4,6 +4,7 @@
 #include <QMenu>
 
 #include "support/windowtest.h"
+#include "ui/caption.h"
 
 namespace kdx::test {
 namespace {
@@ -167,6 +168,25 @@ TEST_F(LabellingTest, ATextThatTheLanguageLacksIsEmpty) {
     EXPECT_EQ(caption("RT_Frame"), "");
     EXPECT_EQ(find<QComboBox>("PTY_Combo1")->count(), 32);  // the position is the code, with or without a name
     EXPECT_EQ(find<QComboBox>("PTY_Combo1")->itemText(3), QString());
+}
+
+TEST_F(LabellingTest, WithoutALanguageFileEveryDesignTextIsWhole) {
+    folder.copyShipped();
+    std::filesystem::remove(folder.data() / kLanguageFile);
+    start();
+    action("Mnu_Info_Log")->trigger();
+    QStringList texts;
+    for (const QWidget* widget : window->findChildren<QWidget*>()) {
+        texts << shownText(widget) << widget->toolTip() << widget->accessibleName();
+    }
+    for (const QAction* entry : window->findChildren<QAction*>()) texts << entry->text();
+    EXPECT_TRUE(texts.contains(QStringLiteral("&Schließen")));
+    EXPECT_TRUE(texts.contains(QStringLiteral("RF [dBµV]")));
+    for (const QString& shown : texts) {
+        // A question mark stands alone after a blank, as on the buttons that ask; a letter that is none has none.
+        EXPECT_FALSE(QString(shown).replace(QLatin1String(" ?"), QString()).contains(QLatin1Char('?')))
+            << shown.toStdString();
+    }
 }
 
 }  // namespace

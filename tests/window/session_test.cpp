@@ -181,6 +181,13 @@ TEST_F(SessionTest, TheInterfaceInUseIsGreyedOut) {
     EXPECT_TRUE(find("Adr1_VScroll")->isHidden());
 }
 
+TEST_F(SessionTest, AnInterfaceThatWasNeverStoredIsWrittenInItsOwnSpelling) {
+    folder.write("RDS_Allg.INI", "");
+    start();
+    action("Mnu_Info_Interface_COM")->trigger();
+    EXPECT_NE(folder.read("RDS_Allg.INI").find("[BUS]\r\nInterface=TCPIP\r\n"), std::string::npos);
+}
+
 TEST_F(SessionTest, AGpibAddressMustLieBetween1And31) {
     useGpib();
     dialogs.inputs = {QStringLiteral("31"), QStringLiteral("1"), QStringLiteral("0"), QStringLiteral("x"),

@@ -1,0 +1,25 @@
+#include <windows.h>
+
+#include <cstdlib>
+#include <string>
+
+#include "app/platform.h"
+
+namespace kdx {
+
+std::filesystem::path programFolder(const char* /*program*/) {
+    std::wstring name(32768, L'\0');  // the longest path there is
+    name.resize(GetModuleFileNameW(nullptr, name.data(), static_cast<DWORD>(name.size())));
+    return std::filesystem::path(name).parent_path();
+}
+
+std::filesystem::path userFolder() {
+    const wchar_t* data = _wgetenv(L"APPDATA");
+    return (data == nullptr ? std::filesystem::path() : std::filesystem::path(data)) / "KDX-RDS";
+}
+
+bool hasDisplay() {
+    return true;
+}
+
+}  // namespace kdx
