@@ -7,6 +7,13 @@
 
 namespace kdx {
 
+namespace {
+
+constexpr float kSecondsOfDay = 86400.0F;
+constexpr std::chrono::milliseconds kLongestDelay{100};
+
+}  // namespace
+
 double SystemClock::secondsSinceMidnight() const {
     using namespace std::chrono;
     const auto now = system_clock::now();
@@ -22,21 +29,33 @@ Date SystemClock::today() const {
     return {local.tm_year + 1900, local.tm_mon + 1, local.tm_mday};
 }
 
+std::chrono::steady_clock::time_point SystemClock::steadyNow() const {
+    return std::chrono::steady_clock::now();
+}
+
 void SystemClock::sleep(std::chrono::nanoseconds duration) {
     // To an absolute point of the steady clock: an interrupted or late sleep does not add up.
     std::this_thread::sleep_until(std::chrono::steady_clock::now() + duration);
 }
 
 void WaitMs(Clock& clock, const std::int16_t& milliseconds) {
+    using namespace std::chrono;
     if (milliseconds == 0) return;
+    const steady_clock::time_point begin = clock.steadyNow();
     const auto start = static_cast<float>(clock.secondsSinceMidnight());
     const float target = start + static_cast<float>(milliseconds) / 1000.0F;
+    const bool pastMidnight = target >= kSecondsOfDay;
+    const bool ends = !pastMidnight || clock.midnightCorrected();
+    // Past midnight the seconds say nothing, so the steady time alone counts there.
+    const auto latest = begin + std::chrono::milliseconds(milliseconds) + (pastMidnight ? 0ms : kLongestDelay);
     for (;;) {
         const double now = clock.secondsSinceMidnight();
-        if (static_cast<float>(now) >= target) return;
-        const std::chrono::duration<double> left{static_cast<double>(target) - now};
+        const steady_clock::time_point steadyNow = clock.steadyNow();
+        if (static_cast<float>(now) >= target || (ends && steadyNow >= latest)) return;
         // At least a microsecond: rounding must not turn the rest into a busy loop.
-        clock.sleep(std::max(std::chrono::ceil<std::chrono::nanoseconds>(left), std::chrono::nanoseconds{1000}));
+        auto left = std::max(ceil<nanoseconds>(duration<double>(static_cast<double>(target) - now)), 1000ns);
+        if (ends) left = std::min<nanoseconds>(left, latest - steadyNow);
+        clock.sleep(left);
     }
 }
 

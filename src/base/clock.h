@@ -20,8 +20,17 @@ public:
     [[nodiscard]] virtual double secondsSinceMidnight() const = 0;
     /// Today's local date.
     [[nodiscard]] virtual Date today() const = 0;
+    /// A time that only ever runs forward, whatever is done to the PC clock.
+    [[nodiscard]] virtual std::chrono::steady_clock::time_point steadyNow() const = 0;
     /// Sleeps for the given time; takes no processor time and handles no events.
     virtual void sleep(std::chrono::nanoseconds duration) = 0;
+
+    /// The user's choice whether a wait over midnight ends like any other; it does not unless chosen.
+    void correctMidnight(bool corrected) { m_midnightCorrected = corrected; }
+    [[nodiscard]] bool midnightCorrected() const { return m_midnightCorrected; }
+
+private:
+    bool m_midnightCorrected = false;
 };
 
 /// The machine's clock in its local time zone.
@@ -29,12 +38,14 @@ class SystemClock final : public Clock {
 public:
     [[nodiscard]] double secondsSinceMidnight() const override;
     [[nodiscard]] Date today() const override;
+    [[nodiscard]] std::chrono::steady_clock::time_point steadyNow() const override;
     void sleep(std::chrono::nanoseconds duration) override;
 };
 
 /// Waits until the clock's seconds since midnight, held in single precision, have reached start + milliseconds / 1000.
 /// The rounding is the one the instrument's timing was tried out with. A target past midnight is never reached, since
-/// the seconds start at 0 again: the wait then does not end. It is left so on purpose.
+/// the seconds start at 0 again: the wait then does not end, on purpose, unless the clock corrects midnight. Every
+/// other wait ends at the latest 100 ms after its length, even when the PC clock is set back meanwhile.
 /// @param milliseconds length of the wait; 0 returns at once.
 void WaitMs(Clock& clock, const std::int16_t& milliseconds);
 

@@ -47,6 +47,7 @@ class ImpatientClock final : public Clock {
 public:
     [[nodiscard]] double secondsSinceMidnight() const override { return m_clock.secondsSinceMidnight(); }
     [[nodiscard]] Date today() const override { return m_clock.today(); }
+    [[nodiscard]] std::chrono::steady_clock::time_point steadyNow() const override { return m_clock.steadyNow(); }
     void sleep(std::chrono::nanoseconds duration) override {
         if (++m_sleeps > 1000) throw std::runtime_error("still waiting");
         m_clock.sleep(duration);
@@ -64,6 +65,48 @@ TEST(WaitMsTest, AWaitAcrossMidnightNeverEnds) {
     EXPECT_GT(clock.daysPassed(), 100);
 }
 
+TEST(WaitMsTest, AWaitAcrossMidnightEndsAfterItsLengthWhenMidnightIsCorrected) {
+    FakeClock clock(86399.98);
+    clock.correctMidnight(true);
+    WaitMs(clock, 50);
+    EXPECT_NEAR(clock.sleptMs(), 50, 0.01);
+    EXPECT_LT(clock.secondsSinceMidnight(), 1);
+}
+
+/// Somebody sets the clock during the first sleep; how much later the wait still goes on is bounded here as well.
+class ClockBeingSet final : public Clock {
+public:
+    explicit ClockBeingSet(double setTo) : m_setTo(setTo) {}
+    [[nodiscard]] double secondsSinceMidnight() const override { return clock.secondsSinceMidnight(); }
+    [[nodiscard]] Date today() const override { return clock.today(); }
+    [[nodiscard]] std::chrono::steady_clock::time_point steadyNow() const override { return clock.steadyNow(); }
+    void sleep(std::chrono::nanoseconds duration) override {
+        if (clock.sleeps.size() > 1000) throw std::runtime_error("still waiting");
+        clock.sleep(duration);
+        if (clock.sleeps.size() == 1) clock.set(m_setTo);
+    }
+
+    FakeClock clock{40000};
+
+private:
+    double m_setTo;
+};
+
+TEST(WaitMsTest, AClockThatIsSetBackDelaysTheEndByATenthOfASecondAtMost) {
+    for (const double setTo : {36400.0, 39999.0, 39999.99, 0.0}) {
+        ClockBeingSet clock(setTo);
+        WaitMs(clock, 50);
+        EXPECT_GE(clock.clock.sleptMs(), 49) << setTo;
+        EXPECT_LE(clock.clock.sleptMs(), 150.01) << setTo;
+    }
+}
+
+TEST(WaitMsTest, AClockThatIsSetForwardEndsTheWait) {
+    ClockBeingSet clock(50000);
+    WaitMs(clock, 50);
+    EXPECT_EQ(clock.clock.sleeps.size(), 1U);
+}
+
 TEST(SystemClockTest, TellsATimeOfDayAndADate) {
     const SystemClock clock;
     EXPECT_GE(clock.secondsSinceMidnight(), 0);
@@ -71,6 +114,13 @@ TEST(SystemClockTest, TellsATimeOfDayAndADate) {
     EXPECT_GE(clock.today().year, 2024);
     EXPECT_GE(clock.today().month, 1);
     EXPECT_LE(clock.today().month, 12);
+}
+
+TEST(SystemClockTest, ItsSteadyTimeRunsWithASleep) {
+    SystemClock clock;
+    const auto before = clock.steadyNow();
+    clock.sleep(std::chrono::milliseconds(2));
+    EXPECT_GE(clock.steadyNow() - before, std::chrono::milliseconds(2));
 }
 
 }  // namespace
