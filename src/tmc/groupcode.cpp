@@ -38,6 +38,7 @@ std::string lastBits(double number, std::size_t count) {
 }
 
 std::string hexadecimal(double number) {
+    if (std::isnan(number)) return "0";  // what is no number counts as 0, as everywhere
     constexpr double kLowest = std::numeric_limits<std::int32_t>::min();
     constexpr double kLargest = std::numeric_limits<std::int32_t>::max();
     const auto whole = static_cast<std::int32_t>(std::nearbyint(std::clamp(number, kLowest, kLargest)));

@@ -29,7 +29,7 @@ struct GroupBits {
 [[nodiscard]] std::string lastBits(double number, std::size_t count);
 
 /// The number, rounded to a whole one, in upper-case hexadecimal digits without leading zeros or blanks; negative
-/// ones as 32-bit two's complement. Beyond 32 bits the nearest number that fits is taken.
+/// ones as 32-bit two's complement. Beyond 32 bits the nearest number that fits is taken; what is no number gives 0.
 [[nodiscard]] std::string hexadecimal(double number);
 
 /// The number that an entry of the event or location list ends in: its last 5 characters, 0 when they are none.

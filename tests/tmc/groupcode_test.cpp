@@ -4,6 +4,7 @@
 
 #include <array>
 #include <cstdio>
+#include <limits>
 #include <random>
 #include <string>
 
@@ -123,6 +124,12 @@ TEST(HexadecimalTest, ShowsNegativeNumbersAsTwosComplement) {
 TEST(HexadecimalTest, TakesTheNearestNumberThatFitsInThirtyTwoBits) {
     EXPECT_EQ(hexadecimal(1e99), "7FFFFFFF");
     EXPECT_EQ(hexadecimal(-1e99), "80000000");
+}
+
+TEST(HexadecimalTest, WhatIsNoNumberIsZero) {
+    EXPECT_EQ(hexadecimal(std::numeric_limits<double>::quiet_NaN()), "0");
+    EXPECT_EQ(hexadecimal(std::numeric_limits<double>::infinity()), "7FFFFFFF");
+    EXPECT_EQ(hexadecimal(-std::numeric_limits<double>::infinity()), "80000000");
 }
 
 TEST(EntryNumberTest, IsTheNumberOfTheLastFiveCharacters) {
