@@ -133,7 +133,8 @@ void ProfileText::setValue(std::string_view section, std::string_view key, std::
     const Place place = find(m_bytes, section, key);
     if (place.keyLine) {
         const Line& line = *place.keyLine;
-        const std::string replaced = assignment(keyOf(textOf(m_bytes, line)), value);  // the key keeps its spelling
+        std::string replaced = assignment(keyOf(textOf(m_bytes, line)), value);  // the key keeps its spelling
+        if (line.next == line.end) replaced += kLineEnd;                         // the file's last line had none
         m_bytes.replace(line.begin, line.end - line.begin, replaced);
         return;
     }

@@ -87,7 +87,11 @@ TEST(ProfileTextTest, TheEmptySectionNameMeansEmptyBrackets) {
 
 TEST(ProfileTextTest, AnExistingKeyKeepsItsSpellingAndItsLineEnd) {
     EXPECT_EQ(written("[Fm]\n pilot_Hub = 675 \nRDS=1\n", "FM", "PILOT_HUB", "700"), "[Fm]\npilot_Hub=700\nRDS=1\n");
-    EXPECT_EQ(written("[FM]\r\nRDS=1", "FM", "RDS", "0"), "[FM]\r\nRDS=0");
+}
+
+TEST(ProfileTextTest, AWriteIntoALastLineWithoutLineEndGivesItOne) {
+    EXPECT_EQ(written("[FM]\r\nRDS=1", "FM", "RDS", "0"), "[FM]\r\nRDS=0\r\n");
+    EXPECT_EQ(written("[FM]\nRDS=1\nARI=1", "FM", "RDS", "0"), "[FM]\nRDS=0\nARI=1") << "another line is not touched";
 }
 
 TEST(ProfileTextTest, AnEmptyValueIsWrittenAsKeyAndEqualsSign) {
