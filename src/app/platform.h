@@ -10,7 +10,7 @@ namespace kdx {
 [[nodiscard]] std::filesystem::path programFolder(const char* program);
 
 /// The user's folder for this program's data: XDG_DATA_HOME or ~/.local/share (XDG base directory standard), %APPDATA%
-/// on Windows.
+/// on Windows; empty when none of them names an absolute folder.
 [[nodiscard]] std::filesystem::path userFolder();
 
 /// Whether a window can be shown.

@@ -22,9 +22,10 @@ std::filesystem::path programFolder(const char* program) {
 }
 
 std::filesystem::path userFolder() {
-    const std::filesystem::path data = variable("XDG_DATA_HOME");
-    // The XDG base directory standard: a relative path there is to be ignored.
-    return (data.is_absolute() ? data : variable("HOME") / ".local" / "share") / "kdx-rds";
+    // The XDG base directory standard: a relative path there is to be ignored. One in HOME is of no more use.
+    if (const std::filesystem::path data = variable("XDG_DATA_HOME"); data.is_absolute()) return data / "kdx-rds";
+    const std::filesystem::path home = variable("HOME");
+    return home.is_absolute() ? home / ".local" / "share" / "kdx-rds" : std::filesystem::path();
 }
 
 bool hasDisplay() {

@@ -6,6 +6,7 @@
 
 #include "base/codepage.h"
 #include "settings/profilefile.h"
+#include "settings/shownpath.h"
 
 namespace kdx {
 
@@ -20,14 +21,15 @@ bool isThere(const fs::path& path) {
 
 /// The folder's entry of that name in any letter case, the exactly spelled one first, else the first by the alphabet;
 /// without one the path at which it would be created.
-fs::path entryNamed(const fs::path& folder, std::string_view name) {
+fs::path entryNamed(const fs::path& folder, const fs::path& name) {
     fs::path exact = folder / name;
     if (isThere(exact)) return exact;
     fs::path found;
+    const std::string wanted = shownPath(name);
     std::error_code error;
     for (fs::directory_iterator entry(folder, error), end; !error && entry != end; entry.increment(error)) {
         const fs::path& path = entry->path();
-        if (equalNoCase(path.filename().string(), name) && (found.empty() || path < found)) found = path;
+        if (equalNoCase(shownPath(path.filename()), wanted) && (found.empty() || path < found)) found = path;
     }
     return found.empty() ? exact : found;
 }
@@ -40,7 +42,7 @@ std::string dataSetFile(std::string_view number) {
 
 DataFolder::DataFolder(const fs::path& appFolder) : m_path(entryNamed(appFolder, "Daten")) {}
 
-fs::path DataFolder::file(std::string_view name) const {
+fs::path DataFolder::file(const fs::path& name) const {
     return entryNamed(m_path, name);
 }
 

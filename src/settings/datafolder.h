@@ -32,7 +32,7 @@ public:
 
     /// Where a file of the given name is: a file whose name differs in letter case only is found too; one spelled
     /// exactly so wins. When there is none, the path it would be created at.
-    [[nodiscard]] std::filesystem::path file(std::string_view name) const;
+    [[nodiscard]] std::filesystem::path file(const std::filesystem::path& name) const;
 
     /// One value; "" when the key, the section or the file is missing, unreadable or the value is empty. Values are
     /// cut at 254 characters. Never creates a file, never throws.

@@ -4,12 +4,19 @@
 
 #include "settings/datafolder.h"
 #include "settings/profilefile.h"
+#include "settings/shownpath.h"
 
 namespace kdx {
 
 namespace fs = std::filesystem;
 
 namespace {
+
+#ifdef _WIN32
+constexpr const char* kHomeVariable = "APPDATA";
+#else
+constexpr const char* kHomeVariable = "HOME";
+#endif
 
 bool isWritableFolder(const fs::path& folder) {
     std::error_code error;
@@ -24,23 +31,23 @@ void fillFrom(const fs::path& shipped, const DataFolder& target, std::string& pr
     std::error_code error;
     fs::create_directories(target.path(), error);
     if (error) {
-        problem = target.path().string() + ": " + error.message();
+        problem = shownPath(target.path()) + ": " + error.message();
         return;
     }
     for (auto entry = fs::directory_iterator(shipped, error); !error && entry != fs::directory_iterator();
          entry.increment(error)) {
         // A file whose name differs in letter case only is the same file.
-        const fs::path file = target.file(entry->path().filename().string());
+        const fs::path file = target.file(entry->path().filename());
         std::error_code ignored;
         if (fs::exists(file, ignored) || !entry->is_regular_file(ignored)) continue;
         // Whole or not at all: half a file would count as the user's own from the next start on.
         const auto bytes = readFile(entry->path());
         if (!bytes || !replaceFile(file, *bytes)) {
-            problem = (bytes ? file : entry->path()).string();
+            problem = shownPath(bytes ? file : entry->path());
             return;
         }
     }
-    if (error) problem = shipped.string() + ": " + error.message();
+    if (error) problem = shownPath(shipped) + ": " + error.message();
 }
 
 }  // namespace
@@ -48,8 +55,20 @@ void fillFrom(const fs::path& shipped, const DataFolder& target, std::string& pr
 fs::path chooseAppFolder(const DataPlaces& places, std::string& problem) {
     if (places.asked) return *places.asked;
     if (isWritableFolder(DataFolder(places.program).path())) return places.program;
+    if (!places.user.is_absolute()) {
+        // Never a folder in the current one, wherever that happens to be: nothing is kept then.
+        problem = std::string("no folder is known for your settings, so that they cannot be kept: ") + kHomeVariable +
+                  " is not set. Set it, or name a folder with --app-folder.";
+        return places.program;
+    }
     fillFrom(DataFolder(places.shipped).path(), DataFolder(places.user), problem);
     return places.user;
+}
+
+fs::path shippedFolder(const fs::path& program, const fs::path& builtIn) {
+    fs::path installed = program / ".." / "share" / "kdx-rds";
+    std::error_code error;  // a folder that nobody may look into counts as none
+    return fs::is_directory(DataFolder(installed).path(), error) ? installed : builtIn;
 }
 
 }  // namespace kdx

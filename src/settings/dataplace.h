@@ -16,7 +16,13 @@ struct DataPlaces {
 
 /// The program's folder whose "Daten" is used: the one asked for; else the program's own when it holds a writable
 /// "Daten"; else the user's, whose "Daten" gets every shipped file it does not have yet. Nothing is ever overwritten.
-/// @param problem gets a message when the user's folder could not be filled.
+/// When the user's folder is not known (empty or relative) it is the program's, and nothing is created.
+/// @param problem gets a message, in UTF-8, when the user's folder is not known or could not be filled.
 [[nodiscard]] std::filesystem::path chooseAppFolder(const DataPlaces& places, std::string& problem);
+
+/// The folder with the "Daten" that came with the program: ../share/kdx-rds as seen from the program's folder, or the
+/// built-in one when there is none there. Never throws, whatever the rights of that folder.
+[[nodiscard]] std::filesystem::path shippedFolder(const std::filesystem::path& program,
+                                                  const std::filesystem::path& builtIn);
 
 }  // namespace kdx

@@ -47,5 +47,17 @@ TEST_F(UserFolder, FollowsTheXdgStandard) {
     EXPECT_EQ(userFolder(), fs::path("/home/someone/.local/share/kdx-rds"));
 }
 
+TEST_F(UserFolder, IsUnknownWithoutAnAbsoluteHome) {
+    unsetenv("XDG_DATA_HOME");
+    unsetenv("HOME");
+    EXPECT_EQ(userFolder(), fs::path());
+    setenv("HOME", "", 1);
+    EXPECT_EQ(userFolder(), fs::path());
+    setenv("HOME", "relative", 1);
+    EXPECT_EQ(userFolder(), fs::path());
+    setenv("XDG_DATA_HOME", "/data", 1);
+    EXPECT_EQ(userFolder(), fs::path("/data/kdx-rds"));
+}
+
 }  // namespace
 }  // namespace kdx

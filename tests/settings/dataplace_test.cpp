@@ -122,6 +122,66 @@ TEST_F(DataPlaceTest, AShippedFileThatCannotBeReadIsNamed) {
     EXPECT_FALSE(fs::exists(user / "Daten" / "RDS_Allg.INI"));
 }
 
+TEST_F(DataPlaceTest, WithoutAUsersFolderNothingIsCreatedAndTheReasonIsTold) {
+    const fs::path before = fs::current_path();
+    fs::current_path(base.path());
+    for (const char* unknown : {"", "kdx-rds", ".local/share/kdx-rds"}) {
+        places.user = unknown;
+        problem.clear();
+        EXPECT_EQ(choose(), program);
+        EXPECT_NE(problem.find("HOME is not set"), std::string::npos) << problem;
+        EXPECT_NE(problem.find("--app-folder"), std::string::npos) << problem;
+    }
+    fs::current_path(before);
+    EXPECT_FALSE(fs::exists(base.data()));
+    EXPECT_FALSE(fs::exists(base.path() / "kdx-rds"));
+    EXPECT_FALSE(fs::exists(base.path() / ".local"));
+    EXPECT_TRUE(fs::is_empty(program));
+}
+
+TEST_F(DataPlaceTest, FolderNamesOfAnyBytesAreUsedAndShown) {
+    places.user = base.path() / "B\xFCro\n";
+    places.shipped = base.path() / "none\xE4";
+    EXPECT_EQ(choose(), places.user);
+    EXPECT_TRUE(fs::is_directory(places.user / "Daten"));
+    EXPECT_NE(problem.find("/none\\xE4/Daten: "), std::string::npos) << problem;
+    put(base.path() / "in\xFCthe\xFFway", "");
+    places.user = base.path() / "in\xFCthe\xFFway";
+    EXPECT_EQ(choose(), places.user);
+    EXPECT_NE(problem.find("/in\\xFCthe\\xFFway/Daten: "), std::string::npos) << problem;
+}
+
+TEST_F(DataPlaceTest, ShippedFilesOfAnyNameAreCopied) {
+    put(shipped / "Daten" / "\xFC\xFF.txt", "x");
+    EXPECT_EQ(choose(), user);
+    EXPECT_EQ(get(user / "Daten" / "\xFC\xFF.txt"), "x");
+    EXPECT_EQ(problem, "");
+}
+
+TEST_F(DataPlaceTest, TheShippedDataAreTheInstalledOnesElseTheBuiltInOnes) {
+    const fs::path builtIn = base.path() / "source";
+    const fs::path installed = program / ".." / "share" / "kdx-rds";
+    EXPECT_EQ(shippedFolder(program, builtIn), builtIn);
+    fs::create_directories(base.path() / "share" / "kdx-rds" / "Daten");
+    EXPECT_EQ(shippedFolder(program, builtIn), installed);
+    fs::permissions(base.path() / "share", fs::perms::none);
+    {
+        const Unprivileged ordinary;
+        EXPECT_EQ(shippedFolder(program, builtIn), builtIn);
+    }
+    fs::permissions(base.path() / "share", fs::perms::all);
+}
+
+TEST_F(DataPlaceTest, ShippedDataThatNobodyMayLookIntoAreReported) {
+    fs::permissions(shipped, fs::perms::none);
+    {
+        const Unprivileged ordinary;
+        EXPECT_EQ(choose(), user);
+    }
+    fs::permissions(shipped, fs::perms::all);
+    EXPECT_NE(problem.find((shipped / "Daten").string()), std::string::npos) << problem;
+}
+
 TEST_F(DataPlaceTest, OnAFullDiskNoHalfFileStaysBehind) {
     put(shipped / "Daten" / "Datenset1.INI", std::string(10000, 'x'));
     const pid_t child = fork();
