@@ -35,8 +35,7 @@ std::filesystem::path appFolder(const kdx::Options& options, const char* program
     if (options.appFolder) places.asked = *options.appFolder;
     places.program = kdx::programFolder(program);
     places.user = kdx::userFolder();
-    places.shipped = places.program / ".." / "share" / "kdx-rds";
-    if (!std::filesystem::exists(places.shipped / "Daten")) places.shipped = KDX_SHIPPED_DATA;
+    places.shipped = kdx::shippedFolder(places.program, KDX_SHIPPED_DATA);
     return kdx::chooseAppFolder(places, problem);
 }
 

@@ -9,36 +9,38 @@
 
 namespace kdx {
 
+namespace {
+
+/// Captions have numbers without leading zeros: "01" is none.
+bool isNumber(std::string_view key) {
+    int number = 0;
+    const auto read = std::from_chars(key.data(), key.data() + key.size(), number);
+    return read.ec == std::errc() && key == std::to_string(number);
+}
+
+}  // namespace
+
 Captions::Captions(const DataFolder& data) : m_data(data) {}
 
 void Captions::load(const std::string& language, const std::string& standard) {
-    m_texts.clear();
-    m_programmeTypes.fill({});
-    // One look at the file instead of one per caption: a relabelling asks for some three hundred.
-    const ProfileText file(readFile(m_data.file(kLanguageFile)).value_or(std::string()));
-    for (const auto& [key, value] : file.section(language)) {
-        int number = 0;
-        const auto read = std::from_chars(key.data(), key.data() + key.size(), number);
-        // Numbers stand without leading zeros: "01" is no caption.
-        if (read.ec == std::errc() && key == std::to_string(number)) m_texts.emplace(number, value);
-    }
+    m_file = m_data.profile(kLanguageFile);
+    m_language = language;
+    m_empty = !m_file || !m_file->anyKey(language, isNumber);
     const char* list = "PTY-Liste_D";
     if (language != "deutsch") list = standard == "RBDS" ? "PTY-Liste_US" : "PTY-Liste_E";
-    const auto names = file.section(list);
     for (std::size_t type = 0; type < m_programmeTypes.size(); ++type) {
-        const auto name = names.find(rightmost("000" + std::to_string(type), 3));
-        if (name != names.end()) m_programmeTypes[type] = name->second;
+        m_programmeTypes[type] =
+            m_file ? m_file->value(list, rightmost("000" + std::to_string(type), 3)) : std::string();
     }
 }
 
 std::string Captions::text(int number) const {
-    const auto found = m_texts.find(number);
-    return found == m_texts.end() ? std::string() : found->second;
+    return m_file ? m_file->value(m_language, std::to_string(number)) : std::string();
 }
 
 std::string Captions::own(int number, std::string_view design) const {
-    const auto found = m_texts.find(number);
-    return found == m_texts.end() || found->second.empty() ? fromUtf8(design) : found->second;
+    std::string found = text(number);
+    return found.empty() ? fromUtf8(design) : found;
 }
 
 }  // namespace kdx

@@ -1,13 +1,14 @@
 #pragma once
 
 #include <array>
-#include <map>
+#include <memory>
 #include <string>
 #include <string_view>
 
 namespace kdx {
 
 class DataFolder;
+class ProfileText;
 
 /// How many programme types there are (IEC 62106, table of programme types).
 inline constexpr int kProgrammeTypes = 32;
@@ -22,7 +23,7 @@ public:
     void load(const std::string& language, const std::string& standard);
 
     /// True when the file had no text at all for the language, or cannot be read.
-    [[nodiscard]] bool isEmpty() const { return m_texts.empty(); }
+    [[nodiscard]] bool isEmpty() const { return m_empty; }
 
     /// The text of that number; "" where the file has none.
     [[nodiscard]] std::string text(int number) const;
@@ -36,7 +37,9 @@ public:
 
 private:
     const DataFolder& m_data;
-    std::map<int, std::string> m_texts;
+    std::shared_ptr<const ProfileText> m_file;  // as loaded, whatever becomes of the file
+    std::string m_language;
+    bool m_empty = true;
     std::array<std::string, kProgrammeTypes> m_programmeTypes;
 };
 

@@ -47,21 +47,26 @@ fs::path DataFolder::file(const fs::path& name) const {
 }
 
 std::string DataFolder::ReadIni(std::string_view section, std::string_view key, std::string_view fileName) const {
-    std::optional<std::string> bytes = readFile(file(fileName));
-    return bytes ? ProfileText(std::move(*bytes)).value(section, key) : std::string();
+    const auto text = profile(fileName);
+    return text ? text->value(section, key) : std::string();
+}
+
+std::shared_ptr<const ProfileText> DataFolder::profile(std::string_view fileName) const {
+    return m_profiles.load(file(fileName));
 }
 
 void DataFolder::WriteIni(std::string_view section, std::string_view key, std::string_view value,
                           std::string_view fileName) {
     const fs::path path = file(fileName);
-    const std::optional<std::string> before = readToChange(path);
-    if (!before) {
-        noteSaved(fileName, false);
+    const auto before = m_profiles.load(path);
+    if (before && before->holds(section, key, value)) return;  // spare the disk
+    std::error_code error;
+    if (!before && fs::status(path, error).type() != fs::file_type::not_found) {
+        noteSaved(fileName, false);  // there but not readable: writing would lose what is in it
         return;
     }
-    ProfileText text(*before);
+    ProfileText text = before ? *before : ProfileText();
     text.setValue(section, key, value);
-    if (before == text.bytes()) return;  // the value stands there already: spare the disk
     noteSaved(fileName, replaceFile(path, text.bytes()));
 }
 

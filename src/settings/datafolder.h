@@ -2,10 +2,13 @@
 
 #include <filesystem>
 #include <functional>
+#include <memory>
 #include <optional>
 #include <string>
 #include <string_view>
 #include <vector>
+
+#include "settings/profilecache.h"
 
 namespace kdx {
 
@@ -38,6 +41,9 @@ public:
     /// cut at 254 characters. Never creates a file, never throws.
     [[nodiscard]] std::string ReadIni(std::string_view section, std::string_view key, std::string_view fileName) const;
 
+    /// All settings of a file as they are now; nothing when it is missing or cannot be read.
+    [[nodiscard]] std::shared_ptr<const ProfileText> profile(std::string_view fileName) const;
+
     /// Writes one key at once; creates the file and the section if needed. A failure changes nothing on disk, throws
     /// nothing and opens no box: it is kept in unsavedFile() until a write to the same file succeeds.
     void WriteIni(std::string_view section, std::string_view key, std::string_view value, std::string_view fileName);
@@ -52,6 +58,7 @@ private:
     void noteSaved(std::string_view fileName, bool saved);
 
     std::filesystem::path m_path;
+    mutable ProfileCache m_profiles;
     std::vector<std::string> m_unsavedFiles;  // the one that failed last at the end
     std::function<void()> m_unsavedFileChanged;
 };

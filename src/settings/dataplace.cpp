@@ -12,12 +12,6 @@ namespace fs = std::filesystem;
 
 namespace {
 
-#ifdef _WIN32
-constexpr const char* kHomeVariable = "APPDATA";
-#else
-constexpr const char* kHomeVariable = "HOME";
-#endif
-
 bool isWritableFolder(const fs::path& folder) {
     std::error_code error;
     if (!fs::is_directory(folder, error)) return false;
@@ -57,8 +51,9 @@ fs::path chooseAppFolder(const DataPlaces& places, std::string& problem) {
     if (isWritableFolder(DataFolder(places.program).path())) return places.program;
     if (!places.user.is_absolute()) {
         // Never a folder in the current one, wherever that happens to be: nothing is kept then.
-        problem = std::string("no folder is known for your settings, so that they cannot be kept: ") + kHomeVariable +
-                  " is not set. Set it, or name a folder with --app-folder.";
+        problem =
+            "no folder is known for your settings, so that they cannot be kept: HOME (APPDATA on Windows) is not set. Set "
+            "it, or name a folder with --app-folder.";
         return places.program;
     }
     fillFrom(DataFolder(places.shipped).path(), DataFolder(places.user), problem);

@@ -1,11 +1,32 @@
 #pragma once
 
+#include <cstdint>
 #include <filesystem>
+#include <optional>
 #include <string_view>
 
 namespace kdx {
 
-/// What replacing a file needs of the operating system: durablefile_posix.cpp, and durablefile_portable.cpp elsewhere.
+/// What reading and replacing files needs of the operating system: durablefile_posix.cpp, and durablefile_portable.cpp
+/// elsewhere.
+
+/// Tells whether a file is still the one it was: as far as the system knows, another file in its place or a change of
+/// its content changes one of these. Times are nanoseconds.
+struct FileIdentity {
+    std::uint64_t device = 0;
+    std::uint64_t number = 0;
+    std::uint64_t size = 0;
+    std::int64_t modified = 0;
+    std::int64_t changed = 0;
+    bool operator==(const FileIdentity&) const = default;
+};
+
+/// The identity of the file, or of the one a link leads to; nothing when it is missing or cannot be looked at.
+[[nodiscard]] std::optional<FileIdentity> identityOf(const std::filesystem::path& file);
+
+/// True when the file's last change is so long ago that the next one is sure to give it another identity: times go in
+/// steps of some milliseconds, on some disks of two seconds.
+[[nodiscard]] bool isSettled(const FileIdentity& identity);
 
 /// True when the user who runs the program may write the existing file.
 [[nodiscard]] bool userMayWrite(const std::filesystem::path& file);

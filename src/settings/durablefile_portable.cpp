@@ -1,9 +1,32 @@
+#include <chrono>
 #include <fstream>
 #include <system_error>
 
 #include "settings/durablefile.h"
 
 namespace kdx {
+
+namespace {
+
+std::int64_t nanoseconds(std::filesystem::file_time_type time) {
+    return std::chrono::duration_cast<std::chrono::nanoseconds>(time.time_since_epoch()).count();
+}
+
+}  // namespace
+
+std::optional<FileIdentity> identityOf(const std::filesystem::path& file) {
+    std::error_code error;
+    FileIdentity identity;
+    identity.size = std::filesystem::file_size(file, error);
+    if (error) return std::nullopt;
+    identity.modified = nanoseconds(std::filesystem::last_write_time(file, error));
+    return error ? std::nullopt : std::optional(identity);
+}
+
+bool isSettled(const FileIdentity& identity) {
+    constexpr std::int64_t kCoarseSteps = 2'000'000'000;
+    return nanoseconds(std::filesystem::file_time_type::clock::now()) - identity.modified > kCoarseSteps;
+}
 
 bool userMayWrite(const std::filesystem::path& file) {
     return std::ofstream(file, std::ios::binary | std::ios::app).is_open();  // opened for appending: nothing changes

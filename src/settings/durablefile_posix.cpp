@@ -2,7 +2,9 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <cerrno>
+#include <ctime>
 
 #include "base/filedescriptor.h"
 #include "settings/durablefile.h"
@@ -30,7 +32,30 @@ bool takeOver(int file, const struct stat& model) {
     return ::fchmod(file, model.st_mode & 07777) == 0;  // after the owner: a new owner clears bits of the mode
 }
 
+std::int64_t nanoseconds(const timespec& time) {
+    constexpr std::int64_t kSecond = 1'000'000'000;
+    return time.tv_sec * kSecond + time.tv_nsec;
+}
+
 }  // namespace
+
+std::optional<FileIdentity> identityOf(const std::filesystem::path& file) {
+    struct stat status {};
+    if (::stat(file.c_str(), &status) != 0) return std::nullopt;
+    return FileIdentity{status.st_dev, status.st_ino, static_cast<std::uint64_t>(status.st_size),
+                        nanoseconds(status.st_mtim), nanoseconds(status.st_ctim)};
+}
+
+bool isSettled(const FileIdentity& identity) {
+    constexpr std::int64_t kSecond = 1'000'000'000;
+    constexpr std::int64_t kFineSteps = kSecond / 10;
+    constexpr std::int64_t kCoarseSteps = 2 * kSecond;
+    // A change at a whole second, to the nanosecond, means a disk that keeps no finer times.
+    const bool coarse = identity.modified % kSecond == 0;
+    timespec now{};
+    ::clock_gettime(CLOCK_REALTIME, &now);
+    return nanoseconds(now) - std::max(identity.modified, identity.changed) > (coarse ? kCoarseSteps : kFineSteps);
+}
 
 bool userMayWrite(const std::filesystem::path& file) {
     return ::faccessat(AT_FDCWD, file.c_str(), W_OK, AT_EACCESS) == 0;

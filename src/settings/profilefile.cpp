@@ -1,12 +1,12 @@
 #include "settings/profilefile.h"
 
-#include <algorithm>
+#include <array>
 #include <fstream>
-#include <sstream>
 #include <system_error>
 #include <utility>
 
-#include "base/codepage.h"
+#include "settings/profileindex.h"
+#include "settings/profilelines.h"
 
 namespace kdx {
 
@@ -14,52 +14,8 @@ namespace {
 
 constexpr std::string_view kLineEnd = "\r\n";
 
-/// One line in the bytes: its text is [begin, end), the next line starts at `next`.
-struct Line {
-    std::size_t begin = 0;
-    std::size_t end = 0;
-    std::size_t next = 0;
-};
-
-/// Where a key is, or where it would have to go.
-struct Place {
-    bool sectionFound = false;
-    std::optional<Line> keyLine;
-    std::size_t newKeyAt = 0;  ///< behind the section's last key, or behind its header when it has none
-};
-
-bool isBlank(char c) {
-    return c == ' ' || c == '\t' || c == '\v';
-}
-
 bool isLineEnd(char c) {
     return c == '\r' || c == '\n';
-}
-
-std::string_view trimmed(std::string_view text) {
-    while (!text.empty() && isBlank(text.front())) text.remove_prefix(1);
-    while (!text.empty() && isBlank(text.back())) text.remove_suffix(1);
-    return text;
-}
-
-Line lineAt(std::string_view bytes, std::size_t begin) {
-    std::size_t end = begin;
-    while (end < bytes.size() && !isLineEnd(bytes[end])) ++end;
-    const bool twoBytes = bytes.substr(end).starts_with(kLineEnd);
-    return {begin, end, twoBytes ? end + 2 : std::min(end + 1, bytes.size())};
-}
-
-std::string_view textOf(std::string_view bytes, const Line& line) {
-    return trimmed(bytes.substr(line.begin, line.end - line.begin));
-}
-
-/// The part before the first '='; a line without one is a key without a value.
-std::string_view keyOf(std::string_view lineText) {
-    return trimmed(lineText.substr(0, lineText.find('=')));
-}
-
-std::string_view sectionOf(std::string_view header) {
-    return trimmed(header.substr(1, header.find(']') - 1));
 }
 
 std::string_view withoutQuotes(std::string_view value) {
@@ -74,75 +30,84 @@ std::string valueOf(std::string_view lineText, std::size_t longest) {
     return std::string(withoutQuotes(trimmed(lineText.substr(equals + 1))).substr(0, longest));
 }
 
-Place find(std::string_view bytes, std::string_view section, std::string_view key) {
-    Place place;
-    Line line;
-    for (std::size_t at = 0; at < bytes.size(); at = line.next) {
-        line = lineAt(bytes, at);
-        const std::string_view text = textOf(bytes, line);
-        if (text.empty() || text.front() == ';') continue;
-        if (text.front() == '[') {
-            if (place.sectionFound) break;  // a later section of the same name is never searched
-            place.sectionFound = equalNoCase(sectionOf(text), section);
-            place.newKeyAt = line.next;
-        } else if (place.sectionFound) {
-            place.newKeyAt = line.next;
-            if (!equalNoCase(keyOf(text), key)) continue;
-            place.keyLine = line;
-            break;
-        }
-    }
-    return place;
-}
-
 std::string assignment(std::string_view key, std::string_view value) {
     return std::string(key).append("=").append(value);
+}
+
+/// Behind the section's last key, or behind its header when it has none.
+std::size_t endOfKeys(std::string_view bytes, const ProfileLine& header) {
+    std::size_t end = header.next;
+    ProfileLine line;
+    for (ProfileLines lines(bytes, header.next); lines.next(line);) {
+        const std::string_view text = textOf(bytes, line);
+        if (isHeader(text)) break;
+        if (!saysNothing(text)) end = line.next;
+    }
+    return end;
 }
 
 }  // namespace
 
 ProfileText::ProfileText(std::string bytes) : m_bytes(std::move(bytes)) {}
 
+const ProfileIndex& ProfileText::index() const {
+    if (!m_index) m_index = std::make_shared<const ProfileIndex>(m_bytes);
+    return *m_index;
+}
+
 std::string ProfileText::value(std::string_view section, std::string_view key, std::size_t longest) const {
-    const Place place = find(m_bytes, trimmed(section), trimmed(key));
-    if (!place.keyLine) return {};
-    return valueOf(textOf(m_bytes, *place.keyLine), longest);
+    const auto line = index().key(m_bytes, trimmed(section), trimmed(key));
+    return line ? valueOf(textOf(m_bytes, *line), longest) : std::string();
+}
+
+bool ProfileText::holds(std::string_view section, std::string_view key, std::string_view value) const {
+    const auto line = index().key(m_bytes, trimmed(section), trimmed(key));
+    if (!line || line->next == line->end) return false;
+    const std::string_view text = std::string_view(m_bytes).substr(line->begin, line->end - line->begin);
+    return text == assignment(keyOf(text), value);
+}
+
+bool ProfileText::anyKey(std::string_view section, const std::function<bool(std::string_view key)>& wanted) const {
+    const auto header = index().header(m_bytes, trimmed(section));
+    if (!header) return false;
+    ProfileLine line;
+    for (ProfileLines lines(m_bytes, header->next); lines.next(line);) {
+        const std::string_view text = textOf(m_bytes, line);
+        if (isHeader(text)) break;
+        if (!saysNothing(text) && wanted(keyOf(text))) return true;
+    }
+    return false;
 }
 
 std::map<std::string, std::string> ProfileText::section(std::string_view name) const {
     std::map<std::string, std::string> values;
-    bool found = false;
-    Line line;
-    for (std::size_t at = 0; at < m_bytes.size(); at = line.next) {
-        line = lineAt(m_bytes, at);
-        const std::string_view text = textOf(m_bytes, line);
-        if (text.empty() || text.front() == ';') continue;
-        if (text.front() == '[') {
-            if (found) break;
-            found = equalNoCase(sectionOf(text), trimmed(name));
-        } else if (found) {
-            values.emplace(keyOf(text), valueOf(text, kLongestValue));
-        }
-    }
+    (void)anyKey(name, [&](std::string_view key) {
+        values.emplace(key, value(name, key));
+        return false;
+    });
     return values;
 }
 
 void ProfileText::setValue(std::string_view section, std::string_view key, std::string_view value) {
     section = trimmed(section);
     key = trimmed(key);
-    const Place place = find(m_bytes, section, key);
-    if (place.keyLine) {
-        const Line& line = *place.keyLine;
-        std::string replaced = assignment(keyOf(textOf(m_bytes, line)), value);  // the key keeps its spelling
-        if (line.next == line.end) replaced += kLineEnd;                         // the file's last line had none
-        m_bytes.replace(line.begin, line.end - line.begin, replaced);
-        return;
+    if (const auto line = index().key(m_bytes, section, key)) {
+        std::string replaced = assignment(keyOf(textOf(m_bytes, *line)), value);  // the key keeps its spelling
+        if (line->next == line->end) replaced += kLineEnd;                        // the file's last line had none
+        m_bytes.replace(line->begin, line->end - line->begin, replaced);
+    } else {
+        const auto header = index().header(m_bytes, section);
+        std::string added = assignment(key, value).append(kLineEnd);
+        if (!header) added.insert(0, std::string("[").append(section).append("]").append(kLineEnd));
+        const std::size_t at = header ? endOfKeys(m_bytes, *header) : m_bytes.size();
+        if (at > firstLine(m_bytes) && !isLineEnd(m_bytes[at - 1])) added.insert(0, kLineEnd);
+        m_bytes.insert(at, added);
     }
-    std::string added = assignment(key, value).append(kLineEnd);
-    if (!place.sectionFound) added.insert(0, std::string("[").append(section).append("]").append(kLineEnd));
-    const std::size_t at = place.sectionFound ? place.newKeyAt : m_bytes.size();
-    if (at > 0 && !isLineEnd(m_bytes[at - 1])) added.insert(0, kLineEnd);
-    m_bytes.insert(at, added);
+    m_index.reset();
+}
+
+bool isUtf16(std::string_view bytes) {
+    return bytes.starts_with("\xFF\xFE") || bytes.starts_with("\xFE\xFF");
 }
 
 std::optional<std::string> readFile(const std::filesystem::path& file) {
@@ -151,10 +116,16 @@ std::optional<std::string> readFile(const std::filesystem::path& file) {
     if (!std::filesystem::is_regular_file(file, error)) return std::nullopt;
     std::ifstream stream(file, std::ios::binary);
     if (!stream) return std::nullopt;
-    std::ostringstream bytes;
-    if (stream.peek() != std::ifstream::traits_type::eof()) bytes << stream.rdbuf();
-    if (stream.bad() || !bytes) return std::nullopt;
-    return std::move(bytes).str();
+    std::string bytes;
+    std::array<char, 64 * 1024> part{};
+    const std::uintmax_t size = std::filesystem::file_size(file, error);
+    if (!error) bytes.reserve(size + 1);
+    while (stream) {
+        stream.read(part.data(), part.size());
+        bytes.append(part.data(), static_cast<std::size_t>(stream.gcount()));
+    }
+    if (stream.bad() || !stream.eof()) return std::nullopt;
+    return bytes;
 }
 
 std::optional<std::string> readToChange(const std::filesystem::path& file) {

@@ -1,7 +1,9 @@
 #pragma once
 
 #include <filesystem>
+#include <functional>
 #include <map>
+#include <memory>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -11,8 +13,11 @@ namespace kdx {
 /// Longest value a read gives: a buffer of 255 characters with its end mark.
 inline constexpr std::size_t kLongestValue = 254;
 
+class ProfileIndex;
+
 /// A profile file's bytes and the rules by which single values are found and replaced in them, the ones of the
-/// operating system's private-profile functions. All texts are 8-bit Windows-1252.
+/// operating system's private-profile functions. All texts are 8-bit Windows-1252; the mark of a UTF-8 file is passed
+/// over. The first read goes through all bytes, every further one straight to its line.
 class ProfileText {
 public:
     explicit ProfileText(std::string bytes = {});
@@ -22,17 +27,30 @@ public:
     [[nodiscard]] std::string value(std::string_view section, std::string_view key,
                                     std::size_t longest = kLongestValue) const;
 
-    /// Replaces or adds one key; every other byte stays as it is. The value is never cut.
+    /// True when setValue() would change nothing.
+    [[nodiscard]] bool holds(std::string_view section, std::string_view key, std::string_view value) const;
+
+    /// Replaces or adds one key; every other byte stays as it is. The value is never cut. A last line without line end
+    /// gets one when it is written.
     void setValue(std::string_view section, std::string_view key, std::string_view value);
 
     /// All keys of the first section of that name with the values that value() gives; the first key of a name wins.
     [[nodiscard]] std::map<std::string, std::string> section(std::string_view name) const;
 
+    /// Whether a key of the first section of that name is a wanted one; asks no further then.
+    [[nodiscard]] bool anyKey(std::string_view section, const std::function<bool(std::string_view key)>& wanted) const;
+
     [[nodiscard]] const std::string& bytes() const { return m_bytes; }
 
 private:
+    [[nodiscard]] const ProfileIndex& index() const;
+
     std::string m_bytes;
+    mutable std::shared_ptr<const ProfileIndex> m_index;  // made at the first read
 };
+
+/// Whether the bytes begin with the mark of a UTF-16 text, in which no 8-bit key can be found or put.
+[[nodiscard]] bool isUtf16(std::string_view bytes);
 
 /// The file's bytes, or nothing when it is missing or cannot be read.
 [[nodiscard]] std::optional<std::string> readFile(const std::filesystem::path& file);

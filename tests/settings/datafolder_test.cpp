@@ -182,7 +182,7 @@ TEST_F(DataFolderTest, ALinkedFileIsWrittenWhereItIs) {
 }
 
 TEST_F(DataFolderTest, GarbageNulBytesAndAMegabyteLongLineAreReadAndKept) {
-    const std::string garbage = std::string("\xFF\xFE\0[\0\r\n=\n]\r", 10) + std::string(1 << 20, '[') + "\n";
+    const std::string garbage = std::string("\xFE\0\xFF[\0\r\n=\n]\r", 10) + std::string(1 << 20, '[') + "\n";
     m_folder.write("Datenset1.INI", garbage);
     EXPECT_EQ(m_data.ReadIni("RDS", "PS", "Datenset1.INI"), "");
     m_data.WriteIni("RDS", "PS", "RADIO", "Datenset1.INI");

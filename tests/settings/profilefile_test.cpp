@@ -53,10 +53,33 @@ TEST(ProfileTextTest, NamesOfSectionsAndKeysAreFoundInAnyLetterCase) {
     EXPECT_EQ(text.value("rds", "GR_FOLGE"), "0A,2A");
 }
 
-TEST(ProfileTextTest, AByteOrderMarkHidesTheHeaderOnItsLine) {
-    const std::string marked = "\xEF\xBB\xBF[RDS]\r\nPS=RADIO\r\n";
-    EXPECT_EQ(ProfileText(marked).value("RDS", "PS"), "");
-    EXPECT_EQ(written(marked, "RDS", "PS", "X"), marked + "[RDS]\r\nPS=X\r\n");
+TEST(ProfileTextTest, TheMarkOfAUtf8FileIsPassedOverAndKept) {
+    const std::string mark = "\xEF\xBB\xBF";
+    const std::string marked = mark + "[RDS]\r\nPS=RADIO\r\n";
+    EXPECT_EQ(ProfileText(marked).value("RDS", "PS"), "RADIO");
+    EXPECT_EQ(written(marked, "RDS", "PS", "X"), mark + "[RDS]\r\nPS=X\r\n");
+    EXPECT_EQ(written(marked, "FM", "ARI", "1"), marked + "[FM]\r\nARI=1\r\n");
+    EXPECT_EQ(written(mark, "RDS", "PS", "X"), mark + "[RDS]\r\nPS=X\r\n");
+    EXPECT_EQ(ProfileText("[RDS]\r\n" + mark + "PS=RADIO\r\n").value("RDS", "PS"), "") << "only where a file begins";
+}
+
+TEST(ProfileTextTest, Utf16IsRecognisedByItsMark) {
+    EXPECT_TRUE(isUtf16("\xFF\xFE[\0"s));
+    EXPECT_TRUE(isUtf16("\xFE\xFF\0["s));
+    EXPECT_TRUE(isUtf16("\xFF\xFE"));
+    EXPECT_FALSE(isUtf16("\xFF"));
+    EXPECT_FALSE(isUtf16(""));
+    EXPECT_FALSE(isUtf16("[RDS]\r\n\xFF\xFE"));
+}
+
+TEST(ProfileTextTest, HoldsWhatAWriteWouldNotChange) {
+    const ProfileText text("[RDS]\r\nPS=RADIO\r\n PI = D3C0\r\nRTA=\"x\"\r\nPTY=1");
+    EXPECT_TRUE(text.holds("rds", " ps ", "RADIO"));
+    EXPECT_FALSE(text.holds("RDS", "PS", "Radio"));
+    EXPECT_FALSE(text.holds("RDS", "PI", "D3C0")) << "blanks around it";
+    EXPECT_FALSE(text.holds("RDS", "RTA", "x")) << "quotes around it";
+    EXPECT_FALSE(text.holds("RDS", "PTY", "1")) << "its line has no end";
+    EXPECT_FALSE(text.holds("RDS", "MS", "")) << "not there";
 }
 
 TEST(ProfileTextTest, VerticalTabsAreDroppedAtTheEdges) {
