@@ -19,6 +19,12 @@ bool isThere(const fs::path& path) {
     return fs::exists(fs::symlink_status(path, error));  // a link counts even when it leads nowhere
 }
 
+/// Something is there, or nobody may look whether it is.
+bool isTaken(const fs::path& path) {
+    std::error_code error;
+    return fs::status(path, error).type() != fs::file_type::not_found;
+}
+
 /// The folder's entry of that name in any letter case, the exactly spelled one first, else the first by the alphabet;
 /// without one the path at which it would be created.
 fs::path entryNamed(const fs::path& folder, const fs::path& name) {
@@ -52,33 +58,91 @@ std::string DataFolder::ReadIni(std::string_view section, std::string_view key, 
 }
 
 std::shared_ptr<const ProfileText> DataFolder::profile(std::string_view fileName) const {
-    return m_profiles.load(file(fileName));
+    const Notice before = notice();
+    const fs::path path = file(fileName);
+    const auto text = load(fileName, path);
+    tellChange(before);
+    const auto unsaved = std::find_if(m_unsaved.begin(), m_unsaved.end(),
+                                      [&](const UnsavedFile& part) { return equalNoCase(part.name, fileName); });
+    if (unsaved == m_unsaved.end()) return text;
+    std::error_code error;
+    const fs::file_status status = fs::status(path, error);
+    if (fs::exists(status) && !fs::is_regular_file(status)) return nullptr;  // a folder reads as nothing
+    auto merged = std::make_shared<ProfileText>(text ? *text : ProfileText());
+    for (const Setting& setting : unsaved->settings) merged->setValue(setting.section, setting.key, setting.value);
+    return merged;
 }
 
 void DataFolder::WriteIni(std::string_view section, std::string_view key, std::string_view value,
                           std::string_view fileName) {
-    const fs::path path = file(fileName);
-    const auto before = m_profiles.load(path);
-    if (before && before->holds(section, key, value)) return;  // spare the disk
-    std::error_code error;
-    if (!before && fs::status(path, error).type() != fs::file_type::not_found) {
-        noteSaved(fileName, false);  // there but not readable: writing would lose what is in it
-        return;
+    const Notice before = notice();
+    UnsavedFile& unsaved = unsavedPart(fileName);
+    const auto same = std::find_if(unsaved.settings.begin(), unsaved.settings.end(), [&](const Setting& setting) {
+        return equalNoCase(setting.section, section) && equalNoCase(setting.key, key);
+    });
+    if (same == unsaved.settings.end()) {
+        unsaved.settings.push_back({std::string(section), std::string(key), std::string(value)});
+    } else {
+        same->value = value;
     }
+    if (save(unsaved)) m_unsaved.pop_back();
+    tellChange(before);
+}
+
+void DataFolder::retryUnsaved() {
+    const Notice before = notice();
+    for (const std::string& name : std::vector(m_unreadable)) (void)load(name, file(name));
+    std::erase_if(m_unsaved, [this](const UnsavedFile& unsaved) { return save(unsaved); });
+    tellChange(before);
+}
+
+/// The file's part of what is not saved, moved to the end; an empty one when all of it was.
+DataFolder::UnsavedFile& DataFolder::unsavedPart(std::string_view fileName) {
+    const auto found = std::find_if(m_unsaved.begin(), m_unsaved.end(),
+                                    [&](const UnsavedFile& part) { return equalNoCase(part.name, fileName); });
+    if (found == m_unsaved.end()) return m_unsaved.emplace_back(UnsavedFile{std::string(fileName), {}});
+    std::rotate(found, found + 1, m_unsaved.end());
+    m_unsaved.back().name = fileName;
+    return m_unsaved.back();
+}
+
+bool DataFolder::save(const UnsavedFile& unsaved) {
+    const fs::path path = file(unsaved.name);
+    const auto before = load(unsaved.name, path);
+    if (!before && isTaken(path)) return false;  // there but not readable: writing would lose what is in it
+    const auto isHeld = [&](const Setting& setting) {
+        return before && before->holds(setting.section, setting.key, setting.value);
+    };
+    if (std::all_of(unsaved.settings.begin(), unsaved.settings.end(), isHeld)) return true;  // spare the disk
     ProfileText text = before ? *before : ProfileText();
-    text.setValue(section, key, value);
-    noteSaved(fileName, replaceFile(path, text.bytes()));
+    for (const Setting& setting : unsaved.settings) text.setValue(setting.section, setting.key, setting.value);
+    return replaceFile(path, text.bytes());
 }
 
 std::optional<std::string> DataFolder::unsavedFile() const {
-    return m_unsavedFiles.empty() ? std::nullopt : std::optional(m_unsavedFiles.back());
+    return m_unsaved.empty() ? std::nullopt : std::optional(m_unsaved.back().name);
 }
 
-void DataFolder::noteSaved(std::string_view fileName, bool saved) {
-    const std::optional<std::string> before = unsavedFile();
-    std::erase_if(m_unsavedFiles, [&](const std::string& name) { return equalNoCase(name, fileName); });
-    if (!saved) m_unsavedFiles.emplace_back(fileName);
-    if (unsavedFile() != before && m_unsavedFileChanged) m_unsavedFileChanged();
+std::optional<std::string> DataFolder::unreadableFile() const {
+    return m_unreadable.empty() ? std::nullopt : std::optional(m_unreadable.back());
+}
+
+/// The file's content on disk; notes whether there is one that cannot be read.
+std::shared_ptr<const ProfileText> DataFolder::load(std::string_view fileName, const fs::path& path) const {
+    auto text = m_profiles.load(path);
+    const bool unreadable = !text && isTaken(path);
+    const auto noted = std::find_if(m_unreadable.begin(), m_unreadable.end(),
+                                    [&](const std::string& name) { return equalNoCase(name, fileName); });
+    if (unreadable && noted == m_unreadable.end()) {
+        m_unreadable.emplace_back(fileName);
+    } else if (!unreadable && noted != m_unreadable.end()) {
+        m_unreadable.erase(noted);
+    }
+    return text;
+}
+
+void DataFolder::tellChange(const Notice& before) const {
+    if (notice() != before && m_noticeChanged) m_noticeChanged();
 }
 
 }  // namespace kdx

@@ -6,6 +6,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 #include "settings/profilecache.h"
@@ -41,26 +42,52 @@ public:
     /// cut at 254 characters. Never creates a file, never throws.
     [[nodiscard]] std::string ReadIni(std::string_view section, std::string_view key, std::string_view fileName) const;
 
-    /// All settings of a file as they are now; nothing when it is missing or cannot be read.
+    /// All settings of a file as they are now, values that could not be written yet included; nothing when it is
+    /// missing or cannot be read.
     [[nodiscard]] std::shared_ptr<const ProfileText> profile(std::string_view fileName) const;
 
     /// Writes one key at once; creates the file and the section if needed. A failure changes nothing on disk, throws
-    /// nothing and opens no box: it is kept in unsavedFile() until a write to the same file succeeds.
+    /// nothing and opens no box: the value is kept, is what a read gives meanwhile, and goes with the next write to the
+    /// same file or with retryUnsaved().
     void WriteIni(std::string_view section, std::string_view key, std::string_view value, std::string_view fileName);
 
-    /// Name of the file that could not be written last and has not been written since; nothing when all is saved.
+    /// Tries to write what could not be written so far, and looks again at what could not be read.
+    void retryUnsaved();
+
+    /// Name of the file that could not be written last and still lacks a value; nothing when all is saved.
     [[nodiscard]] std::optional<std::string> unsavedFile() const;
 
-    /// Called whenever unsavedFile() changes.
-    void onUnsavedFileChanged(std::function<void()> callback) { m_unsavedFileChanged = std::move(callback); }
+    /// Name of the file last found to be there but without settings that can be read: UTF-16 text, a folder, a file
+    /// without rights. Such a file is never written.
+    [[nodiscard]] std::optional<std::string> unreadableFile() const;
+
+    /// Called whenever unsavedFile() or unreadableFile() changes.
+    void onUnsavedFileChanged(std::function<void()> callback) { m_noticeChanged = std::move(callback); }
 
 private:
-    void noteSaved(std::string_view fileName, bool saved);
+    struct Setting {
+        std::string section;
+        std::string key;
+        std::string value;
+    };
+    struct UnsavedFile {
+        std::string name;
+        std::vector<Setting> settings;
+    };
+    using Notice = std::pair<std::optional<std::string>, std::optional<std::string>>;
+
+    UnsavedFile& unsavedPart(std::string_view fileName);
+    [[nodiscard]] bool save(const UnsavedFile& unsaved);
+    [[nodiscard]] std::shared_ptr<const ProfileText> load(std::string_view fileName,
+                                                          const std::filesystem::path& path) const;
+    [[nodiscard]] Notice notice() const { return {unsavedFile(), unreadableFile()}; }
+    void tellChange(const Notice& before) const;
 
     std::filesystem::path m_path;
     mutable ProfileCache m_profiles;
-    std::vector<std::string> m_unsavedFiles;  // the one that failed last at the end
-    std::function<void()> m_unsavedFileChanged;
+    std::vector<UnsavedFile> m_unsaved;             // the one that failed last at the end
+    mutable std::vector<std::string> m_unreadable;  // likewise
+    std::function<void()> m_noticeChanged;
 };
 
 }  // namespace kdx

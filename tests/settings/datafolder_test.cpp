@@ -127,7 +127,7 @@ TEST_F(DataFolderTest, AReadOnlyFolderKeepsItsFilesAndIsReported) {
         const test::Unprivileged user;
         m_data.WriteIni("BUS", "INTERFACE", "TCPIP", kGeneralSettings);
         EXPECT_EQ(m_data.unsavedFile(), "RDS_Allg.INI");
-        EXPECT_EQ(m_data.ReadIni("BUS", "INTERFACE", kGeneralSettings), "IEC");
+        EXPECT_EQ(DataFolder(m_folder.path()).ReadIni("BUS", "INTERFACE", kGeneralSettings), "IEC");
     }
     EXPECT_EQ(m_folder.read("RDS_Allg.INI"), "[BUS]\r\nINTERFACE=IEC\r\n");
 }
