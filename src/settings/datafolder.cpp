@@ -5,6 +5,7 @@
 #include <utility>
 
 #include "base/codepage.h"
+#include "settings/folderlock.h"
 #include "settings/profilefile.h"
 #include "settings/shownpath.h"
 
@@ -107,6 +108,12 @@ DataFolder::UnsavedFile& DataFolder::unsavedPart(std::string_view fileName) {
 }
 
 bool DataFolder::save(const UnsavedFile& unsaved) {
+    bool saved = false;
+    // Reading, changing and writing are one step: another program on the same folder would lose what comes between.
+    return underFolderLock(m_path, [&] { saved = changeFile(unsaved); }) && saved;
+}
+
+bool DataFolder::changeFile(const UnsavedFile& unsaved) {
     const fs::path path = file(unsaved.name);
     const auto before = load(unsaved.name, path);
     if (!before && isTaken(path)) return false;  // there but not readable: writing would lose what is in it

@@ -25,7 +25,7 @@ inline constexpr const char* kPictureOff = "Sch_Off.ico";
 [[nodiscard]] std::string dataSetFile(std::string_view number);
 
 /// The data folder ("Daten" in the program's folder): finds its files without regard to letter case on every system,
-/// and reads and writes settings in its profile files. Texts are 8-bit Windows-1252.
+/// and reads and writes settings in its profile files, also while other programs do. Texts are 8-bit Windows-1252.
 class DataFolder {
 public:
     /// @param appFolder the program's folder; the data are in its sub-folder "Daten" (any letter case).
@@ -78,6 +78,7 @@ private:
 
     UnsavedFile& unsavedPart(std::string_view fileName);
     [[nodiscard]] bool save(const UnsavedFile& unsaved);
+    [[nodiscard]] bool changeFile(const UnsavedFile& unsaved);
     [[nodiscard]] std::shared_ptr<const ProfileText> load(std::string_view fileName,
                                                           const std::filesystem::path& path) const;
     [[nodiscard]] Notice notice() const { return {unsavedFile(), unreadableFile()}; }

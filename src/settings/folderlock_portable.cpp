@@ -1,0 +1,46 @@
+#include <chrono>
+#include <system_error>
+#include <thread>
+
+#include "settings/folderlock.h"
+
+namespace kdx {
+
+namespace {
+
+namespace fs = std::filesystem;
+using namespace std::chrono_literals;
+
+/// Only one program can make a folder of a name. One that is older than any work takes was left by a crash.
+bool isLeftOver(const fs::path& mark) {
+    std::error_code error;
+    const fs::file_time_type made = fs::last_write_time(mark, error);
+    return !error && fs::file_time_type::clock::now() - made > 10s;
+}
+
+}  // namespace
+
+bool underFolderLock(const fs::path& folder, const std::function<void()>& work) {
+    const fs::path mark = folder / ".kdx-rds-lock";
+    const auto latest = std::chrono::steady_clock::now() + 1s;
+    std::error_code error;
+    bool made = false;
+    while (!(made = fs::create_directory(mark, error)) && !error) {
+        if (std::chrono::steady_clock::now() >= latest) return false;
+        if (isLeftOver(mark)) fs::remove(mark, error);
+        std::this_thread::sleep_for(1ms);
+    }
+    work();
+    if (made) fs::remove(mark, error);
+    return true;
+}
+
+// The standard library knows no other programs: nobody is ever told of one.
+struct FolderClaim::Held {};
+FolderClaim::FolderClaim(const fs::path&) {}
+FolderClaim::~FolderClaim() = default;
+bool FolderClaim::isShared() const {
+    return false;
+}
+
+}  // namespace kdx
