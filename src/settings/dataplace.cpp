@@ -3,6 +3,7 @@
 #include <fstream>
 
 #include "settings/datafolder.h"
+#include "settings/leftovers.h"
 #include "settings/profilefile.h"
 #include "settings/shownpath.h"
 
@@ -15,7 +16,7 @@ namespace {
 bool isWritableFolder(const fs::path& folder) {
     std::error_code error;
     if (!fs::is_directory(folder, error)) return false;
-    const fs::path probe = folder / ".kdx-rds-writable";
+    const fs::path probe = writableProbe(folder);
     const bool written = std::ofstream(probe, std::ios::app).good();
     fs::remove(probe, error);
     return written;

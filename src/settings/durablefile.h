@@ -36,6 +36,12 @@ struct FileIdentity {
 [[nodiscard]] bool writeNewFile(const std::filesystem::path& file, std::string_view bytes,
                                 const std::filesystem::path& model);
 
+/// The system's number of this process, which no other living one has; 0 where it is not known.
+[[nodiscard]] std::uint64_t processNumber();
+
+/// Whether another living process may still be writing the file, which the one of that number has begun.
+[[nodiscard]] bool mayStillBeWritten(const std::filesystem::path& file, std::uint64_t process);
+
 /// Makes a rename in the folder last through a power cut, where the system can promise that.
 void flushFolder(const std::filesystem::path& folder);
 

@@ -4,7 +4,9 @@
 
 #include <algorithm>
 #include <cerrno>
+#include <csignal>
 #include <ctime>
+#include <limits>
 
 #include "base/filedescriptor.h"
 #include "settings/durablefile.h"
@@ -70,6 +72,16 @@ bool writeNewFile(const std::filesystem::path& file, std::string_view bytes, con
     if (!writeAll(descriptor.number(), bytes)) return false;
     if (hasModel && !takeOver(descriptor.number(), modelStatus)) return false;
     return ::fsync(descriptor.number()) == 0 && descriptor.close();
+}
+
+std::uint64_t processNumber() {
+    return static_cast<std::uint64_t>(::getpid());
+}
+
+bool mayStillBeWritten(const std::filesystem::path&, std::uint64_t process) {
+    // The own number was another program's before; below 1, it would mean a group of processes.
+    if (process == processNumber() || process < 1 || process > std::numeric_limits<pid_t>::max()) return false;
+    return ::kill(static_cast<pid_t>(process), 0) == 0 || errno != ESRCH;
 }
 
 void flushFolder(const std::filesystem::path& folder) {

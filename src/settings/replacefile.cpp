@@ -1,8 +1,7 @@
-#include <chrono>
-#include <string>
 #include <system_error>
 
 #include "settings/durablefile.h"
+#include "settings/leftovers.h"
 #include "settings/profilefile.h"
 
 namespace kdx {
@@ -23,13 +22,6 @@ std::optional<fs::path> linkTarget(fs::path file) {
         file = file.parent_path() / target;  // an absolute target replaces the folder
     }
     return std::nullopt;
-}
-
-/// A name in the file's own folder that two programs writing at the same time do not share.
-fs::path nameBeside(const fs::path& file) {
-    fs::path beside = file;
-    beside += "." + std::to_string(std::chrono::steady_clock::now().time_since_epoch().count()) + ".new";
-    return beside;
 }
 
 /// A file that is not there yet, or a plain file that is not marked read-only. The mark counts for every user, for
