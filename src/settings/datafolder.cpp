@@ -61,7 +61,7 @@ std::string DataFolder::ReadIni(std::string_view section, std::string_view key, 
 std::shared_ptr<const ProfileText> DataFolder::profile(std::string_view fileName) const {
     const Notice before = notice();
     const fs::path path = file(fileName);
-    const auto text = load(fileName, path);
+    std::shared_ptr<const ProfileText> text = load(fileName, path);
     tellChange(before);
     const auto unsaved = std::find_if(m_unsaved.begin(), m_unsaved.end(),
                                       [&](const UnsavedFile& part) { return equalNoCase(part.name, fileName); });

@@ -117,7 +117,7 @@ std::optional<std::string> readFile(const std::filesystem::path& file) {
     std::ifstream stream(file, std::ios::binary);
     if (!stream) return std::nullopt;
     std::string bytes;
-    std::array<char, 64 * 1024> part{};
+    std::array<char, std::size_t{64} * 1024> part{};
     const std::uintmax_t size = std::filesystem::file_size(file, error);
     if (!error) bytes.reserve(size + 1);
     while (stream) {

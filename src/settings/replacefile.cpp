@@ -30,8 +30,8 @@ bool mayBeReplaced(const fs::path& file) {
     std::error_code error;
     const fs::file_status status = fs::status(file, error);
     if (status.type() == fs::file_type::not_found) return true;
-    constexpr auto anyWrite = fs::perms::owner_write | fs::perms::group_write | fs::perms::others_write;
-    return fs::is_regular_file(status) && (status.permissions() & anyWrite) != fs::perms::none && userMayWrite(file);
+    constexpr auto kAnyWrite = fs::perms::owner_write | fs::perms::group_write | fs::perms::others_write;
+    return fs::is_regular_file(status) && (status.permissions() & kAnyWrite) != fs::perms::none && userMayWrite(file);
 }
 
 }  // namespace

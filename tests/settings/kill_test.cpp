@@ -63,7 +63,7 @@ std::string valueOf(std::uint32_t number) {
 class KillTest : public ::testing::Test {
 protected:
     KillTest() {
-        for (std::size_t file = 0; file < kFiles.size(); ++file) m_folder.write(kFiles.at(file), content({0, 0, 0, 0}));
+        for (const char* file : kFiles) m_folder.write(file, content({0, 0, 0, 0}));
     }
     static std::string content(const std::array<std::uint32_t, kKeys>& numbers) {
         std::string bytes = "; settings\r\n[RDS]\r\n";
