@@ -1,6 +1,7 @@
 #include "link/libraryvisa.h"
 
 #include "link/sharedlibrary.h"
+#include "link/visastatus.h"
 
 #include <algorithm>
 #include <array>
@@ -11,21 +12,40 @@ namespace kdx {
 
 namespace {
 
+/// The standard's unsigned and signed 32-bit arguments as they are handed over: as wide as a register, so that a
+/// library whose types have 64 bits finds no rubbish in the upper half.
+using Argument = std::uintptr_t;
+using SignedArgument = std::intptr_t;
+
 /// The operations as the VISA standard declares them for C.
 struct Operations {
     std::int32_t(KDX_LIBRARY_CALL* viOpenDefaultRM)(std::uint32_t* resourceManager);
-    std::int32_t(KDX_LIBRARY_CALL* viOpen)(std::uint32_t resourceManager, char* resource, std::uint32_t accessMode,
-                                           std::uint32_t openTimeout, std::uint32_t* session);
-    std::int32_t(KDX_LIBRARY_CALL* viClose)(std::uint32_t object);
-    std::int32_t(KDX_LIBRARY_CALL* viStatusDesc)(std::uint32_t object, std::int32_t status, char* description);
-    std::int32_t(KDX_LIBRARY_CALL* viWrite)(std::uint32_t session, const unsigned char* bytes, std::uint32_t count,
-                                            std::uint32_t* written);
-    std::int32_t(KDX_LIBRARY_CALL* viRead)(std::uint32_t session, unsigned char* buffer, std::uint32_t size,
-                                           std::uint32_t* count);
+    std::int32_t(KDX_LIBRARY_CALL* viOpen)(Argument resourceManager, char* resource, Argument accessMode,
+                                        Argument openTimeout, std::uint32_t* session);
+    std::int32_t(KDX_LIBRARY_CALL* viClose)(Argument object);
+    std::int32_t(KDX_LIBRARY_CALL* viStatusDesc)(Argument object, SignedArgument status, char* description);
+    std::int32_t(KDX_LIBRARY_CALL* viWrite)(Argument session, const unsigned char* bytes, Argument count,
+                                         std::uint32_t* written);
+    std::int32_t(KDX_LIBRARY_CALL* viRead)(Argument session, unsigned char* buffer, Argument size, std::uint32_t* count);
 };
 
-std::int32_t atMost(std::uint32_t count, std::size_t limit) {
-    return static_cast<std::int32_t>(std::min<std::size_t>(count, limit));
+/// Room for a number that the library gives back. A library whose types have 64 bits writes eight bytes, of which the
+/// lower half is the number.
+class Result {
+public:
+    explicit Result(std::uint32_t before = 0) : m_halves{before, 0} {}
+    std::uint32_t* room() { return m_halves.data(); }
+    [[nodiscard]] std::uint32_t value() const { return m_halves.front(); }
+    [[nodiscard]] std::int32_t atMost(std::size_t limit) const {
+        return static_cast<std::int32_t>(std::min<std::size_t>(value(), limit));
+    }
+
+private:
+    alignas(std::uint64_t) std::array<std::uint32_t, 2> m_halves;
+};
+
+Argument argument(VisaHandle handle) {
+    return static_cast<std::uint32_t>(handle);
 }
 
 /// The installed VISA library.
@@ -35,15 +55,16 @@ public:
         : m_library(std::move(library)), m_call(operations) {}
 
     VisaStatus viOpenDefaultRM(VisaHandle& resourceManager) override {
-        auto handle = static_cast<std::uint32_t>(resourceManager);
-        const VisaStatus status = m_call.viOpenDefaultRM(&handle);
-        resourceManager = static_cast<VisaHandle>(handle);
+        Result handle(static_cast<std::uint32_t>(resourceManager));
+        const VisaStatus status = m_call.viOpenDefaultRM(handle.room());
+        resourceManager = static_cast<VisaHandle>(handle.value());
         return status;
     }
 
     VisaStatus viStatusDesc(VisaHandle object, VisaStatus status, std::string& description) override {
+        if (m_call.viStatusDesc == nullptr) return describeStatus(status, description);
         std::array<char, 1024> text{};  // the standard asks for 256
-        const VisaStatus result = m_call.viStatusDesc(static_cast<std::uint32_t>(object), status, text.data());
+        const VisaStatus result = m_call.viStatusDesc(argument(object), status, text.data());
         text.back() = '\0';
         description = text.data();
         return result;
@@ -52,32 +73,31 @@ public:
     VisaStatus viOpen(VisaHandle resourceManager, const std::string& resource, std::uint32_t accessMode,
                       std::uint32_t openTimeoutMs, VisaHandle& session) override {
         std::string name = resource;  // the library may not promise to leave it alone
-        auto handle = static_cast<std::uint32_t>(session);
+        Result handle(static_cast<std::uint32_t>(session));
         const VisaStatus status =
-            m_call.viOpen(static_cast<std::uint32_t>(resourceManager), name.data(), accessMode, openTimeoutMs, &handle);
-        session = static_cast<VisaHandle>(handle);
+            m_call.viOpen(argument(resourceManager), name.data(), accessMode, openTimeoutMs, handle.room());
+        session = static_cast<VisaHandle>(handle.value());
         return status;
     }
 
     VisaStatus viWrite(VisaHandle session, std::span<const char> bytes, std::int32_t& written) override {
-        std::uint32_t count = 0;
+        Result count;
         const VisaStatus status =
-            m_call.viWrite(static_cast<std::uint32_t>(session), reinterpret_cast<const unsigned char*>(bytes.data()),
-                           static_cast<std::uint32_t>(bytes.size()), &count);
-        written = atMost(count, bytes.size());
+            m_call.viWrite(argument(session), reinterpret_cast<const unsigned char*>(bytes.data()),
+                           static_cast<std::uint32_t>(bytes.size()), count.room());
+        written = count.atMost(bytes.size());
         return status;
     }
 
     VisaStatus viRead(VisaHandle session, std::span<char> buffer, std::int32_t& count) override {
-        std::uint32_t got = 0;
-        const VisaStatus status =
-            m_call.viRead(static_cast<std::uint32_t>(session), reinterpret_cast<unsigned char*>(buffer.data()),
-                          static_cast<std::uint32_t>(buffer.size()), &got);
-        count = atMost(got, buffer.size());
+        Result got;
+        const VisaStatus status = m_call.viRead(argument(session), reinterpret_cast<unsigned char*>(buffer.data()),
+                                                static_cast<std::uint32_t>(buffer.size()), got.room());
+        count = got.atMost(buffer.size());
         return status;
     }
 
-    VisaStatus viClose(VisaHandle object) override { return m_call.viClose(static_cast<std::uint32_t>(object)); }
+    VisaStatus viClose(VisaHandle object) override { return m_call.viClose(argument(object)); }
 
 private:
     std::unique_ptr<SharedLibrary> m_library;
@@ -99,9 +119,9 @@ std::unique_ptr<Visa> load(const std::filesystem::path& path, std::string& file,
     find(*library, "viOpenDefaultRM", operations.viOpenDefaultRM, missing);
     find(*library, "viOpen", operations.viOpen, missing);
     find(*library, "viClose", operations.viClose, missing);
-    find(*library, "viStatusDesc", operations.viStatusDesc, missing);
     find(*library, "viWrite", operations.viWrite, missing);
     find(*library, "viRead", operations.viRead, missing);
+    operations.viStatusDesc = library->function<decltype(operations.viStatusDesc)>("viStatusDesc");  // may lack
     if (!missing.empty()) {
         reason = "not a VISA library, it lacks " + missing;
         return nullptr;
@@ -110,7 +130,8 @@ std::unique_ptr<Visa> load(const std::filesystem::path& path, std::string& file,
     return std::make_unique<LibraryVisa>(std::move(library), operations);
 }
 
-/// A file that is there is meant as such, though the system would look for a bare name elsewhere.
+/// A file that is there is meant as such when the user names it, though the system would look for a bare name
+/// elsewhere.
 std::filesystem::path asFile(const std::string& name) {
     std::error_code ignored;
     const std::filesystem::path path(name);
@@ -123,7 +144,7 @@ VisaLibrary loadFirstVisaLibrary(std::span<const std::string> names) {
     VisaLibrary result;
     for (const std::string& name : names) {
         std::string cause;
-        result.visa = load(asFile(name), result.file, cause);
+        result.visa = load(name, result.file, cause);
         if (result.visa) break;
         // The system's own message may begin with the name.
         if (!cause.starts_with(name)) cause.insert(0, name + ": ");
@@ -134,8 +155,9 @@ VisaLibrary loadFirstVisaLibrary(std::span<const std::string> names) {
 }
 
 VisaLibrary loadVisaLibrary(const std::string& path) {
-    const std::vector<std::string> names = path.empty() ? usualVisaLibraryNames() : std::vector<std::string>{path};
-    return loadFirstVisaLibrary(names);
+    // The usual names stay bare: what lies in the folder that the program happens to be started in is not installed.
+    if (path.empty()) return loadFirstVisaLibrary(usualVisaLibraryNames());
+    return loadFirstVisaLibrary(std::array{asFile(path).string()});
 }
 
 }  // namespace kdx

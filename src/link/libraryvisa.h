@@ -17,7 +17,8 @@ struct VisaLibrary {
     std::string reason;
 };
 
-/// Loads the first of these libraries that can be loaded and has all six operations.
+/// Loads the first of these libraries that can be loaded and has the operations; the description of statuses may be
+/// missing, then ours stand in. A bare name is looked for only where the system keeps its libraries.
 VisaLibrary loadFirstVisaLibrary(std::span<const std::string> names);
 
 /// Loads that library and no other; with an empty text, the first of the usual names that will do.

@@ -19,7 +19,12 @@ std::vector<std::string> usualVisaLibraryNames() {
 }
 
 std::unique_ptr<SharedLibrary> SharedLibrary::load(const std::filesystem::path& file, std::string& reason) {
-    if (HMODULE handle = LoadLibraryW(file.c_str())) return std::unique_ptr<SharedLibrary>(new SharedLibrary(handle));
+    // What a file needs besides may lie beside it; a bare name is not looked for in the current folder.
+    const DWORD places =
+        LOAD_LIBRARY_SEARCH_DEFAULT_DIRS | (file.is_absolute() ? DWORD{LOAD_LIBRARY_SEARCH_DLL_LOAD_DIR} : DWORD{0});
+    if (HMODULE handle = LoadLibraryExW(file.c_str(), nullptr, places)) {
+        return std::unique_ptr<SharedLibrary>(new SharedLibrary(handle));
+    }
     reason = std::system_category().message(static_cast<int>(GetLastError()));
     return nullptr;
 }

@@ -20,7 +20,7 @@ namespace kdx {
 /// A library loaded at run time; it stays loaded as long as this object lives.
 class SharedLibrary {
 public:
-    /// Loads a file, or a bare name from wherever the system keeps its libraries.
+    /// Loads a file, or a bare name from wherever the system keeps its libraries (never from the current folder).
     /// Gives nothing and the system's reason when that fails.
     static std::unique_ptr<SharedLibrary> load(const std::filesystem::path& file, std::string& reason);
     ~SharedLibrary();

@@ -9,8 +9,16 @@
 
 namespace {
 
-constexpr std::uint32_t kManager = 0x80000001;  // handles are unsigned in the standard
-constexpr std::uint32_t kSession = 0xFFFFFFF0;
+#ifdef KDX_WIDE
+using Unsigned = std::uint64_t;  // as on systems where the library takes "unsigned long" for the standard's 32 bits
+using Signed = std::int64_t;
+#else
+using Unsigned = std::uint32_t;
+using Signed = std::int32_t;
+#endif
+
+constexpr Unsigned kManager = 0x80000001;  // handles are unsigned in the standard
+constexpr Unsigned kSession = 0xFFFFFFF0;
 constexpr std::int32_t kInvalidObject = -1073807346;
 
 std::string held;
@@ -23,15 +31,15 @@ std::int32_t statusIn(const std::string& text) {
 
 extern "C" {
 
-std::int32_t viOpenDefaultRM(std::uint32_t* resourceManager) {
+std::int32_t viOpenDefaultRM(Unsigned* resourceManager) {
     *resourceManager = kManager;
     return 0;
 }
 
 #ifndef KDX_WITHOUT_READ
-std::int32_t viRead(std::uint32_t session, unsigned char* buffer, std::uint32_t size, std::uint32_t* count) {
+std::int32_t viRead(Unsigned session, unsigned char* buffer, Unsigned size, Unsigned* count) {
     if (session != kSession) return kInvalidObject;
-    const std::uint32_t taken = held.size() < size ? static_cast<std::uint32_t>(held.size()) : size;
+    const Unsigned taken = held.size() < size ? static_cast<Unsigned>(held.size()) : size;
     std::memcpy(buffer, held.data(), taken);
     held.erase(0, taken);
     *count = taken;
@@ -40,25 +48,27 @@ std::int32_t viRead(std::uint32_t session, unsigned char* buffer, std::uint32_t 
 #endif
 
 #ifndef KDX_WITHOUT_CLOSE
-std::int32_t viClose(std::uint32_t object) {
+std::int32_t viClose(Unsigned object) {
     return object == kSession || object == kManager ? 0 : kInvalidObject;
 }
 #endif
 
-std::int32_t viOpen(std::uint32_t resourceManager, char* resource, std::uint32_t accessMode, std::uint32_t openTimeout,
-                    std::uint32_t* session) {
+std::int32_t viOpen(Unsigned resourceManager, char* resource, Unsigned accessMode, Unsigned openTimeout,
+                    Unsigned* session) {
     if (resourceManager != kManager) return kInvalidObject;
     *session = kSession;
     held = std::string(resource) + " " + std::to_string(accessMode) + " " + std::to_string(openTimeout);
     return statusIn(resource);
 }
 
-std::int32_t viStatusDesc(std::uint32_t object, std::int32_t status, char* description) {
-    std::snprintf(description, 256, "status %d of %u", status, object);
+#ifndef KDX_WITHOUT_DESCRIPTIONS
+std::int32_t viStatusDesc(Unsigned object, Signed status, char* description) {
+    std::snprintf(description, 256, "status %d of %u", static_cast<int>(status), static_cast<unsigned>(object));
     return status == 7 ? 1073676421 : 0;
 }
+#endif
 
-std::int32_t viWrite(std::uint32_t session, const unsigned char* bytes, std::uint32_t count, std::uint32_t* written) {
+std::int32_t viWrite(Unsigned session, const unsigned char* bytes, Unsigned count, Unsigned* written) {
     if (session != kSession) return kInvalidObject;
     held.assign(reinterpret_cast<const char*>(bytes), count);
     const std::int32_t status = statusIn(held);

@@ -21,10 +21,13 @@ using ::testing::StartsWith;
 
 const std::string kComplete = KDX_FAKE_VISA;
 const std::string kIncomplete = KDX_FAKE_VISA_INCOMPLETE;
+const std::string kWide = KDX_FAKE_VISA_WIDE;
+const std::string kWordless = KDX_FAKE_VISA_WORDLESS;
 
 /// A session to the library's instrument.
 class LibraryVisaTest : public ::testing::Test {
 protected:
+    explicit LibraryVisaTest(const std::string& file = kComplete) : library(loadVisaLibrary(file)) {}
     void SetUp() override {
         ASSERT_NE(library.visa, nullptr) << library.reason;
         ASSERT_EQ(library.visa->viOpenDefaultRM(manager), 0);
@@ -36,7 +39,7 @@ protected:
         return buffer;
     }
 
-    VisaLibrary library = loadVisaLibrary(kComplete);
+    VisaLibrary library;
     VisaHandle manager = 0;
     VisaHandle session = 0;
     VisaStatus status = 0;
@@ -104,6 +107,68 @@ TEST_F(LibraryVisaTest, AWrongSessionIsTheLibrarysAffair) {
     read();
     EXPECT_EQ(status, -1073807346);
     EXPECT_EQ(count, 0);
+}
+
+class WideLibraryVisaTest : public LibraryVisaTest {
+protected:
+    WideLibraryVisaTest() : LibraryVisaTest(kWide) {}
+};
+
+// Beside the variables lie others, which eight bytes written over four would fall on.
+TEST_F(WideLibraryVisaTest, NumbersOfEightBytesFallOnNothingElse) {
+    struct {
+        VisaHandle handle = 0;
+        VisaHandle beside = 4711;
+    } opened;
+    EXPECT_EQ(library.visa->viOpenDefaultRM(opened.handle), 0);
+    EXPECT_EQ(opened.beside, 4711);
+    EXPECT_EQ(library.visa->viOpen(opened.handle, "GPIB0::28::INSTR", 0, 0, opened.handle), 0);
+    EXPECT_EQ(opened.beside, 4711);
+    EXPECT_EQ(opened.handle, session);
+    EXPECT_THAT(read(), StartsWith("GPIB0::28::INSTR 0 0"));
+    EXPECT_EQ(status, 0);
+    EXPECT_EQ(count, 20);
+    const std::string command = "*IDN?";
+    EXPECT_EQ(library.visa->viWrite(session, command, count), 0);
+    EXPECT_EQ(count, 5);
+    std::string text;
+    EXPECT_EQ(library.visa->viStatusDesc(manager, -1073807339, text), 0);
+    EXPECT_EQ(text, "status -1073807339 of 2147483649");
+    EXPECT_EQ(library.visa->viClose(session), 0);
+}
+
+TEST(VisaLibrary, WithoutDescriptionsOfStatusesOursStandIn) {
+    const VisaLibrary library = loadVisaLibrary(kWordless);
+    ASSERT_NE(library.visa, nullptr) << library.reason;
+    std::string text;
+    EXPECT_EQ(library.visa->viStatusDesc(0, -1073807339, text), 0);
+    EXPECT_THAT(text, HasSubstr("time-out"));
+    EXPECT_EQ(library.visa->viStatusDesc(0, 7, text), 1073676421);
+}
+
+/// The current folder holds a VISA library under the first of the usual names while this lives.
+class CurrentFolderWithLibrary {
+public:
+    CurrentFolderWithLibrary() {
+        std::filesystem::copy_file(kComplete, m_folder.data() / usualVisaLibraryNames().front());
+        std::filesystem::current_path(m_folder.data());
+    }
+    CurrentFolderWithLibrary(const CurrentFolderWithLibrary&) = delete;
+    CurrentFolderWithLibrary& operator=(const CurrentFolderWithLibrary&) = delete;
+    ~CurrentFolderWithLibrary() { std::filesystem::current_path(m_before); }
+    [[nodiscard]] bool holds(const std::string& file) const { return file.starts_with(m_folder.data().string() + "/"); }
+
+private:
+    std::filesystem::path m_before = std::filesystem::current_path();
+    test::TempFolder m_folder;
+};
+
+TEST(VisaLibrarySearch, TheUsualNamesAreNotLookedForInTheCurrentFolder) {
+    const CurrentFolderWithLibrary here;
+    const VisaLibrary usual = loadVisaLibrary("");
+    EXPECT_FALSE(here.holds(usual.file)) << usual.file;
+    const VisaLibrary named = loadVisaLibrary(usualVisaLibraryNames().front());
+    EXPECT_TRUE(here.holds(named.file)) << "what the user names is a file: " << named.file;
 }
 
 TEST(VisaLibrarySearch, AMissingFileIsNamed) {
