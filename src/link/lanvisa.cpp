@@ -168,7 +168,8 @@ VisaStatus LanVisa::viWrite(VisaHandle session, std::span<const char> bytes, std
         Device_WriteParms wanted{};
         wanted.lid = link->id;
         wanted.io_timeout = millisecondsUntil(deadline);
-        wanted.flags = part.size() == bytes.size() ? vxi11::kFlagEnd : 0;
+        wanted.lock_timeout = wanted.io_timeout;
+        wanted.flags = vxi11::kFlagWaitLock | (part.size() == bytes.size() ? vxi11::kFlagEnd : 0);
         wanted.data.data_len = static_cast<u_int>(part.size());
         wanted.data.data_val = const_cast<char*>(part.data());  // only read from
         Device_WriteResp done{};
@@ -196,6 +197,8 @@ VisaStatus LanVisa::viRead(VisaHandle session, std::span<char> buffer, std::int3
         wanted.lid = link->id;
         wanted.requestSize = room.size();
         wanted.io_timeout = millisecondsUntil(deadline);
+        wanted.lock_timeout = wanted.io_timeout;
+        wanted.flags = vxi11::kFlagWaitLock;
         Device_ErrorCode error = 0;
         long reason = 0;
         u_int got = 0;
@@ -213,6 +216,10 @@ VisaStatus LanVisa::viRead(VisaHandle session, std::span<char> buffer, std::int3
         buffer = buffer.subspan(got);
         if ((reason & vxi11::kReasonEnd) != 0) return visa::kSuccess;
         if ((reason & vxi11::kReasonTermChar) != 0) return visa::kTermCharacter;
+        // Some devices never give END. A line feed ends every answer; when the count stopped the device, one may as
+        // well stand in the middle.
+        const bool stoppedByCount = (reason & vxi11::kReasonRequestCount) != 0;
+        if (got > 0 && room[got - 1] == '\n' && !stoppedByCount) return visa::kSuccess;
         if (got == 0) return visa::kInputOutput;  // neither bytes nor an end: it would never be over
     }
     return visa::kMaxCountReached;

@@ -26,8 +26,9 @@ struct LanOptions {
 /// VISA sessions to instruments on the network (VXI-11), without an installed library.
 /// Resources: parseLanResource. Statuses that viOpen gives besides those: kResourceNotFound when the host is unknown,
 /// nobody takes the connection, or there is no such device; kTimeout when somebody took it and then kept silent.
-/// viWrite and viRead give kTimeout, kConnectionLost (also ever after), kResourceLocked, kAborted as the cause is;
-/// kInputOutput when the device reports another error, or answers nonsense (then the connection is given up).
+/// viWrite and viRead wait for a lock of somebody else within the I/O time-out; then they give kResourceLocked. They
+/// give kTimeout, kConnectionLost (also ever after), kAborted as the cause is; kInputOutput when the device reports
+/// another error, or answers nonsense (then the connection is given up).
 class LanVisa final : public Visa {
 public:
     explicit LanVisa(LanOptions options = {});
@@ -40,8 +41,8 @@ public:
     VisaStatus viOpen(VisaHandle resourceManager, const std::string& resource, std::uint32_t accessMode,
                       std::uint32_t openTimeoutMs, VisaHandle& session) override;
     VisaStatus viWrite(VisaHandle session, std::span<const char> bytes, std::int32_t& written) override;
-    /// kSuccess when the answer's end came with the bytes, kTermCharacter when the device stopped at its termination
-    /// character, kMaxCountReached when the buffer is full before.
+    /// kSuccess when the answer's end came with the bytes (END, or a line feed at the end of them), kTermCharacter when
+    /// the device stopped at its termination character, kMaxCountReached when the buffer is full before.
     VisaStatus viRead(VisaHandle session, std::span<char> buffer, std::int32_t& count) override;
     /// Closing a resource manager closes its sessions. Succeeds also when the device is no longer there.
     VisaStatus viClose(VisaHandle object) override;

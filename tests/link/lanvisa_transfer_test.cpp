@@ -5,15 +5,20 @@ namespace {
 
 using ::testing::ElementsAre;
 
+// A call says that it waits for a lock of somebody else, and how long.
+constexpr long kWaitLock = 1;
+constexpr long kEnd = 8;
+
 TEST_F(LanVisaTest, AWriteIsOneCallWithTheEndMark) {
     ASSERT_EQ(open(), visa::kSuccess);
     EXPECT_EQ(write(":STEREO:DIRECT \"PS=ABCDEFGH\""), visa::kSuccess);
     EXPECT_EQ(count, 28);
     ASSERT_EQ(device.writes().size(), 1U);
     EXPECT_EQ(device.writes()[0].data, ":STEREO:DIRECT \"PS=ABCDEFGH\"");
-    EXPECT_EQ(device.writes()[0].flags, 8);
+    EXPECT_EQ(device.writes()[0].flags, kWaitLock | kEnd);
     EXPECT_LE(device.writes()[0].ioTimeout, 2000U);
     EXPECT_GE(device.writes()[0].ioTimeout, 1000U);
+    EXPECT_EQ(device.writes()[0].lockTimeout, device.writes()[0].ioTimeout);
 }
 
 TEST_F(LanVisaTest, AllByteValuesAreWrittenAsTheyStand) {
@@ -34,9 +39,9 @@ TEST_F(LanVisaTest, ALongWriteIsSplitAndOnlyTheLastPartBearsTheEndMark) {
     ASSERT_EQ(writes.size(), 3U);
     EXPECT_EQ(writes[0].data + writes[1].data + writes[2].data, text);
     EXPECT_EQ(writes[0].data.size(), 1024U);
-    EXPECT_EQ(writes[0].flags, 0);
-    EXPECT_EQ(writes[1].flags, 0);
-    EXPECT_EQ(writes[2].flags, 8);
+    EXPECT_EQ(writes[0].flags, kWaitLock);
+    EXPECT_EQ(writes[1].flags, kWaitLock);
+    EXPECT_EQ(writes[2].flags, kWaitLock | kEnd);
 }
 
 TEST_F(LanVisaTest, AWriteOfExactlyTheLargestSizeIsOneCall) {
@@ -44,7 +49,7 @@ TEST_F(LanVisaTest, AWriteOfExactlyTheLargestSizeIsOneCall) {
     ASSERT_EQ(open(), visa::kSuccess);
     EXPECT_EQ(write(bytesOf(1024)), visa::kSuccess);
     ASSERT_EQ(device.writes().size(), 1U);
-    EXPECT_EQ(device.writes()[0].flags, 8);
+    EXPECT_EQ(device.writes()[0].flags, kWaitLock | kEnd);
 }
 
 TEST_F(LanVisaTest, ADeviceThatStatesNoLargestSizeGetsWhatEveryDeviceMustTake) {
@@ -99,6 +104,9 @@ TEST_F(LanVisaTest, AQueryIsOneWriteCallAndOneReadCall) {
     EXPECT_THAT(device.calls(), ElementsAre(ScriptedVxi11::kGetPort, ScriptedVxi11::kCreateLink, ScriptedVxi11::kWrite,
                                             ScriptedVxi11::kRead));
     EXPECT_THAT(device.readSizes(), ElementsAre(60U));
+    EXPECT_EQ(device.reads()[0].flags, kWaitLock);
+    EXPECT_GE(device.reads()[0].lockTimeout, 1000U);
+    EXPECT_EQ(device.reads()[0].lockTimeout, device.reads()[0].ioTimeout);
 }
 
 class LanVisaAnswer : public LanVisaTest, public ::testing::WithParamInterface<std::size_t> {};
@@ -154,6 +162,23 @@ TEST_F(LanVisaTest, PartsThatADeviceGivesWithoutAReasonAreReadTogether) {
     EXPECT_EQ(read(), visa::kSuccess);
     EXPECT_EQ(got, "KDX,GEN,1\n");
     EXPECT_THAT(device.readSizes(), ElementsAre(60U, 56U, 53U));
+}
+
+TEST_F(LanVisaTest, ALineFeedAtTheEndOfTheBytesEndsAnAnswerWithoutTheEndMark) {
+    ASSERT_EQ(open(), visa::kSuccess);
+    device.on(ScriptedVxi11::kRead, {.reason = 0, .raw = "KDX,"});
+    device.on(ScriptedVxi11::kRead, {.reason = 0, .raw = "GEN\n"});
+    EXPECT_EQ(read(), visa::kSuccess);
+    EXPECT_EQ(got, "KDX,GEN\n");
+    EXPECT_EQ(device.readSizes().size(), 2U) << "and none that would wait in vain";
+}
+
+TEST_F(LanVisaTest, ALineFeedInTheMiddleEndsNothing) {
+    ASSERT_EQ(open(), visa::kSuccess);
+    device.answer("1\n2\n");
+    EXPECT_EQ(read(2), visa::kMaxCountReached);
+    EXPECT_EQ(read(), visa::kSuccess);
+    EXPECT_EQ(got, "2\n");
 }
 
 TEST_F(LanVisaTest, NeitherBytesNorAnEndIsATransferError) {

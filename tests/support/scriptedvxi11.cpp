@@ -142,8 +142,14 @@ std::vector<ScriptedVxi11::Write> ScriptedVxi11::writes() const {
 }
 
 std::vector<unsigned long> ScriptedVxi11::readSizes() const {
+    std::vector<unsigned long> sizes;
+    for (const Read& read : reads()) sizes.push_back(read.size);
+    return sizes;
+}
+
+std::vector<ScriptedVxi11::Read> ScriptedVxi11::reads() const {
     const std::lock_guard lock(m_mutex);
-    return m_readSizes;
+    return m_reads;
 }
 
 std::vector<ScriptedVxi11::Opened> ScriptedVxi11::opened() const {
@@ -281,7 +287,7 @@ std::string ScriptedVxi11::perform(std::uint32_t procedure, const Reaction& reac
         case kWrite: {
             auto wanted = decoded(xdr_Device_WriteParms, arguments);
             const std::string data(wanted.data.data_val, wanted.data.data_len);
-            m_writes.push_back({wanted.lid, data, wanted.flags, wanted.io_timeout});
+            m_writes.push_back({wanted.lid, data, wanted.flags, wanted.io_timeout, wanted.lock_timeout});
             std::string& command = m_commands[wanted.lid];
             command += data.substr(0, reaction.number.value_or(static_cast<std::uint32_t>(data.size())));
             if ((wanted.flags & 8) != 0) {
@@ -294,7 +300,7 @@ std::string ScriptedVxi11::perform(std::uint32_t procedure, const Reaction& reac
         }
         case kRead: {
             auto wanted = decoded(xdr_Device_ReadParms, arguments);
-            m_readSizes.push_back(wanted.requestSize);
+            m_reads.push_back({wanted.requestSize, wanted.flags, wanted.io_timeout, wanted.lock_timeout});
             std::deque<std::string>& answers = m_answers[wanted.lid];
             Device_ReadResp done{};
             done.error = reaction.error;

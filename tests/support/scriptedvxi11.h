@@ -44,6 +44,13 @@ public:
         std::string data;
         long flags;
         unsigned long ioTimeout;
+        unsigned long lockTimeout;
+    };
+    struct Read {
+        unsigned long size;
+        long flags;
+        unsigned long ioTimeout;
+        unsigned long lockTimeout;
     };
     struct Opened {
         std::string device;
@@ -67,6 +74,7 @@ public:
 
     [[nodiscard]] std::vector<Write> writes() const;
     [[nodiscard]] std::vector<unsigned long> readSizes() const;
+    [[nodiscard]] std::vector<Read> reads() const;
     [[nodiscard]] std::vector<Opened> opened() const;
     [[nodiscard]] std::vector<std::uint32_t> calls() const;
     [[nodiscard]] std::vector<long> destroyed() const;
@@ -93,7 +101,7 @@ private:
     std::map<long, std::string> m_commands;
     std::function<std::string(long, const std::string&)> m_responder;
     std::vector<Write> m_writes;
-    std::vector<unsigned long> m_readSizes;
+    std::vector<Read> m_reads;
     std::vector<Opened> m_opened;
     std::vector<std::uint32_t> m_calls;
     std::vector<long> m_destroyed;
