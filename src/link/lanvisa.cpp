@@ -1,12 +1,12 @@
 #include "link/lanvisa.h"
 
+#include "link/hostlookup.h"
 #include "link/lanresource.h"
 #include "link/rpcchannel.h"
 #include "link/visastatus.h"
 #include "vxi11.h"
 #include "vxi11/numbers.h"
 
-#include <netinet/in.h>
 #include <rpc/pmap_prot.h>
 
 #include <algorithm>
@@ -138,9 +138,9 @@ VisaStatus LanVisa::viOpen(VisaHandle resourceManager, const std::string& resour
     if (const auto* const failure = std::get_if<VisaStatus>(&parsed)) return *failure;
     const LanResource& wanted = std::get<LanResource>(parsed);
 
-    const std::vector<sockaddr_in> addresses = resolveHost(wanted.host);
     const auto connectTime = openTimeoutMs > 0 ? std::chrono::milliseconds(openTimeoutMs) : m_options.connectTimeout;
     const Deadline connectDeadline = steady_clock::now() + connectTime;
+    const std::vector<sockaddr_in> addresses = resolveHost(wanted.host, connectDeadline);
     auto link = std::make_unique<Link>();
     link->manager = resourceManager;
     VisaStatus status = visa::kResourceNotFound;

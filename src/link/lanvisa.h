@@ -13,7 +13,8 @@ namespace kdx {
 
 /// Times and ports of the LAN client.
 struct LanOptions {
-    /// Until somebody must have taken the connection, when viOpen gives no time of its own.
+    /// Until the host's name must be known and somebody have taken the connection, when viOpen gives no time of its
+    /// own.
     std::chrono::milliseconds connectTimeout{3000};
     /// For a whole write or read; the VISA standard's default.
     std::chrono::milliseconds ioTimeout{2000};
@@ -36,7 +37,7 @@ public:
 
     VisaStatus viOpenDefaultRM(VisaHandle& resourceManager) override;
     VisaStatus viStatusDesc(VisaHandle object, VisaStatus status, std::string& description) override;
-    /// Blocks while the host's name is looked up, and then no longer than the connect and I/O time-outs.
+    /// Blocks no longer than the connect and I/O time-outs.
     /// @param accessMode 0 for no lock, 1 for an exclusive one. @param openTimeoutMs replaces the connect time-out.
     VisaStatus viOpen(VisaHandle resourceManager, const std::string& resource, std::uint32_t accessMode,
                       std::uint32_t openTimeoutMs, VisaHandle& session) override;

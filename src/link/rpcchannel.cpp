@@ -3,7 +3,6 @@
 #include "vxi11/xdr.h"
 
 #include <arpa/inet.h>
-#include <netdb.h>
 #include <netinet/in.h>
 #include <netinet/tcp.h>
 #include <poll.h>
@@ -11,8 +10,6 @@
 
 #include <array>
 #include <cerrno>
-#include <cstring>
-#include <memory>
 #include <utility>
 
 namespace kdx {
@@ -143,22 +140,6 @@ RpcOutcome RpcChannel::decodeReply(const Coder& results) {
 RpcOutcome RpcChannel::close(RpcOutcome because) {
     m_socket.close();
     return because;
-}
-
-std::vector<sockaddr_in> resolveHost(const std::string& host) {
-    addrinfo hints{};
-    hints.ai_family = AF_INET;  // VXI-11 knows no other
-    hints.ai_socktype = SOCK_STREAM;
-    addrinfo* first = nullptr;
-    if (getaddrinfo(host.c_str(), nullptr, &hints, &first) != 0) return {};
-    const std::unique_ptr<addrinfo, decltype(&freeaddrinfo)> list(first, &freeaddrinfo);
-    std::vector<sockaddr_in> addresses;
-    for (const addrinfo* entry = first; entry != nullptr; entry = entry->ai_next) {
-        sockaddr_in address{};
-        std::memcpy(&address, entry->ai_addr, sizeof address);
-        addresses.push_back(address);
-    }
-    return addresses;
 }
 
 }  // namespace kdx

@@ -1,23 +1,19 @@
 #pragma once
 
 #include "base/filedescriptor.h"
+#include "link/deadline.h"
 #include "vxi11/rpcrecord.h"
 
 #include <rpc/types.h>
 #include <rpc/xdr.h>
 
-#include <chrono>
 #include <cstdint>
 #include <functional>
 #include <string>
-#include <vector>
 
 struct sockaddr_in;
 
 namespace kdx {
-
-/// A point in time at which waiting ends.
-using Deadline = std::chrono::steady_clock::time_point;
 
 /// How a remote call ended.
 enum class RpcOutcome {
@@ -66,8 +62,5 @@ private:
     RecordReader m_received{kLargestReply};
     std::string m_reply;  ///< one whole message, without record marks
 };
-
-/// The IPv4 addresses of a host, empty when it is unknown. Blocks while the system's name service looks it up.
-std::vector<sockaddr_in> resolveHost(const std::string& host);
 
 }  // namespace kdx

@@ -1,0 +1,16 @@
+#pragma once
+
+#include "link/deadline.h"
+
+#include <netinet/in.h>
+
+#include <string>
+#include <vector>
+
+namespace kdx {
+
+/// The IPv4 addresses of a host; empty when it is unknown, or when the system's name service has not said until the
+/// deadline.
+std::vector<sockaddr_in> resolveHost(const std::string& host, Deadline deadline);
+
+}  // namespace kdx
