@@ -23,7 +23,10 @@ constexpr std::array kErrors = {
     ErrorRow{ScpiError::TooMuchData, "Too much data"},
     ErrorRow{ScpiError::IllegalValue, "Illegal parameter value"},
     ErrorRow{ScpiError::QueueOverflow, "Queue overflow"},
+    ErrorRow{ScpiError::InputBufferOverrun, "Input buffer overrun"},
+    ErrorRow{ScpiError::QueryInterrupted, "Query INTERRUPTED"},
     ErrorRow{ScpiError::QueryUnterminated, "Query UNTERMINATED"},
+    ErrorRow{ScpiError::QueryDeadlocked, "Query DEADLOCKED"},
 };
 
 }  // namespace

@@ -21,7 +21,10 @@ enum class ScpiError : int {
     TooMuchData = -223,
     IllegalValue = -224,
     QueueOverflow = -350,
+    InputBufferOverrun = -363,
+    QueryInterrupted = -410,
     QueryUnterminated = -420,
+    QueryDeadlocked = -430,
 };
 
 /// The standard's words for an error.

@@ -3,6 +3,8 @@
 #include <string>
 #include <string_view>
 
+#include "sim/errorqueue.h"
+
 namespace kdx::sim {
 
 /// An instrument as whatever carries messages to it sees it. All calls come from one thread.
@@ -14,10 +16,11 @@ public:
     virtual std::string execute(std::string_view message) = 0;
     /// Device clear: whatever is in progress ends; settings and the error queue stay.
     virtual void clear() = 0;
-    /// The status byte of IEEE 488.2; bit 4 (message available) is added by the transport.
-    virtual unsigned char statusByte() = 0;
-    /// A client has read in vain: nothing came within its time-out.
-    virtual void unansweredRead() = 0;
+    /// The status byte of IEEE 488.2.
+    /// @param messageAvailable whether the client has an answer to fetch: bit 4.
+    virtual unsigned char statusByte(bool messageAvailable) = 0;
+    /// Takes an error of the message exchange, which only the transport notices: -363, -410, -420, -430.
+    virtual void report(ScpiError error) = 0;
 };
 
 }  // namespace kdx::sim

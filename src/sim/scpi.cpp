@@ -24,13 +24,21 @@ bool wordMatches(std::string_view pattern, std::string_view word) {
 
 }  // namespace
 
+bool Quotes::take(char c) {
+    if (m_open == '\0') {
+        if (c == '"' || c == '\'') m_open = c;
+    } else if (c == m_open) {
+        m_open = '\0';
+    }
+    return m_open != '\0';
+}
+
 std::vector<std::string_view> splitOutsideQuotes(std::string_view text, char separator) {
     std::vector<std::string_view> pieces;
     std::size_t start = 0;
-    bool inQuotes = false;
+    Quotes quotes;
     for (std::size_t i = 0; i < text.size(); ++i) {
-        if (text[i] == '"') inQuotes = !inQuotes;
-        if (text[i] != separator || inQuotes) continue;
+        if (quotes.take(text[i]) || text[i] != separator) continue;
         pieces.push_back(text.substr(start, i - start));
         start = i + 1;
     }

@@ -14,7 +14,17 @@ struct CommandUnit {
     std::string_view parameter;  ///< without the blanks around it
 };
 
-/// Cuts a text at the separator, except inside double quotes. An unclosed quote takes in the rest of the text.
+/// Follows a text character by character and knows which of them stand in a string, in double quotes or single ones.
+class Quotes {
+public:
+    /// True when the character stands inside quotes (the closing one counts as outside).
+    bool take(char c);
+
+private:
+    char m_open = '\0';
+};
+
+/// Cuts a text at the separator, except inside quotes. An unclosed quote takes in the rest of the text.
 [[nodiscard]] std::vector<std::string_view> splitOutsideQuotes(std::string_view text, char separator);
 
 /// Cuts a text at the first separator: what stands before it, and what stands after it (nothing without one).

@@ -44,7 +44,7 @@ VisaStatus SimVisa::viRead(VisaHandle session, std::span<char> buffer, std::int3
     if (found == m_sessions.end()) return visa::kInvalidObject;
     auto& answers = found->second.answers;
     if (answers.empty()) {
-        m_instrument.reportUnansweredRead();
+        m_instrument.report(ScpiError::QueryUnterminated);
         return visa::kTimeout;
     }
     std::string& answer = answers.front();

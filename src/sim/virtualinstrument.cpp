@@ -20,6 +20,7 @@ constexpr unsigned char kPowerOn = 128;
 
 // Status byte.
 constexpr unsigned char kErrorsQueued = 4;
+constexpr unsigned char kMessageAvailable = 16;
 constexpr unsigned char kEventSummary = 32;
 constexpr unsigned char kErrorEvents = kQueryError | kDeviceError | kExecutionError | kCommandError;
 
@@ -69,8 +70,9 @@ std::string VirtualInstrument::execute(std::string_view message) {
     return answers;
 }
 
-unsigned char VirtualInstrument::statusByte() const {
+unsigned char VirtualInstrument::statusByte(bool messageAvailable) const {
     return static_cast<unsigned char>((m_errors.empty() ? 0 : kErrorsQueued) |
+                                      (messageAvailable ? kMessageAvailable : 0) |
                                       ((m_events & kErrorEvents) == 0 ? 0 : kEventSummary));
 }
 

@@ -39,12 +39,13 @@ public:
     /// end here; unread answers and half-received messages are the transport's to drop.
     void deviceClear() {}
 
-    /// To be called when a client reads though nothing was asked: queues -420.
-    void reportUnansweredRead() { report(ScpiError::QueryUnterminated); }
+    /// Queues an error, also one that only the transport notices (a client reads though nothing was asked: -420).
+    void report(ScpiError error);
 
-    /// IEEE 488.2 status byte: 4 errors are queued, 32 an error event
-    /// has not been asked for. The transport knows of unread answers (16).
-    [[nodiscard]] unsigned char statusByte() const;
+    /// IEEE 488.2 status byte: 4 errors are queued, 16 an answer waits to be fetched, 32 an error event has not been
+    /// asked for.
+    /// @param messageAvailable bit 4, of which the transport knows.
+    [[nodiscard]] unsigned char statusByte(bool messageAvailable = false) const;
 
 private:
     struct SystemRow;
@@ -54,7 +55,6 @@ private:
     Reply executeUnit(const CommandUnit& unit, std::string& path);
     std::optional<Reply> tryHeader(std::string_view header, const CommandUnit& unit);
     Reply direct(const CommandUnit& unit);
-    void report(ScpiError error);
     void reset();
     void clearStatus();
     std::string takeEvents();

@@ -9,8 +9,6 @@ struct Create_LinkResp;
 
 namespace kdx::simserver {
 
-constexpr unsigned char kMessageAvailable = 0x10;  // bit of the status byte of IEEE 488.2
-
 /// The answers of the core channel in XDR, as its procedures give them.
 RpcAnswer errorOnly(long error);
 RpcAnswer createLinkAnswer(const Create_LinkResp& response);

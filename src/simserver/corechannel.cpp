@@ -3,6 +3,7 @@
 #include "base/codepage.h"
 #include "base/printable.h"
 #include "link/resource.h"
+#include "sim/scpi.h"
 #include "simserver/coreanswers.h"
 #include "vxi11/numbers.h"
 #include "vxi11/xdr.h"
@@ -18,12 +19,12 @@ namespace {
 
 using std::chrono::milliseconds;
 
-constexpr std::size_t kLongestMessage = 65536;
-constexpr std::size_t kMostParked = 256;
+constexpr std::size_t kMostUnread = 65536;  // bytes of answers that wait on a link
 
 // Where the length words of the fields of variable length stand in the arguments.
 constexpr std::size_t kDeviceNameAt = 12;
 constexpr std::size_t kWriteDataAt = 16;
+constexpr std::size_t kHandleAt = 8;
 
 bool isDeviceName(std::string_view name) {
     if (equalNoCase(name, "inst0")) return true;
@@ -45,10 +46,13 @@ void withArguments(std::string_view bytes, XdrRoutine<Arguments> routine, const 
 }  // namespace
 
 CoreChannel::CoreChannel(PollLoop& loop, sim::MessageDevice& device, Vxi11Options options)
-    : RpcProgram(DEVICE_CORE, DEVICE_CORE_VERSION), m_loop(loop), m_device(device), m_options(std::move(options)) {}
+    : RpcProgram(DEVICE_CORE, DEVICE_CORE_VERSION),
+      m_device(device),
+      m_options(std::move(options)),
+      m_calls(loop, [this](const WaitingCall& call) { return obstacle(call); }) {}
 
 void CoreChannel::call(std::uint32_t procedure, std::string_view arguments, ConnectionId from, const RpcReply& reply) {
-    const auto generically = [&](const char* name, std::function<void(Link&)> action) {
+    const auto generically = [&](const char* name, std::function<ErrorCode(Link&)> action) {
         withArguments<Device_GenericParms>(arguments, xdr_Device_GenericParms, reply, [&](const auto& parms) {
             generic(parms, from, reply, name, std::move(action));
         });
@@ -56,7 +60,12 @@ void CoreChannel::call(std::uint32_t procedure, std::string_view arguments, Conn
     switch (procedure) {
         case create_link:
             withArguments<Create_LinkParms>(
-                arguments, xdr_Create_LinkParms, reply, [&](const auto& parms) { createLink(parms, from, reply); },
+                arguments, xdr_Create_LinkParms, reply,
+                [&](const auto& parms) {
+                    // Not the text that was decoded: that one ends at a NUL, and a name that only begins well is none.
+                    const auto length = xdrWord(arguments, kDeviceNameAt);
+                    createLink(parms, std::string(arguments.substr(kDeviceNameAt + 4, length)), from, reply);
+                },
                 kDeviceNameAt);
             break;
         case device_write:
@@ -73,18 +82,19 @@ void CoreChannel::call(std::uint32_t procedure, std::string_view arguments, Conn
                                                [&](const auto& parms) { readStatusByte(parms, from, reply); });
             break;
         case device_trigger:
-            // The group execute trigger means the same as the common command; whether it means anything, the device
-            // knows.
-            generically("trigger", [this](Link&) { m_device.execute("*TRG"); });
+            generically("trigger", [](Link&) { return vxi11::kNotSupported; });  // there is nothing to trigger
             break;
         case device_clear:
-            generically("clear", [this](Link& link) { clear(link); });
+            generically("clear", [this](Link& link) {
+                clear(link);
+                return vxi11::kNoError;
+            });
             break;
         case device_remote:
-            generically("remote", [](Link&) {});
+            generically("remote", [](Link&) { return vxi11::kNoError; });
             break;
         case device_local:
-            generically("local", [](Link&) {});
+            generically("local", [](Link&) { return vxi11::kNoError; });
             break;
         case device_lock:
             withArguments<Device_LockParms>(arguments, xdr_Device_LockParms, reply,
@@ -102,6 +112,14 @@ void CoreChannel::call(std::uint32_t procedure, std::string_view arguments, Conn
             reply(docmdAnswer(vxi11::kNotSupported));
             break;
         case device_enable_srq:
+            // Allowed, though no request ever comes: without an interrupt channel there is no way for it.
+            withArguments<Device_EnableSrqParms>(
+                arguments, xdr_Device_EnableSrqParms, reply,
+                [&](const auto& parms) {
+                    reply(errorOnly(find(parms.lid, from) == nullptr ? vxi11::kInvalidLink : vxi11::kNoError));
+                },
+                kHandleAt);
+            break;
         case create_intr_chan:
         case destroy_intr_chan:
             reply(errorOnly(vxi11::kNotSupported));
@@ -109,11 +127,11 @@ void CoreChannel::call(std::uint32_t procedure, std::string_view arguments, Conn
         default:
             reply({{}, PROC_UNAVAIL});
     }
-    retryParked();
+    m_calls.retry();
 }
 
-void CoreChannel::createLink(const Create_LinkParms& parms, ConnectionId from, const RpcReply& reply) {
-    const std::string name = parms.device;
+void CoreChannel::createLink(const Create_LinkParms& parms, const std::string& name, ConnectionId from,
+                             const RpcReply& reply) {
     const auto fail = [reply](ErrorCode error) { reply(createLinkAnswer({error, 0, 0, 0})); };
     if (!isDeviceName(name)) return fail(vxi11::kDeviceNotAccessible);
     const bool withLock = parms.lockDevice != 0;
@@ -133,12 +151,11 @@ void CoreChannel::createLink(const Create_LinkParms& parms, ConnectionId from, c
         create();
         return;
     }
-    start({.connection = from,
-           .link = std::nullopt,
-           .waitForLock = true,
-           .lockTimeout = milliseconds(parms.lock_timeout),
-           .perform = create,
-           .fail = fail});
+    m_calls.start({.connection = from,
+                   .waitForLock = true,
+                   .lockTimeout = milliseconds(parms.lock_timeout),
+                   .perform = create,
+                   .fail = fail});
 }
 
 void CoreChannel::write(const Device_WriteParms& parms, ConnectionId from, const RpcReply& reply) {
@@ -147,32 +164,53 @@ void CoreChannel::write(const Device_WriteParms& parms, ConnectionId from, const
         return fail(vxi11::kParameterError);
     }
     const bool end = (parms.flags & vxi11::kFlagEnd) != 0;
-    const auto take = [this, id = parms.lid, end, reply, fail,
-                       data = std::string(parms.data.data_val, parms.data.data_len)] {
-        Link& link = m_links.at(id);
-        if (link.input.size() + data.size() > kLongestMessage) {
-            trace(id, "message too long, dropped");
-            link.input.clear();
-            fail(vxi11::kIoError);
-            return true;
-        }
-        link.input += data;
-        if (end && !link.input.empty()) {
-            trace(id, "< ", link.input);
-            // A new message discards the rest of an answer that nobody fetched, so that client and device agree again.
-            link.output = m_device.execute(std::exchange(link.input, {}));
-            if (!link.output.empty()) trace(id, "> ", link.output);
-        }
+    const auto take = [this, id = parms.lid, end, reply, data = std::string(parms.data.data_val, parms.data.data_len)] {
+        carryOut(id, m_links.at(id), data, end);
         reply(writeAnswer(vxi11::kNoError, data.size()));
         return true;
     };
-    start({.connection = from,
-           .link = parms.lid,
-           .waitForLock = (parms.flags & vxi11::kFlagWaitLock) != 0,
-           .lockTimeout = milliseconds(parms.lock_timeout),
-           .ioTimeout = milliseconds(parms.io_timeout),
-           .perform = take,
-           .fail = fail});
+    m_calls.start({.connection = from,
+                   .link = parms.lid,
+                   .waitForLock = (parms.flags & vxi11::kFlagWaitLock) != 0,
+                   .lockTimeout = milliseconds(parms.lock_timeout),
+                   .ioTimeout = milliseconds(parms.io_timeout),
+                   .perform = take,
+                   .fail = fail});
+}
+
+// One write may bring several messages, each with an answer of its own. A new one discards what nobody has fetched of
+// the answers to those before, so that client and device agree again.
+void CoreChannel::carryOut(LinkId id, Link& link, std::string_view bytes, bool end) {
+    bool overtakes = !link.input.hasBegun() && !link.output.empty();
+    const MessageBuffer::Taken taken = link.input.take(bytes, end);
+    if (taken.overrun) {
+        trace(id, "message too long, dropped");
+        m_device.report(sim::ScpiError::InputBufferOverrun);
+    }
+    std::size_t unread = 0;
+    for (const std::string& answer : link.output) unread += answer.size();
+    bool deadlocked = false;
+    for (const std::string& message : taken.messages) {
+        trace(id, "< ", message);
+        if (sim::trimmed(message).empty()) continue;
+        if (std::exchange(overtakes, false)) {
+            trace(id, "answer dropped that nobody has fetched");
+            link.output.clear();
+            unread = 0;
+            m_device.report(sim::ScpiError::QueryInterrupted);
+        }
+        std::string answer = m_device.execute(message);
+        if (answer.empty()) continue;
+        trace(id, "> ", answer);
+        unread += answer.size();
+        if (!deadlocked && unread > kMostUnread) {
+            deadlocked = true;
+            trace(id, "answers dropped, more than can be kept");
+            link.output.clear();
+            m_device.report(sim::ScpiError::QueryDeadlocked);
+        }
+        if (!deadlocked) link.output.push_back(std::move(answer));
+    }
 }
 
 void CoreChannel::read(const Device_ReadParms& parms, ConnectionId from, const RpcReply& reply) {
@@ -180,83 +218,88 @@ void CoreChannel::read(const Device_ReadParms& parms, ConnectionId from, const R
                        reply] {
         Link& link = m_links.at(id);
         if (link.output.empty() && most > 0) return false;
-        std::size_t count = std::min<std::size_t>(most, link.output.size());
+        const std::string unread = link.output.empty() ? std::string() : std::move(link.output.front());
+        std::size_t count = std::min<std::size_t>(most, unread.size());
         long reason = 0;
         if ((flags & vxi11::kFlagTermChar) != 0) {
-            const std::size_t found = link.output.find(termChar);
+            const std::size_t found = unread.find(termChar);
             if (found < count) {
                 count = found + 1;
                 reason |= vxi11::kReasonTermChar;
             }
         }
         if (count == most) reason |= vxi11::kReasonRequestCount;
-        if (count > 0 && count == link.output.size()) reason |= vxi11::kReasonEnd;
-        std::string data = link.output.substr(0, count);
-        link.output.erase(0, count);
-        reply(readAnswer(vxi11::kNoError, reason, std::move(data)));
+        if (count > 0 && count == unread.size()) reason |= vxi11::kReasonEnd;
+        if (count < unread.size()) {
+            link.output.front() = unread.substr(count);
+        } else if (count > 0) {
+            link.output.pop_front();
+        }
+        reply(readAnswer(vxi11::kNoError, reason, unread.substr(0, count)));
         return true;
     };
-    start({.connection = from,
-           .link = parms.lid,
-           .waitForLock = (parms.flags & vxi11::kFlagWaitLock) != 0,
-           .lockTimeout = milliseconds(parms.lock_timeout),
-           .ioTimeout = milliseconds(parms.io_timeout),
-           .perform = give,
-           .fail = [this, reply](ErrorCode error) {
-               if (error == vxi11::kIoTimeout) m_device.unansweredRead();
-               reply(readAnswer(error, 0, {}));
-           }});
+    m_calls.start({.connection = from,
+                   .link = parms.lid,
+                   .waitForLock = (parms.flags & vxi11::kFlagWaitLock) != 0,
+                   .lockTimeout = milliseconds(parms.lock_timeout),
+                   .ioTimeout = milliseconds(parms.io_timeout),
+                   .perform = give,
+                   .fail = [this, reply](ErrorCode error) {
+                       if (error == vxi11::kIoTimeout) m_device.report(sim::ScpiError::QueryUnterminated);
+                       reply(readAnswer(error, 0, {}));
+                   }});
 }
 
 void CoreChannel::lock(const Device_LockParms& parms, ConnectionId from, const RpcReply& reply) {
     const auto take = [this, id = parms.lid, reply] {
+        if (m_lockHolder == id) {  // a lock is not counted: the second one is as much in the way as a stranger's
+            reply(errorOnly(vxi11::kLockedByAnotherLink));
+            return true;
+        }
         m_lockHolder = id;
         trace(id, "locks");
         reply(errorOnly(vxi11::kNoError));
         return true;
     };
-    start({.connection = from,
-           .link = parms.lid,
-           .waitForLock = (parms.flags & vxi11::kFlagWaitLock) != 0,
-           .lockTimeout = milliseconds(parms.lock_timeout),
-           .perform = take,
-           .fail = [reply](ErrorCode error) { reply(errorOnly(error)); }});
+    m_calls.start({.connection = from,
+                   .link = parms.lid,
+                   .waitForLock = (parms.flags & vxi11::kFlagWaitLock) != 0,
+                   .lockTimeout = milliseconds(parms.lock_timeout),
+                   .perform = take,
+                   .fail = [reply](ErrorCode error) { reply(errorOnly(error)); }});
 }
 
 void CoreChannel::readStatusByte(const Device_GenericParms& parms, ConnectionId from, const RpcReply& reply) {
     const auto give = [this, id = parms.lid, reply] {
-        unsigned char status = m_device.statusByte();
-        if (!m_links.at(id).output.empty()) status |= kMessageAvailable;
-        reply(statusByteAnswer(vxi11::kNoError, status));
+        reply(statusByteAnswer(vxi11::kNoError, m_device.statusByte(!m_links.at(id).output.empty())));
         return true;
     };
-    start({.connection = from,
-           .link = parms.lid,
-           .waitForLock = (parms.flags & vxi11::kFlagWaitLock) != 0,
-           .lockTimeout = milliseconds(parms.lock_timeout),
-           .ioTimeout = milliseconds(parms.io_timeout),
-           .perform = give,
-           .fail = [reply](ErrorCode error) { reply(statusByteAnswer(error, 0)); }});
+    m_calls.start({.connection = from,
+                   .link = parms.lid,
+                   .waitForLock = (parms.flags & vxi11::kFlagWaitLock) != 0,
+                   .lockTimeout = milliseconds(parms.lock_timeout),
+                   .ioTimeout = milliseconds(parms.io_timeout),
+                   .perform = give,
+                   .fail = [reply](ErrorCode error) { reply(statusByteAnswer(error, 0)); }});
 }
 
 void CoreChannel::generic(const Device_GenericParms& parms, ConnectionId from, const RpcReply& reply, const char* name,
-                          std::function<void(Link&)> action) {
-    start({.connection = from,
-           .link = parms.lid,
-           .waitForLock = (parms.flags & vxi11::kFlagWaitLock) != 0,
-           .lockTimeout = milliseconds(parms.lock_timeout),
-           .ioTimeout = milliseconds(parms.io_timeout),
-           .perform =
-               [this, id = parms.lid, reply, name, action = std::move(action)] {
-                   trace(id, name);
-                   action(m_links.at(id));
-                   reply(errorOnly(vxi11::kNoError));
-                   return true;
-               },
-           .fail = [reply](ErrorCode error) { reply(errorOnly(error)); }});
+                          std::function<ErrorCode(Link&)> action) {
+    m_calls.start({.connection = from,
+                   .link = parms.lid,
+                   .waitForLock = (parms.flags & vxi11::kFlagWaitLock) != 0,
+                   .lockTimeout = milliseconds(parms.lock_timeout),
+                   .ioTimeout = milliseconds(parms.io_timeout),
+                   .perform =
+                       [this, id = parms.lid, reply, name, action = std::move(action)] {
+                           trace(id, name);
+                           reply(errorOnly(action(m_links.at(id))));
+                           return true;
+                       },
+                   .fail = [reply](ErrorCode error) { reply(errorOnly(error)); }});
 }
 
-CoreChannel::ErrorCode CoreChannel::unlock(LinkId id, ConnectionId from) {
+ErrorCode CoreChannel::unlock(LinkId id, ConnectionId from) {
     if (find(id, from) == nullptr) return vxi11::kInvalidLink;
     if (m_lockHolder != id) return vxi11::kNoLockHeld;
     m_lockHolder.reset();
@@ -264,91 +307,27 @@ CoreChannel::ErrorCode CoreChannel::unlock(LinkId id, ConnectionId from) {
     return vxi11::kNoError;
 }
 
-CoreChannel::ErrorCode CoreChannel::destroyLink(LinkId id, ConnectionId from) {
+ErrorCode CoreChannel::destroyLink(LinkId id, ConnectionId from) {
     if (find(id, from) == nullptr) return vxi11::kInvalidLink;
     removeLink(id);
     return vxi11::kNoError;
 }
 
-CoreChannel::ErrorCode CoreChannel::abort(LinkId link) {
+ErrorCode CoreChannel::abort(LinkId link) {
     if (!m_links.contains(link)) return vxi11::kInvalidLink;
     trace(link, "aborted");
-    for (auto operation = m_parked.begin(); operation != m_parked.end();) {
-        if (operation->link == link) {
-            m_loop.cancel(operation->timer);
-            operation->fail(vxi11::kAborted);
-            operation = m_parked.erase(operation);
-        } else {
-            ++operation;
-        }
-    }
+    m_calls.abort(link);
     return vxi11::kNoError;
 }
 
 void CoreChannel::connectionClosed(ConnectionId connection) {
-    for (auto operation = m_parked.begin(); operation != m_parked.end();) {
-        if (operation->connection == connection) {
-            m_loop.cancel(operation->timer);
-            operation = m_parked.erase(operation);
-        } else {
-            ++operation;
-        }
-    }
+    m_calls.forget(connection);
     for (auto link = m_links.begin(); link != m_links.end();) {
         const auto next = std::next(link);
         if (link->second.owner == connection) removeLink(link->first);
         link = next;
     }
-    retryParked();
-}
-
-void CoreChannel::start(Operation operation) {
-    if (advance(operation)) return;
-    if (m_parked.size() >= kMostParked) return operation.fail(vxi11::kOutOfResources);
-    m_parked.push_back(std::move(operation));
-    park(std::prev(m_parked.end()));
-}
-
-// True: it is done and answered. False: it waits, for the lock until lockPassed, then for data.
-bool CoreChannel::advance(Operation& operation) {
-    if (operation.link && find(*operation.link, operation.connection) == nullptr) {
-        operation.fail(vxi11::kInvalidLink);
-        return true;
-    }
-    if (!operation.lockPassed && lockedAgainst(operation.link)) {
-        if (!operation.waitForLock) operation.fail(vxi11::kLockedByAnotherLink);
-        return !operation.waitForLock;
-    }
-    operation.lockPassed = true;
-    return operation.perform();
-}
-
-void CoreChannel::park(Parked::iterator operation) {
-    const bool forLock = !operation->lockPassed;
-    const auto timeout = forLock ? operation->lockTimeout : operation->ioTimeout;
-    operation->timer = m_loop.callAt(std::chrono::steady_clock::now() + timeout, [this, operation, forLock] {
-        operation->fail(forLock ? vxi11::kLockedByAnotherLink : vxi11::kIoTimeout);
-        m_parked.erase(operation);
-    });
-}
-
-// What one waiting call does may be what another one waits for, so it goes on until none gets any further.
-void CoreChannel::retryParked() {
-    for (bool changed = true; changed;) {
-        changed = false;
-        for (auto operation = m_parked.begin(); operation != m_parked.end();) {
-            const auto current = operation++;
-            const bool hadPassed = current->lockPassed;
-            if (advance(*current)) {
-                m_loop.cancel(current->timer);
-                m_parked.erase(current);
-                changed = true;
-            } else if (current->lockPassed != hadPassed) {
-                m_loop.cancel(current->timer);
-                park(current);
-            }
-        }
-    }
+    m_calls.retry();
 }
 
 void CoreChannel::clear(Link& link) {
@@ -369,8 +348,9 @@ CoreChannel::Link* CoreChannel::find(LinkId id, ConnectionId from) {
     return found != m_links.end() && found->second.owner == from ? &found->second : nullptr;
 }
 
-bool CoreChannel::lockedAgainst(std::optional<LinkId> link) const {
-    return m_lockHolder && m_lockHolder != link;
+ErrorCode CoreChannel::obstacle(const WaitingCall& call) {
+    if (call.link && find(*call.link, call.connection) == nullptr) return vxi11::kInvalidLink;
+    return m_lockHolder && m_lockHolder != call.link ? vxi11::kLockedByAnotherLink : vxi11::kNoError;
 }
 
 void CoreChannel::trace(LinkId link, std::string_view what, std::string_view text) const {

@@ -89,8 +89,8 @@ public:
         return m_instrument.execute(message);
     }
     void clear() override { m_instrument.deviceClear(); }
-    unsigned char statusByte() override { return m_instrument.statusByte(); }
-    void unansweredRead() override { m_instrument.reportUnansweredRead(); }
+    unsigned char statusByte(bool messageAvailable) override { return m_instrument.statusByte(messageAvailable); }
+    void report(kdx::sim::ScpiError error) override { m_instrument.report(error); }
 
 private:
     kdx::SystemClock m_clock;

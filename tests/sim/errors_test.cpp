@@ -91,7 +91,7 @@ TEST_F(ErrorsTest, AreQueuedForSwitchesAndNumbersThatAreNone) {
 }
 
 TEST_F(ErrorsTest, AreQueuedWhenAClientReadsThoughNothingWasAsked) {
-    instrument.reportUnansweredRead();
+    instrument.report(ScpiError::QueryUnterminated);
     EXPECT_EQ(tell("SYST:ERR?"), "-420,\"Query UNTERMINATED\"\n");
 }
 
@@ -110,7 +110,7 @@ TEST_F(StatusTest, EventRegisterTellsPowerOnThenTheKindsOfErrorsAndIsClearedByRe
     EXPECT_EQ(ask("*ESR?"), "32");
     tell("FREQ 5GHZ");
     EXPECT_EQ(ask("*ESR?"), "16");
-    instrument.reportUnansweredRead();
+    instrument.report(ScpiError::QueryUnterminated);
     EXPECT_EQ(ask("*ESR?"), "4");
     tell("*OPC");
     EXPECT_EQ(ask("*ESR?"), "1");

@@ -23,6 +23,7 @@ public:
     std::string execute(std::string_view message) override {
         const std::lock_guard guard(m_mutex);
         m_got.emplace_back(message);
+        while (!message.empty() && (message.back() == '\n' || message.back() == '\r')) message.remove_suffix(1);
         if (message == "LONG?") return std::string(499, 'x') + "\n";
         if (!message.empty() && message.back() == '?') {
             return std::string(message.substr(0, message.size() - 1)) + "\n";
@@ -30,20 +31,29 @@ public:
         return {};
     }
     void clear() override { ++clears; }
-    unsigned char statusByte() override { return 0x24; }
-    void unansweredRead() override { ++unansweredReads; }
+    unsigned char statusByte(bool messageAvailable) override { return messageAvailable ? 0x34 : 0x24; }
+    void report(sim::ScpiError error) override {
+        const std::lock_guard guard(m_mutex);
+        m_errors.push_back(static_cast<int>(error));
+    }
 
     std::vector<std::string> got() {
         const std::lock_guard guard(m_mutex);
         return m_got;
     }
 
+    /// The errors reported so far.
+    std::vector<int> errors() {
+        const std::lock_guard guard(m_mutex);
+        return m_errors;
+    }
+
     std::atomic<int> clears = 0;
-    std::atomic<int> unansweredReads = 0;
 
 private:
     std::mutex m_mutex;
     std::vector<std::string> m_got;
+    std::vector<int> m_errors;
 };
 
 /// What a device_read has brought.
@@ -67,9 +77,11 @@ public:
 
     using RpcClient::RpcClient;
 
-    static std::string linkArguments(std::string name, bool withLock = false, u_long lockTimeoutMs = 0) {
-        return toXdr<Create_LinkParms>({1, withLock ? TRUE : FALSE, lockTimeoutMs, name.data()}, xdr_Create_LinkParms,
-                                       name.size());
+    /// Put together by hand: the XDR routine would end the name at a NUL.
+    static std::string linkArguments(const std::string& name, bool withLock = false, std::uint32_t lockTimeoutMs = 0) {
+        const auto length = static_cast<std::uint32_t>(name.size());
+        const std::string filled = name + std::string((4 - name.size() % 4) % 4, '\0');
+        return word(1) + word(withLock ? 1 : 0) + word(lockTimeoutMs) + word(length) + filled;
     }
     static std::string writeArguments(long link, std::string text, long flags = kEnd, u_long lockTimeoutMs = 0) {
         return toXdr<Device_WriteParms>(
@@ -88,7 +100,7 @@ public:
     }
     static std::string linkNumber(long link) { return toXdr<Device_Link>(link, xdr_Device_Link); }
 
-    Create_LinkResp createLink(const std::string& name, bool withLock = false, u_long lockTimeoutMs = 0) {
+    Create_LinkResp createLink(const std::string& name, bool withLock = false, std::uint32_t lockTimeoutMs = 0) {
         const std::string bytes = results(create_link, linkArguments(name, withLock, lockTimeoutMs));
         return *XdrDecoded<Create_LinkResp>(bytes, xdr_Create_LinkResp);
     }

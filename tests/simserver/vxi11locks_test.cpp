@@ -58,9 +58,10 @@ TEST_F(Vxi11LockTest, OnlyTheHolderCanUnlock) {
     EXPECT_EQ(unlockOne(), 12);
 }
 
-TEST_F(Vxi11LockTest, LockingTwiceIsOneLock) {
+TEST_F(Vxi11LockTest, TheHolderCannotLockASecondTime) {
     EXPECT_EQ(lockOne(), 0);
-    EXPECT_EQ(lockOne(), 0);
+    EXPECT_EQ(lockOne(), 11);
+    EXPECT_EQ(m_one->error(device_lock, CoreClient::lockArguments(m_linkOne, kWaitLock, kLong)), 11) << "at once";
     EXPECT_EQ(unlockOne(), 0);
     EXPECT_EQ(m_two->write(m_linkTwo, "A").error, 0);
 }

@@ -34,7 +34,7 @@ public:
         options.corePort = m_server.corePort();
         return options;
     }
-    /// Every message since the last call; "(unanswered read)" where one read in vain.
+    /// Every message since the last call; and the words of an error where the exchange went wrong.
     std::vector<std::string> takeReceived() { return m_device.takeReceived(); }
 
 private:
@@ -47,10 +47,11 @@ private:
             return m_instrument.execute(message);
         }
         void clear() override { m_instrument.deviceClear(); }
-        unsigned char statusByte() override { return m_instrument.statusByte(); }
-        void unansweredRead() override {
-            note("(unanswered read)");
-            m_instrument.reportUnansweredRead();
+        unsigned char statusByte(bool messageAvailable) override { return m_instrument.statusByte(messageAvailable); }
+        void report(sim::ScpiError error) override {
+            // The rest of an answer of more than 60 bytes is never fetched; the next command overtakes it.
+            if (error != sim::ScpiError::QueryInterrupted) note(sim::errorText(error));
+            m_instrument.report(error);
         }
         std::vector<std::string> takeReceived() {
             const std::lock_guard guard(m_mutex);
