@@ -26,6 +26,7 @@ ScpiError AfLists::receive(std::string_view value) {
 }
 
 ScpiError AfLists::check(std::string_view list) {
+    if (list.size() > kMaxLength) return ScpiError::TooMuchData;
     const std::vector<std::string_view> frequencies = splitOutsideQuotes(list, ',');
     if (frequencies.size() > kMaxFrequencies) return ScpiError::TooMuchData;
     double tuned = 0;

@@ -16,6 +16,8 @@ public:
     static constexpr std::size_t kCount = 5;
     /// The tuned frequency and 25 more, what one list can carry on the air.
     static constexpr std::size_t kMaxFrequencies = 26;
+    /// Bytes of a list's text: some for every frequency ("108.0,") and for the blanks or digits that users add.
+    static constexpr std::size_t kMaxLength = 10 * kMaxFrequencies;
 
     /// Takes over "N,list" (a new set of lists begins) or "+,list" (appended to the lists there are). A list is decimal
     /// MHz joined by commas: the tuned frequency (86 to 108), then alternatives (87.5 to 108.0 or the tuned one).

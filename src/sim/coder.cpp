@@ -15,6 +15,7 @@ constexpr std::size_t kPsLength = 8;
 constexpr std::size_t kPiLength = 4;
 constexpr std::size_t kRadiotextLength = 64;
 constexpr std::size_t kGroupLength = 10;
+constexpr std::size_t kMostGroups = 256;
 constexpr int kHighestRadiotextNumber = 255;
 constexpr int kHighestGroup = 15;
 
@@ -152,7 +153,9 @@ ScpiError Coder::setRadiotext(std::string_view value) {
 ScpiError Coder::setGroupSequence(std::string_view value) {
     const std::string sequence = upperCase(trimmed(value));
     if (sequence.empty()) return ScpiError::MissingParameter;
-    for (const std::string_view group : splitOutsideQuotes(sequence, ',')) {
+    const std::vector<std::string_view> groups = splitOutsideQuotes(sequence, ',');
+    if (groups.size() > kMostGroups) return ScpiError::TooMuchData;
+    for (const std::string_view group : groups) {
         if (!isGroup(group)) return ScpiError::IllegalValue;
     }
     m_settings.groupSequence = sequence;

@@ -24,6 +24,8 @@ constexpr unsigned char kMessageAvailable = 16;
 constexpr unsigned char kEventSummary = 32;
 constexpr unsigned char kErrorEvents = kQueryError | kDeviceError | kExecutionError | kCommandError;
 
+constexpr std::size_t kLongestAnswer = 65536;
+
 constexpr std::string_view kDirect = "STEReo:DIRect";
 
 unsigned char eventOf(ScpiError error) {
@@ -79,13 +81,19 @@ unsigned char VirtualInstrument::statusByte(bool messageAvailable) const {
 std::string VirtualInstrument::executeLine(std::string_view line) {
     std::string answers;
     std::string path;
+    bool deadlocked = false;
     for (const std::string_view text : splitOutsideQuotes(line, ';')) {
         if (trimmed(text).empty()) continue;
         const Reply reply = executeUnit(readUnit(text), path);
         if (reply.error != ScpiError::None) report(reply.error);
-        if (!reply.answer) continue;
+        if (!reply.answer || deadlocked) continue;
         if (!answers.empty()) answers += ';';
         answers += *reply.answer;
+        // Nobody can fetch an answer while its question is still being sent: room is limited, and then it is dropped.
+        if (answers.size() < kLongestAnswer) continue;
+        deadlocked = true;
+        answers = std::string();
+        report(ScpiError::QueryDeadlocked);
     }
     return answers.empty() ? answers : answers + '\n';
 }

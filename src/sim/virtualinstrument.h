@@ -31,7 +31,8 @@ public:
 
     /// Carries out one program message (several commands may be joined by ";"), its line end left off or not.
     /// @returns the answer with its line feed, or "" when the message asked nothing. Errors go to the error queue.
-    /// Several answers of one line are joined by ";". A message of several lines is several messages.
+    /// Several answers of one line are joined by ";"; beyond 64 KiB there are none at all, and -430. A message of
+    /// several lines is several messages.
     std::string execute(std::string_view message);
 
     /// A device clear: ends whatever the instrument is still doing for its clients, and by IEEE 488.2 leaves settings,

@@ -7,6 +7,7 @@
 
 #include <array>
 #include <cerrno>
+#include <new>
 #include <utility>
 
 namespace kdx::simserver {
@@ -52,6 +53,14 @@ void RpcTcpServer::acceptClients() {
 }
 
 void RpcTcpServer::serve(ConnectionId id, short events) {
+    try {
+        serveEvents(id, events);
+    } catch (const std::bad_alloc&) {
+        close(id);
+    }
+}
+
+void RpcTcpServer::serveEvents(ConnectionId id, short events) {
     Connection& connection = m_connections.at(id);
     if ((events & POLLIN) != 0) {
         readCalls(id, connection);
@@ -96,9 +105,14 @@ void RpcTcpServer::sendRecord(ConnectionId id, const std::string& record) {
     const auto found = m_connections.find(id);
     if (found == m_connections.end()) return;
     Connection& connection = found->second;
-    connection.unsent += framed(record);
     // A connection that fails here is closed when the loop sees it: whoever answers may be in the midst of its own
-    // work.
+    // work, or of another client's.
+    try {
+        connection.unsent += framed(record);
+    } catch (const std::bad_alloc&) {
+        ::shutdown(connection.socket.number(), SHUT_RDWR);
+        return;
+    }
     sendUnsent(connection);
     updateEvents(connection);
 }

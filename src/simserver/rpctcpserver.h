@@ -11,7 +11,8 @@
 
 namespace kdx::simserver {
 
-/// Serves an RPC program on a TCP port to any number of clients at once; none of them can hold up another.
+/// Serves an RPC program on a TCP port to any number of clients at once; none of them can hold up another. When memory
+/// runs out over a call, its connection is closed and the others go on.
 class RpcTcpServer {
 public:
     /// Longest call that is taken; a client that announces a longer one is cut off.
@@ -37,6 +38,7 @@ private:
     };
     void acceptClients();
     void serve(ConnectionId id, short events);
+    void serveEvents(ConnectionId id, short events);
     void readCalls(ConnectionId id, Connection& connection);
     void endInput(ConnectionId id, Connection& connection);
     void sendRecord(ConnectionId id, const std::string& record);

@@ -2,6 +2,7 @@
 
 #include "vxi11/numbers.h"
 
+#include <new>
 #include <utility>
 
 namespace kdx::simserver {
@@ -25,7 +26,7 @@ void WaitingCalls::retry() {
         for (auto call = m_calls.begin(); call != m_calls.end();) {
             const auto current = call++;
             const bool hadPassed = current->lockPassed;
-            if (advance(*current)) {
+            if (advanceOrFail(*current)) {
                 m_loop.cancel(current->timer);
                 m_calls.erase(current);
                 changed = true;
@@ -69,6 +70,17 @@ bool WaitingCalls::advance(WaitingCall& call) {
     }
     call.lockPassed = true;
     return call.perform();
+}
+
+// The caller of the moment is perhaps another client than the one whose call is carried out: it must not suffer when
+// memory runs out here.
+bool WaitingCalls::advanceOrFail(WaitingCall& call) {
+    try {
+        return advance(call);
+    } catch (const std::bad_alloc&) {
+        call.fail(vxi11::kOutOfResources);
+        return true;
+    }
 }
 
 void WaitingCalls::park(Calls::iterator call) {

@@ -47,6 +47,7 @@ private:
     using Calls = std::list<WaitingCall>;
 
     bool advance(WaitingCall& call);
+    bool advanceOrFail(WaitingCall& call);
     void park(Calls::iterator call);
 
     PollLoop& m_loop;

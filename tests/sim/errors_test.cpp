@@ -171,6 +171,31 @@ TEST_F(BadInputTest, OfAMegabyteIsRefusedWithOneError) {
     EXPECT_EQ(askCoder("PS"), "\"KDX-X4  \"");
 }
 
+TEST_F(BadInputTest, AsksForMoreThanAnAnswerHoldsAndGetsNothing) {
+    std::string message = "FREQ 99.9MHZ";
+    while (message.size() < 64000) message += ";:STEREO:DIRECT? \"RT\";*IDN?";
+    coder("RT=0,0," + std::string(64, 'x'));
+    EXPECT_EQ(tell(message + ";:FREQ 98.5MHZ"), "");
+    EXPECT_EQ(error(), -430);
+    EXPECT_EQ(error(), 0);
+    EXPECT_EQ(ask("FREQ?"), "98.5") << "the commands are carried out all the same";
+}
+
+TEST_F(BadInputTest, OfALongListIsRefused) {
+    std::string groups = "0A";
+    for (int i = 1; i < 256; ++i) groups += ",2A";
+    coder("GS=" + groups);
+    EXPECT_EQ(error(), 0);
+    coder("GS=" + groups + ",2A");
+    EXPECT_EQ(error(), -223);
+    EXPECT_EQ(askCoder("GS"), "\"" + groups + "\"");
+    coder("AF=N,87.6,90.1" + std::string(1000, '0'));
+    EXPECT_EQ(error(), -223);
+    coder("EON-PI=D3C2");
+    coder("EON-AFA=D3C2,87.6," + std::string(1000, ' ') + "90.1");
+    EXPECT_EQ(error(), -223);
+}
+
 TEST_F(BadInputTest, WithNulBytesInACommandIsRefused) {
     tell(std::string("FR\0EQ 99MHZ", 11));
     EXPECT_EQ(error(), -113);

@@ -150,5 +150,32 @@ TEST_F(MessageExchangeTest, AReadWithNothingToSayTimesOutAndTheDeviceIsTold) {
     EXPECT_EQ(client.read(link).data, "NAME\n") << "the link is as good as before";
 }
 
+TEST_F(MessageExchangeTest, WhenMemoryRunsOutTheConnectionIsClosedAndOthersGoOn) {
+    CoreClient greedy(port());
+    CoreClient other(port());
+    const long link = other.open();
+    greedy.send(device_write, CoreClient::writeArguments(greedy.open(), "HUGE"));
+    EXPECT_TRUE(greedy.isClosedByServer());
+    other.write(link, "NAME?");
+    EXPECT_EQ(other.read(link).data, "NAME\n");
+}
+
+TEST_F(MessageExchangeTest, WhenMemoryRunsOutOverACallThatHasWaitedOnlyThatOneFails) {
+    CoreClient greedy(port());
+    CoreClient other(port());
+    const long link = other.open();
+    const long greedyLink = greedy.open();
+    other.error(device_lock, CoreClient::lockArguments(link));
+    greedy.send(device_write,
+                CoreClient::writeArguments(greedyLink, "HUGE", CoreClient::kEnd | CoreClient::kWaitLock, 100000));
+    EXPECT_FALSE(greedy.receive(20));
+    EXPECT_EQ(other.error(device_unlock, CoreClient::linkNumber(link)), 0);
+    const auto reply = greedy.receive();
+    ASSERT_TRUE(reply);
+    EXPECT_EQ(reply->word(0), 9U);
+    other.write(link, "NAME?");
+    EXPECT_EQ(other.read(link).data, "NAME\n");
+}
+
 }  // namespace
 }  // namespace kdx::simserver

@@ -9,6 +9,7 @@
 #include <atomic>
 #include <memory>
 #include <mutex>
+#include <new>
 #include <ostream>
 #include <string>
 #include <thread>
@@ -16,14 +17,15 @@
 
 namespace kdx::simserver {
 
-/// Answers "NAME?" by "NAME" and a line feed, "LONG?" by 500 bytes, everything else by nothing; writes down what it
-/// got.
+/// Answers "NAME?" by "NAME" and a line feed, "LONG?" by 500 bytes, everything else by nothing; has no memory left for
+/// "HUGE"; writes down what it got.
 class FakeDevice final : public sim::MessageDevice {
 public:
     std::string execute(std::string_view message) override {
         const std::lock_guard guard(m_mutex);
         m_got.emplace_back(message);
         while (!message.empty() && (message.back() == '\n' || message.back() == '\r')) message.remove_suffix(1);
+        if (message == "HUGE") throw std::bad_alloc();
         if (message == "LONG?") return std::string(499, 'x') + "\n";
         if (!message.empty() && message.back() == '?') {
             return std::string(message.substr(0, message.size() - 1)) + "\n";
