@@ -92,7 +92,7 @@ ScpiError Coder::command(std::string_view text) {
     const Row* row = rowOf(name);
     const bool special = row != nullptr && row->set != nullptr;
     if (name.empty()) return ScpiError::MissingParameter;
-    if (!parameter && !special && !OtherNetworks::knows(name)) return ScpiError::UndefinedHeader;
+    if (!parameter && !special && !OtherNetworks::knows(name)) return ScpiError::IllegalValue;
     if (!value) return ScpiError::MissingParameter;
     if (parameter) return setFromCoder(*parameter, *value, m_settings);
     if (special) return row->set(*this, *value);
@@ -109,7 +109,7 @@ Reply Coder::query(std::string_view text) const {
     const Row* row = rowOf(name);
     const bool special = row != nullptr && row->ask != nullptr;
     if (name.empty()) return {ScpiError::MissingParameter, std::nullopt};
-    if (!parameter && !special) return {ScpiError::UndefinedHeader, std::nullopt};
+    if (!parameter && !special) return {ScpiError::IllegalValue, std::nullopt};
     const ScpiError error = argument ? ScpiError::ParameterNotAllowed : ScpiError::None;
     return {error, parameter ? coderAnswer(*parameter, m_settings) : row->ask(*this)};
 }

@@ -13,6 +13,7 @@ struct ErrorRow {
 
 constexpr std::array kErrors = {
     ErrorRow{ScpiError::None, "No error"},
+    ErrorRow{ScpiError::InvalidSeparator, "Invalid separator"},
     ErrorRow{ScpiError::ParameterNotAllowed, "Parameter not allowed"},
     ErrorRow{ScpiError::MissingParameter, "Missing parameter"},
     ErrorRow{ScpiError::UndefinedHeader, "Undefined header"},

@@ -11,6 +11,7 @@ namespace kdx::sim {
 /// Error numbers of the SCPI standard that the virtual instrument reports.
 enum class ScpiError : int {
     None = 0,
+    InvalidSeparator = -103,
     ParameterNotAllowed = -108,
     MissingParameter = -109,
     UndefinedHeader = -113,

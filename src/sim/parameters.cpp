@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <array>
+#include <cmath>
 #include <span>
 
 #include "base/codepage.h"
@@ -147,26 +148,42 @@ std::string bare(std::string_view value) {
     return text;
 }
 
+// The number behind the words that SCPI has for the ends of a range and for the value after a reset.
+std::optional<double> namedNumber(const NumberRow& row, std::string_view word) {
+    if (wordMatches("MINimum", word)) return row.lowest;
+    if (wordMatches("MAXimum", word)) return row.highest;
+    if (wordMatches("DEFault", word)) return Settings().*row.value;
+    return std::nullopt;
+}
+
+std::optional<bool> onOrOff(std::string_view value) {
+    if (equalNoCase(value, "ON")) return true;
+    if (equalNoCase(value, "OFF")) return false;
+    return std::nullopt;
+}
+
 // One overload for each kind of row and each of the two ways to write a value.
 
+// By SCPI a number stands for "on" unless it is 0 when rounded.
 ScpiError setGenerator(const SwitchRow& row, std::string_view value, Settings& settings) {
-    if (equalNoCase(value, "ON") || equalNoCase(value, "OFF")) {
-        settings.*row.value = equalNoCase(value, "ON");
+    if (const auto word = onOrOff(value)) {
+        settings.*row.value = *word;
         return ScpiError::None;
     }
-    const auto number = readWhole(value);
-    if (!number) return ScpiError::IllegalValue;
-    if (*number != 0 && *number != 1) return ScpiError::OutOfRange;
-    settings.*row.value = *number == 1;
+    const auto number = readNumber(value);
+    if (!number) return errorOfValue(value);
+    if (!number->suffix.empty()) return errorOfSuffix(number->suffix);
+    settings.*row.value = std::round(number->value) != 0;
     return ScpiError::None;
 }
 
 ScpiError setGenerator(const NumberRow& row, std::string_view value, Settings& settings) {
+    if (const auto named = namedNumber(row, value)) return storeNumber(row, *named, settings);
     const auto number = readNumber(value);
-    if (!number) return ScpiError::IllegalValue;
+    if (!number) return errorOfValue(value);
     const Suffix* unit = suffixOf(row.unit);
     const Suffix* suffix = number->suffix.empty() ? unit : suffixOf(number->suffix);
-    if (suffix == nullptr || suffix->base != unit->base) return ScpiError::InvalidSuffix;
+    if (suffix == nullptr || suffix->base != unit->base) return errorOfSuffix(number->suffix);
     return storeNumber(row, number->value * suffix->factor / unit->factor, settings);
 }
 
@@ -180,13 +197,21 @@ ScpiError setGenerator(const WholeRow& row, std::string_view value, Settings& se
 
 ScpiError setGenerator(const ChoiceRow& row, std::string_view value, Settings& settings) {
     const auto word = std::find(row.words.begin(), row.words.end(), bare(value));
-    if (word == row.words.end()) return ScpiError::IllegalValue;
+    if (word == row.words.end()) return errorOfValue(value);
     settings.*row.value = static_cast<int>(word - row.words.begin()) + 1;
     return ScpiError::None;
 }
 
 ScpiError setCoder(const SwitchRow& row, std::string_view value, Settings& settings) {
-    return setGenerator(row, value, settings);
+    if (const auto word = onOrOff(value)) {
+        settings.*row.value = *word;
+        return ScpiError::None;
+    }
+    const auto number = readWhole(value);
+    if (!number) return ScpiError::IllegalValue;
+    if (*number != 0 && *number != 1) return ScpiError::OutOfRange;
+    settings.*row.value = *number == 1;
+    return ScpiError::None;
 }
 
 ScpiError setCoder(const NumberRow& row, std::string_view value, Settings& settings) {
@@ -265,8 +290,15 @@ ScpiError setFromCoder(const Parameter& parameter, std::string_view value, Instr
     return std::visit([&](const auto* row) { return setCoder(*row, trimmed(value), settings); }, parameter);
 }
 
-std::string generatorAnswer(const Parameter& parameter, const InstrumentSettings& settings) {
-    return std::visit([&](const auto* row) { return askGenerator(*row, settings); }, parameter);
+Reply generatorAnswer(const Parameter& parameter, std::string_view argument, const InstrumentSettings& settings) {
+    if (argument.empty()) {
+        return {ScpiError::None, std::visit([&](const auto* row) { return askGenerator(*row, settings); }, parameter)};
+    }
+    const auto* const number = std::get_if<const NumberRow*>(&parameter);
+    if (number == nullptr) return {ScpiError::ParameterNotAllowed, std::nullopt};
+    const auto named = namedNumber(**number, argument);
+    if (!named) return {errorOfValue(argument), std::nullopt};
+    return {ScpiError::None, shortestDecimal(*named)};
 }
 
 std::string coderAnswer(const Parameter& parameter, const InstrumentSettings& settings) {

@@ -16,10 +16,24 @@ bool isWhite(char c) {
     return static_cast<unsigned char>(c) <= 0x20;
 }
 
-bool wordMatches(std::string_view pattern, std::string_view word) {
-    const auto shortEnd = std::find_if(pattern.begin(), pattern.end(), [](char c) { return c >= 'a' && c <= 'z'; });
-    const auto shortLength = static_cast<std::size_t>(shortEnd - pattern.begin());
-    return equalNoCase(word, pattern) || equalNoCase(word, pattern.substr(0, shortLength));
+bool isOfHeader(char c) {
+    return (c >= 'A' && c <= 'Z') || (c >= 'a' && c <= 'z') || (c >= '0' && c <= '9') || c == '_' || c == ':' ||
+           c == '*';
+}
+
+// Where the string that the parameter begins with ends: behind its closing quote; npos when it never closes.
+std::size_t endOfString(std::string_view parameter) {
+    const char quote = parameter.front();
+    for (std::size_t at = 1; at < parameter.size(); ++at) {
+        if (parameter[at] != quote) continue;
+        if (at + 1 == parameter.size() || parameter[at + 1] != quote) return at + 1;
+        ++at;  // the second of a doubled quote
+    }
+    return std::string_view::npos;
+}
+
+bool beginsString(std::string_view parameter) {
+    return !parameter.empty() && (parameter.front() == '"' || parameter.front() == '\'');
 }
 
 }  // namespace
@@ -60,10 +74,21 @@ std::string_view trimmed(std::string_view text) {
 
 CommandUnit readUnit(std::string_view unit) {
     unit = trimmed(unit);
-    const auto end = std::find_if(unit.begin(), unit.end(), [](char c) { return c == '?' || isWhite(c); });
-    const auto length = static_cast<std::size_t>(end - unit.begin());
-    const bool query = end != unit.end() && *end == '?';
-    return {unit.substr(0, length), query, trimmed(unit.substr(length + (query ? 1 : 0)))};
+    const auto end = std::find_if_not(unit.begin(), unit.end(), isOfHeader);
+    CommandUnit result;
+    result.header = unit.substr(0, static_cast<std::size_t>(end - unit.begin()));
+    std::string_view rest = unit.substr(result.header.size());
+    result.query = !rest.empty() && rest.front() == '?';
+    if (result.query) rest.remove_prefix(1);
+    result.separated = rest.empty() || isWhite(rest.front());
+    result.parameter = trimmed(rest);
+    return result;
+}
+
+bool wordMatches(std::string_view pattern, std::string_view word) {
+    const auto shortEnd = std::find_if(pattern.begin(), pattern.end(), [](char c) { return c >= 'a' && c <= 'z'; });
+    const auto shortLength = static_cast<std::size_t>(shortEnd - pattern.begin());
+    return equalNoCase(word, pattern) || equalNoCase(word, pattern.substr(0, shortLength));
 }
 
 bool headerMatches(std::string_view pattern, std::string_view header) {
@@ -78,16 +103,39 @@ bool headerMatches(std::string_view pattern, std::string_view header) {
     }
 }
 
+ScpiError checkOneParameter(const CommandUnit& unit) {
+    if (!unit.separated) return ScpiError::InvalidSeparator;
+    const bool several = splitOutsideQuotes(unit.parameter, ',').size() > 1;
+    return several ? ScpiError::ParameterNotAllowed : ScpiError::None;
+}
+
+ScpiError errorOfValue(std::string_view parameter) {
+    const bool two = std::any_of(parameter.begin(), parameter.end(), [](char c) { return isWhite(c) || c == ':'; });
+    return two ? ScpiError::InvalidSeparator : ScpiError::IllegalValue;
+}
+
+ScpiError errorOfSuffix(std::string_view suffix) {
+    const bool another = isDecimal(suffix.substr(0, 1)) || errorOfValue(suffix) == ScpiError::InvalidSeparator;
+    return another ? ScpiError::InvalidSeparator : ScpiError::InvalidSuffix;
+}
+
+ScpiError errorOfString(std::string_view parameter) {
+    if (!beginsString(parameter)) return ScpiError::InvalidString;
+    const std::size_t end = endOfString(parameter);
+    if (end == std::string_view::npos || parameter.substr(end).find(parameter.front()) != std::string_view::npos) {
+        return ScpiError::InvalidString;
+    }
+    return ScpiError::InvalidSeparator;
+}
+
 std::optional<std::string> unquoted(std::string_view parameter) {
-    if (parameter.size() < 2 || parameter.front() != '"' || parameter.back() != '"') return std::nullopt;
+    if (!beginsString(parameter) || endOfString(parameter) != parameter.size()) return std::nullopt;
+    const char quote = parameter.front();
     const std::string_view inner = parameter.substr(1, parameter.size() - 2);
     std::string text;
-    for (std::size_t i = 0; i < inner.size(); ++i) {
-        if (inner[i] == '"') {
-            ++i;  // the second of a doubled quote
-            if (i == inner.size() || inner[i] != '"') return std::nullopt;
-        }
-        text += inner[i];
+    for (std::size_t at = 0; at < inner.size(); ++at) {
+        text += inner[at];
+        if (inner[at] == quote) ++at;  // the second of a doubled quote
     }
     return text;
 }

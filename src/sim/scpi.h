@@ -5,12 +5,15 @@
 #include <string_view>
 #include <vector>
 
+#include "sim/errorqueue.h"
+
 namespace kdx::sim {
 
 /// One command of a program message, cut into its pieces; the views point into the message.
 struct CommandUnit {
     std::string_view header;     ///< without question mark; a leading colon is still there
     bool query = false;          ///< a question mark followed the header
+    bool separated = true;       ///< white space stood before the parameter, as it should
     std::string_view parameter;  ///< without the blanks around it
 };
 
@@ -37,7 +40,7 @@ struct HeadAndTail {
 /// The text without white space at both ends: blanks and every control character.
 [[nodiscard]] std::string_view trimmed(std::string_view text);
 
-/// Cuts one command at its question mark or its first white space.
+/// Cuts one command after its header.
 [[nodiscard]] CommandUnit readUnit(std::string_view unit);
 
 /// True when the header fits the pattern in any letter case, each of its words in the long form or in the short one.
@@ -45,8 +48,21 @@ struct HeadAndTail {
 /// @param header with or without a leading colon.
 [[nodiscard]] bool headerMatches(std::string_view pattern, std::string_view header);
 
-/// The text inside a parameter in double quotes; a doubled quote stands for one. Nothing when the quotes are missing
-/// or do not close at the end of the parameter.
+/// True when the word is the pattern's long form or its short one, in any letter case.
+[[nodiscard]] bool wordMatches(std::string_view pattern, std::string_view word);
+
+/// What is wrong with a command that takes at most one parameter, before that one is looked at: the separator in front
+/// of it, or a second one behind it.
+[[nodiscard]] ScpiError checkOneParameter(const CommandUnit& unit);
+
+/// What is wrong with a parameter that is no number, no word that belongs there, or no whole string: it may be two
+/// without a comma between them. The same for the suffix of a number that is none.
+[[nodiscard]] ScpiError errorOfValue(std::string_view parameter);
+[[nodiscard]] ScpiError errorOfSuffix(std::string_view suffix);
+[[nodiscard]] ScpiError errorOfString(std::string_view parameter);
+
+/// The text inside a parameter in double or single quotes; a doubled quote stands for one. Nothing when the quotes are
+/// missing or do not close at the end of the parameter.
 [[nodiscard]] std::optional<std::string> unquoted(std::string_view parameter);
 
 /// The text in double quotes, its own quotes doubled.

@@ -7,6 +7,7 @@
 #include "sim/coder.h"
 #include "sim/errorqueue.h"
 #include "sim/setup.h"
+#include "sim/status.h"
 
 namespace kdx {
 class Clock;
@@ -41,30 +42,23 @@ public:
     void deviceClear() {}
 
     /// Queues an error, also one that only the transport notices (a client reads though nothing was asked: -420).
-    void report(ScpiError error);
+    void report(ScpiError error) { m_status.report(error); }
 
-    /// IEEE 488.2 status byte: 4 errors are queued, 16 an answer waits to be fetched, 32 an error event has not been
-    /// asked for.
-    /// @param messageAvailable bit 4, of which the transport knows.
+    /// The status byte of IEEE 488.2, see Status.
+    /// @param messageAvailable whether the client has an answer to fetch, of which the transport knows.
     [[nodiscard]] unsigned char statusByte(bool messageAvailable = false) const;
 
 private:
-    struct SystemRow;
-    static const SystemRow* systemRow(std::string_view header, bool query);
-
     std::string executeLine(std::string_view line);
     Reply executeUnit(const CommandUnit& unit, std::string& path);
     std::optional<Reply> tryHeader(std::string_view header, const CommandUnit& unit);
     Reply direct(const CommandUnit& unit);
     void reset();
-    void clearStatus();
-    std::string takeEvents();
 
     std::string m_identification;
     InstrumentSettings m_settings;
     Coder m_coder;
-    ErrorQueue m_errors;
-    unsigned char m_events = 0;
+    Status m_status;
 };
 
 }  // namespace kdx::sim

@@ -30,7 +30,7 @@ TEST_F(CoderTest, AnswersEveryQueryOfACoderJustSwitchedOn) {
 
 TEST_F(CoderTest, TakesNamesInAnyLetterCaseWithABlankForTheHyphenAndAQuestionMark) {
     coder("pilot=1");
-    EXPECT_EQ(error(), -113);
+    EXPECT_EQ(error(), -224);
     coder("pil-dev=500");
     EXPECT_EQ(askCoder("Pil-Dev"), "\"500\"");
     EXPECT_EQ(askCoder("PIL DEV?"), "\"500\"");

@@ -95,7 +95,7 @@ TEST_F(OtherNetworksTest, RefuseWhatTheyCannotHold) {
                                         {"EON-TA=D3C2,on", -224},
                                         {"EON-AFA=D3C2,85", -222},
                                         {"EON-AFB=D3C2,87.6", -224},
-                                        {"EON-XY=D3C2,1", -113}}) {
+                                        {"EON-XY=D3C2,1", -224}}) {
         coder(command);
         EXPECT_EQ(error(), code) << command;
     }

@@ -258,7 +258,7 @@ TEST_F(ReadbackTest, AQueryTheInstrumentDoesNotKnowFailsOnceAndTheNextOneWorks) 
     EXPECT_EQ(link.X4_Abfrage("?", "XYZ"), "");
     EXPECT_EQ(failures, std::vector<std::string>{"Fehler: -1073807339"});
     EXPECT_EQ(link.X4_Abfrage("PI?", "PI"), "1000");
-    EXPECT_EQ(error(), -113);
+    EXPECT_EQ(error(), -224);
     EXPECT_EQ(error(), -420);
 }
 
