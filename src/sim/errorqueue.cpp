@@ -39,6 +39,10 @@ std::string_view errorText(ScpiError error) {
     return "Unknown error";
 }
 
+std::string errorAnswer(ScpiError error) {
+    return std::to_string(static_cast<int>(error)).append(",\"").append(errorText(error)).append("\"");
+}
+
 void ErrorQueue::push(ScpiError error) {
     if (m_errors.size() < kCapacity) {
         m_errors.push_back(error);
@@ -53,7 +57,7 @@ std::string ErrorQueue::pop() {
         error = m_errors.front();
         m_errors.pop_front();
     }
-    return std::to_string(static_cast<int>(error)).append(",\"").append(errorText(error)).append("\"");
+    return errorAnswer(error);
 }
 
 }  // namespace kdx::sim

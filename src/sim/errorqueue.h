@@ -30,6 +30,8 @@ enum class ScpiError : int {
 
 /// The standard's words for an error.
 [[nodiscard]] std::string_view errorText(ScpiError error);
+/// The error as the instrument tells it: its number, a comma and its text in double quotes.
+[[nodiscard]] std::string errorAnswer(ScpiError error);
 
 /// What one command comes to: an error, or an answer to a query (without quotes and line end), or neither.
 struct Reply {
@@ -44,7 +46,7 @@ public:
     static constexpr std::size_t kCapacity = 32;
 
     void push(ScpiError error);
-    /// Takes the oldest error out: its number, a comma and its text in double quotes; 0,"No error" when there is none.
+    /// Takes the oldest error out and tells it; 0,"No error" when there is none.
     std::string pop();
     void clear() { m_errors.clear(); }
     [[nodiscard]] bool empty() const { return m_errors.empty(); }

@@ -53,10 +53,15 @@ Reply VirtualInstrument::executeUnit(const CommandUnit& unit, std::string& path)
     const bool common = unit.header.starts_with('*');
     const bool fromTheTop = common || unit.header.starts_with(':');
     const std::string header = (fromTheTop ? std::string() : path).append(unit.header);
-    const auto reply = tryHeader(header, unit);
-    if (!reply) return {ScpiError::UndefinedHeader, std::nullopt};
-    if (!common) path = header.substr(0, header.rfind(':') + 1);
-    return *reply;
+    const auto found = tryHeader(header, unit);
+    if (found && !common) path = header.substr(0, header.rfind(':') + 1);
+    const Reply reply = found.value_or(Reply{ScpiError::UndefinedHeader, std::nullopt});
+    if (m_observer) {
+        CommandUnit inFull = unit;
+        inFull.header = header;
+        m_observer(inFull, reply.error);
+    }
+    return reply;
 }
 
 std::optional<Reply> VirtualInstrument::tryHeader(std::string_view header, const CommandUnit& unit) {

@@ -1,8 +1,10 @@
 #pragma once
 
+#include <functional>
 #include <optional>
 #include <string>
 #include <string_view>
+#include <utility>
 
 #include "sim/coder.h"
 #include "sim/errorqueue.h"
@@ -36,6 +38,10 @@ public:
     /// several lines is several messages.
     std::string execute(std::string_view message);
 
+    /// Hears of every command once it has been carried out or refused, its header in full.
+    using UnitObserver = std::function<void(const CommandUnit& unit, ScpiError error)>;
+    void onUnit(UnitObserver observer) { m_observer = std::move(observer); }
+
     /// A device clear: ends whatever the instrument is still doing for its clients, and by IEEE 488.2 leaves settings,
     /// memories, errors and event bits alone. Every command is complete when execute returns, so nothing is left to
     /// end here; unread answers and half-received messages are the transport's to drop.
@@ -59,6 +65,7 @@ private:
     InstrumentSettings m_settings;
     Coder m_coder;
     Status m_status;
+    UnitObserver m_observer;
 };
 
 }  // namespace kdx::sim

@@ -19,6 +19,7 @@
 #include <string>
 #include <string_view>
 #include <system_error>
+#include <utility>
 
 namespace {
 
@@ -78,15 +79,18 @@ void declareOptions(CLI::App& commandLine, Options& options) {
 /// The virtual instrument as the server sees it.
 class InstrumentDevice final : public kdx::sim::MessageDevice {
 public:
-    /// @param explains whether what a message asks of the coder is printed in words, too.
-    InstrumentDevice(const std::string& identification, bool explains)
-        : m_instrument(m_clock, identification), m_explains(explains) {}
+    /// @param explains whether what becomes of a message is printed in words, too.
+    InstrumentDevice(const std::string& identification, bool explains) : m_instrument(m_clock, identification) {
+        if (!explains) return;
+        m_instrument.onUnit([this](const kdx::sim::CommandUnit& unit, kdx::sim::ScpiError error) {
+            const std::string words = kdx::simserver::describe(unit, error);
+            if (!words.empty()) m_words += (m_words.empty() ? "" : "; ") + words;
+        });
+    }
     std::string execute(std::string_view message) override {
-        if (m_explains) {
-            const std::string words = kdx::simserver::describe(message);
-            if (!words.empty()) printLine("       " + words);
-        }
-        return m_instrument.execute(message);
+        std::string answer = m_instrument.execute(message);
+        if (!m_words.empty()) printLine("       " + std::exchange(m_words, {}));
+        return answer;
     }
     void clear() override { m_instrument.deviceClear(); }
     unsigned char statusByte(bool messageAvailable) override { return m_instrument.statusByte(messageAvailable); }
@@ -95,7 +99,7 @@ public:
 private:
     kdx::SystemClock m_clock;
     kdx::sim::VirtualInstrument m_instrument;
-    bool m_explains;
+    std::string m_words;  // of the message under way
 };
 
 /// Makes SIGINT and SIGTERM end the server's run instead of the process.

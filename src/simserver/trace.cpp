@@ -6,7 +6,6 @@
 #include <cstdint>
 
 #include "base/codepage.h"
-#include "sim/scpi.h"
 
 namespace kdx::simserver {
 
@@ -196,17 +195,10 @@ std::string describeCoderCommand(std::string_view command) {
 
 }  // namespace
 
-std::string describe(std::string_view message) {
-    std::string words;
-    for (const std::string_view text : splitOutsideQuotes(message, ';')) {
-        const sim::CommandUnit unit = sim::readUnit(text);
-        if (unit.query || !sim::headerMatches("STEReo:DIRect", unit.header)) continue;
-        const std::string description = describeCoderCommand(sim::unquoted(unit.parameter).value_or(""));
-        if (description.empty()) continue;
-        if (!words.empty()) words += "; ";
-        words += description;
-    }
-    return words;
+std::string describe(const sim::CommandUnit& unit, sim::ScpiError error) {
+    if (error != sim::ScpiError::None) return "refused: " + sim::errorAnswer(error);
+    if (unit.query || !sim::headerMatches("STEReo:DIRect", unit.header)) return {};
+    return describeCoderCommand(sim::unquoted(unit.parameter).value_or(""));
 }
 
 }  // namespace kdx::simserver

@@ -1,13 +1,16 @@
 #pragma once
 
+#include "sim/errorqueue.h"
+#include "sim/scpi.h"
+
 #include <string>
-#include <string_view>
 
 namespace kdx::simserver {
 
-/// Says in words what a program message asks of the coder, where its text does not say so by itself: the fields of a
-/// traffic message (8A) and of its announcement (3A), radiotext, AF lists, other networks, set-ups. "" when there is
-/// nothing to add; several commands are joined by "; ".
-[[nodiscard]] std::string describe(std::string_view message);
+/// Says in words what became of a command: that it was refused and why, or what it asks of the coder where its text
+/// does not say so by itself: the fields of a traffic message (8A) and of its announcement (3A), radiotext, AF lists,
+/// other networks, set-ups. "" when there is nothing to add.
+/// @param unit its header in full.
+[[nodiscard]] std::string describe(const sim::CommandUnit& unit, sim::ScpiError error);
 
 }  // namespace kdx::simserver

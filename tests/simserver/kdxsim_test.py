@@ -98,6 +98,19 @@ class Run(unittest.TestCase):
             self.assertEqual(sim.output.splitlines(), ["link 1 opened: gpib0,28", r"link 1 < *IDN?\r\n",
                                                        r"link 1 > ME\n", "link 1 closed"])
 
+    def testTheTraceSaysWhatBecameOfAMessage(self):
+        with KdxSim(PROGRAM, "--trace") as sim:
+            device = pyvisa.ResourceManager("@py").open_resource("TCPIP::127.0.0.1::inst0::INSTR")
+            device.write(':STEREO:DIRECT "PTY=07";:STEREO:DIRECT "PTY=32";:STEREO:PILOT:STATE ON;NONSENSE 1')
+            device.write(':STEREO:RDS:STATE ON')
+            device.write(':STEREO:RDS:STATE ON;:STEREO:DIRECT "BIN=0";DIRECT "BIN=2"')
+            device.close()
+            self.assertEqual(sim.end(), 0)
+            words = [line for line in sim.output.splitlines() if not line.startswith("link")]
+            self.assertEqual(words, ['       programme type 07; refused: -222,"Data out of range"; '
+                                     'refused: -113,"Undefined header"',
+                                     "       normal operation; test pattern 2"])
+
     def testTheIdentificationIsAnsweredAsItWasGiven(self):
         for identification in ("KDX,KDX-X4,7,2.00", "[a,b]", "-7", "--trace", "'x' \"y\"", "%%", "{}"):
             with self.subTest(identification=identification), KdxSim(PROGRAM, "--idn", identification) as sim:

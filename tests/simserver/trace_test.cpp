@@ -16,7 +16,14 @@ struct TraceCase {
 class Trace : public ::testing::TestWithParam<TraceCase> {};
 
 TEST_P(Trace, SaysInWordsWhatTheCommandAsks) {
-    EXPECT_EQ(describe(GetParam().message), GetParam().words);
+    EXPECT_EQ(describe(sim::readUnit(GetParam().message), sim::ScpiError::None), GetParam().words);
+}
+
+TEST(TraceOfRefusals, SaysWhyTheInstrumentDidNotTakeTheCommand) {
+    const sim::CommandUnit unit = sim::readUnit(R"(:STEREO:DIRECT "PTY=32")");
+    EXPECT_EQ(describe(unit, sim::ScpiError::OutOfRange), "refused: -222,\"Data out of range\"");
+    EXPECT_EQ(describe(sim::readUnit("NONSENSE?"), sim::ScpiError::UndefinedHeader),
+              "refused: -113,\"Undefined header\"");
 }
 
 INSTANTIATE_TEST_SUITE_P(
@@ -69,10 +76,8 @@ INSTANTIATE_TEST_SUITE_P(
         TraceCase{R"(:STEREO:DIRECT "EON-AFB=D3C2,N,87.6,90.1")",
                   "other network D3C2: first AF list of a new set, tuned to 87.6 MHz, 1 alternatives, method A"},
         TraceCase{R"(:STEREO:DIRECT "STORE=3")", "set-up stored in memory 3"},
-        TraceCase{R"(:STEREO:DIRECT "DS=3")", "set-up recalled from memory 3"},
-        TraceCase{"*CLS;:STEREO:DIRECT \"PTY=07\";:STEREO:DIRECT \"BIN=0\"\r\n", "programme type 07; normal operation"},
-        TraceCase{":STEREO:PILOT:STATE ON", ""}, TraceCase{R"(:STEREO:DIRECT? "PS")", ""},
-        TraceCase{R"(:STEREO:DIRECT "TA=1")", ""},
+        TraceCase{R"(:STEREO:DIRECT "DS=3")", "set-up recalled from memory 3"}, TraceCase{":STEREO:PILOT:STATE ON", ""},
+        TraceCase{R"(:STEREO:DIRECT? "PS")", ""}, TraceCase{R"(:STEREO:DIRECT "TA=1")", ""},
         TraceCase{R"(:STEREO:DIRECT "AF=")",
                   "first AF list of a new set, tuned to  MHz, 0 "
                   "alternatives, method A"},
