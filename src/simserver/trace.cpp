@@ -25,6 +25,13 @@ std::uint64_t hexValue(std::string_view digits) {
     return value;
 }
 
+std::string hexDigits(std::uint64_t value, unsigned count) {
+    constexpr std::string_view kDigits = "0123456789ABCDEF";
+    std::string digits;
+    for (unsigned i = count; i > 0; --i) digits += kDigits[(value >> (4 * (i - 1))) & 0xF];
+    return digits;
+}
+
 /// Takes bit fields off a group's contents, the most significant first.
 class BitReader {
 public:
@@ -66,11 +73,22 @@ std::string yesNo(std::uint64_t bit) {
     return bit == 0 ? "no" : "yes";
 }
 
+// The group that an application's data come in: four bits of type, one of version. Two codes are no group.
 std::string groupName(std::uint64_t code) {
-    return number(code >> 1) + ((code & 1) == 0 ? "A" : "B");
+    constexpr std::uint64_t kNoGroup = 0;
+    constexpr std::uint64_t kFault = 31;
+    if (code == kNoGroup) return "no group of its own";
+    if (code == kFault) return "no group for now (fault)";
+    return "group " + number(code >> 1) + ((code & 1) == 0 ? "A" : "B");
 }
 
-// The 16 bits that an announcement of traffic messages carries; what they mean depends on the variant in front.
+// Seconds, in the two bits that enhanced mode has for each of its times.
+std::string timeOf(std::uint64_t code) {
+    return number(std::uint64_t{1} << code) + " s";
+}
+
+// The 16 bits that an announcement of traffic messages carries (ISO 14819-1); what they mean depends on the variant in
+// front.
 std::string describeSystemInformation(std::uint64_t word) {
     BitReader bits(word, 16);
     const std::uint64_t variant = bits.take(2);
@@ -83,13 +101,25 @@ std::string describeSystemInformation(std::uint64_t word) {
         for (const char* area : {"international ", "national ", "regional ", "urban "}) {
             if (bits.take(1) == 1) scope += area;
         }
-        return "location table " + number(table) + ", alternative frequencies " + yesNo(alternative) +
-               ", enhanced mode " + yesNo(enhanced) + ", scope " +
+        return "location table " + number(table) + (table == 0 ? " (encrypted)" : "") + ", alternative frequencies " +
+               yesNo(alternative) + ", enhanced mode " + yesNo(enhanced) + ", scope " +
                (scope.empty() ? "none" : scope.substr(0, scope.size() - 1));
     }
     if (variant == 1) {
-        const std::uint64_t gap = bits.take(2);
-        return "gap code " + number(gap) + ", service " + number(bits.take(6));
+        constexpr std::array<std::uint64_t, 4> kGaps = {3, 5, 8, 11};
+        const std::uint64_t gap = kGaps[bits.take(2)];
+        const std::uint64_t service = bits.take(6);
+        const std::string activity = timeOf(bits.take(2));
+        const std::string window = timeOf(bits.take(2));
+        const std::uint64_t delay = bits.take(2);
+        return "gap of " + number(gap) + " groups, service " + number(service) + ", activity " + activity +
+               ", window " + window + ", delay " + number(delay) + " s";
+    }
+    if (variant == 2) {
+        const std::uint64_t country = bits.take(4);
+        bits.take(2);  // reserved
+        return "location table country " + hexDigits(country, 1) + ", extended country code " +
+               hexDigits(bits.take(8), 2);
     }
     return "variant " + number(variant);
 }
@@ -97,13 +127,15 @@ std::string describeSystemInformation(std::uint64_t word) {
 std::string describeOpenData(std::string_view value) {
     if (!isGroup(value)) return "incomplete open-data announcement";
     BitReader bits(hexValue(value.substr(kGroupPrefix)), 40);
-    const std::uint64_t group = bits.take(8);
+    bits.take(3);  // the group type has five bits
+    const std::uint64_t group = bits.take(5);
     const std::uint64_t word = bits.take(16);
     const std::uint64_t application = bits.take(16);
-    std::string text = "open data in group " + groupName(group) + ", application ";
+    std::string text = "open data in " + groupName(group) + ", application ";
     text.append(value.substr(value.size() - 4));
-    constexpr std::uint64_t kTrafficApplication = 0xCD46;
-    if (application == kTrafficApplication) text += " (traffic messages), " + describeSystemInformation(word);
+    constexpr std::array<std::uint64_t, 2> kTrafficApplications = {0xCD46, 0xCD47};
+    const bool traffic = std::count(kTrafficApplications.begin(), kTrafficApplications.end(), application) > 0;
+    if (traffic) text += " (traffic messages), " + describeSystemInformation(word);
     return text;
 }
 
@@ -125,22 +157,29 @@ std::string describeRadiotext(std::string_view value) {
     return "radiotext of " + number(text.size()) + " characters";
 }
 
-// "N,87.6,90.1" or, after a network's PI, the same without or with the letter.
+// "N,87.6,90.1": what kind of list it is and how many alternatives it has.
+std::string describeList(std::string_view mode, const std::vector<std::string_view>& frequencies,
+                         std::size_t alternatives, std::string_view method) {
+    return std::string(mode == "+" ? "a further AF list" : "first AF list of a new set") + ", tuned to " +
+           std::string(frequencies[0]) + " MHz, " + number(alternatives) + " alternatives, " + std::string(method);
+}
+
 std::string describeFrequencies(std::string_view value) {
     const auto [mode, rest] = cutAt(value, ',');
-    const bool append = mode == "+";
     const std::vector<std::string_view> frequencies = splitOutsideQuotes(rest.value_or(""), ',');
     // Method B repeats the tuned frequency in every pair: it stands twice at the beginning.
     const bool methodB = frequencies.size() > 1 && frequencies[0] == frequencies[1];
     const std::size_t alternatives = methodB ? (frequencies.size() - 1) / 2 : frequencies.size() - 1;
-    return std::string(append ? "a further AF list" : "first AF list of a new set") + ", tuned to " +
-           std::string(frequencies[0]) + " MHz, " + number(alternatives) + " alternatives, method " +
-           (methodB ? "B" : "A");
+    return describeList(mode, frequencies, alternatives, methodB ? "method B" : "method A");
 }
 
+// The frequencies of another network have no method: each is mapped to the tuned frequency of this one.
 std::string describeNetworkFrequencies(std::string_view value) {
-    const auto [pi, list] = cutAt(value, ',');
-    return "other network " + std::string(pi) + ": " + describeFrequencies(list.value_or(""));
+    const auto [pi, rest] = cutAt(value, ',');
+    const auto [mode, list] = cutAt(rest.value_or(""), ',');
+    const std::vector<std::string_view> frequencies = splitOutsideQuotes(list.value_or(""), ',');
+    return "other network " + std::string(pi) + ": " +
+           describeList(mode, frequencies, frequencies.size() - 1, "mapped");
 }
 
 std::string describeClock(std::string_view value) {
