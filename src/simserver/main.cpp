@@ -1,13 +1,16 @@
 // kdx-sim: the virtual generator with its coder as a program of its own, a network instrument of the VXI-11 standard.
 
 #include "base/clock.h"
+#include "base/printable.h"
 #include "sim/virtualinstrument.h"
+#include "simserver/linewriter.h"
 #include "simserver/portannouncement.h"
 #include "simserver/trace.h"
 #include "simserver/vxi11server.h"
 
 #include <poll.h>
 #include <sys/signalfd.h>
+#include <unistd.h>
 #include <vxi11.h>
 #include <CLI/CLI.hpp>
 
@@ -16,6 +19,7 @@
 #include <csignal>
 #include <exception>
 #include <iostream>
+#include <memory>
 #include <string>
 #include <string_view>
 #include <system_error>
@@ -36,6 +40,7 @@ runs.)";
 struct Options {
     kdx::simserver::Vxi11Options server;
     std::string identification = kdx::sim::kDefaultIdentification;
+    bool trace = false;
 };
 
 unsigned short portNumber(const std::string& text) {
@@ -65,8 +70,7 @@ void declareOptions(CLI::App& commandLine, Options& options) {
         ->type_name("ADDR")
         ->take_last();
     commandLine.add_option("--idn", options.identification, "the answer to *IDN?")->type_name("TEXT")->take_last();
-    commandLine.add_flag_callback(
-        "--trace", [&] { options.server.trace = printLine; }, "print what happens on every link");
+    commandLine.add_flag("--trace", options.trace, "print what happens on every link");
     commandLine.set_help_flag("--help", "print this and end");
     commandLine.set_version_flag("--version", "kdx-sim " KDX_VERSION, "print the version and end");
     commandLine.footer(kFooter);
@@ -79,17 +83,14 @@ void declareOptions(CLI::App& commandLine, Options& options) {
 /// The virtual instrument as the server sees it.
 class InstrumentDevice final : public kdx::sim::MessageDevice {
 public:
-    /// @param explains whether what becomes of a message is printed in words, too.
-    InstrumentDevice(const std::string& identification, bool explains) : m_instrument(m_clock, identification) {
-        if (!explains) return;
-        m_instrument.onUnit([this](const kdx::sim::CommandUnit& unit, kdx::sim::ScpiError error) {
-            const std::string words = kdx::simserver::describe(unit, error);
-            if (!words.empty()) m_words += (m_words.empty() ? "" : "; ") + words;
-        });
+    /// @param trace gets in words what becomes of a message; null: nobody wants to know.
+    InstrumentDevice(const std::string& identification, kdx::simserver::LineWriter* trace)
+        : m_instrument(m_clock, identification), m_trace(trace) {
+        if (m_trace != nullptr) m_instrument.onUnit([this](const auto& unit, auto error) { explain(unit, error); });
     }
     std::string execute(std::string_view message) override {
         std::string answer = m_instrument.execute(message);
-        if (!m_words.empty()) printLine("       " + std::exchange(m_words, {}));
+        if (!m_words.empty()) m_trace->print("       " + kdx::printable(std::exchange(m_words, {})));
         return answer;
     }
     void clear() override { m_instrument.deviceClear(); }
@@ -97,31 +98,40 @@ public:
     void report(kdx::sim::ScpiError error) override { m_instrument.report(error); }
 
 private:
+    void explain(const kdx::sim::CommandUnit& unit, kdx::sim::ScpiError error) {
+        constexpr std::size_t kMost = 2000;  // of a message of thousands of commands the first ones will do
+        if (m_words.size() > kMost) return;
+        const std::string words = kdx::simserver::describe(unit, error);
+        if (!words.empty()) m_words += (m_words.empty() ? "" : "; ") + words;
+        if (m_words.size() > kMost) m_words += "; ...";
+    }
+
     kdx::SystemClock m_clock;
     kdx::sim::VirtualInstrument m_instrument;
+    kdx::simserver::LineWriter* m_trace;
     std::string m_words;  // of the message under way
 };
 
-/// Makes SIGINT and SIGTERM end the server's run instead of the process.
+/// SIGINT and SIGTERM as something to wait for instead of the process's end. To be made before any thread, which would
+/// get them otherwise.
 class EndSignals {
 public:
-    explicit EndSignals(kdx::simserver::Vxi11Server& server) : m_loop(server.loop()) {
+    EndSignals() {
         sigset_t signals;
         sigemptyset(&signals);
         sigaddset(&signals, SIGINT);
         sigaddset(&signals, SIGTERM);
         m_descriptor = kdx::FileDescriptor(::signalfd(-1, &signals, SFD_NONBLOCK | SFD_CLOEXEC));
-        if (!m_descriptor.isOpen() || ::sigprocmask(SIG_BLOCK, &signals, nullptr) != 0) {
+        if (!m_descriptor.isOpen() || ::pthread_sigmask(SIG_BLOCK, &signals, nullptr) != 0) {
             throw std::system_error(errno, std::generic_category(), "signals");
         }
-        m_loop.watch(m_descriptor.number(), POLLIN, [&server](short) { server.stop(); });
     }
-    EndSignals(const EndSignals&) = delete;
-    EndSignals& operator=(const EndSignals&) = delete;
-    ~EndSignals() { m_loop.forget(m_descriptor.number()); }
+    /// From now on they end the server's run, which must be over before this object is.
+    void endRunOf(kdx::simserver::Vxi11Server& server) const {
+        server.loop().watch(m_descriptor.number(), POLLIN, [&server](short) { server.stop(); });
+    }
 
 private:
-    kdx::simserver::PollLoop& m_loop;
     kdx::FileDescriptor m_descriptor;
 };
 
@@ -140,9 +150,16 @@ std::string portMapperText(kdx::simserver::PortAnnouncement::Way way) {
 int serve(const Options& options) {
     // The RPC library writes to the port mapper without a guard; one that hangs up must not end this program.
     std::signal(SIGPIPE, SIG_IGN);
-    InstrumentDevice device(options.identification, options.server.trace != nullptr);
-    kdx::simserver::Vxi11Server server(device, options.server);
-    const EndSignals endSignals(server);
+    const EndSignals endSignals;
+    std::unique_ptr<kdx::simserver::LineWriter> trace;
+    kdx::simserver::Vxi11Options serverOptions = options.server;
+    if (options.trace) {
+        trace = std::make_unique<kdx::simserver::LineWriter>(STDOUT_FILENO);
+        serverOptions.trace = [&trace](std::string_view line) { trace->print(line); };
+    }
+    InstrumentDevice device(options.identification, trace.get());
+    kdx::simserver::Vxi11Server server(device, serverOptions);
+    endSignals.endRunOf(server);
     const kdx::simserver::PortAnnouncement announcement(server.loop(),
                                                         {{DEVICE_CORE, DEVICE_CORE_VERSION, server.corePort()},
                                                          {DEVICE_ASYNC, DEVICE_ASYNC_VERSION, server.abortPort()}},

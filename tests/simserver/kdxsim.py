@@ -30,6 +30,13 @@ class KdxSim:
         if self._process.poll() is None:
             self.end()
 
+    def sendSignal(self, number):
+        self._process.send_signal(number)
+
+    def wait(self):
+        """The exit code, without reading what the program prints."""
+        return self._process.wait(timeout=30)
+
     def end(self, by=signal.SIGTERM):
         """Ends the program; its exit code, and what it printed since it was ready."""
         self._process.send_signal(by)

@@ -111,6 +111,35 @@ class Run(unittest.TestCase):
                                      'refused: -113,"Undefined header"',
                                      "       normal operation; test pattern 2"])
 
+    def testTheTraceShowsControlCharactersAsEscapes(self):
+        with KdxSim(PROGRAM, "--trace") as sim:
+            device = pyvisa.ResourceManager("@py").open_resource("TCPIP::127.0.0.1::inst0::INSTR")
+            device.write_raw(b':STEREO:DIRECT "STORE=1\x1b[2J\x07";:STEREO:DIRECT "BIN=1\t"')
+            device.write_raw(b':STEREO:DIRECT "STORE=\x0b1"')
+            device.close()
+            self.assertEqual(sim.end(), 0)
+            self.assertIn(r"\x1B[2J", sim.output)
+            self.assertIn(r"set-up stored in memory \x0B1", sim.output)
+            self.assertEqual([c for c in sim.output if c < " " and c != "\n"], [])
+
+    def testATraceThatNobodyReadsHoldsUpNobody(self):
+        with KdxSim(PROGRAM, "--trace") as sim:
+            device = pyvisa.ResourceManager("@py").open_resource("TCPIP::127.0.0.1::inst0::INSTR")
+            for _ in range(1000):
+                device.write("X" * 1000)
+            self.assertEqual(device.query("*OPC?"), "1\n")
+            device.close()
+            self.assertEqual(sim.end(), 0)
+            self.assertRegex(sim.output, r"(?m)^\d+ lines dropped that nobody read$")
+
+    def testItEndsThoughNobodyReadsItsTrace(self):
+        with KdxSim(PROGRAM, "--trace") as sim:
+            device = pyvisa.ResourceManager("@py").open_resource("TCPIP::127.0.0.1::inst0::INSTR")
+            for _ in range(200):
+                device.write("X" * 1000)
+            sim.sendSignal(signal.SIGTERM)
+            self.assertEqual(sim.wait(), 0)
+
     def testTheIdentificationIsAnsweredAsItWasGiven(self):
         for identification in ("KDX,KDX-X4,7,2.00", "[a,b]", "-7", "--trace", "'x' \"y\"", "%%", "{}"):
             with self.subTest(identification=identification), KdxSim(PROGRAM, "--idn", identification) as sim:
