@@ -21,12 +21,13 @@ using SignedArgument = std::intptr_t;
 struct Operations {
     std::int32_t(KDX_LIBRARY_CALL* viOpenDefaultRM)(std::uint32_t* resourceManager);
     std::int32_t(KDX_LIBRARY_CALL* viOpen)(Argument resourceManager, char* resource, Argument accessMode,
-                                        Argument openTimeout, std::uint32_t* session);
+                                           Argument openTimeout, std::uint32_t* session);
     std::int32_t(KDX_LIBRARY_CALL* viClose)(Argument object);
     std::int32_t(KDX_LIBRARY_CALL* viStatusDesc)(Argument object, SignedArgument status, char* description);
     std::int32_t(KDX_LIBRARY_CALL* viWrite)(Argument session, const unsigned char* bytes, Argument count,
-                                         std::uint32_t* written);
-    std::int32_t(KDX_LIBRARY_CALL* viRead)(Argument session, unsigned char* buffer, Argument size, std::uint32_t* count);
+                                            std::uint32_t* written);
+    std::int32_t(KDX_LIBRARY_CALL* viRead)(Argument session, unsigned char* buffer, Argument size,
+                                           std::uint32_t* count);
 };
 
 /// Room for a number that the library gives back. A library whose types have 64 bits writes eight bytes, of which the

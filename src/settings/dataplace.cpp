@@ -53,7 +53,8 @@ fs::path chooseAppFolder(const DataPlaces& places, std::string& problem) {
     if (!places.user.is_absolute()) {
         // Never a folder in the current one, wherever that happens to be: nothing is kept then.
         problem =
-            "no folder is known for your settings, so that they cannot be kept: HOME (APPDATA on Windows) is not set. Set "
+            "no folder is known for your settings, so that they cannot be kept: HOME is not set (on Windows: APPDATA). "
+            "Set "
             "it, or name a folder with --app-folder.";
         return places.program;
     }

@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include "support/sourcefolder.h"
 #include "support/tempfolder.h"
 
 namespace kdx {
@@ -22,7 +23,7 @@ protected:
 };
 
 TEST_F(ProfileCacheTest, AFileThatStaysTheSameIsReadOnce) {
-    const fs::path shipped = fs::path(KDX_SOURCE_DIR) / "Daten" / "Sprachen.ini";
+    const fs::path shipped = test::sourceFolder() / "Daten" / "Sprachen.ini";
     const auto text = m_cache.load(shipped);
     ASSERT_NE(text, nullptr);
     EXPECT_EQ(m_cache.load(shipped), text);

@@ -149,10 +149,11 @@ TEST_F(TmcLinkTest, TheTraceOfTheInstrumentSaysInWordsWhatWasSent) {
     }
     const std::string announced = "open data in group 8A, application CD46 (traffic messages), ";
     EXPECT_EQ(decoded,
-              (Lines{announced + "gap code 2, service 4", messages[1].words(),
+              (Lines{announced + "gap of 8 groups, service 4, activity 1 s, window 1 s, delay 0 s", messages[1].words(),
                      announced + "location table 1, alternative frequencies yes, enhanced mode no, scope national "
                                  "regional",
-                     messages[2].words(), announced + "gap code 2, service 4", messages[0].words()}));
+                     messages[2].words(), announced + "gap of 8 groups, service 4, activity 1 s, window 1 s, delay 0 s",
+                     messages[0].words()}));
 }
 
 }  // namespace
