@@ -1,29 +1,27 @@
 #pragma once
 
 #include "af/aflistview.h"
-#include "ui/pagecontext.h"
+#include "ui/clickablelabel.h"
+#include "ui/form.h"
 
 #include <QDialog>
-
-class QGroupBox;
-class QLineEdit;
-class QPushButton;
+#include <QGroupBox>
+#include <QLineEdit>
+#include <QPushButton>
 
 namespace kdx {
 
-class ClickableLabel;
 struct Place;
 
 /// The editor of the five AF lists of the current data set: the own programme's or, when ProgramState::afEditorKind is
 /// "EON AF", the other network's. It edits and stores only. It opens on list 1, in the current language.
-class AF_Listenform : public QDialog {
+class AF_Listenform : public QDialog, public Form {
     Q_OBJECT
 public:
     AF_Listenform(const PageContext& with, QWidget* parent);
 
 private:
     void create();
-    void createChange();
     void arrange();
     void Form_Load();
     void AFList_Opt_Click(int index);
@@ -32,7 +30,7 @@ private:
     void AF_OF_add_Click();
     void Rem_Freq_Click();
     void Uebernahme_Knopf_Click();
-    void Ende_Knopf_Click();
+    void Ende_Knopf_Click() { reject(); }
 
     /// Where the list with that option is kept.
     [[nodiscard]] const Place& place(int index) const;
@@ -41,9 +39,6 @@ private:
     /// What `Text2` reads when it is an allowed AF; else says so and gives an empty text.
     [[nodiscard]] QString checkedEntry();
     void refuse(int reason);
-
-    PageContext m_with;
-    CaptionBook m_book;
 
     AfListView m_view;                // AFList_Opt, AF_TN, AF_List1
     ClickableLabel* AF_TN = nullptr;  // tuned frequency; a click asks for a new one
@@ -55,9 +50,7 @@ private:
     QPushButton* Uebernahme_Knopf = nullptr;
     QPushButton* Ende_Knopf = nullptr;
 
-    QGroupBox* m_choice = nullptr;
-    QGroupBox* m_content = nullptr;
-    QGroupBox* m_change = nullptr;
+    QGroupBox *m_choice = nullptr, *m_content = nullptr, *m_change = nullptr;
     QLabel* m_entryHeading = nullptr;
 };
 

@@ -2,9 +2,7 @@
 
 #include "af/modul2.h"
 #include "settings/storedvalue.h"
-
-#include <QBoxLayout>
-#include <QListWidget>
+#include "ui/layouts.h"
 
 namespace kdx {
 
@@ -15,32 +13,25 @@ void AfListView::createOptions(const char* name, int caption, CaptionBook& book,
     }
 }
 
-void AfListView::createContent(QLabel* tuned, const Caption& heading, const Part& list, CaptionBook& book,
-                               QWidget* parent) {
+void AfListView::createContent(QLabel* tuned, const Caption& tunedHeading, const char* list, const Caption& listHeading,
+                               CaptionBook& book) {
+    QWidget* parent = tuned->parentWidget();
     m_tuned = tuned;
-    m_tunedHeading = new QLabel(parent);
-    m_listHeading = new QLabel(parent);
-    m_list = named<QListWidget>(list.name, parent);
     m_tuned->setFrameStyle(QFrame::Panel | QFrame::Sunken);
+    m_tunedHeading = book.captioned<QLabel>("", tunedHeading, parent);
+    m_listHeading = book.captioned<QLabel>("", listHeading, parent);
+    m_list = named<QListWidget>(list, parent);
     for (QLabel* label : {m_tuned, m_tunedHeading, m_listHeading}) label->setTextFormat(Qt::PlainText);
-    m_tunedHeading->setBuddy(m_tuned);
-    m_listHeading->setBuddy(m_list);
-    book.text(m_tunedHeading, heading);
-    book.text(m_listHeading, list.heading);
-    book.spokenAs(m_tuned, m_tunedHeading);
-    book.spokenAs(m_list, m_listHeading);
+    book.head(m_tunedHeading, m_tuned);
+    book.head(m_listHeading, m_list);
 }
 
-void AfListView::arrangeOptions(QBoxLayout* column) const {
-    for (QRadioButton* option : m_options) column->addWidget(option);
-    column->addStretch();
+QBoxLayout* AfListView::optionColumn() const {
+    return add(column(m_options), {kRoom});
 }
 
-void AfListView::arrangeContent(QBoxLayout* column) const {
-    column->addWidget(m_tunedHeading);
-    column->addWidget(m_tuned);
-    column->addWidget(m_listHeading);
-    column->addWidget(m_list, 1);
+QBoxLayout* AfListView::contentColumn() const {
+    return column({m_tunedHeading, m_tuned, m_listHeading, {m_list, 1}});
 }
 
 void AfListView::chooseStored(std::string_view number) {

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QLabel>
+#include <QListWidget>
 
 #include <string_view>
 
@@ -9,7 +10,6 @@
 #include "ui/controls.h"
 
 class QBoxLayout;
-class QListWidget;
 
 namespace kdx {
 
@@ -19,23 +19,13 @@ class AfListView {
 public:
     /// @param caption is followed by the list's number.
     void createOptions(const char* name, int caption, CaptionBook& book, QWidget* parent);
+    /// Makes the part that follows the options. @param tuned shows the tuned frequency.
+    void createContent(QLabel* tuned, const Caption& tunedHeading, const char* list, const Caption& listHeading,
+                       CaptionBook& book);
 
-    /// What shows a part of the list, and the heading above it.
-    struct Part {
-        const char* name;
-        Caption heading;
-    };
-    /// Makes the part that follows the options. @tparam Tuned kind of label that shows the tuned frequency.
-    template <typename Tuned = QLabel>
-    Tuned* createContent(const Part& tuned, const Part& list, CaptionBook& book, QWidget* parent) {
-        auto* label = named<Tuned>(tuned.name, parent);
-        createContent(label, tuned.heading, list, book, parent);
-        return label;
-    }
-
-    /// Adds the options and the room that is left under them.
-    void arrangeOptions(QBoxLayout* column) const;
-    void arrangeContent(QBoxLayout* column) const;
+    /// The options and the room that is left under them.
+    [[nodiscard]] QBoxLayout* optionColumn() const;
+    [[nodiscard]] QBoxLayout* contentColumn() const;
 
     /// Chooses the list of the number that is stored; one that no list has, such as 1.5, chooses none.
     void chooseStored(std::string_view number);
@@ -46,8 +36,6 @@ public:
     [[nodiscard]] QListWidget* list() const { return m_list; }
 
 private:
-    void createContent(QLabel* tuned, const Caption& heading, const Part& list, CaptionBook& book, QWidget* parent);
-
     OptionArray<kAfLists> m_options;
     QLabel* m_tunedHeading = nullptr;
     QLabel* m_tuned = nullptr;

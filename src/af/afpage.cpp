@@ -4,10 +4,7 @@
 #include "af/settings.h"
 #include "settings/programstate.h"
 #include "ui/dialogs.h"
-
-#include <QBoxLayout>
-#include <QGroupBox>
-#include <QPushButton>
+#include "ui/layouts.h"
 
 namespace kdx {
 
@@ -19,51 +16,27 @@ AfPage::AfPage(const PageContext& with, AfListSet& lists, QWidget* parent) : Pag
 
 void AfPage::create() {
     Frame2 = captioned<QGroupBox>("Frame2", {71}, this);
-    m_choice = new QGroupBox(Frame2);
-    m_shown = new QGroupBox(Frame2);
-    m_transmission = new QGroupBox(Frame2);
-    m_book.text(m_choice, {440, "Auswahl"});
-    m_book.text(m_shown, {441, "Inhalt"});
-    m_book.text(m_transmission, {442, "Übertragung"});
+    m_choice = captioned<QGroupBox>("", {440, "Auswahl"}, Frame2);
+    m_shown = captioned<QGroupBox>("", {441, "Inhalt"}, Frame2);
+    m_transmission = captioned<QGroupBox>("", {442, "Übertragung"}, Frame2);
 
     m_view.createOptions("AFList_Opt", 74, m_book, m_choice);
     m_view.options().onClick(this, &AfPage::AFList_Opt_Click);
-    AF_Bearbeiten = captioned<QPushButton>("AF_Bearbeiten", {72}, m_choice);
-    connect(AF_Bearbeiten, &QPushButton::clicked, this, &AfPage::AF_Bearbeiten_Click);
-    m_view.createContent({"AF_TN", {443, "Sendefrequenz [MHz]"}}, {"AF_List1", {444, "AF [MHz]"}}, m_book, m_shown);
+    AF_Bearbeiten = clicked<QPushButton>("AF_Bearbeiten", {72}, m_choice, &AfPage::AF_Bearbeiten_Click);
+    m_view.createContent(named<QLabel>("AF_TN", m_shown), {443, "Sendefrequenz [MHz]"}, "AF_List1", {444, "AF [MHz]"},
+                         m_book);
 
-    AFMethod_opt.create("AFMethod_opt", m_transmission);
-    AFMethod_opt.onClick(this, &AfPage::AFMethod_opt_Click);
-    m_book.text(AFMethod_opt[0], {75});
-    m_book.text(AFMethod_opt[1], {76});
-    Taste_AF_Senden = captioned<QPushButton>("Taste_AF_Senden", {73}, m_transmission);
-    connect(Taste_AF_Senden, &QPushButton::clicked, this, &AfPage::Taste_AF_Senden_Click);
+    createOptions(AFMethod_opt, "AFMethod_opt", {{75}, {76}}, m_transmission, &AfPage::AFMethod_opt_Click);
+    Taste_AF_Senden = clicked<QPushButton>("Taste_AF_Senden", {73}, m_transmission, &AfPage::Taste_AF_Senden_Click);
 }
 
 void AfPage::arrange() {
-    auto* choice = new QVBoxLayout(m_choice);
-    tighten(choice);
-    m_view.arrangeOptions(choice);
-    choice->addWidget(AF_Bearbeiten);
-
-    auto* shown = new QVBoxLayout(m_shown);
-    tighten(shown);
-    m_view.arrangeContent(shown);
-
-    auto* transmission = new QVBoxLayout(m_transmission);
-    tighten(transmission);
-    for (QRadioButton* option : AFMethod_opt) transmission->addWidget(option);
-    transmission->addStretch();
-    transmission->addWidget(Taste_AF_Senden);
-
+    layOut(m_choice, add(m_view.optionColumn(), {AF_Bearbeiten}));
+    layOut(m_shown, m_view.contentColumn());
+    layOut(m_transmission, add(column(AFMethod_opt), {kRoom, Taste_AF_Senden}));
     // Three equal columns in the order of the work: choose a list, look at it, send them all.
-    auto* frame = new QHBoxLayout(Frame2);
-    tighten(frame);
-    for (QGroupBox* column : {m_choice, m_shown, m_transmission}) frame->addWidget(column, 1);
-
-    auto* page = new QVBoxLayout(this);
-    tighten(page, kPageMargin);
-    page->addWidget(Frame2);
+    layOut(Frame2, row({{m_choice, 1}, {m_shown, 1}, {m_transmission, 1}}));
+    layOut(this, column({Frame2}), kPageMargin);
 }
 
 void AfPage::load() {
@@ -82,10 +55,6 @@ void AfPage::AF_Bearbeiten_Click() {
     m_with.state.afEditorKind = kAfKind;
     m_openEditor();
     if (const int chosen = m_view.options().chosen(); chosen >= 0) AFList_Opt_Click(chosen);
-}
-
-void AfPage::AFMethod_opt_Click(int index) {
-    m_lists.method = index == 1 ? AfMethod::B : AfMethod::A;
 }
 
 void AfPage::Taste_AF_Senden_Click() {

@@ -4,10 +4,10 @@
 #include "af/aflistview.h"
 #include "ui/page.h"
 
-#include <functional>
+#include <QGroupBox>
+#include <QPushButton>
 
-class QGroupBox;
-class QPushButton;
+#include <functional>
 
 namespace kdx {
 
@@ -32,7 +32,7 @@ private:
     void arrange();
     void AFList_Opt_Click(int index);
     void AF_Bearbeiten_Click();
-    void AFMethod_opt_Click(int index);
+    void AFMethod_opt_Click(int index) { m_lists.method = index == 1 ? AfMethod::B : AfMethod::A; }
     void Taste_AF_Senden_Click();
     void showList(int index);
     void refuse(int number);
@@ -46,9 +46,7 @@ private:
     QPushButton* Taste_AF_Senden = nullptr;
     QPushButton* AF_Bearbeiten = nullptr;
 
-    QGroupBox* m_choice = nullptr;
-    QGroupBox* m_shown = nullptr;
-    QGroupBox* m_transmission = nullptr;
+    QGroupBox *m_choice = nullptr, *m_shown = nullptr, *m_transmission = nullptr;
 };
 
 }  // namespace kdx

@@ -3,19 +3,18 @@
 #include "af/aflistview.h"
 #include "ui/page.h"
 
+#include <QCheckBox>
+#include <QComboBox>
+#include <QGroupBox>
+#include <QLineEdit>
+#include <QPushButton>
+
 #include <functional>
 #include <string>
-
-class QCheckBox;
-class QComboBox;
-class QGroupBox;
-class QLineEdit;
-class QPushButton;
 
 namespace kdx {
 
 class PictureSwitch;
-class Ticker;
 struct OtherNetwork;
 
 /// The page "E O N": describes one other network to the coder. Its PI, which leads every EON command, is the
@@ -40,8 +39,6 @@ private:
     void createProgramme();
     void createLists();
     void arrange();
-    void arrangeProgramme();
-    void arrangeLists();
     void EON_PI_Text_Change();
     void EON_PI_Taste_Click();
     void EON_PS_Text_Change();
@@ -55,7 +52,7 @@ private:
     void EON_AFB_Senden_Click();
     void holdPi(const std::string& pi);
     [[nodiscard]] bool mayAnnounce();
-    void chooseStoredProgrammeType();
+    void showStoredProgrammeType();
 
     OtherNetwork& m_network;
     std::function<void()> m_openEditor;

@@ -1,15 +1,10 @@
 #include "groups/grouppage.h"
 
-#include "groups/sequencelabel.h"
 #include "groups/settings.h"
 #include "settings/programstate.h"
-#include "ui/controls.h"
 #include "ui/dialogs.h"
+#include "ui/layouts.h"
 #include "ui/text.h"
-
-#include <QGridLayout>
-#include <QPushButton>
-#include <QScrollArea>
 
 namespace kdx {
 
@@ -29,16 +24,13 @@ void GroupPage::create() {
     m_sequenceView = new QScrollArea(this);
     m_book.spoken(m_sequenceView, {83});
     Label10 = named<SequenceLabel>("Label10", m_sequenceView);
-    newList = captioned<QPushButton>("newList", {156}, this);
-    connect(newList, &QPushButton::clicked, this, &GroupPage::newList_Click);
-    GS_Senden = captioned<QPushButton>("GS_Senden", {82}, this);
-    connect(GS_Senden, &QPushButton::clicked, this, &GroupPage::GS_Senden_Click);
+    newList = clicked<QPushButton>("newList", {156}, this, &GroupPage::newList_Click);
+    GS_Senden = clicked<QPushButton>("GS_Senden", {82}, this, &GroupPage::GS_Senden_Click);
 }
 
 void GroupPage::arrange() {
     constexpr int kColumns = 4;
-    auto* page = new QGridLayout(this);
-    tighten(page, 2 * kGap);
+    auto* page = grid({});
     for (int number = 0; number < kGroups; ++number) {
         QPushButton* button = Gruppe[static_cast<std::size_t>(number)];
         button->setSizePolicy(QSizePolicy::Preferred, QSizePolicy::Preferred);
@@ -61,6 +53,7 @@ void GroupPage::arrange() {
     page->setRowStretch(below + 1, 7);  // as high as three and a half rows of buttons
     page->addWidget(newList, below + 2, 0);
     page->addWidget(GS_Senden, below + 2, kColumns - 1);
+    layOut(this, page, 2 * kGap);
 }
 
 void GroupPage::label() {

@@ -1,16 +1,15 @@
 #pragma once
 
 #include "groups/groupsequence.h"
+#include "groups/sequencelabel.h"
 #include "ui/page.h"
+
+#include <QPushButton>
+#include <QScrollArea>
 
 #include <array>
 
-class QPushButton;
-class QScrollArea;
-
 namespace kdx {
-
-class SequenceLabel;
 
 /// The page "Gruppen": composes the order in which the coder sends its groups.
 class GroupPage : public Page {

@@ -1,8 +1,6 @@
 #include "rds/dynamicps.h"
 
-#include <QCheckBox>
 #include <QCoreApplication>
-#include <QLabel>
 
 #include <algorithm>
 #include <stdexcept>
@@ -13,11 +11,8 @@
 #include "coder/sendparam.h"
 #include "rds/programme.h"
 #include "rds/settings.h"
-#include "ui/caption.h"
-#include "ui/pictureswitch.h"
 #include "ui/statusrow.h"
 #include "ui/text.h"
-#include "ui/ticker.h"
 
 namespace kdx {
 
@@ -47,24 +42,15 @@ protected:
 }  // namespace
 
 DynamicPs::DynamicPs(const PageContext& with, const Programme& programme, std::function<std::string()> typedPs,
-                     CaptionBook& book, QWidget* page)
-    : QObject(page), m_with(with), m_programme(programme), m_typedPs(std::move(typedPs)) {
-    PS_A_Label = book.captioned<QLabel>("PS_A_Label", {390, "PS dyn."}, page);
-    Taste_PS_Auto = named<PictureSwitch>("Taste_PS_Auto", with.data, page);
-    book.spokenAs(Taste_PS_Auto, PS_A_Label);
-    PS_A_Label->setBuddy(Taste_PS_Auto);
-    connect(Taste_PS_Auto, &PictureSwitch::clicked, this, &DynamicPs::Taste_PS_Auto_Click);
-    PS_dyn_Check = book.captioned<ModeBox>("PS_dyn_Check", {391, "Serial"}, page);
-    book.tip(PS_dyn_Check, {392, "unchecked:  PS toggles. / checked: PS scrolls"});
-
-    PS_Timer = named<Ticker>("PS_Timer", with.tickers, this);
-    PS_Timer->setPeriod(2500);
+                     QWidget* page)
+    : QObject(page), Form(with), m_programme(programme), m_typedPs(std::move(typedPs)) {
+    Taste_PS_Auto = wired<PictureSwitch>("Taste_PS_Auto", &PictureSwitch::clicked, &DynamicPs::Taste_PS_Auto_Click,
+                                         with.data, page);
+    PS_A_Label = heading("PS_A_Label", {390, "PS dyn."}, Taste_PS_Auto);
+    PS_dyn_Check = captioned<ModeBox>("PS_dyn_Check", {391, "Serial"}, page);
+    m_book.tip(PS_dyn_Check, {392, "unchecked:  PS toggles. / checked: PS scrolls"});
+    PS_Timer = timer("PS_Timer", 2500, &DynamicPs::PS_Timer_Timer);
     PS_Timer->setEnabled(true);
-    connect(PS_Timer, &QTimer::timeout, this, &DynamicPs::PS_Timer_Timer);
-}
-
-void DynamicPs::showStopped() {
-    Taste_PS_Auto->showState(false);
 }
 
 void DynamicPs::Taste_PS_Auto_Click() {

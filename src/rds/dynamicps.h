@@ -1,36 +1,29 @@
 #pragma once
 
-#include <QObject>
+#include <QCheckBox>
 
 #include <functional>
 #include <string>
 
 #include "rds/dynamicpsrule.h"
-#include "ui/pagecontext.h"
-
-class QCheckBox;
-class QLabel;
-class QWidget;
+#include "ui/form.h"
+#include "ui/pictureswitch.h"
 
 namespace kdx {
 
-class CaptionBook;
-class PictureSwitch;
-class Ticker;
 struct Programme;
 
 /// The programme service name that changes on a timer: it takes turns with a marker or scrolls the radiotext.
-class DynamicPs : public QObject {
+class DynamicPs : public QObject, public Form {
     Q_OBJECT
 public:
     /// @param programme its radiotext is scrolled; lent.
     /// @param typedPs gives the text of `PS_T`.
-    /// @param book of the page, for the controls' captions.
-    DynamicPs(const PageContext& with, const Programme& programme, std::function<std::string()> typedPs,
-              CaptionBook& book, QWidget* page);
+    DynamicPs(const PageContext& with, const Programme& programme, std::function<std::string()> typedPs, QWidget* page);
 
+    void label() { m_book.label(m_with.captions); }
     /// Start-up: the switch shows its off picture.
-    void showStopped();
+    void showStopped() { Taste_PS_Auto->showState(false); }
     /// Stops the steps without changing the switch's picture and without sending the typed PS.
     void stopQuietly() { m_running = false; }
 
@@ -46,8 +39,6 @@ private:
     void restoreTypedPs();
 
     Ticker* PS_Timer = nullptr;
-
-    PageContext m_with;
     const Programme& m_programme;
     std::function<std::string()> m_typedPs;
     DynamicPsRecord m_record;

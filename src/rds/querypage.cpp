@@ -1,16 +1,11 @@
 #include "rds/querypage.h"
 
-#include <QFrame>
-#include <QGridLayout>
-#include <QLabel>
-#include <QPushButton>
-
 #include <array>
 
 #include "coder/readback.h"
 #include "link/commandsequence.h"
 #include "settings/programstate.h"
-#include "ui/controls.h"
+#include "ui/layouts.h"
 #include "ui/text.h"
 
 namespace kdx {
@@ -59,25 +54,20 @@ void QueryPage::arrange() {
         separator->setFrameStyle(QFrame::HLine | QFrame::Sunken);
         return separator;
     };
-    auto* grid = new QGridLayout;
-    grid->setSpacing(kGap);
-    int row = 0;
-    int column = 0;
+    auto* buttons = grid({});
+    int lines = 0;
+    int across = 0;
     QWidget* previous = nullptr;
     for (const int index : kOrder) {
         QPushButton* button = m_buttons[static_cast<std::size_t>(index)];
-        grid->addWidget(button, row, column);
+        buttons->addWidget(button, lines, across);
         if (previous != nullptr) setTabOrder(previous, button);
         previous = button;
-        if (++column < kColumns) continue;
-        column = 0;
-        if (++row == kCoderRows) grid->addWidget(line(), row++, 0, 1, kColumns);
+        if (++across < kColumns) continue;
+        across = 0;
+        if (++lines == kCoderRows) buttons->addWidget(line(), lines++, 0, 1, kColumns);
     }
-    auto* page = new QVBoxLayout(this);
-    tighten(page, 8);
-    page->addLayout(grid);
-    page->addWidget(line());
-    page->addWidget(gelesen, 1);
+    layOut(this, column({buttons, line(), {gelesen, 1}}), 8);
 }
 
 void QueryPage::label() {

@@ -1,12 +1,11 @@
 #pragma once
 
+#include <QPushButton>
+
 #include <string>
 #include <vector>
 
 #include "ui/page.h"
-
-class QLabel;
-class QPushButton;
 
 namespace kdx {
 

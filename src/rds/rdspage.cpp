@@ -1,8 +1,5 @@
 #include "rds/rdspage.h"
 
-#include <QCheckBox>
-#include <QComboBox>
-#include <QLineEdit>
 #include <QTime>
 
 #include <utility>
@@ -10,18 +7,13 @@
 #include "base/clock.h"
 #include "coder/sendparam.h"
 #include "rds/dynamicps.h"
-#include "rds/programme.h"
 #include "rds/settings.h"
 #include "rds/taframe.h"
 #include "settings/captions.h"
 #include "settings/programstate.h"
 #include "settings/storedvalue.h"
-#include "ui/clickablelabel.h"
 #include "ui/dialogs.h"
-#include "ui/pictureswitch.h"
 #include "ui/statusrow.h"
-#include "ui/text.h"
-#include "ui/ticker.h"
 
 namespace kdx {
 
@@ -33,6 +25,7 @@ constexpr int kClockRepeatMs = 20000;
 
 void RdsPage::label() {
     Page::label();
+    m_dynamicPs->label();
     if (m_clockShowsWord) showClock(caption({193}));
     m_ta->label();
     if (m_shownTrafficProgramme) showTrafficProgramme(*m_shownTrafficProgramme);
@@ -41,12 +34,8 @@ void RdsPage::label() {
 }
 
 void RdsPage::fillProgrammeTypes() {
-    PTY_Combo1->clear();
-    for (std::size_t type = 0; type < kProgrammeTypes; ++type) {
-        PTY_Combo1->addItem(toText(m_with.captions.programmeType(type)));
-    }
-    // A relabelling chooses what data set 1 holds, whatever set is at work.
-    m_programme.pty = std::to_string(storedEntry(m_with.profile.read(setting::kPty.place), kProgrammeTypes));
+    showProgrammeTypes(PTY_Combo1, setting::kPty.place);
+    m_programme.pty = std::to_string(PTY_Combo1->currentIndex());
     showProgrammeType();
 }
 
@@ -81,13 +70,8 @@ void RdsPage::stepGoesOut(const Step& step) {
 
 void RdsPage::PS_Taste_Click() {
     m_programme.ps = toBytes(PS_T->text()).substr(0, kPsLength);
-    m_with.params.SendParam(setting::kPs.sendKey, m_programme.ps);
-    m_with.profile.write(setting::kPs.place, m_programme.ps);
+    sendAndStore(setting::kPs, m_programme.ps);
     m_with.status.show(StatusSlot::Ps, m_programme.ps);
-}
-
-void RdsPage::PI_T_Change() {
-    m_programme.pi = toBytes(PI_T->text());
 }
 
 void RdsPage::Command3_Click() {
@@ -98,8 +82,7 @@ void RdsPage::Command3_Click() {
 
 void RdsPage::PTY_Combo1_Click() {
     m_programme.pty = std::to_string(PTY_Combo1->currentIndex());
-    m_with.params.SendParam(setting::kPty.sendKey, m_programme.pty);
-    m_with.profile.write(setting::kPty.place, m_programme.pty);
+    sendAndStore(setting::kPty, m_programme.pty);
     m_with.status.show(StatusSlot::Pty, PTY_Combo1->currentText());
 }
 
@@ -112,18 +95,12 @@ void RdsPage::Check1_Click() {
 void RdsPage::MS_opt_Click(int index) {
     m_programme.musicSpeech = index == 0 ? "M" : "S";
     showMusicSpeech();
-    m_with.params.SendParam(setting::kMusicSpeech.sendKey, m_programme.musicSpeech);
-    m_with.profile.write(setting::kMusicSpeech.place, m_programme.musicSpeech);
+    sendAndStore(setting::kMusicSpeech, m_programme.musicSpeech);
 }
 
 void RdsPage::DI_Opt_Click(int index) {
     m_programme.decoderInfo = std::to_string(index);
-    m_with.params.SendParam(setting::kDecoderInfo.sendKey, m_programme.decoderInfo);
-    m_with.profile.write(setting::kDecoderInfo.place, m_programme.decoderInfo);
-}
-
-void RdsPage::RT_Text1_Change() {
-    m_programme.radiotext = toBytes(RT_Text1->text());
+    sendAndStore(setting::kDecoderInfo, m_programme.decoderInfo);
 }
 
 void RdsPage::RT_Taste1_Click() {

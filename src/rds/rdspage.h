@@ -1,25 +1,23 @@
 #pragma once
 
+#include <QCheckBox>
+#include <QComboBox>
+#include <QGroupBox>
+#include <QLineEdit>
+#include <QPushButton>
+
 #include <optional>
 
-#include "ui/controls.h"
+#include "rds/programme.h"
+#include "ui/clickablelabel.h"
 #include "ui/page.h"
-
-class QCheckBox;
-class QComboBox;
-class QGroupBox;
-class QLabel;
-class QLineEdit;
-class QPushButton;
+#include "ui/pictureswitch.h"
+#include "ui/text.h"
 
 namespace kdx {
 
-class ClickableLabel;
 class DynamicPs;
-class PictureSwitch;
 class TaFrame;
-class Ticker;
-struct Programme;
 
 /// The page "R D S": programme service name, identification and type, traffic flags, music/speech, decoder
 /// information, radiotext and clock time.
@@ -38,17 +36,17 @@ public:
 private:
     void create();
     void createService();
-    QPushButton* sendButton(const char* name, const char* what, QLineEdit* entry, QWidget* parent);
+    QPushButton* sendButton(const char* name, const char* what, QLineEdit* entry, void (RdsPage::*handler)());
     void arrange();
 
     void PS_Taste_Click();
-    void PI_T_Change();
+    void PI_T_Change() { m_programme.pi = toBytes(PI_T->text()); }
     void Command3_Click();
     void PTY_Combo1_Click();
     void Check1_Click();
     void MS_opt_Click(int index);
     void DI_Opt_Click(int index);
-    void RT_Text1_Change();
+    void RT_Text1_Change() { m_programme.radiotext = toBytes(RT_Text1->text()); }
     void RT_Taste1_Click();
     void RT_clear1_Click();
     void Zeit_Taste_Click();

@@ -1,10 +1,10 @@
 #pragma once
 
+#include <QPushButton>
+
 #include <array>
 
 #include "ui/page.h"
-
-class QPushButton;
 
 namespace kdx {
 
@@ -15,9 +15,6 @@ public:
     StorePage(const PageContext& with, QWidget* parent);
 
 private:
-    void create();
-    void arrange();
-
     void Store_Taste_Click(int index);
 
     std::array<QPushButton*, 5> Store_Taste{};

@@ -1,43 +1,16 @@
 #include "rds/taframe.h"
 
-#include <QCheckBox>
-#include <QGridLayout>
-#include <QGroupBox>
-#include <QLabel>
-#include <QPushButton>
-
 #include <algorithm>
 
-#include "base/clock.h"
 #include "base/numbers.h"
 #include "coder/sendparam.h"
 #include "rds/programme.h"
 #include "rds/settings.h"
 #include "ui/dialogs.h"
+#include "ui/layouts.h"
 #include "ui/statusrow.h"
-#include "ui/ticker.h"
 
 namespace kdx {
-
-namespace {
-
-constexpr int kShortestDuration = 1;
-constexpr int kLongestDuration = 600;
-constexpr int kShortestPeriod = 2;
-constexpr int kLongestPeriod = 3600;
-
-/// A scroll bar that acts where it comes to rest, not on the way.
-QScrollBar* timeBar(const char* name, QWidget* parent, int shortest, int longest) {
-    auto* bar = named<QScrollBar>(name, Qt::Horizontal, parent);
-    bar->setRange(shortest, longest);
-    bar->setPageStep(10);
-    bar->setTracking(false);
-    bar->setFocusPolicy(Qt::StrongFocus);
-    bar->setMinimumWidth(100);
-    return bar;
-}
-
-}  // namespace
 
 TaFrame::TaFrame(const PageContext& with, Programme& programme, QWidget* parent)
     : Page(with, parent), m_programme(programme) {
@@ -47,66 +20,51 @@ TaFrame::TaFrame(const PageContext& with, Programme& programme, QWidget* parent)
 
 void TaFrame::create() {
     Frame1 = captioned<QGroupBox>("Frame1", {47}, this);
-
-    TA_Check = captioned<QCheckBox>("TA_Check", {381, "TA on / off"}, Frame1);
+    TA_Check = clicked<QCheckBox>("TA_Check", {381, "TA on / off"}, Frame1, &TaFrame::TA_Check_Click);
     TA_Check->setEnabled(false);
-    connect(TA_Check, &QCheckBox::clicked, this, &TaFrame::TA_Check_Click);
-    TA_EON_Hilfe = captioned<QPushButton>("TA_EON_Hilfe", {385, "EON ?"}, Frame1);
-    connect(TA_EON_Hilfe, &QPushButton::clicked, this, &TaFrame::TA_EON_Hilfe_Click);
-
-    TA_Option.create("TA_Option", Frame1);
-    TA_Option.onClick(this, &TaFrame::TA_Option_Click);
+    TA_EON_Hilfe = clicked<QPushButton>("TA_EON_Hilfe", {385, "EON ?"}, Frame1, &TaFrame::TA_EON_Hilfe_Click);
+    createOptions(TA_Option, "TA_Option", {{48}, {383, "&Automatisch"}}, Frame1, &TaFrame::TA_Option_Click);
     TA_Option.choose(0);
     TA_Option[1]->setEnabled(false);
-    m_book.text(TA_Option[0], {48});
     m_book.tip(TA_Option[0], {382, "TA Single"});
-    m_book.text(TA_Option[1], {383, "&Automatisch"});
     m_book.tip(TA_Option[1], {384, "TA Repetition"});
 
-    m_durationTitle = new QLabel(Frame1);
-    m_book.text(m_durationTitle, {386, "Dauer"});
-    TA_HScroll = timeBar("TA_HScroll", Frame1, kShortestDuration, kLongestDuration);
-    m_book.spokenAs(TA_HScroll, m_durationTitle);
-    m_durationTitle->setBuddy(TA_HScroll);
-    connect(TA_HScroll, &QScrollBar::sliderMoved, this, &TaFrame::showDuration);
-    connect(TA_HScroll, &QScrollBar::valueChanged, this, &TaFrame::TA_HScroll_Change);
+    TA_HScroll = createTime("TA_HScroll", 1, 600, &TaFrame::showDuration, &TaFrame::TA_HScroll_Change);
+    m_durationTitle = heading("", {386, "Dauer"}, TA_HScroll);
     TA_Zeit_Label = named<QLabel>("TA_Zeit_Label", Frame1);
-
-    m_periodTitle = new QLabel(Frame1);
-    m_book.text(m_periodTitle, {387, "Wiederholung"});
-    TA_Rep_HScroll = timeBar("TA_Rep_HScroll", Frame1, kShortestPeriod, kLongestPeriod);
-    m_book.spokenAs(TA_Rep_HScroll, m_periodTitle);
-    m_periodTitle->setBuddy(TA_Rep_HScroll);
-    connect(TA_Rep_HScroll, &QScrollBar::sliderMoved, this, &TaFrame::showPeriod);
-    connect(TA_Rep_HScroll, &QScrollBar::valueChanged, this, &TaFrame::TA_Rep_HScroll_Change);
+    TA_Rep_HScroll = createTime("TA_Rep_HScroll", 2, 3600, &TaFrame::showPeriod, &TaFrame::TA_Rep_HScroll_Change);
+    m_periodTitle = heading("", {387, "Wiederholung"}, TA_Rep_HScroll);
     TA_Rep_Label = named<QLabel>("TA_Rep_Label", Frame1);
 
-    TA_Timer = named<Ticker>("TA_Timer", m_with.tickers, this);
-    TA_Timer->setPeriod(333);
+    TA_Timer = timer("TA_Timer", 333, &TaFrame::TA_Timer_Timer);
     TA_Timer->setEnabled(true);
-    connect(TA_Timer, &QTimer::timeout, this, &TaFrame::TA_Timer_Timer);
-    TA_Rep_Timer = named<Ticker>("TA_Rep_Timer", m_with.tickers, this);
-    TA_Rep_Timer->setPeriod(500);
-    connect(TA_Rep_Timer, &QTimer::timeout, this, &TaFrame::TA_Rep_Timer_Timer);
+    TA_Rep_Timer = timer("TA_Rep_Timer", 500, &TaFrame::TA_Rep_Timer_Timer);
+}
+
+/// A scroll bar for seconds that acts where it comes to rest, not on the way.
+QScrollBar* TaFrame::createTime(const char* name, int shortest, int longest, void (TaFrame::*shown)(int),
+                                void (TaFrame::*handler)()) {
+    auto* bar = named<QScrollBar>(name, Qt::Horizontal, Frame1);
+    bar->setRange(shortest, longest);
+    bar->setPageStep(10);
+    bar->setTracking(false);
+    bar->setFocusPolicy(Qt::StrongFocus);
+    bar->setMinimumWidth(100);
+    connect(bar, &QScrollBar::sliderMoved, this, shown);
+    connect(bar, &QScrollBar::valueChanged, this, handler);
+    return bar;
 }
 
 void TaFrame::arrange() {
-    auto* grid = new QGridLayout(Frame1);
-    tighten(grid);
-    grid->addWidget(TA_Check, 0, 0);
-    grid->addWidget(TA_EON_Hilfe, 0, 1, Qt::AlignRight);
-    grid->addWidget(TA_Option[0], 1, 0);
-    grid->addWidget(TA_Option[1], 1, 1);
-    grid->addWidget(m_durationTitle, 2, 0);
-    grid->addWidget(TA_Zeit_Label, 2, 1, Qt::AlignRight);
-    grid->addWidget(TA_HScroll, 3, 0, 1, 2);
-    grid->addWidget(m_periodTitle, 4, 0);
-    grid->addWidget(TA_Rep_Label, 4, 1, Qt::AlignRight);
-    grid->addWidget(TA_Rep_HScroll, 5, 0, 1, 2);
-    grid->setRowStretch(6, 1);
-    auto* whole = new QVBoxLayout(this);
-    tighten(whole, 0);
-    whole->addWidget(Frame1);
+    auto* controls = grid({{TA_Check, {TA_EON_Hilfe, 1, Qt::AlignRight}},
+                           {TA_Option[0], TA_Option[1]},
+                           {m_durationTitle, {TA_Zeit_Label, 1, Qt::AlignRight}},
+                           {{TA_HScroll, 2}},
+                           {m_periodTitle, {TA_Rep_Label, 1, Qt::AlignRight}},
+                           {{TA_Rep_HScroll, 2}}});
+    controls->setRowStretch(6, 1);
+    layOut(Frame1, controls);
+    layOut(this, column({Frame1}), 0);
 }
 
 void TaFrame::label() {
@@ -213,10 +171,6 @@ void TaFrame::TA_EON_Hilfe_Click() {
                            caption({389,
                                     "EON TA lässt sich nur geben, solange TP aus und TA ein ist und EON TP "
                                     "angekreuzt ist."}));
-}
-
-float TaFrame::now() const {
-    return static_cast<float>(m_with.clock.secondsSinceMidnight());
 }
 
 void TaFrame::showByHand(bool on) {

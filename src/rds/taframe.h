@@ -1,16 +1,14 @@
 #pragma once
 
-#include "ui/controls.h"
-#include "ui/page.h"
+#include <QCheckBox>
+#include <QGroupBox>
+#include <QPushButton>
 
-class QCheckBox;
-class QGroupBox;
-class QLabel;
-class QPushButton;
+#include "base/clock.h"
+#include "ui/page.h"
 
 namespace kdx {
 
-class Ticker;
 struct Programme;
 
 /// The traffic announcement by hand or by itself: an announcement of a set duration, repeated after a set period.
@@ -35,6 +33,8 @@ signals:
 
 private:
     void create();
+    QScrollBar* createTime(const char* name, int shortest, int longest, void (TaFrame::*shown)(int),
+                           void (TaFrame::*handler)());
     void arrange();
 
     void TA_Check_Click();
@@ -45,7 +45,7 @@ private:
     void TA_Rep_Timer_Timer();
     void TA_EON_Hilfe_Click();
 
-    [[nodiscard]] float now() const;
+    [[nodiscard]] float now() const { return static_cast<float>(m_with.clock.secondsSinceMidnight()); }
     /// The announcement by hand was switched: while it runs the automatic cannot be chosen.
     void showByHand(bool on);
     void showAnnouncing(bool announcing);
@@ -61,10 +61,8 @@ private:
     QScrollBar* TA_Rep_HScroll = nullptr;  // repetition period
     QLabel* TA_Rep_Label = nullptr;
     QPushButton* TA_EON_Hilfe = nullptr;
-    QLabel* m_durationTitle = nullptr;
-    QLabel* m_periodTitle = nullptr;
-    Ticker* TA_Timer = nullptr;
-    Ticker* TA_Rep_Timer = nullptr;
+    QLabel *m_durationTitle = nullptr, *m_periodTitle = nullptr;
+    Ticker *TA_Timer = nullptr, *TA_Rep_Timer = nullptr;
 
     Programme& m_programme;
     bool m_automatic = false;

@@ -1,11 +1,8 @@
 #include "rds/testmode.h"
 
-#include <QGridLayout>
-#include <QGroupBox>
-#include <QPushButton>
-
 #include "coder/sendparam.h"
 #include "rds/settings.h"
+#include "ui/layouts.h"
 
 namespace kdx {
 
@@ -21,34 +18,18 @@ constexpr std::array kPatterns = {"0 0 0 0 0 0 0 0", "1 1 1 1 1 1 1 1", "0 1 0 1
 }  // namespace
 
 TestMode::TestMode(const PageContext& with, QWidget* parent) : Page(with, parent) {
-    create();
-    arrange();
-}
-
-void TestMode::create() {
     Frame11 = captioned<QGroupBox>("Frame11", {420, "Test Mode"}, this);
-    Taste_DATA_MODE = named<QPushButton>("Taste_DATA_MODE", kStartCaption.toString(), Frame11);
+    Taste_DATA_MODE = wired<QPushButton>("Taste_DATA_MODE", &QPushButton::clicked, &TestMode::Taste_DATA_MODE_Click,
+                                         kStartCaption.toString(), Frame11);
     m_book.tip(Taste_DATA_MODE, {421, "Zwischen RDS-Betrieb und Testmuster umschalten"});
-    connect(Taste_DATA_MODE, &QPushButton::clicked, this, &TestMode::Taste_DATA_MODE_Click);
     TestDat_Opt.create("TestDat_Opt", Frame11);
     TestDat_Opt.onClick(this, &TestMode::TestDat_Opt_Click);
     for (std::size_t i = 0; i < kPatterns.size(); ++i) TestDat_Opt[i]->setText(QString::fromLatin1(kPatterns[i]));
     // The coder starts in RDS mode, where a pattern command would be read as a change of mode.
     enablePatterns(false);
-}
 
-void TestMode::arrange() {
-    auto* grid = new QGridLayout(Frame11);
-    tighten(grid);
-    grid->addWidget(Taste_DATA_MODE, 0, 0, 1, 2);
-    for (int i = 0; i < 4; ++i) grid->addWidget(TestDat_Opt[static_cast<std::size_t>(i)], 1 + i / 2, i % 2);
-    auto* whole = new QVBoxLayout(this);
-    tighten(whole, 0);
-    whole->addWidget(Frame11);
-}
-
-void TestMode::load() {
-    TestDat_Opt.choose(0);
+    layOut(Frame11, grid({{{Taste_DATA_MODE, 2}}, {TestDat_Opt[0], TestDat_Opt[1]}, {TestDat_Opt[2], TestDat_Opt[3]}}));
+    layOut(this, column({Frame11}), 0);
 }
 
 void TestMode::stepGoesOut(const Step& step) {

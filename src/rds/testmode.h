@@ -1,10 +1,9 @@
 #pragma once
 
-#include "ui/controls.h"
-#include "ui/page.h"
+#include <QGroupBox>
+#include <QPushButton>
 
-class QGroupBox;
-class QPushButton;
+#include "ui/page.h"
 
 namespace kdx {
 
@@ -16,13 +15,10 @@ public:
     TestMode(const PageContext& with, QWidget* parent);
 
     /// Selects the first pattern without sending it.
-    void load() override;
+    void load() override { TestDat_Opt.choose(0); }
     void stepGoesOut(const Step& step) override;
 
 private:
-    void create();
-    void arrange();
-
     void Taste_DATA_MODE_Click();
     void TestDat_Opt_Click(int index);
 

@@ -7,12 +7,11 @@
 #include "stereo/multiplex.h"
 #include "stereo/settingscrollbar.h"
 #include "ui/controls.h"
+#include "ui/pictureswitch.h"
 
 class QLabel;
 
 namespace kdx {
-
-class PictureSwitch;
 
 /// A setting of the multiplex and its value there.
 struct Adjustment {

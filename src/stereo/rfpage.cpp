@@ -1,16 +1,10 @@
 #include "stereo/rfpage.h"
 
-#include <QGridLayout>
-#include <QGroupBox>
-#include <QVBoxLayout>
-
 #include "coder/sendparam.h"
 #include "settings/storedvalue.h"
 #include "stereo/carrier.h"
-#include "ui/clickablelabel.h"
-#include "ui/controls.h"
 #include "ui/dialogs.h"
-#include "ui/pictureswitch.h"
+#include "ui/layouts.h"
 #include "ui/text.h"
 
 namespace kdx {
@@ -34,17 +28,16 @@ void RfPage::create() {
     createValue(Input_HF_Pegel_Label, "Input_HF_Pegel_Label", "RF_Level_Frame", {218},
                 &RfPage::Input_HF_Pegel_Label_Click);
     createValue(Input_AF_Freq_Label, "Input_AF_Freq_Label", "AF_Freq_Frame", {215}, &RfPage::Input_AF_Freq_Label_Click);
-    m_outputFrame = new QGroupBox(this);
-    m_book.text(m_outputFrame, {630, "HF-Ausgang"});
-    HfOnOffState = named<PictureSwitch>("HfOnOffState", m_with.data, m_outputFrame);
+    m_outputFrame = captioned<QGroupBox>("", {630, "HF-Ausgang"}, this);
+    HfOnOffState = wired<PictureSwitch>("HfOnOffState", &PictureSwitch::clicked, &RfPage::HfOnOffState_Click,
+                                        m_with.data, m_outputFrame);
     m_book.describe(HfOnOffState, {632, "HF-Ausgang ein / aus"});
-    connect(HfOnOffState, &PictureSwitch::clicked, this, &RfPage::HfOnOffState_Click);
 }
 
 void RfPage::createValue(Value& value, const char* name, const char* frame, const Caption& title,
                          void (RfPage::*handler)()) {
     value.frame = captioned<QGroupBox>(frame, title, this);
-    value.label = named<ClickableLabel>(name, value.frame);
+    value.label = wired<ClickableLabel>(name, &ClickableLabel::clicked, handler, value.frame);
     m_book.tip(value.label, {631, "Klicken, um einen neuen Wert einzugeben"});
     value.label->setText(QStringLiteral("-"));
     value.label->setAlignment(Qt::AlignCenter);
@@ -54,28 +47,18 @@ void RfPage::createValue(Value& value, const char* name, const char* frame, cons
     value.label->setFont(font);
     // A text of any length may be entered: it must not push the frames about.
     value.label->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Preferred);
-    connect(value.label, &ClickableLabel::clicked, this, handler);
+    layOut(value.frame, column({value.label}));
 }
 
 void RfPage::arrange() {
-    for (const Value* value : values()) {
-        tighten(new QVBoxLayout(value->frame));
-        value->frame->layout()->addWidget(value->label);
-    }
-    auto* output = new QVBoxLayout(m_outputFrame);
-    tighten(output);
-    output->addWidget(HfOnOffState, 0, Qt::AlignCenter);
-
-    auto* grid = new QGridLayout(this);
-    tighten(grid, kPageMargin);
-    grid->setSpacing(2 * kGap);
-    grid->addWidget(Input_HF_Freq_Label.frame, 0, 0);
-    grid->addWidget(Input_HF_Pegel_Label.frame, 0, 1);
-    grid->addWidget(Input_AF_Freq_Label.frame, 1, 0);
-    grid->addWidget(m_outputFrame, 1, 1);
-    grid->setColumnStretch(0, 1);
-    grid->setColumnStretch(1, 1);
-    grid->setRowStretch(2, 1);
+    layOut(m_outputFrame, column({{HfOnOffState, 0, Qt::AlignCenter}}));
+    auto* frames =
+        grid({{Input_HF_Freq_Label.frame, Input_HF_Pegel_Label.frame}, {Input_AF_Freq_Label.frame, m_outputFrame}});
+    frames->setSpacing(2 * kGap);
+    frames->setColumnStretch(0, 1);
+    frames->setColumnStretch(1, 1);
+    frames->setRowStretch(2, 1);
+    layOut(this, frames, kPageMargin);
 }
 
 void RfPage::label() {
@@ -119,10 +102,6 @@ void RfPage::showValue(const Value& value, const QString& text) {
 void RfPage::showOutput(bool on) {
     m_carrier.outputOn = on;
     HfOnOffState->showState(on);
-}
-
-std::array<RfPage::Value*, 3> RfPage::values() {
-    return {&Input_HF_Freq_Label, &Input_HF_Pegel_Label, &Input_AF_Freq_Label};
 }
 
 }  // namespace kdx

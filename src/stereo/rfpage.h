@@ -1,17 +1,17 @@
 #pragma once
 
+#include <QGroupBox>
+
 #include <array>
 
 #include "stereo/settings.h"
+#include "ui/clickablelabel.h"
 #include "ui/page.h"
+#include "ui/pictureswitch.h"
 #include "ui/statusrow.h"
-
-class QGroupBox;
 
 namespace kdx {
 
-class ClickableLabel;
-class PictureSwitch;
 struct Carrier;
 
 /// The page "* * *": RF frequency, RF level, audio frequency and RF output of the generator. The values are entered by
@@ -48,7 +48,9 @@ private:
     void enter(const Value& value);
     void showValue(const Value& value, const QString& text);
     void showOutput(bool on);
-    [[nodiscard]] std::array<Value*, 3> values();
+    [[nodiscard]] std::array<Value*, 3> values() {
+        return {&Input_HF_Freq_Label, &Input_HF_Pegel_Label, &Input_AF_Freq_Label};
+    }
 
     Carrier& m_carrier;
 

@@ -2,9 +2,7 @@
 
 #include <QLabel>
 
-#include "coder/sendparam.h"
 #include "settings/storedvalue.h"
-#include "ui/pictureswitch.h"
 #include "ui/text.h"
 
 namespace kdx {
@@ -60,8 +58,7 @@ void StereoPage::HScroll1_Change() {
 
 void StereoPage::change(const Adjustment& what, const std::string& value) {
     what.value = value;
-    m_with.params.SendParam(what.setting.sendKey, std::string(value));
-    m_with.profile.write(what.setting.place, value);
+    sendAndStore(what.setting, value);
 }
 
 void StereoPage::changeDeviation(const DeviationBar& bar) {

@@ -60,12 +60,9 @@ private:
     void createStereo();
     void createSubcarriers();
     void createDeviation(DeviationBar& bar, const char* scroll, const char* label, const Caption& spoken,
-                         void (StereoPage::*handler)(), QWidget* frame);
-    void createSwitch(FlagSwitch& flag, const char* name, const Caption& spoken, void (StereoPage::*handler)(),
-                      QWidget* frame);
-    template <std::size_t Count>
-    void createOptions(Choice<Count>& choice, const char* name, void (StereoPage::*handler)(int),
-                       const Caption (&captions)[Count], QWidget* frame);
+                         QWidget* frame, void (StereoPage::*handler)());
+    void createSwitch(FlagSwitch& flag, const char* name, const Caption& spoken, QWidget* frame,
+                      void (StereoPage::*handler)());
     void arrange();
     void arrangeFrames();
 

@@ -2,10 +2,8 @@
 
 #include "tmc/valuelabel.h"
 #include "ui/caption.h"
-#include "ui/controls.h"
+#include "ui/layouts.h"
 #include "ui/text.h"
-
-#include <QGridLayout>
 
 namespace kdx {
 
@@ -29,19 +27,18 @@ constexpr std::array kRows = {
 
 BitDisplay::BitDisplay(CaptionBook& book, QWidget* parent) : QWidget(parent) {
     static_assert(kRows.size() == kFields);
-    auto* grid = new QGridLayout(this);
-    tighten(grid, 0);
+    auto* fields = grid({});
     for (std::size_t field = 0; field < kFields; ++field) {
         const FieldRow& row = kRows.at(field);
-        m_headings.at(field) = new QLabel(this);
-        book.text(m_headings.at(field), {row.heading, row.design});
+        m_headings.at(field) = book.captioned<QLabel>("", {row.heading, row.design}, this);
         auto* bits = named<ValueLabel>(row.name, this);
         bits->setText(QStringLiteral("-"));
         bits->makeRoomFor(row.bits);
         m_bits.at(field) = bits;
-        grid->addWidget(m_headings.at(field), 0, static_cast<int>(field), Qt::AlignHCenter);
-        grid->addWidget(bits, 1, static_cast<int>(field), Qt::AlignHCenter);
+        fields->addWidget(m_headings.at(field), 0, static_cast<int>(field), Qt::AlignHCenter);
+        fields->addWidget(bits, 1, static_cast<int>(field), Qt::AlignHCenter);
     }
+    layOut(this, fields, 0);
 }
 
 void BitDisplay::set(Field field, double number) {

@@ -1,18 +1,15 @@
 #pragma once
 
-#include "ui/controls.h"
+#include "tmc/bitdisplay.h"
+#include "tmc/valuelabel.h"
 #include "ui/page.h"
 
 #include <QCheckBox>
 #include <QComboBox>
 #include <QGroupBox>
-#include <QLabel>
 #include <QPushButton>
 
 namespace kdx {
-
-class BitDisplay;
-class ValueLabel;
 
 /// Upper part of the TMC page: composes one traffic message from its fields.
 class TmcBuilder : public Page {
@@ -29,7 +26,7 @@ public:
 
     [[nodiscard]] QString locationText() const { return TMC_Loc_Combo->currentText(); }
     [[nodiscard]] QString eventText() const { return TMC_Event_Combo->currentText(); }
-    [[nodiscard]] QString groupCode() const;
+    [[nodiscard]] QString groupCode() const { return TMC_Gr8_Label->text(); }
 
 private:
     void create();
@@ -37,30 +34,24 @@ private:
     void createDuration();
     void createCode();
     void arrange();
-    QLayout* arrangeLists();
-    QLayout* arrangeFields();
-    QLayout* arrangeCode();
 
-    void TMC_Event_Combo_Click();
-    void TMC_Loc_Combo_Click();
+    void TMC_Event_Combo_Click() { showNumber(TMC_Event_Combo, TMC_Event_Hex_Label, BitDisplay::Event); }
+    void TMC_Loc_Combo_Click() { showNumber(TMC_Loc_Combo, TMC_Local_Hex_Label, BitDisplay::Location); }
     void TMC_Var_Combo_Click();
-    void Tmc_richtung_Click(int index);
-    void TMC_Div_Click();
-    void TMC_F_Check_Click();
-    void TMC_T_Check_Click();
-    void TMC_DP1_Check_Click();
-    void TMC_DP2_Check_Click();
-    void TMC_DP3Check_Click();
+    void Tmc_richtung_Click(int index) { m_bits->set(BitDisplay::U, index == 1 ? 1 : 0); }
+    void TMC_Div_Click() { m_bits->set(BitDisplay::D, TMC_Div->isChecked() ? 1 : 0); }
+    void TMC_F_Check_Click() { m_bits->set(BitDisplay::F, TMC_F_Check->isChecked() ? 1 : 0); }
+    void TMC_T_Check_Click() { m_bits->set(BitDisplay::T, TMC_T_Check->isChecked() ? 1 : 0); }
+    void TMC_DP1_Check_Click() { showDuration(); }
+    void TMC_DP2_Check_Click() { showDuration(); }
+    void TMC_DP3Check_Click() { showDuration(); }
     void DurationCombo_Click();
     void TMCInfoOnOff_Click();
     void TMCGruppe8Maker();
 
-    void fill(QComboBox* combo, const char* fileName);
+    void reload(QComboBox* combo, const char* fileName);
+    void showNumber(const QComboBox* combo, QLabel* hexadecimals, BitDisplay::Field field);
     void showDuration();
-
-    int m_dp1Weight = 0;  ///< 4 or 0
-    int m_dp2Weight = 0;  ///< 2 or 0
-    int m_dp3Weight = 0;  ///< 1 or 0
 
     QLabel *Label3 = nullptr, *Label4 = nullptr;  // headings of the events and the locations
     QComboBox *TMC_Event_Combo = nullptr, *TMC_Loc_Combo = nullptr;

@@ -1,20 +1,18 @@
 #pragma once
 
-#include "ui/caption.h"
 #include "ui/clickablelabel.h"
-#include "ui/pagecontext.h"
+#include "ui/form.h"
 
 #include <QDialog>
-#include <QLabel>
 #include <QListWidget>
 #include <QPushButton>
 
-class QLayout;
+class QBoxLayout;
 
 namespace kdx {
 
 /// The editor of the TMC event and location lists: shows both files of the data folder and appends entries to them.
-class TMC_Listedit : public QDialog {
+class TMC_Listedit : public QDialog, public Form {
     Q_OBJECT
 public:
     TMC_Listedit(const PageContext& with, QWidget* parent);
@@ -37,25 +35,25 @@ protected:
 
 private:
     void create();
-    void arrange();
-    QLayout* arrangeEntry(QLabel* heading, QListWidget* list, QLabel* text, QLabel* code, QPushButton* add);
-    [[nodiscard]] QString heading(const Caption& text, const Caption& code) const;
+    ClickableLabel* createInput(const char* name, const Caption& what, void (TMC_Listedit::*handler)());
+    QBoxLayout* arrangeList(QLabel* columns, QListWidget* list, QLabel* text, QLabel* code, QPushButton* add);
+    [[nodiscard]] QString columns(const Caption& text, const Caption& code) const;
 
     void Form_Load();
-    void Event_Input_Nr_Click();
-    void Event_Input_TXT_Click();
-    void Loc_Input_Nr_Click();
-    void Loc_INput_TXT1_Click();
-    void Event_Hinzu_Click();
-    void Loc_Hinzu_Click();
-    void Zuruek_Knopf_Click();
+    void Event_Input_Nr_Click() { ask(Event_Input_Nr); }
+    void Event_Input_TXT_Click() { ask(Event_Input_TXT); }
+    void Loc_Input_Nr_Click() { ask(Loc_Input_Nr); }
+    void Loc_INput_TXT1_Click() { ask(Loc_INput_TXT1); }
+    void Event_Hinzu_Click() { take(Event_Input_TXT, Event_Input_Nr, &TMC_Listedit::Event_anhaengen); }
+    void Loc_Hinzu_Click() { take(Loc_INput_TXT1, Loc_Input_Nr, &TMC_Listedit::Location_Anhaengen); }
+    void Zuruek_Knopf_Click() { close(); }
 
     void ask(QLabel* label);
     void load(QListWidget* list, const char* fileName);
-    bool append(const QLabel* text, const QLabel* code, const char* fileName);
+    bool append(QListWidget* list, const QLabel* text, const QLabel* code, const char* fileName);
+    /// Appends a whole entry and makes room for the next one; what cannot be stored stays to be tried again.
+    void take(QLabel* text, QLabel* code, bool (TMC_Listedit::*appendIt)());
 
-    PageContext m_with;
-    CaptionBook m_book;
     QLabel* Label1 = nullptr;
     QListWidget* List1 = nullptr;  // events
     ClickableLabel* Event_Input_TXT = nullptr;

@@ -2,21 +2,17 @@
 
 #include "tmc/tmcbuilder.h"
 #include "tmc/tmctransmission.h"
-#include "ui/controls.h"
+#include "ui/layouts.h"
 
 #include <QPushButton>
-#include <QVBoxLayout>
 
 namespace kdx {
 
 TmcPage::TmcPage(const PageContext& with, QWidget* parent) : Page(with, parent) {
     m_builder = new TmcBuilder(with, this);
     m_transmission = new TmcTransmission(with, *m_builder, this);
-    auto* layout = new QVBoxLayout(this);
-    tighten(layout, kPageMargin);
-    layout->addWidget(m_builder);
-    layout->addWidget(m_transmission, 1);           // room to spare goes to the message list
-    named<QPushButton>("Command23", this)->hide();  // belongs to the page, does nothing
+    layOut(this, column({m_builder, {m_transmission, 1}}), kPageMargin);  // room to spare goes to the message list
+    named<QPushButton>("Command23", this)->hide();                        // belongs to the page, does nothing
 }
 
 void TmcPage::label() {

@@ -1,16 +1,12 @@
 #include "tmc/tmctransmission.h"
 
-#include "coder/sendparam.h"
 #include "tmc/messagedelegate.h"
 #include "tmc/messagelist.h"
 #include "tmc/settings.h"
 #include "tmc/tmcbuilder.h"
-#include "ui/controls.h"
 #include "ui/dialogs.h"
+#include "ui/layouts.h"
 #include "ui/text.h"
-
-#include <QHBoxLayout>
-#include <QVBoxLayout>
 
 #include <memory>
 #include <stdexcept>
@@ -39,10 +35,8 @@ void TmcTransmission::create() {
     TMC_List->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     TMC_List->setMinimumHeight(3 * fontMetrics().height());
     m_book.spoken(TMC_List, {585, "Meldungen"});
-    TMC_Gr8_apply = captioned<QPushButton>("TMC_Gr8_apply", {196}, this);
-    connect(TMC_Gr8_apply, &QPushButton::clicked, this, &TmcTransmission::TMC_Gr8_apply_Click);
-    TMC_Gr8_Remove = captioned<QPushButton>("TMC_Gr8_Remove", {197}, this);
-    connect(TMC_Gr8_Remove, &QPushButton::clicked, this, &TmcTransmission::TMC_Gr8_Remove_Click);
+    TMC_Gr8_apply = clicked<QPushButton>("TMC_Gr8_apply", {196}, this, &TmcTransmission::TMC_Gr8_apply_Click);
+    TMC_Gr8_Remove = clicked<QPushButton>("TMC_Gr8_Remove", {197}, this, &TmcTransmission::TMC_Gr8_Remove_Click);
     createSending();
 }
 
@@ -55,44 +49,19 @@ void TmcTransmission::createSending() {
     connect(optMultiMessage, &QRadioButton::toggled, this, [this](bool chosen) {
         if (chosen) optMultiMessage_Click();
     });
-    lblCycleTime = captioned<QLabel>("lblCycleTime", {200}, this);
     txtCycleTime = named<QLineEdit>("txtCycleTime", QStringLiteral("1"), this);
     txtCycleTime->setFixedWidth(fontMetrics().horizontalAdvance(QStringLiteral("65.5350")) + 8);
-    lblCycleTime->setBuddy(txtCycleTime);
-    TMC_Senden_Taste = captioned<QPushButton>("TMC_Senden_Taste", {53}, this);
-    connect(TMC_Senden_Taste, &QPushButton::clicked, this, &TmcTransmission::TMC_Senden_Taste_Click);
-    Stop_Timer = captioned<QPushButton>("Stop_Timer", {584, "stop"}, this);
-    connect(Stop_Timer, &QPushButton::clicked, this, &TmcTransmission::Stop_Timer_Click);
-    TMC_Sende_Timer = named<Ticker>("TMC_Sende_Timer", m_with.tickers, this);
-    connect(TMC_Sende_Timer, &Ticker::timeout, this, &TmcTransmission::TMC_Sende_Timer_Timer);
+    lblCycleTime = heading("lblCycleTime", {200}, txtCycleTime);
+    TMC_Senden_Taste = clicked<QPushButton>("TMC_Senden_Taste", {53}, this, &TmcTransmission::TMC_Senden_Taste_Click);
+    Stop_Timer = clicked<QPushButton>("Stop_Timer", {584, "stop"}, this, &TmcTransmission::Stop_Timer_Click);
+    TMC_Sende_Timer = timer("TMC_Sende_Timer", 0, &TmcTransmission::TMC_Sende_Timer_Timer);
 }
 
 void TmcTransmission::arrange() {
-    auto* changes = new QVBoxLayout;
-    tighten(changes, 0);
-    changes->addWidget(TMC_Gr8_apply);
-    changes->addWidget(TMC_Gr8_Remove);
-    changes->addStretch(1);
-    auto* messages = new QHBoxLayout;
-    tighten(messages, 0);
-    messages->addWidget(TMC_List, 1);
-    messages->addLayout(changes);
-
-    auto* sending = new QHBoxLayout;
-    tighten(sending, 0);
-    sending->addWidget(optSingleMessage);
-    sending->addSpacing(kGap);
-    sending->addWidget(optMultiMessage);
-    sending->addStretch(1);
-    sending->addWidget(lblCycleTime);
-    sending->addWidget(txtCycleTime);
-    sending->addStretch(1);
-    sending->addWidget(TMC_Senden_Taste);
-    sending->addWidget(Stop_Timer);
-    auto* layout = new QVBoxLayout(this);
-    tighten(layout, 0);
-    layout->addLayout(messages, 1);
-    layout->addLayout(sending);
+    auto* messages = row({{TMC_List, 1}, column({TMC_Gr8_apply, TMC_Gr8_Remove, kRoom})});
+    auto* sending = row({optSingleMessage, space(kGap), optMultiMessage, kRoom, lblCycleTime, txtCycleTime, kRoom,
+                         TMC_Senden_Taste, Stop_Timer});
+    layOut(this, column({{messages, 1}, sending}), 0);
 }
 
 void TmcTransmission::TMC_Gr8_apply_Click() {
@@ -144,11 +113,6 @@ void TmcTransmission::TMC_Sende_Timer_Timer() {
     if (!multi) Stop_Timer_Click();
 }
 
-void TmcTransmission::sendAndStore(const Setting& setting, const std::string& value) {
-    m_with.params.SendParam(setting.sendKey, std::string(value));
-    m_with.profile.write(setting.place, value);
-}
-
 void TmcTransmission::Stop_Timer_Click() {
     TMC_Sende_Timer->setEnabled(false);
     allowChanges(true);
@@ -159,14 +123,9 @@ void TmcTransmission::allowChanges(bool allowed) {
     TMC_Gr8_Remove->setEnabled(allowed);
 }
 
-void TmcTransmission::optMultiMessage_Click() {
-    txtCycleTime->setEnabled(true);
-    lblCycleTime->setEnabled(true);
-}
-
-void TmcTransmission::optSingleMessage_Click() {
-    txtCycleTime->setEnabled(false);
-    lblCycleTime->setEnabled(false);
+void TmcTransmission::allowCycleTime(bool allowed) {
+    txtCycleTime->setEnabled(allowed);
+    lblCycleTime->setEnabled(allowed);
 }
 
 }  // namespace kdx

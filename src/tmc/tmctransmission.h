@@ -1,20 +1,15 @@
 #pragma once
 
 #include "ui/page.h"
-#include "ui/ticker.h"
 
-#include <QLabel>
 #include <QLineEdit>
 #include <QListWidget>
 #include <QPushButton>
 #include <QRadioButton>
 
-#include <string>
-
 namespace kdx {
 
 class TmcBuilder;
-struct Setting;
 
 /// Lower part of the TMC page: the list of messages and its transmission, one at a tick of `TMC_Sende_Timer`, each with
 /// the announcement that tells receivers about TMC.
@@ -34,26 +29,23 @@ private:
     void TMC_Senden_Taste_Click();
     void TMC_Sende_Timer_Timer();
     void Stop_Timer_Click();
-    void optMultiMessage_Click();
-    void optSingleMessage_Click();
+    void optMultiMessage_Click() { allowCycleTime(true); }
+    void optSingleMessage_Click() { allowCycleTime(false); }
 
     [[nodiscard]] bool setInterval();
     void allowChanges(bool allowed);
-    void sendAndStore(const Setting& setting, const std::string& value);
+    void allowCycleTime(bool allowed);
 
     const TmcBuilder& m_builder;
     int m_sendPosition = 0;
     bool m_otherVariant = false;  ///< which announcement comes next
 
     QListWidget* TMC_List = nullptr;
-    QPushButton* TMC_Gr8_apply = nullptr;
-    QPushButton* TMC_Gr8_Remove = nullptr;
-    QRadioButton* optSingleMessage = nullptr;
-    QRadioButton* optMultiMessage = nullptr;
+    QPushButton *TMC_Gr8_apply = nullptr, *TMC_Gr8_Remove = nullptr;
+    QRadioButton *optSingleMessage = nullptr, *optMultiMessage = nullptr;
     QLabel* lblCycleTime = nullptr;
     QLineEdit* txtCycleTime = nullptr;
-    QPushButton* TMC_Senden_Taste = nullptr;
-    QPushButton* Stop_Timer = nullptr;
+    QPushButton *TMC_Senden_Taste = nullptr, *Stop_Timer = nullptr;
     Ticker* TMC_Sende_Timer = nullptr;
 };
 

@@ -45,6 +45,11 @@ void CaptionBook::describe(QWidget* control, const Caption& caption) {
     spoken(control, caption);
 }
 
+void CaptionBook::head(QLabel* heading, QWidget* control) {
+    heading->setBuddy(control);
+    spokenAs(control, heading);
+}
+
 void CaptionBook::label(const Captions& captions) const {
     for (const Row& row : m_rows) {
         switch (row.what) {

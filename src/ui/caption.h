@@ -7,6 +7,7 @@
 
 #include "ui/named.h"
 
+class QLabel;
 class QWidget;
 
 namespace kdx {
@@ -31,9 +32,9 @@ struct Caption {
 class CaptionBook {
 public:
     /// Makes a control that bears the system's name and is captioned from now on.
-    template <typename Control, typename... Args>
-    Control* captioned(const char* name, const Caption& caption, Args&&... args) {
-        auto* control = named<Control>(name, std::forward<Args>(args)...);
+    template <typename Control>
+    Control* captioned(const char* name, const Caption& caption, QWidget* parent) {
+        auto* control = named<Control>(name, parent);
         text(control, caption);
         return control;
     }
@@ -51,6 +52,9 @@ public:
     void spokenAs(QWidget* control, const QWidget* heading) {
         m_rows.push_back({control, What::SpokenAs, {0}, heading});
     }
+
+    /// The label is the control's heading: its spoken name, and by its mnemonic the way to it.
+    void head(QLabel* heading, QWidget* control);
 
     /// Shows everything that was said, in that order, in the current language.
     void label(const Captions& captions) const;

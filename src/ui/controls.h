@@ -1,7 +1,6 @@
 #pragma once
 
 #include <QButtonGroup>
-#include <QLayout>
 #include <QRadioButton>
 #include <QScrollBar>
 #include <QSignalBlocker>
@@ -14,20 +13,10 @@
 
 namespace kdx {
 
-/// Spacing of all pages, in pixels at 96 dpi: tight enough for 640 x 480, the same everywhere.
-inline constexpr int kGap = 4;
-inline constexpr int kPageMargin = 4;
-
 /// Arial, its metric twin, and what there is without both. One list for all: a font with another one is looked up and
 /// loaded anew.
 [[nodiscard]] inline QStringList arialFamilies() {
     return {QStringLiteral("Arial"), QStringLiteral("Liberation Sans"), QStringLiteral("DejaVu Sans")};
-}
-
-/// Gives a layout the margins and gaps of the pages.
-inline void tighten(QLayout* layout, int margin = kGap) {
-    layout->setContentsMargins(margin, margin, margin, margin);
-    layout->setSpacing(kGap);
 }
 
 /// A control array of option buttons: one of them at most is chosen.

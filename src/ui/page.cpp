@@ -1,6 +1,12 @@
 #include "ui/page.h"
 
+#include <QComboBox>
+
 #include "coder/sendparam.h"
+#include "settings/captions.h"
+#include "settings/profile.h"
+#include "settings/storedvalue.h"
+#include "ui/text.h"
 
 namespace kdx {
 
@@ -9,6 +15,20 @@ void Page::send(const Steps& steps) {
         stepGoesOut(step);
         if (step.kind == Step::Kind::Parameter) m_with.params.SendParam(step.key, std::string(step.value));
     }
+}
+
+void Page::sendAndStore(const Setting& setting, const std::string& value) {
+    m_with.params.SendParam(setting.sendKey, std::string(value));
+    m_with.profile.write(setting.place, value);
+}
+
+void Page::showProgrammeTypes(QComboBox* box, const Place& stored) {
+    const QSignalBlocker quiet(box);
+    box->clear();
+    for (std::size_t type = 0; type < kProgrammeTypes; ++type) {
+        box->addItem(toText(m_with.captions.programmeType(type)));
+    }
+    box->setCurrentIndex(storedEntry(m_with.profile.read(stored), kProgrammeTypes));
 }
 
 }  // namespace kdx

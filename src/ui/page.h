@@ -3,17 +3,21 @@
 #include <QWidget>
 
 #include "coder/step.h"
-#include "ui/caption.h"
-#include "ui/pagecontext.h"
+#include "ui/form.h"
+
+class QComboBox;
 
 namespace kdx {
 
+struct Place;
+struct Setting;
+
 /// A page of the window, or a frame of one that lives like a page. What its controls are called is said where they are
 /// made; the window calls the rest.
-class Page : public QWidget {
+class Page : public QWidget, public Form {
     Q_OBJECT
 public:
-    Page(const PageContext& with, QWidget* parent) : QWidget(parent), m_with(with) {}
+    Page(const PageContext& with, QWidget* parent) : QWidget(parent), Form(with) {}
 
     /// Captions everything in the current language; values stay. Overridden for texts that are composed.
     virtual void label() { m_book.label(m_with.captions); }
@@ -26,17 +30,11 @@ public:
     virtual void stepGoesOut(const Step& /*step*/) {}
 
 protected:
-    /// A control that bears the system's name and its caption from its birth on.
-    template <typename Control, typename... Args>
-    Control* captioned(const char* name, const Caption& caption, Args&&... args) {
-        return m_book.captioned<Control>(name, caption, std::forward<Args>(args)...);
-    }
     /// Sends steps at once, each for itself and without a sequence around them.
     void send(const Steps& steps);
-    [[nodiscard]] QString caption(const Caption& caption) const { return captionText(m_with.captions, caption); }
-
-    PageContext m_with;
-    CaptionBook m_book;
+    void sendAndStore(const Setting& setting, const std::string& value);
+    /// Lists the programme types in the current language and chooses the stored one; no handler runs.
+    void showProgrammeTypes(QComboBox* box, const Place& stored);
 };
 
 }  // namespace kdx

@@ -1,7 +1,6 @@
 #include "window/connectionbar.h"
 
 #include <QGroupBox>
-#include <QHBoxLayout>
 #include <QLabel>
 #include <QPushButton>
 #include <QScrollBar>
@@ -10,8 +9,8 @@
 #include "settings/generalsettings.h"
 #include "settings/programstate.h"
 #include "ui/clickablelabel.h"
-#include "ui/controls.h"
 #include "ui/dialogs.h"
+#include "ui/layouts.h"
 #include "ui/text.h"
 
 namespace kdx {
@@ -35,18 +34,10 @@ ConnectionBar::ConnectionBar(const PageContext& with, QWidget* parent) : QWidget
     Image2->setPixmap(QPixmap(QStringLiteral(":/banner.png")));
     Image2->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
 
-    auto* connection = new QHBoxLayout(Frame8);
-    tighten(connection);
-    for (QWidget* control : std::initializer_list<QWidget*>{INIT_Taste, Label6, Adr1_Label, Adr1_VScroll}) {
-        connection->addWidget(control);
-    }
-    auto* row = new QHBoxLayout(this);
-    row->setContentsMargins(0, 0, 0, 0);
-    row->setSpacing(8);
-    row->addWidget(Frame8);
-    row->addWidget(Ende_Taste);
-    row->addStretch();
-    row->addWidget(Image2);
+    layOut(Frame8, row({INIT_Taste, Label6, Adr1_Label, Adr1_VScroll}));
+    auto* whole = row({Frame8, Ende_Taste, kRoom, Image2});
+    whole->setSpacing(8);
+    layOut(this, whole, 0);
 }
 
 bool ConnectionBar::isLan() const {

@@ -2,7 +2,6 @@
 
 #include <QClipboard>
 #include <QGuiApplication>
-#include <QHBoxLayout>
 #include <QHeaderView>
 #include <QLineEdit>
 #include <QPushButton>
@@ -10,12 +9,12 @@
 #include <QShortcut>
 #include <QSortFilterProxyModel>
 #include <QTableView>
-#include <QVBoxLayout>
 
 #include <algorithm>
 
 #include "settings/captions.h"
-#include "ui/controls.h"
+#include "ui/layouts.h"
+#include "ui/named.h"
 #include "ui/text.h"
 #include "window/trafficlog.h"
 
@@ -59,16 +58,7 @@ LogView::LogView(TrafficLog& log, const Captions& captions, QWidget* parent) : Q
     connect(m_close, &QPushButton::clicked, this, &QDialog::close);
     for (QPushButton* button : {m_copy, m_clear, m_close}) button->setAutoDefault(false);
 
-    auto* buttons = new QHBoxLayout;
-    buttons->setSpacing(kGap);
-    buttons->addWidget(m_filter, 1);
-    buttons->addWidget(m_copy);
-    buttons->addWidget(m_clear);
-    buttons->addWidget(m_close);
-    auto* column = new QVBoxLayout(this);
-    tighten(column, 6);
-    column->addWidget(m_table, 1);
-    column->addLayout(buttons);
+    layOut(this, column({{m_table, 1}, row({{m_filter, 1}, m_copy, m_clear, m_close})}), 6);
     resize(700, 360);
     label(captions);
 }

@@ -2,7 +2,6 @@
 #include <gtest/gtest.h>
 
 #include "eonpagetest.h"
-#include "support/layoutcheck.h"
 
 #include <QGroupBox>
 
@@ -258,28 +257,6 @@ TEST_F(EonPageTest, ButtonsOfTheSameTextAreNamedWithWhatTheySend) {
     EXPECT_EQ(find("EON_PI_Taste")->accessibleName().toStdString(), "EON PI senden");
     EXPECT_EQ(find("EON_PS_Taste")->accessibleName().toStdString(), "EON PS senden");
     EXPECT_EQ(find("EON_AFB_Senden")->accessibleName().toStdString(), "EON AF Listen senden");
-}
-
-TEST_F(EonPageTest, NothingIsCutOffInAnyLanguage) {
-    store("EON_AFB", "1");
-    store("EON_AFB1", "107.6,90.1,94.3,101.2");
-    load();
-    for (const char* language : {"deutsch", "english", "english US"}) {
-        useLanguage(language);
-        page->label();
-        page->resize(620, 322);
-        page->show();
-        QApplication::processEvents();
-        EXPECT_LE(page->minimumSizeHint().width(), 620) << language;
-        EXPECT_LE(page->minimumSizeHint().height(), 322) << language;
-        EXPECT_EQ(page->size(), QSize(620, 322)) << language;
-        expectNothingCutOff(*page, language);
-        for (int type = 0; type < 32; ++type) {
-            const QSignalBlocker quiet(find<QComboBox>("EON_PTY_Combo"));
-            find<QComboBox>("EON_PTY_Combo")->setCurrentIndex(type);
-            expectNothingCutOff(*page, language);
-        }
-    }
 }
 
 }  // namespace

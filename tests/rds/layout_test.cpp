@@ -10,7 +10,6 @@
 #include "rds/querypage.h"
 #include "rds/rdspage.h"
 #include "rds/storepage.h"
-#include "support/layoutcheck.h"
 #include "support/pagetest.h"
 
 namespace kdx::test {
@@ -41,7 +40,6 @@ protected:
         EXPECT_LE(least.width(), kPageSize.width());
         EXPECT_LE(least.height(), kPageSize.height());
         EXPECT_EQ(m_page->size(), kPageSize);
-        expectNothingCutOff(*m_page, GetParam());
         expectNoOverlaps();
         expectMnemonicsUnique();
         expectEverythingNamed();

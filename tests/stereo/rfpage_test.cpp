@@ -6,7 +6,6 @@
 #include <QMouseEvent>
 
 #include "stereo/carrier.h"
-#include "support/layoutcheck.h"
 #include "support/pagetest.h"
 
 namespace kdx::test {
@@ -259,19 +258,6 @@ TEST_F(RfPageTest, EveryControlHasAnAccessibleName) {
     EXPECT_FALSE(find("Input_HF_Pegel_Label")->accessibleName().isEmpty());
     EXPECT_FALSE(find("Input_AF_Freq_Label")->accessibleName().isEmpty());
     EXPECT_FALSE(find("HfOnOffState")->accessibleName().isEmpty());
-}
-
-TEST_F(RfPageTest, NothingIsCutOffInAnyLanguage) {
-    page.resize(620, 322);
-    page.show();
-    for (const char* language : {"deutsch", "english", "english US"}) {
-        useLanguage(language);
-        page.label();
-        QApplication::processEvents();
-        EXPECT_LE(page.minimumSizeHint().width(), 620) << language;
-        EXPECT_LE(page.minimumSizeHint().height(), 322) << language;
-        expectNothingCutOff(page, language);
-    }
 }
 
 }  // namespace

@@ -10,7 +10,6 @@
 #include <set>
 
 #include "stereopagetest.h"
-#include "support/layoutcheck.h"
 
 namespace kdx::test {
 namespace {
@@ -312,22 +311,6 @@ TEST_F(StereoPageTest, TheTabKeyFollowsTheColumns) {
     }
     EXPECT_EQ(order, (Lines{"FM_Hub_Scroll", "Pilot_OnOff", "Pilot_Hub_Scroll", "HScroll1", "RDS_OnOff",
                             "RDS_Hub_Scroll", "Ari_OnOff", "Ari_hub_Scroll", "Taste_DATA_MODE", "Btn_SetRdsStereo"}));
-}
-
-TEST_F(StereoPageTest, NothingIsCutOffInAnyLanguage) {
-    start();
-    page.resize(620, 322);
-    page.show();
-    scroll("FM_Hub_Scroll", 8000);
-    scroll("Pilot_Hub_Scroll", 1500);
-    for (const char* language : {"deutsch", "english", "english US"}) {
-        useLanguage(language);
-        page.label();
-        QApplication::processEvents();
-        EXPECT_LE(page.minimumSizeHint().width(), 620) << language;
-        EXPECT_LE(page.minimumSizeHint().height(), 322) << language;
-        expectNothingCutOff(page, language);
-    }
 }
 
 }  // namespace

@@ -23,7 +23,9 @@ public:
         m_process.start(QStringLiteral(KDX_SIM_PROGRAM),
                         options + QStringList{QStringLiteral("--port"), QString::number(m_port)});
         while (!m_process.canReadLine()) {
-            if (!m_process.waitForReadyRead()) throw std::runtime_error("kdx-sim does not start");
+            if (!m_process.waitForReadyRead()) {
+                throw std::runtime_error("kdx-sim does not start: " + m_process.readAllStandardError().toStdString());
+            }
         }
         const QString ready = QString::fromLatin1(m_process.readLine());
         const auto match = QRegularExpression(QStringLiteral("^ready: \\S+ port (\\d+)")).match(ready);

@@ -1,4 +1,3 @@
-#include "support/layoutcheck.h"
 #include "tmcpagetest.h"
 
 #include <set>
@@ -120,23 +119,6 @@ TEST_F(TmcPageTest, TheButtonWithoutBehaviourIsThereAndHidden) {
 
 TEST_F(TmcPageTest, TheGroupCodeIsInArial) {
     EXPECT_EQ(find<QLabel>("TMC_Gr8_Label")->font().families().first().toStdString(), "Arial");
-}
-
-TEST_F(TmcPageTest, NothingIsCutOffInAnyLanguage) {
-    click("TMCInfoOnOff");
-    page->resize(620, 322);
-    page->show();
-    composeMessage();
-    click("TMC_Gr8_apply");
-    for (const char* language : kLanguages) {
-        useLanguage(language);
-        page->label();
-        QApplication::processEvents();
-        const QSize least = page->minimumSizeHint();
-        EXPECT_LE(least.width(), 620) << language;
-        EXPECT_LE(least.height(), 322) << language;
-        expectNothingCutOff(*page, language);
-    }
 }
 
 TEST_F(TmcPageTest, MnemonicsAreUniqueInEveryLanguage) {

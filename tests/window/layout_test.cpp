@@ -15,13 +15,30 @@ protected:
     void walk(const char* language, const std::function<void(int page)>& look) {
         folder.copyShipped();
         setGeneral("Sprache", "Sprache", language);
+        std::string list = "107.6";
+        for (int i = 0; i < 25; ++i) list += ",107.6";
+        setDataSet1("RDS", "AF_LISTE1", list);
+        setDataSet1("RDS", "EON_AFB1", list);
         start();
         openSession();
+        fillPages();
         for (int page = 0; page < 9; ++page) {
             showPage(page);
             QCoreApplication::processEvents();
             look(page);
         }
+    }
+
+private:
+    /// What needs the most room: the widest numbers, the fields that are hidden at first, a listed message.
+    void fillPages() {
+        scroll("FM_Hub_Scroll", 8000);
+        scroll("Pilot_Hub_Scroll", 1500);
+        click("EON_AFB_Opt_0");
+        select("TMC_Event_Combo", 0);
+        select("TMC_Loc_Combo", 0);
+        click("TMC_Gr8_apply");
+        click("TMCInfoOnOff");
     }
 };
 
@@ -32,6 +49,20 @@ TEST_F(LayoutTest, NothingIsCutOffInAnyLanguageAtTheDesignSize) {
         walk(language, [&](int page) {
             EXPECT_EQ(window->size(), QSize(640, 480));
             expectNothingCutOff(*window, std::string(language) + " page " + std::to_string(page));
+        });
+    }
+}
+
+TEST_F(LayoutTest, EveryProgrammeTypeIsShownWhole) {
+    for (const char* language : kLanguages) {
+        walk(language, [&](int page) {
+            for (auto* types : {find<QComboBox>("PTY_Combo1"), find<QComboBox>("EON_PTY_Combo")}) {
+                const QSignalBlocker quiet(types);
+                for (int type = 0; types->isVisible() && type < types->count(); ++type) {
+                    types->setCurrentIndex(type);
+                    expectNothingCutOff(*window, std::string(language) + " page " + std::to_string(page));
+                }
+            }
         });
     }
 }
