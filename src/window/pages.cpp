@@ -70,6 +70,7 @@ constexpr std::array<MakePage, 9> kPages = {makeStereo,  makeRds,   makeAf,  mak
 
 std::vector<Page*> makePages(const PageContext& with, Station& station, HMenue& window) {
     std::vector<Page*> pages;
+    pages.reserve(kPages.size());
     for (const MakePage make : kPages) pages.push_back(make(with, station, window));
     return pages;
 }
