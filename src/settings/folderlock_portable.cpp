@@ -25,7 +25,8 @@ bool underFolderLock(const fs::path& folder, const std::function<void()>& work) 
     const auto latest = std::chrono::steady_clock::now() + 1s;
     std::error_code error;
     bool made = false;
-    while (!(made = fs::create_directory(mark, error)) && !error) {
+    // A mark that goes away while it is looked at is told as an existing file: its owner has just let go.
+    while (!(made = fs::create_directory(mark, error)) && (!error || error == std::errc::file_exists)) {
         if (std::chrono::steady_clock::now() >= latest) return false;
         if (isLeftOver(mark)) fs::remove(mark, error);
         std::this_thread::sleep_for(1ms);
