@@ -12,6 +12,7 @@
 #include "settings/captions.h"
 #include "settings/datafolder.h"
 #include "settings/dataplace.h"
+#include "settings/leftovers.h"
 #include "settings/programstate.h"
 #include "sim/virtualinstrument.h"
 #include "station/session.h"
@@ -73,6 +74,7 @@ int main(int argc, char** argv) {
     std::string problem;
     kdx::DataFolder data(appFolder(options, argv[0], problem));
     if (!problem.empty()) std::fprintf(stderr, "kdx-rds: %s\n", problem.c_str());
+    kdx::sweepLeftovers(data.path());
     kdx::ProgramState state;
     kdx::Captions captions(data);
     kdx::QtDialogs boxes(captions);

@@ -55,7 +55,7 @@ Reply VirtualInstrument::executeUnit(const CommandUnit& unit, std::string& path)
     const std::string header = (fromTheTop ? std::string() : path).append(unit.header);
     const auto found = tryHeader(header, unit);
     if (found && !common) path = header.substr(0, header.rfind(':') + 1);
-    const Reply reply = found.value_or(Reply{ScpiError::UndefinedHeader, std::nullopt});
+    Reply reply = found.value_or(Reply{ScpiError::UndefinedHeader, std::nullopt});
     if (m_observer) {
         CommandUnit inFull = unit;
         inFull.header = header;
@@ -65,7 +65,7 @@ Reply VirtualInstrument::executeUnit(const CommandUnit& unit, std::string& path)
 }
 
 std::optional<Reply> VirtualInstrument::tryHeader(std::string_view header, const CommandUnit& unit) {
-    if (const auto reply = statusCommand(header, unit, m_status)) return reply;
+    if (auto reply = statusCommand(header, unit, m_status)) return reply;
     const bool identification = unit.query && headerMatches("*IDN", header);
     const bool resets = !unit.query && headerMatches("*RST", header);
     const bool isDirect = headerMatches(kDirect, header);

@@ -9,7 +9,9 @@
 #include <QStackedWidget>
 #include <QTabBar>
 #include <QTabWidget>
+#include <QTimer>
 
+#include <chrono>
 #include <filesystem>
 
 #include "base/codepage.h"
@@ -18,6 +20,7 @@
 #include "settings/datafolder.h"
 #include "settings/generalsettings.h"
 #include "settings/programstate.h"
+#include "settings/shownpath.h"
 #include "tmc/tmclistedit.h"
 #include "ui/controls.h"
 #include "ui/dialogs.h"
@@ -39,7 +42,8 @@ namespace {
 constexpr int kGroupPage = 3;
 constexpr int kQueryPage = 5;
 constexpr int kFirstTabCaption = 10;
-constexpr QSize kDesignSize{640, 480};  // pixels at 96 dpi
+constexpr std::chrono::seconds kRetryInterval{10};  // until what could not be saved is tried again
+constexpr QSize kDesignSize{640, 480};              // pixels at 96 dpi
 
 /// Tells its layout no sizes of its own: the window's size is stated, and asking all nine pages what they need takes a
 /// fifth of the whole start. That every page fits is the tests' concern.
@@ -75,12 +79,16 @@ HMenue::HMenue(const Surroundings& surroundings)
     m_s.session.instrument.onFailure(
         [this](const std::string& text, bool sequenceRuns) { return showInterfaceError(text, sequenceRuns); });
     m_s.data.onUnsavedFileChanged([this] { showNotice(); });
+    auto* retry = named<QTimer>("UnsavedTimer", this);
+    connect(retry, &QTimer::timeout, this, [this] { m_s.data.retryUnsaved(); });
+    retry->start(kRetryInterval);
 }
 
 HMenue::~HMenue() {
     m_s.session.transmitter.setWatcher(nullptr);
     m_s.session.instrument.onFailure(nullptr);
     m_s.data.onUnsavedFileChanged(nullptr);
+    m_s.data.retryUnsaved();  // a last time
 }
 
 void HMenue::createPages() {
@@ -299,7 +307,7 @@ void HMenue::showNotice() {
 QString HMenue::missingData() const {
     const std::filesystem::path& folder = m_s.data.path();
     std::error_code error;
-    if (!std::filesystem::is_directory(folder, error)) return QString::fromStdU16String(folder.u16string());
+    if (!std::filesystem::is_directory(folder, error)) return QString::fromStdString(shownPath(folder));
     // Missing, unreadable, garbage, or without this language: the captions are empty all the same.
     if (m_s.captions.isEmpty()) {
         return QStringLiteral("%1 [%2]").arg(QLatin1String(kLanguageFile), toText(m_s.state.language));

@@ -275,6 +275,44 @@ TEST_F(StartUpTest, AMissingLanguageFileIsTold) {
     EXPECT_EQ(text("GTL_Taste"), "Local");  // the program's own texts stay as designed
 }
 
+TEST_F(StartUpTest, AValueThatCouldNotBeSavedIsTriedAgainByItselfAndAtTheEnd) {
+    startShipped();
+    openSession();
+    const auto file = folder.data() / dataSetFile("1");
+    const std::string content = folder.read(dataSetFile("1"));
+    const auto hinder = [&] {
+        std::filesystem::remove(file);
+        std::filesystem::create_directories(file / "x");
+    };
+    hinder();
+    type("PS_T", "SPAETER");
+    click("PS_Taste");
+    EXPECT_NE(text("QuietLine").find("Datenset1.INI"), std::string::npos);
+    std::filesystem::remove_all(file);
+    folder.write("Datenset1.INI", content);
+    EXPECT_TRUE(tick("UnsavedTimer"));
+    EXPECT_EQ(data.ReadIni("RDS", "PS", "Datenset1.INI"), "SPAETER");
+    EXPECT_NE(folder.read("Datenset1.INI").find("PS=SPAETER"), std::string::npos);
+    EXPECT_EQ(text("QuietLine"), "");
+    hinder();
+    type("PS_T", "ZULETZT");
+    click("PS_Taste");
+    std::filesystem::remove_all(file);
+    folder.write("Datenset1.INI", content);
+    window.reset();
+    EXPECT_NE(folder.read("Datenset1.INI").find("PS=ZULETZT"), std::string::npos);
+}
+
+TEST_F(StartUpTest, AMissingFolderWhoseNameIsNoUtf8IsTold) {
+    DataFolder odd(folder.path() / "J\xFCrgen");
+    captions.load("deutsch", "RDS");
+    Session other(visa, state, odd, captions, clock, [] {});
+    TickerGroup group;
+    HMenue shown({other, state, odd, captions, clock, dialogs, group, QString(), [] {}});
+    shown.startUp();
+    EXPECT_TRUE(shown.findChild<QLabel*>(QStringLiteral("QuietLine"))->text().contains(QStringLiteral("\\xFCrgen")));
+}
+
 TEST_F(StartUpTest, ASettingThatCannotBeSavedIsNamedUntilItCan) {
     startShipped();
     openSession();
