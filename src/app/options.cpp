@@ -4,6 +4,7 @@
 
 #include <algorithm>
 #include <memory>
+#include <utility>
 
 namespace kdx {
 
@@ -44,6 +45,11 @@ Options parseOptions(const std::vector<std::string>& arguments) {
         commandLine(options)->parse(reversed);
     } catch (const CLI::ParseError& error) {
         options.error = error.what();
+    }
+    for (const auto& [name, value] :
+         {std::pair{"--app-folder", &options.appFolder}, std::pair{"--visa-library", &options.visaLibrary},
+          std::pair{"--tour", &options.tourFolder}}) {
+        if (options.error.empty() && *value && (*value)->empty()) options.error = std::string(name) + " needs a value";
     }
     return options;
 }

@@ -70,7 +70,7 @@ void declareOptions(CLI::App& commandLine, Options& options) {
         ->type_name("ADDR")
         ->take_last();
     commandLine.add_option("--idn", options.identification, "the answer to *IDN?")->type_name("TEXT")->take_last();
-    commandLine.add_flag("--trace", options.trace, "print what happens on every link");
+    commandLine.add_flag("--trace", options.trace, "print what happens on every link")->disable_flag_override();
     commandLine.set_help_flag("--help", "print this and end");
     commandLine.set_version_flag("--version", "kdx-sim " KDX_VERSION, "print the version and end");
     commandLine.footer(kFooter);

@@ -31,6 +31,13 @@ TEST(OptionsTest, AMissingOrSuperfluousValueIsNamed) {
     }
 }
 
+TEST(OptionsTest, AnEmptyValueIsNoneAndOfAnOptionGivenTwiceTheLastCounts) {
+    for (const char* name : {"--tour", "--app-folder", "--visa-library"}) {
+        EXPECT_EQ(parseOptions({name, ""}).error, std::string(name) + " needs a value");
+    }
+    EXPECT_EQ(parseOptions({"--app-folder", "/a", "--app-folder", "/b"}).appFolder, "/b");
+}
+
 TEST(OptionsTest, TwoInstrumentsExcludeEachOther) {
     EXPECT_NE(parseOptions({"--simulate", "--visa-library", "x.so"}).error, "");
 }

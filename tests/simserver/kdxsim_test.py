@@ -45,7 +45,7 @@ class Options(unittest.TestCase):
         self.assertRegex(result.stdout, r"^kdx-sim \d+\.\d+\.\d+\n$")
 
     def testWrongUsageIsSaidOnStderrAndExitsWith2(self):
-        for options in (["--nonsense"], ["inst0"], ["-h"], ["--port"], ["--port", ""], ["--port", "70000"],
+        for options in (["--nonsense"], ["--trace=no"], ["inst0"], ["-h"], ["--port"], ["--port", ""], ["--port", "70000"],
                         ["--port", "-1"], ["--port", "12x"], ["--idn"], ["--bind"]):
             with self.subTest(options=options):
                 result = run(*options)
