@@ -1,6 +1,7 @@
 #include "rds/querypage.h"
 
 #include <array>
+#include <utility>
 
 #include "coder/readback.h"
 #include "link/commandsequence.h"
@@ -82,11 +83,12 @@ void QueryPage::Fragen_Schalter(bool on) {
 void QueryPage::ask(const ReadBack& readBack) {
     if (!m_with.state.InstrumentOnline) return;
     const CommandSequence sequence(m_with.instrument);
-    m_answers.clear();
+    std::vector<std::string> answers;  // of this call: a box of a failed question lets another button be pressed
     for (const Query& query : readBack.queries(m_with.state.eonIdentifier)) {
-        m_answers.push_back(readBack.generator ? m_with.instrument.VRN_Abfrage(query.label, query.key)
-                                               : m_with.instrument.X4_Abfrage(query.label, query.key));
+        answers.push_back(readBack.generator ? m_with.instrument.VRN_Abfrage(query.label, query.key)
+                                             : m_with.instrument.X4_Abfrage(query.label, query.key));
     }
+    m_answers = std::move(answers);
     m_asked = &readBack;
     showAnswers();
 }

@@ -184,6 +184,24 @@ TEST_F(QueryPageTest, TheQuestionsLeftAreNotAskedAfterAStop) {
     EXPECT_EQ(text("gelesen"), "RADIO");
 }
 
+TEST_F(QueryPageTest, AButtonPressedWhileABoxOfAnotherIsOpenLeavesEachItsOwnAnswers) {
+    for (const auto& [query, answer] : {std::pair{"ARI-DEV", "350"}, {"ARI-ID", "3"}, {"BK", "B"}, {"PS", "RADIO"}}) {
+        visa.answersTo[coder(query)] = std::string("\"") + answer + "\"\n";
+    }
+    visa.readStatuses = {visa::kTimeout};
+    std::string meanwhile;
+    instrument.onFailure([&](const std::string&, bool) {
+        click("Command5");
+        meanwhile = text("gelesen");
+        return false;
+    });
+    click("Command1");
+    EXPECT_EQ(meanwhile, "RADIO");
+    const auto asked = std::find_if(readBacks().begin(), readBacks().end(),
+                                    [](const ReadBack& one) { return std::string(one.button) == "Command1"; });
+    EXPECT_EQ(text("gelesen"), toText(asked->words({"", "350", "3", "B"}, captions)).toStdString());
+}
+
 TEST_F(QueryPageTest, AnAnswerIsShownInWordsOverSeveralLines) {
     for (const char* answer : {"\"1\"\n", "\"350\"\n", "\"3\"\n", "\"B\"\n"}) visa.answers.emplace_back(answer);
     click("Command1");
