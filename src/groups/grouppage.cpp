@@ -24,6 +24,8 @@ void GroupPage::create() {
     m_sequenceView = new QScrollArea(this);
     m_book.spoken(m_sequenceView, {83});
     Label10 = named<SequenceLabel>("Label10", m_sequenceView);
+    m_note = captioned<QLabel>("SequenceNote", {460, "Eine gespeicherte Folge wird nur bis zum 254. Zeichen gelesen."},
+                               this);
     newList = clicked<QPushButton>("newList", {156}, this, &GroupPage::newList_Click);
     GS_Senden = clicked<QPushButton>("GS_Senden", {82}, this, &GroupPage::GS_Senden_Click);
 }
@@ -51,8 +53,9 @@ void GroupPage::arrange() {
     page->setRowMinimumHeight(below, 2 * kGap);
     page->addWidget(m_sequenceView, below + 1, 0, 1, kColumns);
     page->setRowStretch(below + 1, 7);  // as high as three and a half rows of buttons
-    page->addWidget(newList, below + 2, 0);
-    page->addWidget(GS_Senden, below + 2, kColumns - 1);
+    page->addWidget(m_note, below + 2, 0, 1, kColumns);
+    page->addWidget(newList, below + 3, 0);
+    page->addWidget(GS_Senden, below + 3, kColumns - 1);
     layOut(this, page, 2 * kGap);
 }
 
@@ -74,6 +77,7 @@ void GroupPage::opened() {
 
 void GroupPage::Gruppe_Click(int number) {
     m_sequence.groups += groupText(number);
+    m_sequence.composed = true;
     countUp(m_with.state.groupCount);
     if (number == kTmcGroup) countUp(m_with.state.group8ACount);
     showSequence();
@@ -81,6 +85,7 @@ void GroupPage::Gruppe_Click(int number) {
 
 void GroupPage::newList_Click() {
     m_sequence.groups.clear();
+    m_sequence.composed = true;
     countAnew();
     showSequence();
 }
@@ -109,18 +114,20 @@ void GroupPage::Gruppenfolge() {
 
 void GroupPage::stepGoesOut(const Step& step) {
     constexpr const Setting& kSequence = setting::kGroupSequence;
-    if (step.key == kSequence.sendKey) m_with.profile.write(kSequence.place, step.value + ",");
+    if (step.key != kSequence.sendKey || !m_sequence.isToBeStored(m_with.profile)) return;
+    m_with.profile.write(kSequence.place, step.value + ",");
 }
 
 void GroupPage::showStored() {
     // Data set 1 whatever set is at work, although sending stores in the one at work.
-    m_sequence.groups = m_with.profile.read(setting::kShownGroupSequence);
+    m_sequence.setRead(m_with.profile.read(setting::kShownGroupSequence));
     m_with.state.storedGroupSequence = m_sequence.groups;
     showSequence();
 }
 
 void GroupPage::showSequence() {
     Label10->setText(caption({83}) + QLatin1Char(':') + toText(m_sequence.groups));
+    m_note->setVisible(m_sequence.exceedsReading());
 }
 
 }  // namespace kdx

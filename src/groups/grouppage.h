@@ -44,6 +44,7 @@ private:
     QPushButton* GS_Senden = nullptr;
     SequenceLabel* Label10 = nullptr;  // heading and sequence
     QScrollArea* m_sequenceView = nullptr;
+    QLabel* m_note = nullptr;  // that a sequence is longer than can be read back
 };
 
 }  // namespace kdx

@@ -1,8 +1,10 @@
 #include "groups/groupsequence.h"
 
 #include <limits>
+#include <utility>
 
 #include "groups/settings.h"
+#include "settings/profilefile.h"
 
 namespace kdx {
 
@@ -16,7 +18,20 @@ std::string sequenceToSend(std::string_view groups) {
 }
 
 void GroupSequence::load(const Profile& profile) {
-    groups = profile.read(setting::kGroupSequence.place);
+    setRead(profile.read(setting::kGroupSequence.place));
+}
+
+void GroupSequence::setRead(std::string text) {
+    groups = std::move(text);
+    composed = false;
+}
+
+bool GroupSequence::exceedsReading() const {
+    return groups.size() > kLongestValue || (!composed && groups.size() == kLongestValue);
+}
+
+bool GroupSequence::isToBeStored(const Profile& profile) const {
+    return composed || (!exceedsReading() && profile.read(setting::kGroupSequence.place) != groups);
 }
 
 void GroupSequence::appendSteps(Steps& steps) const {

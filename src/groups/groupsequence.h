@@ -22,11 +22,19 @@ inline constexpr int kTmcGroup = 8;
 /// The sequence as the coder takes it: without its last character, the comma after the last group.
 [[nodiscard]] std::string sequenceToSend(std::string_view groups);
 
-/// The group sequence of a data set.
+/// The group sequence of a data set. It may have any length, but a file gives the beginning only of a long one: what
+/// was read and not composed since must not take the place of what is stored.
 struct GroupSequence {
-    std::string groups;  ///< each followed by a comma
+    std::string groups;     ///< each followed by a comma
+    bool composed = false;  ///< by the user, since it was read
 
     void load(const Profile& profile);
+    /// Takes over what was read.
+    void setRead(std::string text);
+    /// Whether it is longer than a reading gives; true also for one that was read and may go on in its file.
+    [[nodiscard]] bool exceedsReading() const;
+    /// Whether the set at work is to get it when it is sent.
+    [[nodiscard]] bool isToBeStored(const Profile& profile) const;
     /// Adds the sequence; no step without one.
     void appendSteps(Steps& steps) const;
 };

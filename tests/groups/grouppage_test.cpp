@@ -12,6 +12,12 @@ using test::Lines;
 
 constexpr const char* kSet1 = "Datenset1.INI";
 
+std::string repeated(const std::string& text, int times) {
+    std::string all;
+    for (int i = 0; i < times; ++i) all += text;
+    return all;
+}
+
 class GroupPageTest : public test::PageTest {
 protected:
     GroupPageTest() { page.label(); }
@@ -222,6 +228,89 @@ TEST_F(GroupPageTest, TheSequenceIsStoredBeforeItIsSent) {
     });
     click("GS_Senden");
     EXPECT_EQ(stored, "0A,2A,");
+}
+
+/// A sequence longer than a reading of the file gives, stored in data set 1.
+class LongGroupSequence : public GroupPageTest {
+protected:
+    LongGroupSequence() {
+        for (int i = 0; i < 100; ++i) press({15});
+        click("GS_Senden");
+        stored = folder.read(kSet1);
+        page.opened();
+        sent();
+    }
+    std::string note() {
+        const auto* label = find<QLabel>("SequenceNote");
+        return label->isHidden() ? std::string() : label->text().toStdString();
+    }
+
+    std::string stored;
+};
+
+TEST_F(LongGroupSequence, IsStoredWholeAndReadInPart) {
+    EXPECT_NE(stored.find("=" + repeated("15A,", 100) + "\r\n"), std::string::npos);
+    EXPECT_EQ(part.groups, repeated("15A,", 100).substr(0, kLongestValue));
+}
+
+TEST_F(LongGroupSequence, IsNotStoredAgainAsItWasRead) {
+    click("GS_Senden");
+    EXPECT_EQ(sent().size(), 1U);
+    EXPECT_EQ(folder.read(kSet1), stored);
+    Steps steps;
+    part.appendSteps(steps);
+    page.stepGoesOut(steps.front());  // with the whole data set
+    EXPECT_EQ(folder.read(kSet1), stored);
+}
+
+TEST_F(LongGroupSequence, IsNotStoredInAnotherSetAsItWasRead) {
+    setProfile("Datenset2.INI", "RDS", "GR_FOLGE", "0A,");
+    state.CurrentDataSet = "2";
+    click("GS_Senden");
+    EXPECT_EQ(profile("Datenset2.INI", "RDS", "GR_FOLGE"), "0A,");
+}
+
+TEST_F(LongGroupSequence, IsStoredOnceItIsComposedAnew) {
+    click("newList");
+    press({0, 2});
+    click("GS_Senden");
+    EXPECT_EQ(profile(kSet1, "RDS", "GR_FOLGE"), "0A,2A,");
+}
+
+TEST_F(LongGroupSequence, IsToldInWordsOfTheLanguage) {
+    EXPECT_EQ(note(), "Eine gespeicherte Folge wird nur bis zum 254. Zeichen gelesen.");
+    for (const char* language : {"english", "english US"}) {
+        useLanguage(language);
+        page.label();
+        EXPECT_EQ(note(), "A stored sequence is read up to its 254th character only.");
+    }
+    click("newList");
+    EXPECT_EQ(note(), "");
+    for (int i = 0; i < 63; ++i) press({15});
+    EXPECT_EQ(note(), "") << "252 characters are read back whole";
+    press({15});
+    EXPECT_NE(note(), "");
+}
+
+TEST_F(LongGroupSequence, LeavesThePageItsSize) {
+    page.resize(620, 322);
+    page.show();
+    QApplication::processEvents();
+    EXPECT_LE(page.minimumSizeHint().height(), 322);
+    EXPECT_LE(page.minimumSizeHint().width(), 620);
+    EXPECT_TRUE(find("SequenceNote")->isVisible());
+    test::expectNothingCutOff(page, "long sequence");
+}
+
+TEST_F(GroupPageTest, ASequenceThatWasOnlyReadIsNotWrittenBack) {
+    setProfile(kSet1, "RDS", "GR_FOLGE", "0A,2A");  // by hand, without the last comma
+    part.load(settings);
+    page.load();
+    click("GS_Senden");
+    EXPECT_EQ(profile(kSet1, "RDS", "GR_FOLGE"), "0A,2A");
+    press({8});
+    click("GS_Senden");
+    EXPECT_EQ(profile(kSet1, "RDS", "GR_FOLGE"), "0A,2A8A,");
 }
 
 /// The sequence as a reader of the label finds it: after the heading of fixed length, without the last comma.
