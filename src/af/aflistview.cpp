@@ -21,7 +21,6 @@ void AfListView::createContent(QLabel* tuned, const Caption& tunedHeading, const
     m_tunedHeading = book.captioned<QLabel>("", tunedHeading, parent);
     m_listHeading = book.captioned<QLabel>("", listHeading, parent);
     m_list = named<QListWidget>(list, parent);
-    for (QLabel* label : {m_tuned, m_tunedHeading, m_listHeading}) label->setTextFormat(Qt::PlainText);
     book.head(m_tunedHeading, m_tuned);
     book.head(m_listHeading, m_list);
 }

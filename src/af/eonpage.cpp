@@ -38,7 +38,6 @@ EonPage::EonPage(const PageContext& with, OtherNetwork& network, QWidget* parent
 void EonPage::create() {
     createProgramme();
     createLists();
-    for (QLabel* label : findChildren<QLabel*>()) label->setTextFormat(Qt::PlainText);
 }
 
 void EonPage::createProgramme() {

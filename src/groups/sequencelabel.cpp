@@ -8,7 +8,6 @@
 namespace kdx {
 
 SequenceLabel::SequenceLabel(QWidget* parent) : QLabel(parent) {
-    setTextFormat(Qt::PlainText);
     setWordWrap(true);
     setMargin(2);
 }

@@ -37,7 +37,6 @@ void QueryPage::create() {
         m_buttons.push_back(button);
     }
     gelesen = captioned<QLabel>("gelesen", {139}, this);
-    gelesen->setTextFormat(Qt::PlainText);
     gelesen->setFrameStyle(QFrame::Panel | QFrame::Sunken);
     gelesen->setAlignment(Qt::AlignLeft | Qt::AlignTop);
     gelesen->setWordWrap(true);

@@ -9,7 +9,6 @@ class ValueLabel : public QLabel {
 public:
     explicit ValueLabel(QWidget* parent) : QLabel(parent) {
         setFrameStyle(QFrame::Panel | QFrame::Sunken);
-        setTextFormat(Qt::PlainText);
         setAlignment(Qt::AlignCenter);
     }
     /// Keeps it wide enough for that many digits of its font.

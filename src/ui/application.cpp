@@ -1,7 +1,9 @@
 #include "ui/application.h"
 
 #include "ui/controls.h"
+#include "ui/plaintext.h"
 
+#include <QEvent>
 #include <QFont>
 #include <QStyleFactory>
 
@@ -25,6 +27,7 @@ void Application::onFailure(std::function<void(const QString&, const QString&)> 
 }
 
 bool Application::notify(QObject* receiver, QEvent* event) {
+    if (event->type() == QEvent::Polish) keepTextPlain(*receiver);
     try {
         return QApplication::notify(receiver, event);
     } catch (const std::exception& error) {

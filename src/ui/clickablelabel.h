@@ -14,7 +14,6 @@ public:
         setCursor(Qt::PointingHandCursor);
         setFocusPolicy(Qt::StrongFocus);
         setFrameStyle(QFrame::Panel | QFrame::Sunken);
-        setTextFormat(Qt::PlainText);
     }
 
 signals:

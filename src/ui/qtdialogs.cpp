@@ -32,7 +32,6 @@ QtDialogs::QtDialogs(const Captions& captions) : m_captions(captions) {}
 
 void QtDialogs::message(Icon icon, const QString& title, const QString& text, const QString& details) {
     QMessageBox box(boxIcon(icon), title, text, QMessageBox::NoButton, QApplication::activeWindow());
-    box.setTextFormat(Qt::PlainText);
     box.setInformativeText(details);
     box.addButton(toText(m_captions.own(317, "OK")), QMessageBox::AcceptRole);
     box.exec();
@@ -40,7 +39,6 @@ void QtDialogs::message(Icon icon, const QString& title, const QString& text, co
 
 bool QtDialogs::messageOrStop(const QString& title, const QString& text) {
     QMessageBox box(QMessageBox::Critical, title, text, QMessageBox::NoButton, QApplication::activeWindow());
-    box.setTextFormat(Qt::PlainText);
     QPushButton* ok = box.addButton(toText(m_captions.own(317, "OK")), QMessageBox::AcceptRole);
     box.setDefaultButton(ok);
     box.setEscapeButton(ok);
@@ -52,7 +50,6 @@ bool QtDialogs::messageOrStop(const QString& title, const QString& text) {
 
 bool QtDialogs::confirm(const QString& title, const QString& text) {
     QMessageBox box(QMessageBox::Question, title, text, QMessageBox::NoButton, QApplication::activeWindow());
-    box.setTextFormat(Qt::PlainText);
     const QPushButton* yes = box.addButton(toText(m_captions.own(315, "&Ja")), QMessageBox::YesRole);
     box.setEscapeButton(box.addButton(toText(m_captions.own(316, "&Nein")), QMessageBox::NoRole));
     box.exec();

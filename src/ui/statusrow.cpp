@@ -40,7 +40,6 @@ StatusRow::StatusRow(QWidget* parent) : QWidget(parent) {
     grid->setHorizontalSpacing(3);
     grid->setVerticalSpacing(1);
     Gen1_Label = named<QLabel>("Gen1_Label", QStringLiteral("Status :"), this);
-    Gen1_Label->setTextFormat(Qt::PlainText);
     grid->addWidget(Gen1_Label, 0, 0, 2, 1);
     int column = 1;
     for (const Pair& pair : kPairs) {
@@ -48,7 +47,6 @@ StatusRow::StatusRow(QWidget* parent) : QWidget(parent) {
         Status[pair.value] = element<QLabel>("Status", pair.value, QString::fromUtf8(pair.design), this);
         for (QLabel* label : {Status[pair.heading], Status[pair.value]}) {
             label->setFont(arial(font()));
-            label->setTextFormat(Qt::PlainText);
             label->setAlignment(Qt::AlignCenter);
         }
         QLabel* value = Status[pair.value];

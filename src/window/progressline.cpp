@@ -10,7 +10,6 @@ namespace kdx {
 
 ProgressLine::ProgressLine(QWidget* parent) : QWidget(parent) {
     m_text = named<QLabel>("QuietLine", this);
-    m_text->setTextFormat(Qt::PlainText);
     m_text->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Fixed);
     m_bar = named<QProgressBar>("ProgressBar", this);
     m_bar->setTextVisible(false);

@@ -231,6 +231,7 @@ TEST_F(QueryPageTest, AnAnswerIsNeverTakenForMarkup) {
     visa.answers = {"\"<b>A</b>\"\n"};
     click("Command5");
     EXPECT_EQ(text("gelesen"), "<b>A</b>");
+    page.ensurePolished();  // as before it is shown
     EXPECT_EQ(find<QLabel>("gelesen")->textFormat(), Qt::PlainText);
 }
 
