@@ -1,12 +1,38 @@
 #include "ui/plaintext.h"
 
+#include "ui/text.h"
+
 #include <QLabel>
+#include <QLineEdit>
+#include <QValidator>
+
+#include <algorithm>
 
 namespace kdx {
+
+namespace {
+
+/// Takes the control characters out of whatever comes into an entry, and accepts the rest.
+class ControlRemover final : public QValidator {
+public:
+    using QValidator::QValidator;
+
+    State validate(QString& input, int& position) const override {
+        // A letter in the cursor's place: what stands before it is not the end of the text.
+        const auto before = withoutControls(QString(input.left(position) + QLatin1Char('x'))).size() - 1;
+        input = withoutControls(input);
+        position = static_cast<int>(std::min(before, input.size()));
+        return Acceptable;
+    }
+};
+
+}  // namespace
 
 void keepTextPlain(QObject& control) {
     if (auto* label = qobject_cast<QLabel*>(&control)) {
         label->setTextFormat(Qt::PlainText);  // the tool tip is one too
+    } else if (auto* entry = qobject_cast<QLineEdit*>(&control); entry != nullptr && entry->validator() == nullptr) {
+        entry->setValidator(new ControlRemover(entry));
     }
 }
 

@@ -5,7 +5,8 @@ class QObject;
 namespace kdx {
 
 /// To be called for each control before it is first shown. What labels and tool tips show is text and never markup: a
-/// caption or an answer of the instrument must not make the program fetch a picture.
+/// caption or an answer of the instrument must not make the program fetch a picture. What is typed or pasted into an
+/// entry loses its control characters: line ends copied along would end the command or the line of the file.
 void keepTextPlain(QObject& control);
 
 }  // namespace kdx

@@ -63,7 +63,7 @@ QString QtDialogs::input(const QString& prompt, const QString& title, const QStr
     box.setTextValue(preset);
     box.setOkButtonText(toText(m_captions.own(317, "OK")));
     box.setCancelButtonText(toText(m_captions.own(318, "Abbrechen")));
-    return box.exec() == QDialog::Accepted ? box.textValue() : QString();
+    return box.exec() == QDialog::Accepted ? withoutControls(box.textValue()) : QString();
 }
 
 }  // namespace kdx

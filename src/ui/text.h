@@ -17,6 +17,20 @@ namespace kdx {
     return text;
 }
 
+/// An entered text as it can be sent and kept in one line: control characters become blanks, CR LF a single one; those
+/// at either end are left out. Blanks stay as typed.
+[[nodiscard]] inline QString withoutControls(QStringView text) {
+    const auto isControl = [](QChar c) { return c < QChar(0x20) || c == QChar(0x7F); };
+    while (!text.isEmpty() && isControl(text.front())) text = text.sliced(1);
+    while (!text.isEmpty() && isControl(text.back())) text.chop(1);
+    QString plain;
+    for (qsizetype at = 0; at < text.size(); ++at) {
+        if (text.sliced(at).startsWith(QLatin1String("\r\n"))) ++at;
+        plain += isControl(text[at]) ? QLatin1Char(' ') : text[at];
+    }
+    return plain;
+}
+
 /// The window's text as 8-bit Windows-1252; a character the code page does not have becomes '?', one a character.
 [[nodiscard]] inline std::string toBytes(const QString& text) {
     std::string bytes;

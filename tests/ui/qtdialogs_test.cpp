@@ -110,6 +110,14 @@ TEST_F(QtDialogsTest, AnInputGivesWhatWasTypedAndNothingWhenCancelled) {
     EXPECT_EQ(answer([](QInputDialog& box) { button(box, "Cancel")->click(); }), QString());
 }
 
+TEST_F(QtDialogsTest, AnAnswerHasNoControlCharacters) {
+    meet<QInputDialog>([](QInputDialog& box) {
+        box.setTextValue(QStringLiteral(" lab\r\n7\t"));
+        box.accept();
+    });
+    EXPECT_EQ(dialogs.input(QString(), QString(), QString()), QStringLiteral(" lab 7"));
+}
+
 TEST_F(QtDialogsTest, WithoutALanguageFileTheButtonsReadAsDesigned) {
     captions.load("none", "RDS");
     meet<QMessageBox>([](QMessageBox& box) { button(box, "&Nein")->click(); });

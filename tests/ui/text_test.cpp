@@ -22,5 +22,19 @@ TEST(TextTest, UmlautsAreOneByte) {
     EXPECT_EQ(toBytes(QString::fromUtf8("\xC3\xBC\xE2\x82\xAC")), "\xFC\x80");
 }
 
+TEST(TextTest, EnteredControlCharactersBecomeBlanksAndThoseAtTheEndsNothing) {
+    const auto plain = [](const char* text) { return withoutControls(QString::fromLatin1(text)).toStdString(); };
+    EXPECT_EQ(plain(""), "");
+    EXPECT_EQ(plain("\r\n\t"), "");
+    EXPECT_EQ(plain("A\r\nB"), "A B");
+    EXPECT_EQ(plain("A\n\rB\tC\x7F"
+                    "D"),
+              "A  B C D");
+    EXPECT_EQ(plain("\x01\r\nA\r\n"), "A");
+    EXPECT_EQ(plain(" A  B "), " A  B ");
+    EXPECT_EQ(plain(" \nA\n "), "  A  ") << "inside the blanks that were typed";
+    EXPECT_EQ(withoutControls(QString::fromUtf8("\xC3\xBC\xE2\x82\xAC")), QString::fromUtf8("\xC3\xBC\xE2\x82\xAC"));
+}
+
 }  // namespace
 }  // namespace kdx
