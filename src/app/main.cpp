@@ -1,4 +1,6 @@
 // Options and wiring of the program; what there is to test stands elsewhere.
+#include <QSocketNotifier>
+
 #include <cstdio>
 #include <cstdlib>
 #include <filesystem>
@@ -40,6 +42,17 @@ std::filesystem::path appFolder(const kdx::Options& options, const char* program
     return kdx::chooseAppFolder(places, problem);
 }
 
+/// Ends the program when the operating system asks for it.
+void endWhenAsked(kdx::Application& application) {
+    const int requests = kdx::endRequests();
+    if (requests < 0) return;
+    auto* asked = new QSocketNotifier(requests, QSocketNotifier::Read, &application);
+    QObject::connect(asked, &QSocketNotifier::activated, &application, [asked, &application] {
+        asked->setEnabled(false);
+        application.end();
+    });
+}
+
 }  // namespace
 
 int main(int argc, char** argv) {
@@ -71,6 +84,7 @@ int main(int argc, char** argv) {
     }
 
     kdx::Application application(argc, argv);
+    endWhenAsked(application);
     std::string problem;
     kdx::DataFolder data(appFolder(options, argv[0], problem));
     if (!problem.empty()) std::fprintf(stderr, "kdx-rds: %s\n", problem.c_str());
@@ -84,7 +98,7 @@ int main(int argc, char** argv) {
         dialogs.message(kdx::Dialogs::Icon::Critical, kdx::toText(captions.own(313, "Fehler")),
                         kdx::toText(captions.own(314, "Bei \"%1\": %2")).arg(doing, error));
     });
-    const auto end = [] { QCoreApplication::quit(); };
+    const auto end = [&application] { application.end(); };
     kdx::Session session(*link.visa, state, data, captions, clock, end);
     kdx::TickerGroup tickers;
     kdx::HMenue window(
@@ -93,6 +107,7 @@ int main(int argc, char** argv) {
     if (options.tourFolder) {
         return kdx::makeTour(window, session.instrument, tourBoxes, QString::fromStdString(*options.tourFolder), print);
     }
+    if (application.isEnding()) return EXIT_SUCCESS;  // asked for while a box of the start was open
     window.show();
     return kdx::Application::exec();
 }

@@ -4,7 +4,7 @@
 
 namespace kdx {
 
-// What the programs ask of the operating system at their beginning.
+// What the programs ask of the operating system.
 
 /// The folder of the program file. @param program the program's name as it was called, where nothing better is known.
 [[nodiscard]] std::filesystem::path programFolder(const char* program);
@@ -15,5 +15,9 @@ namespace kdx {
 
 /// Whether a window can be shown.
 [[nodiscard]] bool hasDisplay();
+
+/// From now on the system's requests to end the program (SIGTERM, SIGINT, SIGHUP) no longer end it at once: they make
+/// the descriptor that this gives readable. -1 when they cannot be had so.
+[[nodiscard]] int endRequests();
 
 }  // namespace kdx

@@ -1,3 +1,9 @@
+#include <fcntl.h>
+#include <unistd.h>
+
+#include <array>
+#include <cerrno>
+#include <csignal>
 #include <cstdlib>
 #include <system_error>
 
@@ -11,6 +17,15 @@ namespace {
 std::filesystem::path variable(const char* name) {
     const char* value = std::getenv(name);
     return value == nullptr ? std::filesystem::path() : std::filesystem::path(value);
+}
+
+// A signal's handler knows nothing but what is global.
+volatile std::sig_atomic_t requestSink = -1;
+
+extern "C" void noteEndRequest(int /*signal*/) {
+    const int before = errno;
+    [[maybe_unused]] const ssize_t ignored = write(requestSink, "", 1);  // full: it was asked for already
+    errno = before;
 }
 
 }  // namespace
@@ -30,6 +45,26 @@ std::filesystem::path userFolder() {
 
 bool hasDisplay() {
     return !variable("DISPLAY").empty() || !variable("WAYLAND_DISPLAY").empty() || !variable("QT_QPA_PLATFORM").empty();
+}
+
+int endRequests() {
+    std::array<int, 2> ends{};
+    if (pipe(ends.data()) != 0) return -1;
+    for (const int end : ends) {
+        fcntl(end, F_SETFD, FD_CLOEXEC);
+        fcntl(end, F_SETFL, O_NONBLOCK);
+    }
+    requestSink = ends[1];
+    struct sigaction noting {};
+    noting.sa_handler = noteEndRequest;
+    noting.sa_flags = SA_RESTART;
+    for (const int signal : {SIGTERM, SIGINT, SIGHUP}) {
+        struct sigaction before {};
+        sigaction(signal, nullptr, &before);
+        // Who started the program with it switched off (nohup, a shell's background) wants it to live on.
+        if (before.sa_handler != SIG_IGN) sigaction(signal, &noting, nullptr);
+    }
+    return ends[0];
 }
 
 }  // namespace kdx

@@ -22,4 +22,8 @@ bool hasDisplay() {
     return true;
 }
 
+int endRequests() {
+    return -1;  // there the system closes the window
+}
+
 }  // namespace kdx

@@ -28,11 +28,12 @@ VisaStatus Instrument::open(const std::string& kind, const std::string& address)
     LastVisaStatus = m_visa.viStatusDesc(DefaultRm, LastVisaStatus, description);
     const std::string resource = (kind == "TCPIP" ? "TCPIP::" : "GPIB0::") + address + "::INSTR";
     LastVisaStatus = m_visa.viOpen(DefaultRm, resource, 0, 0, InstrSession);
-    if (LastVisaStatus == 0) m_state.InstrumentOnline = true;
+    if (LastVisaStatus == 0) m_state.InstrumentOnline = m_open = true;
     return LastVisaStatus;
 }
 
 void Instrument::close() {
+    m_open = false;
     LastVisaStatus = m_visa.viClose(InstrSession);
 }
 

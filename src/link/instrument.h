@@ -44,26 +44,24 @@ public:
     /// Closes the session; a failure stays silent. The handle keeps its value and the instrument counts as online
     /// still: whoever closes keeps commands away from it.
     void close();
+    /// Whether a session was opened and not closed since.
+    [[nodiscard]] bool isOpen() const { return m_open; }
 
     /// Writes the command byte for byte. Does nothing while no session has been opened. Any non-zero status is
     /// reported once; there is no retry.
     void Send2Gen(const std::string& command);
-
     /// Reads one answer: always 60 characters, the answer's bytes followed by blanks; "Error" after a failed read.
     /// While no session has been opened: kNoSessionAnswer, without touching the library.
     std::string ReadFromGen();
-
     /// Appends one line to the command log when logging is on: the key right-aligned in 15 characters, "= ", the
     /// value, and the note in double quotes unless it is empty. A log that cannot be written is passed over.
     void WriteLog(std::string_view key, std::string_view value, std::string_view note);
-
     /// Empties the command log; creates it when missing.
     void emptyLog();
 
     /// Asks the coder for one value; gives its text without quotes and line end, "" after a failed read.
     /// @param label the name under which the query is logged; @param key the coder's query text.
     std::string X4_Abfrage(const std::string& label, const std::string& key);
-
     /// Asks the generator for one value; `command` is the header without its question mark.
     std::string VRN_Abfrage(const std::string& label, const std::string& command);
 
@@ -90,6 +88,7 @@ private:
     Clock& m_clock;
     InterfaceError m_interfaceError;
     std::vector<TrafficWatcher*> m_watchers;
+    bool m_open = false;
     int m_sequences = 0;
     bool m_sequenceStopped = false;
 };

@@ -250,8 +250,7 @@ void LanVisa::destroyLink(Link& link) {
     Device_Error ignored{};
     link.channel.call(
         destroy_link, 0, [&](XDR* xdr) { return xdr_Device_Link(xdr, &link.id); },
-        [&](XDR* xdr) { return xdr_Device_Error(xdr, &ignored); },
-        steady_clock::now() + m_options.ioTimeout + m_options.answerMargin);
+        [&](XDR* xdr) { return xdr_Device_Error(xdr, &ignored); }, steady_clock::now() + m_options.closeTimeout);
 }
 
 }  // namespace kdx

@@ -20,6 +20,8 @@ struct LanOptions {
     std::chrono::milliseconds ioTimeout{2000};
     /// How much longer than the device itself we wait for its answer, since its own report of a time-out must reach us.
     std::chrono::milliseconds answerMargin{500};
+    /// For the device to let go of a link that is given up whatever it answers: somebody waits for the program to end.
+    std::chrono::milliseconds closeTimeout{500};
     std::uint16_t portMapperPort = 111;
     std::uint16_t corePort = 0;  ///< 0: the port mapper is asked
 };

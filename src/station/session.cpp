@@ -13,6 +13,10 @@ Session::Session(Visa& visa, ProgramState& state, DataFolder& data, const Captio
       m_state(state),
       m_source(profile) {}
 
+Session::~Session() {
+    if (instrument.isOpen()) instrument.close();
+}
+
 void Session::load(const Profile& source) {
     m_source = source;
     station.load(source);

@@ -16,6 +16,10 @@ namespace kdx {
 struct Session {
     Session(Visa& visa, ProgramState& state, DataFolder& data, const Captions& captions, Clock& clock,
             std::function<void()> endProgram);
+    /// Lets the instrument go when a session is open still: others would find it taken.
+    ~Session();
+    Session(const Session&) = delete;
+    Session& operator=(const Session&) = delete;
 
     /// Loads the data set of the profile, or of any other source; whatever is looked up at sending comes from there.
     void load() { load(profile); }

@@ -26,6 +26,12 @@ void Application::onFailure(std::function<void(const QString&, const QString&)> 
     m_report = std::move(report);
 }
 
+void Application::end() {
+    m_ending = true;
+    closeAllWindows();
+    exit(0);  // not quit(), which does nothing before the event loop runs: a box of the start would stay
+}
+
 bool Application::notify(QObject* receiver, QEvent* event) {
     if (event->type() == QEvent::Polish) keepTextPlain(*receiver);
     try {
@@ -36,6 +42,11 @@ bool Application::notify(QObject* receiver, QEvent* event) {
         report(receiver, QStringLiteral("?"));
     }
     return true;
+}
+
+bool Application::event(QEvent* event) {
+    if (event->type() == QEvent::Quit) m_ending = true;
+    return QApplication::event(event);
 }
 
 void Application::report(const QObject* receiver, const QString& error) {

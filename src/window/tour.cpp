@@ -79,6 +79,7 @@ void TourDialogs::note(const QString& title, const QString& text) {
 
 int makeTour(HMenue& window, Instrument& instrument, const TourDialogs& dialogs, const QString& folder,
              const std::function<void(const std::string&)>& print) {
+    if (instrument.isOpen()) window.GTL_Taste_Click();  // opened at the start already: the tour shows how
     TrafficPrinter traffic(instrument, print);
     int failures = 0;
     window.show();
@@ -90,6 +91,10 @@ int makeTour(HMenue& window, Instrument& instrument, const TourDialogs& dialogs,
     for (int page = 0; page < pages->count(); ++page) {
         pages->setCurrentIndex(page);
         QCoreApplication::processEvents();
+        if (!window.isVisible()) {
+            ++failures;  // the program is to end
+            break;
+        }
         const QString file = QDir(folder).filePath(QStringLiteral("page_%1.png").arg(page));
         if (window.grab().save(file)) {
             ++pictures;

@@ -2,6 +2,9 @@
 
 #include <gtest/gtest.h>
 
+#include <poll.h>
+
+#include <csignal>
 #include <cstdlib>
 #include <filesystem>
 #include <optional>
@@ -57,6 +60,29 @@ TEST_F(UserFolder, IsUnknownWithoutAnAbsoluteHome) {
     EXPECT_EQ(userFolder(), fs::path());
     setenv("XDG_DATA_HOME", "/data", 1);
     EXPECT_EQ(userFolder(), fs::path("/data/kdx-rds"));
+}
+
+bool isReadable(int descriptor) {
+    pollfd asked{descriptor, POLLIN, 0};
+    return poll(&asked, 1, 0) == 1;
+}
+
+TEST(EndRequests, OfTheSystemAreHeardAndEndNothing) {
+    for (const int signal : {SIGTERM, SIGINT, SIGHUP}) {
+        const int requests = endRequests();
+        ASSERT_GE(requests, 0);
+        EXPECT_FALSE(isReadable(requests));
+        EXPECT_EQ(raise(signal), 0);
+        EXPECT_TRUE(isReadable(requests)) << signal;
+    }
+}
+
+TEST(EndRequests, ThatWereSwitchedOffStaySo) {
+    std::signal(SIGHUP, SIG_IGN);
+    const int requests = endRequests();
+    EXPECT_EQ(raise(SIGHUP), 0);
+    EXPECT_FALSE(isReadable(requests));
+    std::signal(SIGHUP, SIG_DFL);
 }
 
 }  // namespace

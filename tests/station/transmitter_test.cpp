@@ -142,5 +142,32 @@ TEST(SessionTest, SendsADataSetWithoutAWindow) {
     EXPECT_EQ(bench.visa.calls.back(), "viClose " + std::to_string(session.instrument.InstrSession));
 }
 
+/// The calls of a session that is opened with this status and then ends, closed before or not.
+Lines callsAtTheEnd(VisaStatus openStatus, bool closed) {
+    Bench bench;
+    bench.visa.openStatus = openStatus;
+    {
+        Session session(bench.visa, bench.state, bench.data, bench.captions, bench.clock, [] {});
+        session.open("TCPIP", "10.0.0.1");
+        if (closed) session.close();
+        bench.visa.calls.erase(bench.visa.calls.begin(), bench.visa.calls.begin() + 3);
+    }
+    return bench.visa.calls;
+}
+
+TEST(SessionTest, ItsEndClosesWhatIsOpenOnce) {
+    EXPECT_EQ(callsAtTheEnd(0, false), Lines{"viClose 102"});
+    EXPECT_EQ(callsAtTheEnd(0, true), Lines{"viClose 102"});
+    EXPECT_EQ(callsAtTheEnd(visa::kTimeout, false), Lines{});
+}
+
+TEST(SessionTest, ThatWasNeverOpenedClosesNothing) {
+    Bench bench;
+    {
+        const Session session(bench.visa, bench.state, bench.data, bench.captions, bench.clock, [] {});
+    }
+    EXPECT_EQ(bench.visa.calls, Lines{});
+}
+
 }  // namespace
 }  // namespace kdx::test

@@ -21,7 +21,7 @@ protected:
         folder.copyShipped();
     }
 
-    ~KdxSimTest() override { window.reset(); }  // before what it works with
+    ~KdxSimTest() override { end(); }  // before what it works with
 
     /// Starts the instrument and the window; nothing is opened yet.
     void startBoth(const QStringList& simOptions = {}, LanOptions options = {}) {

@@ -20,14 +20,13 @@ protected:
 
     /// Makes the window and runs its start-up; a second call is a second start of the program.
     void start() {
-        window.reset();
-        m_listener.reset();
+        end();
         state = ProgramState();
-        const auto end = [this] { ++ended; };
-        session = std::make_unique<Session>(instrumentLink(), state, data, captions, clock, end);
+        const auto ask = [this] { ++ended; };
+        session = std::make_unique<Session>(instrumentLink(), state, data, captions, clock, ask);
         tickers.setHeld(false);
         window = std::make_unique<HMenue>(Surroundings{*session, state, data, captions, clock, boxesOfWindow(), tickers,
-                                                       QStringLiteral("scripted"), end});
+                                                       QStringLiteral("scripted"), ask});
         m_listener = std::make_unique<TrafficListener>(session->instrument, [this](const Traffic& traffic) {
             if (heard) heard(traffic);
         });
@@ -35,7 +34,13 @@ protected:
         window->show();
         QCoreApplication::processEvents();
     }
-    /// The same with the data that are shipped.
+    /// Ends the program. Who brings a link of its own calls it before that goes.
+    void end() {
+        window.reset();
+        m_listener.reset();
+        session.reset();
+    }
+    /// The same as start() with the data that are shipped.
     void startShipped() {
         folder.copyShipped();
         start();

@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include <QFontInfo>
+#include <QMessageBox>
 #include <QTimer>
 
 #include <stdexcept>
@@ -27,6 +28,42 @@ TEST(ApplicationTest, AnExceptionThatLeavesAHandlerIsToldAndTheProgramGoesOn) {
     EXPECT_EQ(doing, QStringLiteral("PS_Timer"));
     EXPECT_EQ(error, QStringLiteral("page 9 of 0 to 8"));
     application.onFailure(nullptr);
+}
+
+TEST(ApplicationTest, EndingClosesTheWindowAndABoxOverIt) {
+    auto& application = dynamic_cast<Application&>(*QCoreApplication::instance());
+    EXPECT_FALSE(application.isEnding());
+    QWidget window;
+    QMessageBox box(QMessageBox::Critical, QString(), QStringLiteral("Fehler"), QMessageBox::Ok, &window);
+    bool endingInTheBox = false;
+    QTimer::singleShot(0, &window, [&] {
+        box.exec();
+        endingInTheBox = application.isEnding();
+    });
+    QTimer::singleShot(50, &application, [&] { application.end(); });
+    window.show();
+    EXPECT_EQ(QApplication::exec(), 0);
+    EXPECT_TRUE(endingInTheBox);
+    EXPECT_FALSE(window.isVisible());
+}
+
+TEST(ApplicationTest, ABoxOfTheStartIsClosedToo) {
+    auto& application = dynamic_cast<Application&>(*QCoreApplication::instance());
+    QMessageBox box(QMessageBox::Critical, QString(), QStringLiteral("Fehler"), QMessageBox::Ok);
+    QTimer::singleShot(50, &application, [&] { application.end(); });
+    box.exec();  // before the event loop of the program runs
+    EXPECT_TRUE(application.isEnding());
+    QTimer::singleShot(0, &application, [] { QApplication::quit(); });
+    QApplication::exec();  // takes the end back for the tests after this one
+}
+
+TEST(ApplicationTest, ClosingTheLastWindowEndsTheProgram) {
+    auto& application = dynamic_cast<Application&>(*QCoreApplication::instance());
+    QWidget window;
+    QTimer::singleShot(0, &window, [&] { window.close(); });
+    window.show();
+    QApplication::exec();
+    EXPECT_TRUE(application.isEnding());
 }
 
 TEST(ApplicationTest, SpeaksInArialOrItsMetricTwin) {

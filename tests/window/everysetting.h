@@ -19,6 +19,7 @@ inline const Lines kIllegalValue = {R"(-224,"Illegal parameter value")"};
 /// boxes; a second client of the same instrument reads back what has arrived.
 class EverySetting : public WindowTest {
 protected:
+    ~EverySetting() override { end(); }
     void SetUp() override {
         folder.copyShipped();
         start();

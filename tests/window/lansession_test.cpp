@@ -18,9 +18,11 @@ protected:
         setGeneral("BUS", "INTERFACE", "TCPIP");
     }
 
+    ~LanSessionTest() override { end(); }
+
     void startOn(std::uint16_t port, const char* host = "127.0.0.1") {
         setGeneral("ADRESSEN", "KDX_TCPIP", host);
-        window.reset();
+        end();
         link = std::make_unique<LanVisa>(
             LanOptions{.connectTimeout = 200ms, .ioTimeout = 200ms, .answerMargin = 100ms, .portMapperPort = port});
         start();
@@ -52,6 +54,24 @@ TEST_F(LanSessionTest, OpensSendsAndReadsBack) {
     EXPECT_NE(readBackWith("\"MESSTURM\"\n").find("MESSTURM"), std::string::npos);
     click("GTL_Taste");
     EXPECT_EQ(device.destroyed().size(), 1U);
+}
+
+TEST_F(LanSessionTest, TheEndOfTheProgramLetsTheDeviceGo) {
+    startOn(device.port());
+    openOn();
+    end();
+    EXPECT_EQ(device.destroyed().size(), 1U);
+}
+
+TEST_F(LanSessionTest, ADeviceThatNoLongerAnswersHoldsTheEndUpForHalfASecondAtMost) {
+    startOn(device.port());
+    link = std::make_unique<LanVisa>(LanOptions{.portMapperPort = device.port()});  // the program's own times
+    start();
+    openOn();
+    device.on(ScriptedVxi11::kDestroyLink, {.kind = Reaction::Kind::Silence});
+    const auto begin = steady_clock::now();
+    end();
+    EXPECT_LT(steady_clock::now() - begin, 900ms);
 }
 
 class UnreachableInstrument : public LanSessionTest {

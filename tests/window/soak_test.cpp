@@ -147,7 +147,7 @@ protected:
         time = std::make_unique<VirtualTime>(clock, *window);
     }
     ~SoakTest() override {
-        window.reset();  // before what it works with
+        end();  // before what it works with
         dynamic_cast<Application&>(*QApplication::instance()).onFailure({});
     }
 

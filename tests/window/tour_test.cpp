@@ -68,6 +68,30 @@ TEST_F(TourTest, AnInstrumentThatIsNotThereIsAFailure) {
     EXPECT_EQ(printed.front(), "!! Interface Error: Please Check Device! -1073807343");
 }
 
+TEST_F(TourTest, ASessionOpenedAtTheStartIsClosedBeforeItsOwn) {
+    data.WriteIni("BUS", "IECBUS", "AUTO", kGeneralSettings);
+    FakeVisa visa;
+    tour(visa);
+    Lines calls;
+    for (const std::string& call : visa.calls) {
+        if (call.starts_with("viOpen TCPIP") || call.starts_with("viClose")) calls.push_back(call);
+    }
+    const std::string open = "viOpen TCPIP::127.0.0.1::INSTR 0 0";
+    EXPECT_EQ(calls, (Lines{open, "viClose 102", open, "viClose 104"}));
+}
+
+TEST_F(TourTest, EndsEarlyWhenItsWindowIsClosed) {
+    sim::VirtualInstrument instrument(clock);
+    sim::SimVisa visa(instrument);
+    print = [this, print = print](const std::string& line) {
+        print(line);
+        if (line != "-> *IDN?") return;
+        for (QWidget* top : QApplication::topLevelWidgets()) top->hide();
+    };
+    EXPECT_EQ(tour(visa), 1);
+    EXPECT_TRUE(printed.back().starts_with("0 pictures, ")) << printed.back();
+}
+
 TEST_F(TourTest, AFolderThatCannotBeMadeIsAFailure) {
     std::ofstream(folder.path() / "file") << "x";
     pictures = folder.path() / "file" / "pictures";
