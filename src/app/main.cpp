@@ -91,7 +91,7 @@ int main(int argc, char** argv) {
     kdx::sweepLeftovers(data.path());
     kdx::ProgramState state;
     kdx::Captions captions(data);
-    kdx::QtDialogs boxes(captions);
+    kdx::QtDialogs boxes(captions, [&application] { return application.isEnding(); });
     kdx::TourDialogs tourBoxes(print);
     kdx::Dialogs& dialogs = options.tourFolder ? static_cast<kdx::Dialogs&>(tourBoxes) : boxes;
     application.onFailure([&](const QString& doing, const QString& error) {

@@ -5,6 +5,8 @@
 #include <QMessageBox>
 #include <QPushButton>
 
+#include <utility>
+
 #include "settings/captions.h"
 #include "ui/text.h"
 
@@ -26,11 +28,17 @@ QMessageBox::Icon boxIcon(Dialogs::Icon icon) {
     return QMessageBox::NoIcon;
 }
 
+bool isClicked(const QMessageBox& box, const QAbstractButton* button) {
+    return box.clickedButton() == button;
+}
+
 }  // namespace
 
-QtDialogs::QtDialogs(const Captions& captions) : m_captions(captions) {}
+QtDialogs::QtDialogs(const Captions& captions, std::function<bool()> ending)
+    : m_captions(captions), m_ending(std::move(ending)) {}
 
 void QtDialogs::message(Icon icon, const QString& title, const QString& text, const QString& details) {
+    if (m_ending()) return;
     QMessageBox box(boxIcon(icon), title, text, QMessageBox::NoButton, QApplication::activeWindow());
     box.setInformativeText(details);
     box.addButton(toText(m_captions.own(317, "OK")), QMessageBox::AcceptRole);
@@ -38,6 +46,7 @@ void QtDialogs::message(Icon icon, const QString& title, const QString& text, co
 }
 
 bool QtDialogs::messageOrStop(const QString& title, const QString& text) {
+    if (m_ending()) return true;
     QMessageBox box(QMessageBox::Critical, title, text, QMessageBox::NoButton, QApplication::activeWindow());
     QPushButton* ok = box.addButton(toText(m_captions.own(317, "OK")), QMessageBox::AcceptRole);
     box.setDefaultButton(ok);
@@ -45,18 +54,20 @@ bool QtDialogs::messageOrStop(const QString& title, const QString& text) {
     const QPushButton* stop =
         box.addButton(toText(m_captions.own(323, "&Rest abbrechen")), QMessageBox::DestructiveRole);
     box.exec();
-    return static_cast<const QAbstractButton*>(box.clickedButton()) == static_cast<const QAbstractButton*>(stop);
+    return m_ending() || isClicked(box, stop);
 }
 
 bool QtDialogs::confirm(const QString& title, const QString& text) {
+    if (m_ending()) return false;
     QMessageBox box(QMessageBox::Question, title, text, QMessageBox::NoButton, QApplication::activeWindow());
     const QPushButton* yes = box.addButton(toText(m_captions.own(315, "&Ja")), QMessageBox::YesRole);
     box.setEscapeButton(box.addButton(toText(m_captions.own(316, "&Nein")), QMessageBox::NoRole));
     box.exec();
-    return static_cast<const QAbstractButton*>(box.clickedButton()) == static_cast<const QAbstractButton*>(yes);
+    return isClicked(box, yes);
 }
 
 QString QtDialogs::input(const QString& prompt, const QString& title, const QString& preset) {
+    if (m_ending()) return {};
     QInputDialog box(QApplication::activeWindow());
     box.setWindowTitle(title);
     box.setLabelText(prompt);

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "ui/dialogs.h"
+#include <functional>
 
-class QWidget;
+#include "ui/dialogs.h"
 
 namespace kdx {
 
@@ -11,7 +11,10 @@ class Captions;
 /// The real boxes, modal over the active window, their buttons in the program's language.
 class QtDialogs final : public Dialogs {
 public:
-    explicit QtDialogs(const Captions& captions);
+    /// @param ending whether the program is ending: then no box opens any more, and one that was open when the end came
+    /// was not answered by the user. What runs is stopped, and everything else is cancelled.
+    explicit QtDialogs(
+        const Captions& captions, std::function<bool()> ending = [] { return false; });
 
     void message(Icon icon, const QString& title, const QString& text, const QString& details = {}) override;
     bool messageOrStop(const QString& title, const QString& text) override;
@@ -20,6 +23,7 @@ public:
 
 private:
     const Captions& m_captions;
+    std::function<bool()> m_ending;
 };
 
 }  // namespace kdx

@@ -77,6 +77,18 @@ class Ending(unittest.TestCase):
                 self.assertEqual(self.record(folder)[-1], "close")
                 self.assertEqual(self.record(folder).count("close"), 1)
 
+    def testABoxOverADeadInstrumentIsClosedAndTheRestIsNotSent(self):
+        folder = self.folder("box", "dead")
+        process = self.start(folder)
+        self.waitForTheFirstWrite(folder, process)
+        time.sleep(1)  # the box is there, and waits
+        self.assertIsNone(process.poll())
+        asked = time.monotonic()
+        process.terminate()
+        self.assertEqual(process.wait(PATIENCE), 0, process.stdout.read())
+        self.assertLess(time.monotonic() - asked, 30)
+        self.assertEqual(self.record(folder), ["open TCPIP::dead::INSTR", "write", "close"])
+
     def testWhoSwitchedTheHangUpOffKeepsTheProgram(self):
         folder = self.folder("nohup", "dead")
         process = self.start(folder, preexec_fn=lambda: signal.signal(signal.SIGHUP, signal.SIG_IGN))

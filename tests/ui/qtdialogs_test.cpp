@@ -110,6 +110,25 @@ TEST_F(QtDialogsTest, AnInputGivesWhatWasTypedAndNothingWhenCancelled) {
     EXPECT_EQ(answer([](QInputDialog& box) { button(box, "Cancel")->click(); }), QString());
 }
 
+TEST_F(QtDialogsTest, NothingOpensOnceTheProgramEnds) {
+    QtDialogs ending(captions, [] { return true; });
+    ending.message(Dialogs::Icon::Critical, QString(), QStringLiteral("Fehler: -1"));
+    EXPECT_TRUE(ending.messageOrStop(QString(), QStringLiteral("Fehler: -1")));
+    EXPECT_FALSE(ending.confirm(QString(), QStringLiteral("Delete?")));
+    EXPECT_EQ(ending.input(QString(), QString(), QStringLiteral("28")), QString());
+}
+
+TEST_F(QtDialogsTest, ABoxThatTheEndOfTheProgramClosesStopsWhatRuns) {
+    bool ends = false;
+    QtDialogs ending(captions, [&ends] { return ends; });
+    meet<QMessageBox>([&ends](QMessageBox& box) {
+        ends = true;
+        box.close();
+    });
+    EXPECT_TRUE(ending.messageOrStop(QString(), QStringLiteral("Fehler: -1")));
+    EXPECT_TRUE(met);
+}
+
 TEST_F(QtDialogsTest, AnAnswerHasNoControlCharacters) {
     meet<QInputDialog>([](QInputDialog& box) {
         box.setTextValue(QStringLiteral(" lab\r\n7\t"));
