@@ -103,9 +103,14 @@ int main(int argc, char** argv) {
     kdx::TickerGroup tickers;
     kdx::HMenue window(
         {session, state, data, captions, clock, dialogs, tickers, QString::fromStdString(link.description), end});
-    window.startUp();
+    application.guarded(window.objectName(), [&] { window.startUp(); });
     if (options.tourFolder) {
-        return kdx::makeTour(window, session.instrument, tourBoxes, QString::fromStdString(*options.tourFolder), print);
+        int result = EXIT_FAILURE;
+        application.guarded(window.objectName(), [&] {
+            const QString folder = QString::fromStdString(*options.tourFolder);
+            result = kdx::makeTour(window, session.instrument, tourBoxes, folder, print);
+        });
+        return result;
     }
     if (application.isEnding()) return EXIT_SUCCESS;  // asked for while a box of the start was open
     window.show();

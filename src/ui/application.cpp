@@ -7,9 +7,32 @@
 #include <QFont>
 #include <QStyleFactory>
 
+#include <cstdio>
 #include <exception>
+#include <utility>
 
 namespace kdx {
+
+namespace {
+
+/// Runs the task; the text of an exception that leaves it goes to `failed`.
+template <typename Task, typename Failed>
+void guard(const Task& task, const Failed& failed) {
+    try {
+        task();
+    } catch (const std::exception& error) {
+        failed(QString::fromUtf8(error.what()));
+    } catch (...) {
+        failed(QStringLiteral("?"));
+    }
+}
+
+QString nameOf(const QObject& object) {
+    const QString name = object.objectName();
+    return name.isEmpty() ? QString::fromLatin1(object.metaObject()->className()) : name;
+}
+
+}  // namespace
 
 Application::Application(int& argc, char** argv) : QApplication(argc, argv) {
     setApplicationName(QStringLiteral("KDX-RDS"));
@@ -26,6 +49,15 @@ void Application::onFailure(std::function<void(const QString&, const QString&)> 
     m_report = std::move(report);
 }
 
+bool Application::guarded(const QString& doing, const std::function<void()>& task) {
+    bool whole = true;
+    guard(task, [&](const QString& error) {
+        whole = false;
+        report(doing, error);
+    });
+    return whole;
+}
+
 void Application::end() {
     m_ending = true;
     closeAllWindows();
@@ -34,14 +66,16 @@ void Application::end() {
 
 bool Application::notify(QObject* receiver, QEvent* event) {
     if (event->type() == QEvent::Polish) keepTextPlain(*receiver);
-    try {
-        return QApplication::notify(receiver, event);
-    } catch (const std::exception& error) {
-        report(receiver, QString::fromUtf8(error.what()));
-    } catch (...) {
-        report(receiver, QStringLiteral("?"));
-    }
-    return true;
+    bool handled = true;
+    guard([&] { handled = QApplication::notify(receiver, event); },
+          [&](const QString& error) {
+              if (event->type() == QEvent::Paint) {
+                  reportPainting(nameOf(*receiver), error);
+              } else {
+                  report(nameOf(*receiver), error);
+              }
+          });
+    return handled;
 }
 
 bool Application::event(QEvent* event) {
@@ -49,8 +83,14 @@ bool Application::event(QEvent* event) {
     return QApplication::event(event);
 }
 
-void Application::report(const QObject* receiver, const QString& error) {
-    if (m_report) m_report(receiver->objectName(), error);
+void Application::report(const QString& doing, const QString& error) const {
+    if (m_report) m_report(doing, error);
+}
+
+void Application::reportPainting(const QString& painted, const QString& error) {
+    if (m_failedPaintings.contains(painted)) return;
+    m_failedPaintings.insert(painted);
+    std::fprintf(stderr, "kdx-rds: %s cannot be painted: %s\n", qUtf8Printable(painted), qUtf8Printable(error));
 }
 
 }  // namespace kdx

@@ -107,6 +107,23 @@ class Ending(unittest.TestCase):
                 calls = [line.split()[0] for line in self.record(folder) if line != "write"]
                 self.assertEqual(calls, ["open", "close"] * (2 if atStart else 1))
 
+    def testAnExceptionAtTheStartAndInTheTourIsShownLikeThatOfAHandler(self):
+        folder = self.folder("broken", "broken")
+        process = self.start(folder, "--tour", str(folder / "pictures"))
+        printed = process.communicate(timeout=PATIENCE)[0]
+        self.assertEqual(process.returncode, 1, printed)
+        boxes = [line for line in printed.splitlines() if line.startswith("!!")]
+        self.assertEqual(boxes, ['!! Fehler: Bei "HMenue": the library is broken'] * 2)
+
+    def testAfterAnExceptionAtTheStartTheWindowGoesOn(self):
+        folder = self.folder("window", "broken")
+        process = self.start(folder)
+        self.waitFor(process, lambda: "broken" in self.record(folder))
+        time.sleep(2)
+        self.assertIsNone(process.poll())
+        process.terminate()
+        self.assertEqual(process.wait(PATIENCE), 0, process.stdout.read())
+
 
 if __name__ == "__main__":
     LIBRARY = os.path.abspath(sys.argv.pop(2))

@@ -30,6 +30,38 @@ TEST(ApplicationTest, AnExceptionThatLeavesAHandlerIsToldAndTheProgramGoesOn) {
     application.onFailure(nullptr);
 }
 
+TEST(ApplicationTest, WhatNoControlStartedIsGuardedTheSameWay) {
+    auto& application = dynamic_cast<Application&>(*QCoreApplication::instance());
+    QStringList told;
+    application.onFailure([&](const QString& what, const QString& why) { told << what << why; });
+    EXPECT_TRUE(application.guarded(QStringLiteral("HMenue"), [] {}));
+    EXPECT_EQ(told, QStringList());
+    EXPECT_FALSE(application.guarded(QStringLiteral("HMenue"), [] { throw std::runtime_error("no data"); }));
+    EXPECT_FALSE(application.guarded(QStringLiteral("tour"), [] { throw 7; }));
+    EXPECT_EQ(told, QStringList({QStringLiteral("HMenue"), QStringLiteral("no data"), QStringLiteral("tour"),
+                                 QStringLiteral("?")}));
+    application.onFailure(nullptr);
+}
+
+class Unpaintable : public QWidget {
+protected:
+    void paintEvent(QPaintEvent* /*event*/) override { throw std::runtime_error("no picture"); }
+};
+
+TEST(ApplicationTest, AFailedPaintingIsWrittenOnceAndOpensNoBox) {
+    auto& application = dynamic_cast<Application&>(*QCoreApplication::instance());
+    int boxes = 0;
+    application.onFailure([&](const QString&, const QString&) { ++boxes; });
+    Unpaintable widget;
+    widget.setObjectName(QStringLiteral("RDS_OnOff"));
+    testing::internal::CaptureStderr();
+    widget.show();
+    for (int times = 0; times < 3; ++times) widget.repaint();
+    EXPECT_EQ(testing::internal::GetCapturedStderr(), "kdx-rds: RDS_OnOff cannot be painted: no picture\n");
+    EXPECT_EQ(boxes, 0);
+    application.onFailure(nullptr);
+}
+
 TEST(ApplicationTest, EndingClosesTheWindowAndABoxOverIt) {
     auto& application = dynamic_cast<Application&>(*QCoreApplication::instance());
     EXPECT_FALSE(application.isEnding());
