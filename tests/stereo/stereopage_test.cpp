@@ -23,7 +23,7 @@ struct ScrollCase {
     const char* key;
     const char* stored;
     std::string Multiplex::*member;
-    friend void PrintTo(const ScrollCase& value, std::ostream* out) { *out << value.scroll << " at " << value.value; }
+    friend void PrintTo(const ScrollCase& tried, std::ostream* out) { *out << tried.scroll << " at " << tried.value; }
 };
 
 class StereoScroll : public StereoPageTest, public ::testing::WithParamInterface<ScrollCase> {};

@@ -52,7 +52,7 @@ public:
             ADD_FAILURE() << "unexpected input box: " << prompt.toStdString();
             return {};
         }
-        const QString answer = inputs.front();
+        QString answer = inputs.front();
         inputs.pop_front();
         return answer;
     }

@@ -211,7 +211,7 @@ bool ScriptedVxi11::serveConnection(Connection& connection) {
 Reaction ScriptedVxi11::nextReaction(std::uint32_t procedure) {
     std::deque<Reaction>& script = m_reactions[procedure];
     if (script.empty()) return {};
-    const Reaction reaction = script.front();
+    Reaction reaction = script.front();
     script.pop_front();
     return reaction;
 }
@@ -342,7 +342,7 @@ DeafPort::DeafPort() {
     // Fill the queue until a connection has to wait.
     for (;;) {
         m_waiting.push_back(socket(AF_INET, SOCK_STREAM | SOCK_NONBLOCK | SOCK_CLOEXEC, 0));
-        connect(m_waiting.back(), reinterpret_cast<sockaddr*>(&address), sizeof address);
+        if (connect(m_waiting.back(), reinterpret_cast<sockaddr*>(&address), sizeof address) == 0) continue;
         pollfd waiting{m_waiting.back(), POLLOUT, 0};
         if (poll(&waiting, 1, 20) == 0) return;
     }

@@ -11,6 +11,7 @@ namespace {
 
 std::vector<int> positions(int messageCount, int ticks) {
     std::vector<int> sent;
+    sent.reserve(static_cast<std::size_t>(ticks));
     int position = 0;
     for (int tick = 0; tick < ticks; ++tick) sent.push_back(position = nextPosition(position, messageCount));
     return sent;

@@ -1,5 +1,7 @@
 #include "tmcpagetest.h"
 
+#include <QGroupBox>
+
 #include <set>
 
 namespace kdx::test {

@@ -181,7 +181,9 @@ TEST_F(ProgressTest, CountsExactlyWhateverTheDataSetHolds) {
         openSession();
         const std::string commands = std::to_string(sent().size());
         EXPECT_EQ(shown.front(), "Sende Befehl 1 von " + commands) << key;
-        EXPECT_EQ(shown.back(), "Sende Befehl " + commands + " von " + commands) << key;
+        std::string last = "Sende Befehl " + commands;
+        last += " von " + commands;
+        EXPECT_EQ(shown.back(), last) << key;
     }
 }
 

@@ -184,7 +184,7 @@ TEST_F(StartUpTest, HidesThePhaseOfTheRdsSubcarrier) {
 TEST_F(StartUpTest, GarbageInTheSettingsStopsNothing) {
     folder.copyShipped();
     std::string garbage("\0[\x01=\xFF]]\r[BUS\n=\n", 15);
-    garbage += std::string(1024 * 1024, 'x');
+    garbage += std::string(std::size_t{1024} * 1024, 'x');
     for (const char* file : {"RDS_Allg.INI", "Datenset1.INI", "Sprachen.ini", "Sch_On.ico", "Event.txt"})
         folder.write(file, garbage);
     start();
