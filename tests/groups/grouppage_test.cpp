@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include "support/layoutcheck.h"
 #include "support/pagetest.h"
 
 namespace kdx {

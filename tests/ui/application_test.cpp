@@ -56,6 +56,7 @@ TEST(ApplicationTest, AFailedPaintingIsWrittenOnceAndOpensNoBox) {
     widget.setObjectName(QStringLiteral("RDS_OnOff"));
     testing::internal::CaptureStderr();
     widget.show();
+    QCoreApplication::processEvents();  // nothing is painted before the window system has shown it
     for (int times = 0; times < 3; ++times) widget.repaint();
     EXPECT_EQ(testing::internal::GetCapturedStderr(), "kdx-rds: RDS_OnOff cannot be painted: no picture\n");
     EXPECT_EQ(boxes, 0);
