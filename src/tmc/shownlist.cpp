@@ -1,32 +1,41 @@
 #include "tmc/shownlist.h"
 
 #include "settings/datafolder.h"
-#include "tmc/tmclist.h"
 #include "ui/caption.h"
 #include "ui/text.h"
 
 #include <stdexcept>
 #include <string>
-#include <string_view>
+#include <utility>
 
 namespace kdx {
 
-namespace {
+void ShownList::load(const PageContext& with, const char* fileName) {
+    auto entries = loadTmcList(with.data.file(fileName));
+    beginResetModel();
+    m_entries = entries ? std::move(*entries) : TmcList();
+    endResetModel();
+    if (entries) return;
+    const QString text = captionText(with.captions, {593, "%1 kann nicht gelesen werden."});
+    throw std::runtime_error(text.arg(QLatin1String(fileName)).toStdString());
+}
 
-// No entry is that long; a file of garbage must not keep the window laying out a line of a megabyte.
-constexpr std::size_t kLongestShown = 1000;
-
-}  // namespace
-
-QStringList loadShownList(const PageContext& with, const char* fileName) {
-    const auto entries = loadTmcList(with.data.file(fileName));
-    if (!entries) {
-        const QString text = captionText(with.captions, {593, "%1 kann nicht gelesen werden."});
-        throw std::runtime_error(text.arg(QLatin1String(fileName)).toStdString());
+int ShownList::rowOf(const QString& text) const {
+    const std::string wanted = toBytes(text);
+    for (std::size_t row = 0; row < m_entries.size(); ++row) {
+        if (m_entries[row] == wanted) return static_cast<int>(row);
     }
-    QStringList shown;
-    for (const std::string& entry : *entries) shown << toText(std::string_view(entry).substr(0, kLongestShown));
-    return shown;
+    return -1;
+}
+
+int ShownList::rowCount(const QModelIndex& parent) const {
+    return parent.isValid() ? 0 : static_cast<int>(m_entries.size());
+}
+
+QVariant ShownList::data(const QModelIndex& index, int role) const {
+    // A combo box shows the text it would edit.
+    if (!index.isValid() || (role != Qt::DisplayRole && role != Qt::EditRole)) return {};
+    return toText(m_entries[static_cast<std::size_t>(index.row())]);
 }
 
 QFont fixedPitch(const QString& family) {

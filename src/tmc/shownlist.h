@@ -2,18 +2,33 @@
 
 #include "ui/pagecontext.h"
 
+#include "tmc/tmclist.h"
+
+#include <QAbstractListModel>
 #include <QFont>
-#include <QStringList>
 
 #include <functional>
 #include <initializer_list>
 
 namespace kdx {
 
-/// The entries of an event or location file of the data folder, as the lists show them; an entry of
-/// more than 1000 characters is cut there.
-/// @throws std::runtime_error naming the file, in the current language, when it is missing or cannot be read.
-[[nodiscard]] QStringList loadShownList(const PageContext& with, const char* fileName);
+/// The entries of an event or location file of the data folder, for the controls that show them.
+class ShownList final : public QAbstractListModel {
+public:
+    using QAbstractListModel::QAbstractListModel;
+
+    /// @throws std::runtime_error naming the file, in the current language, when it is missing or cannot be read; the
+    /// list is empty then.
+    void load(const PageContext& with, const char* fileName);
+    /// The row of the first entry that reads so; -1 when none does.
+    [[nodiscard]] int rowOf(const QString& text) const;
+
+    [[nodiscard]] int rowCount(const QModelIndex& parent = {}) const override;
+    [[nodiscard]] QVariant data(const QModelIndex& index, int role) const override;
+
+private:
+    TmcList m_entries;
+};
 
 /// The fixed-pitch font of that name, or a twin with the same widths: the codes of the entries line up in it.
 [[nodiscard]] QFont fixedPitch(const QString& family);

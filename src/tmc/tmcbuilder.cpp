@@ -64,6 +64,10 @@ void TmcBuilder::createLists() {
     Label4 = heading("Label4", {206}, TMC_Loc_Combo);
     TMC_Local_Hex_Label = named<ValueLabel>("TMC_Local_Hex_Label", this);
     m_book.tip(TMC_Local_Hex_Label, {563, "Locationnummer, hexadezimal"});
+    m_events = new ShownList(this);
+    TMC_Event_Combo->setModel(m_events);
+    m_locations = new ShownList(this);
+    TMC_Loc_Combo->setModel(m_locations);
     for (QComboBox* combo : {TMC_Event_Combo, TMC_Loc_Combo}) {
         combo->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
         combo->setMinimumContentsLength(20);
@@ -132,14 +136,14 @@ void TmcBuilder::load() {
 }
 
 void TmcBuilder::reloadLists() {
-    takeAllSteps({[this] { reload(TMC_Event_Combo, kEventList); }, [this] { reload(TMC_Loc_Combo, kLocationList); }});
+    takeAllSteps({[this] { reload(TMC_Event_Combo, m_events, kEventList); },
+                  [this] { reload(TMC_Loc_Combo, m_locations, kLocationList); }});
 }
 
-void TmcBuilder::reload(QComboBox* combo, const char* fileName) {
+void TmcBuilder::reload(QComboBox* combo, ShownList* list, const char* fileName) {
     const QString chosen = combo->currentText();
-    combo->clear();
-    combo->addItems(loadShownList(m_with, fileName));
-    combo->setCurrentIndex(chosen.isEmpty() ? -1 : combo->findText(chosen));
+    list->load(m_with, fileName);
+    combo->setCurrentIndex(chosen.isEmpty() ? -1 : list->rowOf(chosen));
 }
 
 void TmcBuilder::showNumber(const QComboBox* combo, QLabel* hexadecimals, BitDisplay::Field field) {

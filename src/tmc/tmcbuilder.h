@@ -11,6 +11,8 @@
 
 namespace kdx {
 
+class ShownList;
+
 /// Upper part of the TMC page: composes one traffic message from its fields.
 class TmcBuilder : public Page {
     Q_OBJECT
@@ -49,12 +51,13 @@ private:
     void TMCInfoOnOff_Click();
     void TMCGruppe8Maker();
 
-    void reload(QComboBox* combo, const char* fileName);
+    void reload(QComboBox* combo, ShownList* list, const char* fileName);
     void showNumber(const QComboBox* combo, QLabel* hexadecimals, BitDisplay::Field field);
     void showDuration();
 
     QLabel *Label3 = nullptr, *Label4 = nullptr;  // headings of the events and the locations
     QComboBox *TMC_Event_Combo = nullptr, *TMC_Loc_Combo = nullptr;
+    ShownList *m_events = nullptr, *m_locations = nullptr;
     ValueLabel *TMC_Event_Hex_Label = nullptr, *TMC_Local_Hex_Label = nullptr;
     QGroupBox* TMC_Frame1 = nullptr;
     OptionArray<2> Tmc_richtung;

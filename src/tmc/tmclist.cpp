@@ -1,6 +1,10 @@
 #include "tmc/tmclist.h"
 
+#include <algorithm>
+#include <utility>
+
 #include "base/numbers.h"
+#include "settings/folderlock.h"
 #include "settings/profilefile.h"
 
 namespace kdx {
@@ -8,32 +12,41 @@ namespace kdx {
 namespace {
 
 constexpr std::string_view kLineEnd = "\r\n";
+constexpr std::size_t kLongestShown = 1000;
 
 }  // namespace
 
 std::optional<std::string> shownEntry(std::string_view line) {
     const std::size_t semicolon = line.find(';');
     if (semicolon == std::string_view::npos) return std::nullopt;
-    std::string entry = padRight(line.substr(0, semicolon), kListTextLength);
-    entry += line.substr(semicolon + 1);
+    std::string entry = padRight(line.substr(0, std::min(semicolon, kListTextLength)), kListTextLength);
+    entry += line.substr(semicolon + 1, kLongestShown - kListTextLength);
     return entry;
 }
 
-std::optional<std::vector<std::string>> loadTmcList(const std::filesystem::path& file) {
-    const std::optional<std::string> content = readFile(file);
-    if (!content) return std::nullopt;
-    std::vector<std::string> entries;
-    for (std::string_view rest = *content; !rest.empty();) {
-        const std::size_t lineFeed = rest.find('\n');
-        std::string_view line = rest.substr(0, lineFeed);
-        rest.remove_prefix(lineFeed == std::string_view::npos ? rest.size() : lineFeed + 1);
+TmcList::TmcList(std::string bytes) : m_bytes(std::move(bytes)) {
+    for (std::size_t begin = 0; begin < m_bytes.size();) {
+        const std::size_t end = std::min(m_bytes.find('\n', begin), m_bytes.size());
+        std::string_view line(m_bytes.data() + begin, end - begin);
         if (line.ends_with('\r')) line.remove_suffix(1);
-        if (auto entry = shownEntry(line)) entries.push_back(std::move(*entry));
+        if (line.find(';') != std::string_view::npos) m_lines.push_back({begin, line.size()});
+        begin = end + 1;
     }
-    return entries;
 }
 
-bool appendToTmcList(const std::filesystem::path& file, std::string_view text, std::string_view code) {
+std::string TmcList::operator[](std::size_t index) const {
+    const Line& line = m_lines.at(index);
+    return shownEntry(std::string_view(m_bytes).substr(line.begin, line.length)).value();
+}
+
+std::optional<TmcList> loadTmcList(const std::filesystem::path& file) {
+    std::optional<std::string> content = readFile(file);
+    return content ? std::optional<TmcList>(std::in_place, std::move(*content)) : std::nullopt;
+}
+
+namespace {
+
+bool appendLine(const std::filesystem::path& file, std::string_view text, std::string_view code) {
     const std::optional<std::string> content = readToChange(file);
     if (!content) return false;
     std::string bytes = *content;
@@ -43,6 +56,13 @@ bool appendToTmcList(const std::filesystem::path& file, std::string_view text, s
     bytes += code;
     bytes += kLineEnd;
     return replaceFile(file, bytes);
+}
+
+}  // namespace
+
+bool appendToTmcList(const std::filesystem::path& file, std::string_view text, std::string_view code) {
+    bool appended = false;
+    return underFolderLock(file.parent_path(), [&] { appended = appendLine(file, text, code); }) && appended;
 }
 
 }  // namespace kdx

@@ -35,14 +35,16 @@ TMC_Listedit::TMC_Listedit(const PageContext& with, QWidget* parent) : QDialog(p
 void TMC_Listedit::create() {
     const Caption add{615, "Add to list"};
     Label1 = named<QLabel>("Label1", this);
-    List1 = named<QListWidget>("List1", this);
+    m_events = new ShownList(this);
+    List1 = createList("List1", m_events);
     m_book.spoken(List1, {622, "Events"});
     Event_Input_TXT = createInput("Event_Input_TXT", {619, "Event Text"}, &TMC_Listedit::Event_Input_TXT_Click);
     Event_Input_Nr = createInput("Event_Input_Nr", {618, "Event Nr"}, &TMC_Listedit::Event_Input_Nr_Click);
     Event_Hinzu = clicked<QPushButton>("Event_Hinzu", add, this, &TMC_Listedit::Event_Hinzu_Click);
 
     Label2 = named<QLabel>("Label2", this);
-    List2 = named<QListWidget>("List2", this);
+    m_locations = new ShownList(this);
+    List2 = createList("List2", m_locations);
     m_book.spoken(List2, {623, "Locations"});
     Loc_INput_TXT1 = createInput("Loc_INput_TXT1", {621, "Location Text"}, &TMC_Listedit::Loc_INput_TXT1_Click);
     Loc_Input_Nr = createInput("Loc_Input_Nr", {620, "Location Nr"}, &TMC_Listedit::Loc_Input_Nr_Click);
@@ -52,14 +54,20 @@ void TMC_Listedit::create() {
     for (QPushButton* button : {Event_Hinzu, Loc_Hinzu, Zuruek_Knopf}) button->setAutoDefault(false);
 }
 
+QListView* TMC_Listedit::createList(const char* name, ShownList* entries) {
+    auto* list = named<QListView>(name, this);
+    list->setUniformItemSizes(true);  // else every entry of a long list is measured before the first is shown
+    list->setModel(entries);
+    return list;
+}
+
 ClickableLabel* TMC_Listedit::createInput(const char* name, const Caption& what, void (TMC_Listedit::*handler)()) {
     auto* input = wired<ClickableLabel>(name, &ClickableLabel::clicked, handler, this);
     m_book.describe(input, what);
     return input;
 }
 
-QBoxLayout* TMC_Listedit::arrangeList(QLabel* columns, QListWidget* list, QLabel* text, QLabel* code,
-                                      QPushButton* add) {
+QBoxLayout* TMC_Listedit::arrangeList(QLabel* columns, QListView* list, QLabel* text, QLabel* code, QPushButton* add) {
     columns->setFont(fixedPitch(QStringLiteral("Courier")));
     list->setFont(fixedPitch(QStringLiteral("Courier New")));
     // The heading's columns stand over the list's: its frame and its entries' own margin come before the text.
@@ -98,33 +106,29 @@ void TMC_Listedit::Form_Load() {
 }
 
 void TMC_Listedit::Event_Laden() {
-    load(List1, kEventList);
+    m_events->load(m_with, kEventList);
 }
 
 void TMC_Listedit::Location_Laden() {
-    load(List2, kLocationList);
-}
-
-void TMC_Listedit::load(QListWidget* list, const char* fileName) {
-    list->clear();
-    list->addItems(loadShownList(m_with, fileName));
+    m_locations->load(m_with, kLocationList);
 }
 
 bool TMC_Listedit::Event_anhaengen() {
-    return append(List1, Event_Input_TXT, Event_Input_Nr, kEventList);
+    return append(List1, m_events, Event_Input_TXT, Event_Input_Nr, kEventList);
 }
 
 bool TMC_Listedit::Location_Anhaengen() {
-    return append(List2, Loc_INput_TXT1, Loc_Input_Nr, kLocationList);
+    return append(List2, m_locations, Loc_INput_TXT1, Loc_Input_Nr, kLocationList);
 }
 
-bool TMC_Listedit::append(QListWidget* list, const QLabel* text, const QLabel* code, const char* fileName) {
+bool TMC_Listedit::append(QListView* list, ShownList* entries, const QLabel* text, const QLabel* code,
+                          const char* fileName) {
     if (!appendToTmcList(m_with.data.file(fileName), toBytes(text->text()), toBytes(code->text()))) {
         const QString failure = caption({624, "%1 kann nicht gespeichert werden."});
         m_with.dialogs.message(Dialogs::Icon::Exclamation, windowTitle(), failure.arg(QLatin1String(fileName)));
         return false;
     }
-    load(list, fileName);
+    entries->load(m_with, fileName);
     list->scrollToBottom();
     return true;
 }

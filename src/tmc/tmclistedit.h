@@ -4,12 +4,14 @@
 #include "ui/form.h"
 
 #include <QDialog>
-#include <QListWidget>
+#include <QListView>
 #include <QPushButton>
 
 class QBoxLayout;
 
 namespace kdx {
+
+class ShownList;
 
 /// The editor of the TMC event and location lists: shows both files of the data folder and appends entries to them.
 class TMC_Listedit : public QDialog, public Form {
@@ -35,8 +37,9 @@ protected:
 
 private:
     void create();
+    QListView* createList(const char* name, ShownList* entries);
     ClickableLabel* createInput(const char* name, const Caption& what, void (TMC_Listedit::*handler)());
-    QBoxLayout* arrangeList(QLabel* columns, QListWidget* list, QLabel* text, QLabel* code, QPushButton* add);
+    QBoxLayout* arrangeList(QLabel* columns, QListView* list, QLabel* text, QLabel* code, QPushButton* add);
     [[nodiscard]] QString columns(const Caption& text, const Caption& code) const;
 
     void Form_Load();
@@ -49,18 +52,19 @@ private:
     void Zuruek_Knopf_Click() { close(); }
 
     void ask(QLabel* label);
-    void load(QListWidget* list, const char* fileName);
-    bool append(QListWidget* list, const QLabel* text, const QLabel* code, const char* fileName);
+    bool append(QListView* list, ShownList* entries, const QLabel* text, const QLabel* code, const char* fileName);
     /// Appends a whole entry and makes room for the next one; what cannot be stored stays to be tried again.
     void take(QLabel* text, QLabel* code, bool (TMC_Listedit::*appendIt)());
 
     QLabel* Label1 = nullptr;
-    QListWidget* List1 = nullptr;  // events
+    QListView* List1 = nullptr;  // events
+    ShownList* m_events = nullptr;
     ClickableLabel* Event_Input_TXT = nullptr;
     ClickableLabel* Event_Input_Nr = nullptr;
     QPushButton* Event_Hinzu = nullptr;
     QLabel* Label2 = nullptr;
-    QListWidget* List2 = nullptr;  // locations
+    QListView* List2 = nullptr;  // locations
+    ShownList* m_locations = nullptr;
     ClickableLabel* Loc_INput_TXT1 = nullptr;
     ClickableLabel* Loc_Input_Nr = nullptr;
     QPushButton* Loc_Hinzu = nullptr;

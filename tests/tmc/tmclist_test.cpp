@@ -4,7 +4,9 @@
 #include <gtest/gtest.h>
 
 #include <filesystem>
+#include <optional>
 #include <string>
+#include <vector>
 
 #include "support/tempfolder.h"
 #include "support/unprivileged.h"
@@ -23,6 +25,14 @@ protected:
     [[nodiscard]] fs::path file() const { return m_folder.data() / "Event.txt"; }
     void write(const std::string& bytes) const { m_folder.write("Event.txt", bytes); }
     [[nodiscard]] std::string content() const { return m_folder.read("Event.txt"); }
+    /// What loading the file gives.
+    [[nodiscard]] std::optional<std::vector<std::string>> entries() const {
+        const std::optional<TmcList> list = loadTmcList(file());
+        if (!list) return std::nullopt;
+        std::vector<std::string> all;
+        for (std::size_t i = 0; i < list->size(); ++i) all.push_back((*list)[i]);
+        return all;
+    }
     [[nodiscard]] std::ptrdiff_t filesInFolder() const {
         return std::distance(fs::directory_iterator(m_folder.data()), fs::directory_iterator());
     }
@@ -53,29 +63,28 @@ TEST(ShownEntryTest, IsNothingWithoutASemicolon) {
 
 TEST_F(TmcListTest, LoadsEveryLineThatHasASemicolon) {
     write("; a remark\r\nno entry\r\n\r\nStau;00101\r\nUnfall;00201\r\n");
-    EXPECT_THAT(loadTmcList(file()),
+    EXPECT_THAT(entries(),
                 Optional(ElementsAre(std::string(42, ' ') + " a remark", "Stau" + std::string(38, ' ') + "00101",
                                      "Unfall" + std::string(36, ' ') + "00201")));
 }
 
 TEST_F(TmcListTest, LoadsTheLastLineWithoutItsEndAndBareLineFeeds) {
     write("a;1\nb;2");
-    EXPECT_THAT(loadTmcList(file()),
-                Optional(ElementsAre("a" + std::string(41, ' ') + "1", "b" + std::string(41, ' ') + "2")));
+    EXPECT_THAT(entries(), Optional(ElementsAre("a" + std::string(41, ' ') + "1", "b" + std::string(41, ' ') + "2")));
 }
 
 TEST_F(TmcListTest, LoadsAnEmptyFileAsAnEmptyList) {
     write("");
-    EXPECT_THAT(loadTmcList(file()), Optional(IsEmpty()));
+    EXPECT_THAT(entries(), Optional(IsEmpty()));
 }
 
 TEST_F(TmcListTest, LoadsGarbageWithoutLosingTheEntriesBesideIt) {
     write(std::string("\0\x01\xff\r\n", 5) + std::string(1'000'000, 'x') + "\r\nStau;00101\r\n");
-    EXPECT_THAT(loadTmcList(file()), Optional(ElementsAre("Stau" + std::string(38, ' ') + "00101")));
+    EXPECT_THAT(entries(), Optional(ElementsAre("Stau" + std::string(38, ' ') + "00101")));
 }
 
 TEST_F(TmcListTest, LoadingAMissingFileFails) {
-    EXPECT_EQ(loadTmcList(file()), std::nullopt);
+    EXPECT_EQ(entries(), std::nullopt);
 }
 
 TEST_F(TmcListTest, AppendsALineAsItWasTyped) {
@@ -114,7 +123,7 @@ TEST_F(TmcListTest, AFileThatCannotBeReadIsNotReplaced) {
     fs::permissions(file(), fs::perms::owner_write | fs::perms::others_write);
     {
         const test::Unprivileged user;
-        EXPECT_EQ(loadTmcList(file()), std::nullopt);
+        EXPECT_EQ(entries(), std::nullopt);
         EXPECT_FALSE(appendToTmcList(file(), "Unfall", "00201"));
     }
     fs::permissions(file(), fs::perms::owner_all);

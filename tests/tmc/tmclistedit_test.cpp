@@ -5,7 +5,7 @@
 #include "support/unprivileged.h"
 #include "ui/application.h"
 
-#include <QListWidget>
+#include <QListView>
 #include <QMouseEvent>
 
 namespace kdx::test {
@@ -26,8 +26,9 @@ protected:
 
     Lines entries(const char* name) {
         Lines lines;
-        const auto* list = find<QListWidget>(name);
-        for (int i = 0; i < list->count(); ++i) lines.push_back(list->item(i)->text().toStdString());
+        const QAbstractItemModel& shown = *find<QListView>(name)->model();
+        for (int row = 0; row < shown.rowCount(); ++row)
+            lines.push_back(shown.index(row, 0).data().toString().toStdString());
         return lines;
     }
     /// Clicks an input label and answers the box that it opens.
@@ -103,8 +104,7 @@ TEST_F(TmcListeditTest, AddingALocationAppendsItAndShowsIt) {
     enter("Loc_Input_Nr", "00007");
     click("Loc_Hinzu");
     EXPECT_EQ(folder.read("Location.txt"), "Musterstadt;12345\r\nM\xfcnchen;00007\r\n");
-    EXPECT_EQ(find<QListWidget>("List2")->item(1)->text(),
-              QString::fromUtf8("München").leftJustified(42) + QStringLiteral("00007"));
+    EXPECT_EQ(entries("List2").back(), "München" + std::string(42 - 7, ' ') + "00007");
     EXPECT_EQ(folder.read("Event.txt"), "Stau;00101\r\nUnfall;00201\r\n");
 }
 
@@ -187,6 +187,19 @@ TEST_F(TmcListeditTest, NothingIsCutOffInAnyLanguage) {
         QApplication::processEvents();
         expectNothingCutOff(*editor, language);
     }
+}
+
+TEST_F(TmcListeditTest, AMillionEntriesAreShownToTheLast) {
+    std::string lines;
+    for (int i = 0; i < 1'000'000; ++i) lines += "Ort;" + std::to_string(i) + "\r\n";
+    folder.write("Location.txt", lines);
+    open();
+    auto* list = find<QListView>("List2");
+    EXPECT_EQ(list->model()->rowCount(), 1'000'000);
+    const QModelIndex last = list->model()->index(999'999, 0);
+    EXPECT_EQ(last.data().toString().toStdString(), entry("Ort", "999999"));
+    list->scrollToBottom();
+    EXPECT_TRUE(list->viewport()->rect().contains(list->visualRect(last)));
 }
 
 TEST_F(TmcListeditTest, AnEntryOfAMegabyteIsShownCutAndStaysWholeInTheFile) {
