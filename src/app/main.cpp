@@ -14,6 +14,7 @@
 #include "settings/captions.h"
 #include "settings/datafolder.h"
 #include "settings/dataplace.h"
+#include "settings/folderlock.h"
 #include "settings/leftovers.h"
 #include "settings/programstate.h"
 #include "sim/virtualinstrument.h"
@@ -89,6 +90,7 @@ int main(int argc, char** argv) {
     kdx::DataFolder data(appFolder(options, argv[0], problem));
     if (!problem.empty()) std::fprintf(stderr, "kdx-rds: %s\n", problem.c_str());
     kdx::sweepLeftovers(data.path());
+    const kdx::FolderClaim claim(data.path());
     kdx::ProgramState state;
     kdx::Captions captions(data);
     kdx::QtDialogs boxes(captions, [&application] { return application.isEnding(); });
@@ -101,8 +103,8 @@ int main(int argc, char** argv) {
     const auto end = [&application] { application.end(); };
     kdx::Session session(*link.visa, state, data, captions, clock, end);
     kdx::TickerGroup tickers;
-    kdx::HMenue window(
-        {session, state, data, captions, clock, dialogs, tickers, QString::fromStdString(link.description), end});
+    kdx::HMenue window({session, state, data, captions, clock, dialogs, tickers, claim,
+                        QString::fromStdString(link.description), end});
     application.guarded(window.objectName(), [&] { window.startUp(); });
     if (options.tourFolder) {
         int result = EXIT_FAILURE;

@@ -16,6 +16,8 @@ namespace kdx {
 
 namespace {
 
+constexpr std::string_view kCoderCommand = ":STEREO:DIRECT ";
+
 constexpr const char* kEndKey = "DS";
 
 /// How a command travels.
@@ -251,7 +253,11 @@ std::optional<std::string> composeCommand(std::string_view key, std::string& val
     std::string command(row->command);
     if (row->route == Route::Eon) command.append(context.eonIdentifier).append(",");
     command.append(formatted(*row, value, context)).append(row->unit);
-    return row->route == Route::Scpi ? command : ":STEREO:DIRECT \"" + command + "\"";
+    return row->route == Route::Scpi ? command : std::string(kCoderCommand).append("\"").append(command).append("\"");
+}
+
+bool endsItsTextEarly(std::string_view command) {
+    return command.starts_with(kCoderCommand) && std::count(command.begin(), command.end(), '"') > 2;
 }
 
 ParamSender::ParamSender(Instrument& instrument, ProgramState& state, Clock& clock, std::function<void()> endProgram)
@@ -268,10 +274,16 @@ void ParamSender::SendParam(const std::string& key, std::string& value, const st
                                dateText(m_clock.today())};
     const std::optional<std::string> command = composeCommand(key, value, context);
     if (!command || m_instrument.isSequenceStopped()) return;
+    noteQuotes(key, *command);
     m_instrument.WriteLog(key, "", *command);
     // Gives the coder time to take one command before the next; without a session nothing is sent to it.
     if (m_state.InstrumentOnline) WaitMs(m_clock, kCommandPauseMs);
     m_instrument.Send2Gen(*command);
+}
+
+void ParamSender::noteQuotes(const std::string& key, std::string_view command) {
+    const bool changed = endsItsTextEarly(command) ? m_quotedKeys.insert(key).second : m_quotedKeys.erase(key) > 0;
+    if (changed && m_quotedKeysChanged) m_quotedKeysChanged();
 }
 
 void ParamSender::SendParam(const std::string& key, std::string& value) {

@@ -3,8 +3,10 @@
 #include <cstdint>
 #include <functional>
 #include <optional>
+#include <set>
 #include <string>
 #include <string_view>
+#include <utility>
 
 namespace kdx {
 
@@ -28,6 +30,10 @@ struct ParamContext {
 [[nodiscard]] std::optional<std::string> composeCommand(std::string_view key, std::string& value,
                                                         const ParamContext& context);
 
+/// Whether a text in the command holds a double quote: the coder takes the text for ended there and the instrument
+/// refuses the rest, or takes it for a command of its own.
+[[nodiscard]] bool endsItsTextEarly(std::string_view command);
+
 /// Whether the key table has a row for the key.
 [[nodiscard]] bool isParameter(std::string_view key);
 
@@ -48,11 +54,20 @@ public:
     /// The same for a value that nobody keeps.
     void SendParam(const std::string& key, std::string&& value);
 
+    /// Keys whose value went out last with a double quote in it.
+    [[nodiscard]] const std::set<std::string>& quotedKeys() const { return m_quotedKeys; }
+    /// Called whenever quotedKeys() changes.
+    void onQuotedKeysChanged(std::function<void()> callback) { m_quotedKeysChanged = std::move(callback); }
+
 private:
+    void noteQuotes(const std::string& key, std::string_view command);
+
     Instrument& m_instrument;
     ProgramState& m_state;
     Clock& m_clock;
     std::function<void()> m_endProgram;
+    std::set<std::string> m_quotedKeys;
+    std::function<void()> m_quotedKeysChanged;
 };
 
 }  // namespace kdx

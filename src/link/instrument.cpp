@@ -1,13 +1,11 @@
 #include "link/instrument.h"
 
 #include <array>
-#include <fstream>
 
 #include "base/clock.h"
 #include "base/numbers.h"
 #include "link/commandsequence.h"
 #include "settings/captions.h"
-#include "settings/datafolder.h"
 #include "settings/programstate.h"
 
 namespace kdx {
@@ -64,16 +62,8 @@ void Instrument::WriteLog(std::string_view key, std::string_view value, std::str
     std::string line = rightmost(std::string(20, ' ').append(key), kLogKeyWidth);
     line.append("= ").append(value);
     if (!note.empty()) line.append("\"").append(note).append("\"");
-    if (m_state.LogEnabled) {
-        // Opened and closed for every line, so that the log can be read or deleted while the program runs.
-        std::ofstream log(m_data.file(kCommandLog), std::ios::binary | std::ios::app);
-        log << line << "\r\n";
-    }
+    if (m_state.LogEnabled) log.append(line);
     notify(Traffic::Kind::Logged, line);
-}
-
-void Instrument::emptyLog() {
-    const std::ofstream log(m_data.file(kCommandLog), std::ios::binary | std::ios::trunc);
 }
 
 std::string Instrument::X4_Abfrage(const std::string& label, const std::string& key) {

@@ -6,6 +6,7 @@
 #include <string_view>
 #include <vector>
 
+#include "link/commandlog.h"
 #include "link/traffic.h"
 #include "link/visa.h"
 
@@ -13,7 +14,6 @@ namespace kdx {
 
 class Captions;
 class Clock;
-class DataFolder;
 struct ProgramState;
 
 inline constexpr std::size_t kAnswerLength = 60;     ///< receive buffer: an answer is read in pieces of at most this
@@ -29,8 +29,8 @@ public:
     using InterfaceError = std::function<bool(const std::string& text, bool sequenceRuns)>;
 
     /// @param captions gives the query texts 142 ("display"), 143 ("no answer") and 144 ("empty").
-    Instrument(Visa& visa, ProgramState& state, DataFolder& data, const Captions& captions, Clock& clock)
-        : m_visa(visa), m_state(state), m_data(data), m_captions(captions), m_clock(clock) {}
+    Instrument(Visa& visa, ProgramState& state, const DataFolder& data, const Captions& captions, Clock& clock)
+        : log(data), m_visa(visa), m_state(state), m_captions(captions), m_clock(clock) {}
 
     /// Who shows failures; without one they pass silently.
     void onFailure(InterfaceError interfaceError) { m_interfaceError = std::move(interfaceError); }
@@ -56,8 +56,6 @@ public:
     /// Appends one line to the command log when logging is on: the key right-aligned in 15 characters, "= ", the
     /// value, and the note in double quotes unless it is empty. A log that cannot be written is passed over.
     void WriteLog(std::string_view key, std::string_view value, std::string_view note);
-    /// Empties the command log; creates it when missing.
-    void emptyLog();
 
     /// Asks the coder for one value; gives its text without quotes and line end, "" after a failed read.
     /// @param label the name under which the query is logged; @param key the coder's query text.
@@ -70,6 +68,7 @@ public:
     /// Stops the running sequence, if any.
     void stopSequence() { m_sequenceStopped = m_sequences > 0; }
 
+    CommandLog log;
     VisaHandle DefaultRm = 0;
     VisaHandle InstrSession = 0;  ///< 0 until opened; closing keeps the old value
     VisaStatus LastVisaStatus = 0;
@@ -83,7 +82,6 @@ private:
 
     Visa& m_visa;
     ProgramState& m_state;
-    DataFolder& m_data;
     const Captions& m_captions;
     Clock& m_clock;
     InterfaceError m_interfaceError;

@@ -36,6 +36,13 @@ struct FileIdentity {
 [[nodiscard]] bool writeNewFile(const std::filesystem::path& file, std::string_view bytes,
                                 const std::filesystem::path& model);
 
+/// Appends to a plain file, which is created when missing. False on any failure, and at once when a link, a pipe, a
+/// device or a folder is in its place, which is then left alone.
+[[nodiscard]] bool appendToPlainFile(const std::filesystem::path& file, std::string_view bytes);
+
+/// Empties a plain file; otherwise as appendToPlainFile.
+[[nodiscard]] bool emptyPlainFile(const std::filesystem::path& file);
+
 /// The system's number of this process, which no other living one has; 0 where it is not known.
 [[nodiscard]] std::uint64_t processNumber();
 

@@ -8,6 +8,20 @@ namespace kdx {
 
 namespace {
 
+bool isPlainOrMissing(const std::filesystem::path& file) {
+    std::error_code error;
+    const auto type = std::filesystem::symlink_status(file, error).type();
+    return type == std::filesystem::file_type::regular || type == std::filesystem::file_type::not_found;
+}
+
+bool writePlainFile(const std::filesystem::path& file, std::string_view bytes, std::ios::openmode how) {
+    if (!isPlainOrMissing(file)) return false;
+    std::ofstream stream(file, std::ios::binary | how);
+    stream.write(bytes.data(), static_cast<std::streamsize>(bytes.size()));
+    stream.close();
+    return !stream.fail();
+}
+
 std::int64_t nanoseconds(std::filesystem::file_time_type time) {
     return std::chrono::duration_cast<std::chrono::nanoseconds>(time.time_since_epoch()).count();
 }
@@ -43,6 +57,14 @@ bool writeNewFile(const std::filesystem::path& file, std::string_view bytes, con
     if (!std::filesystem::exists(modelStatus)) return true;
     std::filesystem::permissions(file, modelStatus.permissions(), error);
     return !error;
+}
+
+bool appendToPlainFile(const std::filesystem::path& file, std::string_view bytes) {
+    return writePlainFile(file, bytes, std::ios::app);
+}
+
+bool emptyPlainFile(const std::filesystem::path& file) {
+    return writePlainFile(file, {}, std::ios::trunc);
 }
 
 std::uint64_t processNumber() {

@@ -34,6 +34,17 @@ bool takeOver(int file, const struct stat& model) {
     return ::fchmod(file, model.st_mode & 07777) == 0;  // after the owner: a new owner clears bits of the mode
 }
 
+/// Not through a link, and without waiting for a reader of a pipe.
+FileDescriptor openPlainFile(const std::filesystem::path& file) {
+    constexpr mode_t kUsersMaskDecides = 0666;
+    constexpr int kHow = O_WRONLY | O_APPEND | O_CREAT | O_NOFOLLOW | O_NONBLOCK | O_NOCTTY | O_CLOEXEC;
+    FileDescriptor descriptor(::open(file.c_str(), kHow, kUsersMaskDecides));
+    struct stat status {};
+    if (descriptor.isOpen() && (::fstat(descriptor.number(), &status) != 0 || !S_ISREG(status.st_mode)))
+        descriptor.close();
+    return descriptor;
+}
+
 std::int64_t nanoseconds(const timespec& time) {
     constexpr std::int64_t kSecond = 1'000'000'000;
     return time.tv_sec * kSecond + time.tv_nsec;
@@ -72,6 +83,16 @@ bool writeNewFile(const std::filesystem::path& file, std::string_view bytes, con
     if (!writeAll(descriptor.number(), bytes)) return false;
     if (hasModel && !takeOver(descriptor.number(), modelStatus)) return false;
     return ::fsync(descriptor.number()) == 0 && descriptor.close();
+}
+
+bool appendToPlainFile(const std::filesystem::path& file, std::string_view bytes) {
+    FileDescriptor descriptor = openPlainFile(file);
+    return descriptor.isOpen() && writeAll(descriptor.number(), bytes) && descriptor.close();
+}
+
+bool emptyPlainFile(const std::filesystem::path& file) {
+    FileDescriptor descriptor = openPlainFile(file);
+    return descriptor.isOpen() && ::ftruncate(descriptor.number(), 0) == 0 && descriptor.close();
 }
 
 std::uint64_t processNumber() {

@@ -1,5 +1,8 @@
 #include "station/session.h"
 
+#include "base/clock.h"
+#include "base/numbers.h"
+#include "settings/generalsettings.h"
 #include "settings/programstate.h"
 
 namespace kdx {
@@ -11,6 +14,7 @@ Session::Session(Visa& visa, ProgramState& state, DataFolder& data, const Captio
       transmitter(instrument, params),
       profile(Profile::followingDataSet(data, state.CurrentDataSet)),
       m_state(state),
+      m_clock(clock),
       m_source(profile) {}
 
 Session::~Session() {
@@ -19,6 +23,7 @@ Session::~Session() {
 
 void Session::load(const Profile& source) {
     m_source = source;
+    m_clock.correctMidnight(leadingNumber(source.read(setting::kMidnightCorrected)) == 1);
     station.load(source);
 }
 

@@ -22,6 +22,7 @@ struct Session {
     Session& operator=(const Session&) = delete;
 
     /// Loads the data set of the profile, or of any other source; whatever is looked up at sending comes from there.
+    /// What the general settings correct of the program's ways holds from here on.
     void load() { load(profile); }
     void load(const Profile& source);
     /// Opens the session to the address; see Instrument::open.
@@ -43,6 +44,7 @@ private:
     void lookUp();
 
     ProgramState& m_state;
+    Clock& m_clock;
     Profile m_source;
 };
 

@@ -1,11 +1,17 @@
 #include "ui/pictureswitch.h"
 
+#include <QBuffer>
 #include <QImageReader>
 #include <QPainter>
 #include <QStyle>
 #include <QStyleOptionFocusRect>
 
 #include "settings/datafolder.h"
+#include "settings/profilefile.h"
+
+#include <algorithm>
+#include <optional>
+#include <string>
 
 namespace kdx {
 
@@ -13,10 +19,16 @@ namespace {
 
 constexpr int kPictureWidth = 32;
 constexpr int kPictureHeight = 16;
+constexpr std::size_t kLargestPicture = 1024 * 1024;  // bytes; what is longer is none
 
 /// The picture of the file that is sharpest at the width; an empty one when none can be read.
 QPixmap loadPicture(const std::filesystem::path& file, int width) {
-    QImageReader reader(QString::fromStdU16String(file.u16string()));
+    std::optional<std::string> bytes = readFile(file);
+    if (!bytes) return {};
+    QBuffer buffer;
+    buffer.setData(bytes->data(), static_cast<qsizetype>(std::min(bytes->size(), kLargestPicture)));
+    buffer.open(QIODevice::ReadOnly);
+    QImageReader reader(&buffer);
     QImage best;
     do {
         const QImage image = reader.read();

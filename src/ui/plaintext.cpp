@@ -2,6 +2,7 @@
 
 #include "ui/text.h"
 
+#include <QApplication>
 #include <QLabel>
 #include <QLineEdit>
 #include <QValidator>
@@ -26,6 +27,14 @@ public:
     }
 };
 
+/// Shows the text in red while it has a double quote in it, which would end it for the coder.
+void markQuote(QLineEdit& entry) {
+    QPalette palette = entry.palette();
+    const bool quoted = entry.text().contains(QLatin1Char('"'));
+    palette.setColor(QPalette::Text, quoted ? QColor(Qt::red) : QApplication::palette(&entry).color(QPalette::Text));
+    entry.setPalette(palette);
+}
+
 }  // namespace
 
 void keepTextPlain(QObject& control) {
@@ -33,6 +42,8 @@ void keepTextPlain(QObject& control) {
         label->setTextFormat(Qt::PlainText);  // the tool tip is one too
     } else if (auto* entry = qobject_cast<QLineEdit*>(&control); entry != nullptr && entry->validator() == nullptr) {
         entry->setValidator(new ControlRemover(entry));
+        QObject::connect(entry, &QLineEdit::textChanged, entry, [entry] { markQuote(*entry); });
+        if (entry->text().contains(QLatin1Char('"'))) markQuote(*entry);
     }
 }
 

@@ -18,6 +18,7 @@
 #include "base/numbers.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
+#include "settings/folderlock.h"
 #include "settings/generalsettings.h"
 #include "settings/programstate.h"
 #include "settings/shownpath.h"
@@ -78,9 +79,16 @@ HMenue::HMenue(const Surroundings& surroundings)
     m_s.session.transmitter.setWatcher(this);
     m_s.session.instrument.onFailure(
         [this](const std::string& text, bool sequenceRuns) { return showInterfaceError(text, sequenceRuns); });
-    m_s.data.onUnsavedFileChanged([this] { showNotice(); });
+    const auto changed = [this] { showNotice(); };
+    m_s.data.onUnsavedFileChanged(changed);
+    m_s.session.instrument.log.onChange(changed);
+    m_s.session.params.onQuotedKeysChanged(changed);
     auto* retry = named<QTimer>("UnsavedTimer", this);
-    connect(retry, &QTimer::timeout, this, [this] { m_s.data.retryUnsaved(); });
+    connect(retry, &QTimer::timeout, this, [this] {
+        m_s.data.retryUnsaved();
+        m_s.session.instrument.log.retry();
+        showNotice();  // another program on the same data comes and goes
+    });
     retry->start(kRetryInterval);
 }
 
@@ -88,6 +96,8 @@ HMenue::~HMenue() {
     m_s.session.transmitter.setWatcher(nullptr);
     m_s.session.instrument.onFailure(nullptr);
     m_s.data.onUnsavedFileChanged(nullptr);
+    m_s.session.instrument.log.onChange(nullptr);
+    m_s.session.params.onQuotedKeysChanged(nullptr);
     m_s.data.retryUnsaved();  // a last time
 }
 
@@ -169,7 +179,7 @@ void HMenue::startUp() {
     m_s.state.CurrentDataSet = "1";
     m_s.session.load();
     loadPages();
-    m_s.session.instrument.emptyLog();
+    m_s.session.instrument.log.empty();
     if (upperCase(profile.read(setting::kOpenAtStart)) == "AUTO") INIT_Taste_Click();
 }
 
@@ -292,16 +302,31 @@ void HMenue::Mnu_Info_Log_Click() {
 }
 
 void HMenue::showNotice() {
+    m_lowerEdge->setNotice(notes().join(QStringLiteral("  -  ")));
+}
+
+QStringList HMenue::notes() const {
     QStringList notes;
+    const auto note = [&](const Caption& caption, const QString& what = {}) {
+        const QString text = captionText(m_s.captions, caption);
+        notes += what.isEmpty() ? text : text.arg(what);
+    };
     if (const QString missing = missingData(); !missing.isEmpty()) {
-        notes += captionText(m_s.captions, {322, "Nicht gefunden: %1"}).arg(missing);
+        note({322, "Nicht gefunden: %1"}, missing);
     } else if (!m_startNotice.isEmpty()) {
         notes += m_startNotice;
     }
+    if (const auto unreadable = m_s.data.unreadableFile()) note({325, "Nicht lesbar: %1"}, toText(*unreadable));
     if (const auto unsaved = m_s.data.unsavedFile()) {
-        notes += captionText(m_s.captions, {312, "Nicht gespeichert: %1"}).arg(toText(*unsaved));
+        note({312, "Nicht gespeichert: %1"}, toText(*unsaved));
+    } else if (!m_s.session.instrument.log.isWritable()) {
+        note({312, "Nicht gespeichert: %1"}, toText(kCommandLog));
     }
-    m_lowerEdge->setNotice(notes.join(QStringLiteral("  -  ")));
+    if (m_s.claim.isShared()) note({326, "Ein anderes Programm nutzt dieselben Daten"});
+    QStringList quoted;
+    for (const std::string& key : m_s.session.params.quotedKeys()) quoted += toText(key);
+    if (!quoted.isEmpty()) note({327, "Anführungszeichen beendet den Text: %1"}, quoted.join(QStringLiteral(", ")));
+    return notes;
 }
 
 QString HMenue::missingData() const {

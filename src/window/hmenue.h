@@ -15,6 +15,7 @@ class QTabWidget;
 namespace kdx {
 
 class ConnectionBar;
+class FolderClaim;
 class LogView;
 class MainMenu;
 class Page;
@@ -32,6 +33,7 @@ struct Surroundings {
     Clock& clock;
     Dialogs& dialogs;
     TickerGroup& tickers;
+    const FolderClaim& claim;          ///< on the data folder
     QString linkDescription;           ///< how instruments are reached, for the about box
     std::function<void()> endProgram;  ///< ends the program at once
 };
@@ -75,6 +77,7 @@ private:
     void loadPages();
     void showSessionOpen(bool open);
     void showNotice();
+    [[nodiscard]] QStringList notes() const;
     [[nodiscard]] QString missingData() const;
     bool showInterfaceError(const std::string& text, bool sequenceRuns);
 
@@ -86,7 +89,7 @@ private:
     QPushButton* GTL_Taste = nullptr;
     QTabWidget* SSTab1 = nullptr;
     std::vector<Page*> m_pages;
-    ProgressLine* m_lowerEdge = nullptr;  // progress, and what could not be saved or found
+    ProgressLine* m_lowerEdge = nullptr;  // progress, and what the user should know
     QString m_startNotice;                // what start-up could not read
     MainMenu* m_menu = nullptr;
     TrafficLog* m_trafficLog = nullptr;

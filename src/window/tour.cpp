@@ -2,6 +2,7 @@
 
 #include <QCoreApplication>
 #include <QDir>
+#include <QFileInfo>
 #include <QPixmap>
 #include <QPushButton>
 #include <QTabWidget>
@@ -19,6 +20,12 @@ namespace {
 /// Without trailing blanks and with dots for control characters, so that a line stays a line.
 std::string shown(std::string_view text) {
     return toText(printable(text.substr(0, text.find_last_not_of(" \n\r") + 1), '.')).toStdString();
+}
+
+/// Not a link, a pipe or a device: what is behind them is not the tour's to overwrite, and nobody may read the pipe.
+bool isPlainOrMissing(const QString& file) {
+    const QFileInfo place(file);
+    return !place.isSymLink() && (place.isFile() || !place.exists());
 }
 
 /// Prints what is written and read while it lives, and counts the answers and what failed.
@@ -96,7 +103,7 @@ int makeTour(HMenue& window, Instrument& instrument, const TourDialogs& dialogs,
             break;
         }
         const QString file = QDir(folder).filePath(QStringLiteral("page_%1.png").arg(page));
-        if (window.grab().save(file)) {
+        if (isPlainOrMissing(file) && window.grab().save(file)) {
             ++pictures;
         } else {
             ++failures;

@@ -5,6 +5,7 @@
 
 #include "base/clock.h"
 #include "base/printable.h"
+#include "coder/sendparam.h"
 #include "settings/captions.h"
 #include "ui/text.h"
 
@@ -73,7 +74,7 @@ QVariant TrafficLog::data(const QModelIndex& index, int role) const {
     if (!index.isValid()) return {};
     const Line& line = m_lines.at(static_cast<std::size_t>(index.row()));
     if (role == Qt::DisplayRole) return cell(line, index.column());
-    if (role == Qt::ForegroundRole && line.status < 0) return QBrush(Qt::red);
+    if (role == Qt::ForegroundRole && (line.status < 0 || endsItsTextEarly(line.text))) return QBrush(Qt::red);
     return {};
 }
 

@@ -33,6 +33,14 @@ TEST_P(ComposeCommand, GivesExactlyTheseBytes) {
     EXPECT_EQ(composeCommand(GetParam().key, value, kContext), GetParam().command);
 }
 
+TEST(EndsItsTextEarlyTest, IsACoderCommandWithAQuoteInItsText) {
+    EXPECT_TRUE(endsItsTextEarly(R"(:STEREO:DIRECT "PS=A"B     ")"));
+    EXPECT_TRUE(endsItsTextEarly(R"(:STEREO:DIRECT "PS=";*RST;"")"));
+    EXPECT_FALSE(endsItsTextEarly(R"(:STEREO:DIRECT "PS=RADIO   ")"));
+    EXPECT_FALSE(endsItsTextEarly("FREQ \"1\" MHz\"")) << "no text of the coder's";
+    EXPECT_FALSE(endsItsTextEarly(""));
+}
+
 std::string lettersOf(std::string key) {
     std::erase_if(key, [](unsigned char c) { return std::isalnum(c) == 0; });
     return key;

@@ -3,6 +3,7 @@
 #include <filesystem>
 
 #include "link/commandsequence.h"
+#include "support/fulldisk.h"
 
 namespace kdx::test {
 namespace {
@@ -201,13 +202,13 @@ TEST_F(InstrumentTest, TheLogIsFoundInAnyLetterCaseAndEmptied) {
     folder.write("RDS_Log.txt", "old\r\n");
     instrument.WriteLog("PTY", "1", "");
     EXPECT_EQ(folder.read("RDS_Log.txt"), "old\r\n            PTY= 1\r\n");
-    instrument.emptyLog();
+    instrument.log.empty();
     EXPECT_EQ(folder.read("RDS_Log.txt"), "");
     EXPECT_FALSE(std::filesystem::exists(folder.data() / kCommandLog));
 }
 
 TEST_F(InstrumentTest, EmptyingCreatesTheLog) {
-    instrument.emptyLog();
+    instrument.log.empty();
     EXPECT_TRUE(std::filesystem::exists(folder.data() / kCommandLog));
     EXPECT_EQ(log(), "");
 }
@@ -221,7 +222,7 @@ TEST_F(InstrumentTest, TheLogMayBeDeletedBetweenTwoLines) {
 
 TEST_F(InstrumentTest, ALogThatCannotBeWrittenStopsNothing) {
     std::filesystem::remove_all(folder.data());
-    instrument.emptyLog();
+    instrument.log.empty();
     EXPECT_EQ(askCoder("\"RADIO\"\n"), "RADIO");
     EXPECT_EQ(visa.written.size(), 1U);
     EXPECT_TRUE(failures.empty());
@@ -230,15 +231,16 @@ TEST_F(InstrumentTest, ALogThatCannotBeWrittenStopsNothing) {
 
 TEST_F(InstrumentTest, AFolderInTheLogsPlaceStopsNothing) {
     std::filesystem::create_directory(folder.data() / kCommandLog);
-    instrument.emptyLog();
+    instrument.log.empty();
     EXPECT_EQ(askCoder("\"RADIO\"\n"), "RADIO");
     EXPECT_TRUE(failures.empty());
 }
 
 TEST_F(InstrumentTest, AFullDiskUnderTheLogStopsNothing) {
-    std::filesystem::create_symlink("/dev/full", folder.data() / kCommandLog);
+    const FullDisk disk;
     EXPECT_EQ(askCoder("\"RADIO\"\n"), "RADIO");
     EXPECT_TRUE(failures.empty());
+    EXPECT_FALSE(instrument.log.isWritable());
 }
 
 }  // namespace

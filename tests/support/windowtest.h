@@ -5,6 +5,7 @@
 
 #include <memory>
 
+#include "settings/folderlock.h"
 #include "support/pagetest.h"
 #include "window/hmenue.h"
 
@@ -26,7 +27,7 @@ protected:
         session = std::make_unique<Session>(instrumentLink(), state, data, captions, clock, ask);
         tickers.setHeld(false);
         window = std::make_unique<HMenue>(Surroundings{*session, state, data, captions, clock, boxesOfWindow(), tickers,
-                                                       QStringLiteral("scripted"), ask});
+                                                       claim, QStringLiteral("scripted"), ask});
         m_listener = std::make_unique<TrafficListener>(session->instrument, [this](const Traffic& traffic) {
             if (heard) heard(traffic);
         });
@@ -72,6 +73,7 @@ protected:
     int ended = 0;  ///< how often the end of the program was asked for
     TickerGroup tickers;
     std::unique_ptr<Session> session;
+    FolderClaim claim{folder.data()};
     std::unique_ptr<HMenue> window;
     std::function<void(const Traffic&)> heard;  ///< hears everything that passes, from the next start on
 

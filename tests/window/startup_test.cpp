@@ -227,7 +227,9 @@ TEST_F(StartUpTest, ADataFolderThatCannotBeReadIsToldAndTheWindowWorksWithoutIt)
     std::filesystem::permissions(folder.data(), std::filesystem::perms::none);
     const Unprivileged ordinary;
     start();
-    EXPECT_EQ(text("QuietLine"), "Nicht gefunden: Sprachen.ini [deutsch]  -  Nicht gespeichert: RDS_Allg.INI");
+    EXPECT_EQ(text("QuietLine"),
+              "Nicht gefunden: Sprachen.ini [deutsch]  -  Nicht lesbar: Datenset1.INI  -  "
+              "Nicht gespeichert: RDS_Allg.INI");
     expectToWork();
 }
 
@@ -242,7 +244,7 @@ TEST_F(StartUpTest, ADataFolderThatCannotBeWrittenLosesNothingAndIsTold) {
         const Unprivileged ordinary;
         start();
         EXPECT_EQ(text("PS_T"), "MESSTURM");
-        EXPECT_EQ(text("QuietLine"), "");
+        EXPECT_EQ(text("QuietLine"), "Nicht gespeichert: RDS_log.txt");
         expectToWork();
         EXPECT_EQ(text("QuietLine"), "Nicht gespeichert: Datenset1.INI");
     }
@@ -308,7 +310,7 @@ TEST_F(StartUpTest, AMissingFolderWhoseNameIsNoUtf8IsTold) {
     captions.load("deutsch", "RDS");
     Session other(visa, state, odd, captions, clock, [] {});
     TickerGroup group;
-    HMenue shown({other, state, odd, captions, clock, dialogs, group, QString(), [] {}});
+    HMenue shown({other, state, odd, captions, clock, dialogs, group, claim, QString(), [] {}});
     shown.startUp();
     EXPECT_TRUE(shown.findChild<QLabel*>(QStringLiteral("QuietLine"))->text().contains(QStringLiteral("\\xFCrgen")));
 }

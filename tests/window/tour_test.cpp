@@ -5,6 +5,7 @@
 #include <QImage>
 
 #include "settings/captions.h"
+#include "settings/folderlock.h"
 #include "sim/simvisa.h"
 #include "sim/virtualinstrument.h"
 #include "support/windowtest.h"
@@ -19,7 +20,8 @@ protected:
     int tour(Visa& visa) {
         Session session(visa, state, data, captions, clock, [] {});
         TickerGroup tickers;
-        HMenue window({session, state, data, captions, clock, dialogs, tickers, QString(), [] {}});
+        const FolderClaim claim(data.path());
+        HMenue window({session, state, data, captions, clock, dialogs, tickers, claim, QString(), [] {}});
         window.startUp();
         return makeTour(window, session.instrument, dialogs, QString::fromStdString(pictures.string()), print);
     }

@@ -1,0 +1,119 @@
+// What the quiet line at the lower edge tells beside what could not be saved.
+#include <gtest/gtest.h>
+
+#include <sys/stat.h>
+
+#include <optional>
+
+#include "settings/shownpath.h"
+#include "support/windowtest.h"
+
+namespace kdx::test {
+namespace {
+
+class NoticeTest : public WindowTest {
+protected:
+    NoticeTest() { folder.copyShipped(); }
+    std::string notice() { return text("QuietLine"); }
+    void waitForRetry() { tick("UnsavedTimer"); }
+};
+
+TEST_F(NoticeTest, ThereIsNoneWhenAllIsWell) {
+    start();
+    openSession();
+    EXPECT_EQ(notice(), "");
+}
+
+TEST_F(NoticeTest, ALogThatLeadsElsewhereIsToldAlsoWithLoggingOff) {
+    const auto thesis = folder.path() / "thesis.txt";
+    folder.write("../thesis.txt", "ten years");
+    std::filesystem::create_symlink(thesis, folder.data() / kCommandLog);
+    setGeneral("ADRESSEN", "Log_Key", "0");
+    start();
+    EXPECT_EQ(notice(), "Nicht gespeichert: RDS_log.txt");
+    EXPECT_EQ(folder.read("../thesis.txt"), "ten years");
+    std::filesystem::remove(folder.data() / kCommandLog);
+    waitForRetry();
+    EXPECT_EQ(notice(), "");
+}
+
+TEST_F(NoticeTest, PipesInThePlaceOfFilesDelayNothing) {
+    for (const char* file : {kCommandLog, kPictureOn, kPictureOff, kEventList, "Datenset1.INI"}) {
+        std::filesystem::remove(folder.data() / file);
+        ASSERT_EQ(mkfifo((folder.data() / file).c_str(), 0600), 0);
+    }
+    start();
+    openSession();
+    showPage(1);
+    QCoreApplication::processEvents();
+    EXPECT_NE(notice().find("Nicht lesbar: Datenset1.INI"), std::string::npos) << notice();
+    EXPECT_NE(notice().find("Nicht gespeichert: RDS_log.txt"), std::string::npos) << notice();
+}
+
+TEST_F(NoticeTest, SettingsInAnotherEncodingAreToldAndLeftAlone) {
+    std::string wide = "\xFF\xFE";
+    for (const char letter : std::string("[RDS]\r\nPS=RADIO\r\n")) wide += {letter, '\0'};
+    folder.write("Datenset1.INI", wide);
+    start();
+    EXPECT_EQ(notice(), "Nicht lesbar: Datenset1.INI");
+    openSession();
+    type("PS_T", "NEW");
+    click("PS_Taste");
+    EXPECT_EQ(folder.read("Datenset1.INI"), wide);
+    EXPECT_EQ(notice(), "Nicht lesbar: Datenset1.INI  -  Nicht gespeichert: Datenset1.INI");
+}
+
+TEST_F(NoticeTest, AnotherProgramOnTheSameDataIsToldWhileItRuns) {
+    std::optional<FolderClaim> other(folder.data());
+    start();
+    EXPECT_EQ(notice(), "Ein anderes Programm nutzt dieselben Daten");
+    action("Mnu_Info_Sprache_E")->trigger();
+    EXPECT_EQ(notice(), "Another program uses the same data");
+    other.reset();
+    waitForRetry();
+    EXPECT_EQ(notice(), "");
+}
+
+class QuoteTest : public NoticeTest {
+protected:
+    bool isRed(const char* entry) { return find<QLineEdit>(entry)->palette().color(QPalette::Text) == Qt::red; }
+};
+
+TEST_F(QuoteTest, AValueWithADoubleQuoteIsToldAndMarkedUntilAnotherIsSent) {
+    start();
+    openSession();
+    visa.written.clear();
+    type("PS_T", "A\"B");
+    EXPECT_TRUE(isRed("PS_T"));
+    EXPECT_EQ(notice(), "") << "not sent yet";
+    click("PS_Taste");
+    EXPECT_EQ(sent(), Lines{":STEREO:DIRECT \"PS=A\"B     \""}) << "sent as it stands";
+    EXPECT_EQ(notice(), "Anführungszeichen beendet den Text: PS");
+    type("PS_T", "AB");
+    EXPECT_FALSE(isRed("PS_T"));
+    click("PS_Taste");
+    EXPECT_EQ(notice(), "");
+}
+
+TEST_F(QuoteTest, ACraftedDataSetIsToldByItsKeysAndMarkedFromTheStart) {
+    setDataSet1("RDS", "PS", "x\";*RST");
+    setDataSet1("RDS", "PI", "D\"C0");
+    start();
+    EXPECT_TRUE(isRed("PS_T"));
+    openSession();
+    EXPECT_EQ(notice(), "Anführungszeichen beendet den Text: PI, PS");
+}
+
+TEST_F(NoticeTest, TheCorrectionOfMidnightIsAsTheGeneralSettingsSay) {
+    start();
+    EXPECT_TRUE(clock.midnightCorrected()) << "as it is shipped";
+    setGeneral("Berichtigungen", "Mitternacht", "0");
+    start();
+    EXPECT_FALSE(clock.midnightCorrected());
+    folder.write("RDS_Allg.INI", "[BUS]\r\n");
+    start();
+    EXPECT_FALSE(clock.midnightCorrected()) << "missing";
+}
+
+}  // namespace
+}  // namespace kdx::test
