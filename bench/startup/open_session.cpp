@@ -6,6 +6,7 @@
 #include "base/clock.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
+#include "settings/folderlock.h"
 #include "settings/programstate.h"
 #include "sim/simvisa.h"
 #include "sim/virtualinstrument.h"
@@ -44,7 +45,8 @@ int main(int argc, char** argv) {
     kdx::sim::SimVisa visa(instrument);
     kdx::Session session(visa, state, data, captions, clock, [] {});
     kdx::TickerGroup tickers;
-    kdx::HMenue window({session, state, data, captions, clock, dialogs, tickers, QString(), [] {}});
+    const kdx::FolderClaim claim(data.path());
+    kdx::HMenue window({session, state, data, captions, clock, dialogs, tickers, claim, QString(), [] {}});
     window.startUp();
     window.show();
     CommandCounter counter(session.instrument);

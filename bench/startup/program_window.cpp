@@ -19,6 +19,7 @@
 #include "link/lanvisa.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
+#include "settings/folderlock.h"
 #include "settings/programstate.h"
 #include "station/session.h"
 #include "ui/application.h"
@@ -59,7 +60,8 @@ int main(int argc, char** argv) {
     kdx::LanVisa visa;
     kdx::Session session(visa, state, data, captions, clock, [] {});
     kdx::TickerGroup tickers;
-    kdx::HMenue window({session, state, data, captions, clock, dialogs, tickers, QString(), [] {}});
+    const kdx::FolderClaim claim(data.path());
+    kdx::HMenue window({session, state, data, captions, clock, dialogs, tickers, claim, QString(), [] {}});
     window.startUp();
     if (argc > 2 && std::strcmp(argv[2], "--count") == 0) {
         printCounts(window);
