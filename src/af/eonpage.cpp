@@ -131,7 +131,8 @@ void EonPage::EON_PI_Text_Change() {
 }
 
 void EonPage::EON_PI_Taste_Click() {
-    m_with.params.SendParam(setting::kEonRemoval, firstNetwork(m_with.instrument.X4_Abfrage("EON-PI", "EON PI?")));
+    const auto& [label, key] = setting::kHeldNetworks;
+    m_with.params.SendParam(setting::kEonRemoval, firstNetwork(m_with.instrument.X4_Abfrage(label, key)));
     m_with.params.SendParam(setting::kEonPi.sendKey, m_network.pi);
 }
 

@@ -13,6 +13,12 @@ inline constexpr std::array kAfLists{
     Setting{"AF5", {KeptIn::DataSet, "RDS", "AF_LISTE5"}}};
 inline constexpr Place kShownAfList{KeptIn::DataSet, "RDS", "AF_LISTE"};  // its number
 
+/// The question for the networks that the coder holds: the name it is logged under, and the coder's query text.
+struct Question {
+    const char* label;
+    const char* key;
+};
+inline constexpr Question kHeldNetworks{"EON-PI", "EON PI?"};
 inline constexpr Setting kEonPi{"EON_PI", {KeptIn::DataSet, "RDS", "EON_PI"}};
 inline constexpr Setting kEonPs{"EON_PS", {KeptIn::DataSet, "RDS", "EON_PS"}};
 // The chosen type's name goes out under the key of the PI, so that the coder gets its first 4 characters as one; the

@@ -4,6 +4,7 @@
 #include <thread>
 
 #include "base/localtime.h"
+#include "base/numbers.h"
 
 namespace kdx {
 
@@ -36,6 +37,11 @@ std::chrono::steady_clock::time_point SystemClock::steadyNow() const {
 void SystemClock::sleep(std::chrono::nanoseconds duration) {
     // To an absolute point of the steady clock: an interrupted or late sleep does not add up.
     std::this_thread::sleep_until(std::chrono::steady_clock::now() + duration);
+}
+
+std::string timeText(const Clock& clock) {
+    const int seconds = static_cast<int>(clock.secondsSinceMidnight());
+    return twoDigits(seconds / 3600) + ":" + twoDigits(seconds / 60 % 60) + ":" + twoDigits(seconds % 60);
 }
 
 void WaitMs(Clock& clock, const std::int16_t& milliseconds) {

@@ -2,6 +2,7 @@
 
 #include <chrono>
 #include <cstdint>
+#include <string>
 
 namespace kdx {
 
@@ -41,6 +42,9 @@ public:
     [[nodiscard]] std::chrono::steady_clock::time_point steadyNow() const override;
     void sleep(std::chrono::nanoseconds duration) override;
 };
+
+/// The clock's time of day as "hh:mm:ss".
+[[nodiscard]] std::string timeText(const Clock& clock);
 
 /// Waits until the clock's seconds since midnight, held in single precision, have reached start + milliseconds / 1000.
 /// The rounding is the one the instrument's timing was tried out with. A target past midnight is never reached, since

@@ -29,4 +29,8 @@ std::string printable(std::string_view text, char substitute) {
     return result;
 }
 
+std::string printableLine(std::string_view text, char substitute) {
+    return printable(text.substr(0, text.find_last_not_of(" \n") + 1), substitute);
+}
+
 }  // namespace kdx

@@ -13,4 +13,8 @@ namespace kdx {
 /// code page's characters can be shown.
 [[nodiscard]] std::string printable(std::string_view text, char substitute);
 
+/// The same for an answer or a command: blanks at its end, which only pad it, and the line feed after them are left
+/// out.
+[[nodiscard]] std::string printableLine(std::string_view text, char substitute);
+
 }  // namespace kdx

@@ -232,11 +232,6 @@ std::string formatted(const ParamRow& row, std::string& value, const ParamContex
     return {};
 }
 
-std::string timeText(double secondsSinceMidnight) {
-    const int seconds = static_cast<int>(secondsSinceMidnight);
-    return twoDigits(seconds / 3600) + ":" + twoDigits(seconds / 60 % 60) + ":" + twoDigits(seconds % 60);
-}
-
 std::string dateText(const Date& date) {
     return twoDigits(date.day) + "." + twoDigits(date.month) + "." + twoDigits(date.year % 100);
 }
@@ -270,8 +265,7 @@ void ParamSender::SendParam(const std::string& key, std::string& value, const st
         m_endProgram();
         return;
     }
-    const ParamContext context{m_state.eonIdentifier, m_state.shownClock, timeText(m_clock.secondsSinceMidnight()),
-                               dateText(m_clock.today())};
+    const ParamContext context{m_state.eonIdentifier, m_state.shownClock, timeText(m_clock), dateText(m_clock.today())};
     const std::optional<std::string> command = composeCommand(key, value, context);
     if (!command || m_instrument.isSequenceStopped()) return;
     noteQuotes(key, *command);

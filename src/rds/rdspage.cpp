@@ -1,7 +1,5 @@
 #include "rds/rdspage.h"
 
-#include <QTime>
-
 #include <utility>
 
 #include "base/clock.h"
@@ -124,14 +122,14 @@ void RdsPage::Zeit_Taste_Click() {
 
 void RdsPage::Timer1_Timer() {
     if (!m_clockOn) return;
-    showClock(pcTime());
+    showClock(toText(timeText(m_with.clock)));
     m_clockShowsWord = false;
     m_with.params.SendParam(setting::kClock, toBytes(Uhr_Zeit->text()));
 }
 
 void RdsPage::Uhr_Zeit_DblClick() {
     // A harmless prompt: the answer is not used, the time sent is always the PC's.
-    m_with.dialogs.input(caption({397, "Uhrzeit: "}), caption({398, "Zeit eingabe"}), pcTime());
+    m_with.dialogs.input(caption({397, "Uhrzeit: "}), caption({398, "Zeit eingabe"}), toText(timeText(m_with.clock)));
 }
 
 void RdsPage::showMusicSpeech() {
@@ -151,11 +149,6 @@ void RdsPage::showTrafficProgramme(bool on) {
 void RdsPage::showClock(const QString& text) {
     Uhr_Zeit->setText(text);
     m_with.state.shownClock = toBytes(text);
-}
-
-QString RdsPage::pcTime() const {
-    return QTime::fromMSecsSinceStartOfDay(static_cast<int>(m_with.clock.secondsSinceMidnight()) * 1000)
-        .toString(QStringLiteral("HH:mm:ss"));
 }
 
 }  // namespace kdx

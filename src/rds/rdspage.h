@@ -59,7 +59,6 @@ private:
     void setTrafficProgramme(bool on);
     void showTrafficProgramme(bool on);
     void showClock(const QString& text);
-    [[nodiscard]] QString pcTime() const;
 
     Programme& m_programme;
 

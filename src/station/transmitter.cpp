@@ -3,6 +3,7 @@
 #include <algorithm>
 
 #include "af/othernetwork.h"
+#include "af/settings.h"
 #include "coder/sendparam.h"
 #include "link/commandsequence.h"
 
@@ -78,7 +79,7 @@ void Transmitter::runStep(const Step& step) {
 
 /// Asks the question of step `at` and repeats the removal after it for each network of the answer.
 void Transmitter::askNetworks(Steps& steps, std::size_t at) {
-    const std::string answer = m_instrument.X4_Abfrage("EON-PI", "EON PI?");
+    const std::string answer = m_instrument.X4_Abfrage(setting::kHeldNetworks.label, setting::kHeldNetworks.key);
     if (m_watcher != nullptr) m_watcher->stepAnswered(steps[at], answer);
     const auto removal = steps.begin() + static_cast<std::ptrdiff_t>(at) + 1;
     if (removal == steps.end()) return;

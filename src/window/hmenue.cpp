@@ -316,8 +316,10 @@ QStringList HMenue::notes() const {
     } else if (!m_startNotice.isEmpty()) {
         notes += m_startNotice;
     }
-    if (const auto unreadable = m_s.data.unreadableFile()) note({325, "Nicht lesbar: %1"}, toText(*unreadable));
-    if (const auto unsaved = m_s.data.unsavedFile()) {
+    const auto unsaved = m_s.data.unsavedFile();
+    const auto unreadable = m_s.data.unreadableFile();
+    if (unreadable && unreadable != unsaved) note({325, "Nicht lesbar: %1"}, toText(*unreadable));
+    if (unsaved) {
         note({312, "Nicht gespeichert: %1"}, toText(*unsaved));
     } else if (!m_s.session.instrument.log.isWritable()) {
         note({312, "Nicht gespeichert: %1"}, toText(kCommandLog));

@@ -17,11 +17,6 @@ namespace kdx {
 
 namespace {
 
-/// Without trailing blanks and with dots for control characters, so that a line stays a line.
-std::string shown(std::string_view text) {
-    return toText(printable(text.substr(0, text.find_last_not_of(" \n\r") + 1), '.')).toStdString();
-}
-
 /// Not a link, a pipe or a device: what is behind them is not the tour's to overwrite, and nobody may read the pipe.
 bool isPlainOrMissing(const QString& file) {
     const QFileInfo place(file);
@@ -44,7 +39,7 @@ public:
         const bool read = traffic.kind == Traffic::Kind::Read;
         if (read) ++answers;
         if (traffic.status < 0) ++failures;
-        m_print((read ? "<- " : "-> ") + shown(traffic.text) +
+        m_print((read ? "<- " : "-> ") + toText(printableLine(traffic.text, '.')).toStdString() +
                 (traffic.status < 0 ? "  [" + std::to_string(traffic.status) + "]" : ""));
     }
 

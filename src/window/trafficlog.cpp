@@ -11,16 +11,6 @@
 
 namespace kdx {
 
-namespace {
-
-/// Trailing blanks go and control characters become dots, so that a line stays a line.
-QString shown(std::string_view bytes) {
-    bytes = bytes.substr(0, bytes.find_last_not_of(" \n") + 1);
-    return toText(printable(bytes, '\xB7'));
-}
-
-}  // namespace
-
 TrafficLog::TrafficLog(Instrument& instrument, const Clock& clock, QObject* parent)
     : QAbstractTableModel(parent), m_instrument(instrument), m_clock(clock) {
     m_instrument.addWatcher(*this);
@@ -98,7 +88,7 @@ QString TrafficLog::cell(const Line& line, int column) const {
             }
             return {};
         case Text:
-            return shown(line.text);
+            return toText(printableLine(line.text, '\xB7'));
         default:
             return line.kind == Traffic::Kind::Logged ? QString() : QString::number(line.status);
     }

@@ -60,7 +60,7 @@ TEST_F(NoticeTest, SettingsInAnotherEncodingAreToldAndLeftAlone) {
     type("PS_T", "NEW");
     click("PS_Taste");
     EXPECT_EQ(folder.read("Datenset1.INI"), wide);
-    EXPECT_EQ(notice(), "Nicht lesbar: Datenset1.INI  -  Nicht gespeichert: Datenset1.INI");
+    EXPECT_EQ(notice(), "Nicht gespeichert: Datenset1.INI");
 }
 
 TEST_F(NoticeTest, AnotherProgramOnTheSameDataIsToldWhileItRuns) {
