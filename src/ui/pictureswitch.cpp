@@ -26,7 +26,7 @@ QPixmap loadPicture(const std::filesystem::path& file, int width) {
     std::optional<std::string> bytes = readFile(file);
     if (!bytes) return {};
     QBuffer buffer;
-    buffer.setData(bytes->data(), static_cast<qsizetype>(std::min(bytes->size(), kLargestPicture)));
+    buffer.setData(bytes->data(), static_cast<int>(std::min(bytes->size(), kLargestPicture)));
     buffer.open(QIODevice::ReadOnly);
     QImageReader reader(&buffer);
     QImage best;
