@@ -148,7 +148,7 @@ std::string portMapperText(kdx::simserver::PortAnnouncement::Way way) {
 }
 
 int serve(const Options& options) {
-    // The RPC library writes to the port mapper without a guard; one that hangs up must not end this program.
+    // Whoever reads what is printed may go away; that must not end this program.
     std::signal(SIGPIPE, SIG_IGN);
     const EndSignals endSignals;
     std::unique_ptr<kdx::simserver::LineWriter> trace;

@@ -1,7 +1,9 @@
 #pragma once
 
 #include "simserver/portmapper.h"
+#include "simserver/registration.h"
 
+#include <chrono>
 #include <memory>
 #include <string>
 #include <vector>
@@ -18,25 +20,27 @@ public:
         None         ///< nobody tells clients the port; see problem()
     };
 
-    /// Takes at most some seconds when a port mapper runs but does not answer.
+    static constexpr std::chrono::milliseconds kLookAfterEvery{2000};
+
+    /// Takes three seconds at most, when a port mapper runs but does not answer.
     /// @param bindAddress where the programs listen: a port mapper of our own listens there too.
+    /// @param lookAfterEvery how often a running port mapper is asked whether it still knows the programs.
     PortAnnouncement(PollLoop& loop, std::vector<PortMapping> mappings, const std::string& bindAddress,
-                     unsigned short mapperPort = kPortMapperPort);
+                     unsigned short mapperPort = kPortMapperPort,
+                     std::chrono::milliseconds lookAfterEvery = kLookAfterEvery);
     PortAnnouncement(const PortAnnouncement&) = delete;
     PortAnnouncement& operator=(const PortAnnouncement&) = delete;
-    /// Takes registrations back.
-    ~PortAnnouncement();
 
     [[nodiscard]] Way way() const { return m_way; }
-    /// For the user: why clients cannot find the programs, and what to do about it. Empty unless way() is None.
+    /// For the user: why clients cannot find the programs, how they reach them all the same, and what to do about it.
+    /// Empty unless way() is None.
     [[nodiscard]] const std::string& problem() const { return m_problem; }
 
 private:
-    std::vector<PortMapping> m_mappings;
-    unsigned short m_mapperPort;
     Way m_way = Way::None;
     std::string m_problem;
     std::unique_ptr<PortMapper> m_mapper;
+    std::unique_ptr<Registration> m_registration;
 };
 
 }  // namespace kdx::simserver

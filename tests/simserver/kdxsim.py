@@ -8,6 +8,7 @@ import socketserver
 import struct
 import subprocess
 import threading
+import time
 
 
 class KdxSim:
@@ -51,6 +52,7 @@ class RegisteringPortMapper:
 
     def __enter__(self):
         self.ports = {}
+        self.secondsPerByte = 0
         mapper = self
 
         class Handler(socketserver.StreamRequestHandler):
@@ -58,7 +60,7 @@ class RegisteringPortMapper:
                 while len(mark := self.rfile.read(4)) == 4:
                     call = self.rfile.read(struct.unpack(">I", mark)[0] & 0x7FFFFFFF)
                     reply = mapper.reply(call)
-                    self.wfile.write(struct.pack(">I", 0x80000000 | len(reply)) + reply)
+                    mapper.send(self.wfile, struct.pack(">I", 0x80000000 | len(reply)) + reply)
 
         class Server(socketserver.ThreadingTCPServer):
             allow_reuse_address = True
@@ -71,6 +73,17 @@ class RegisteringPortMapper:
     def __exit__(self, *_):
         self._server.shutdown()
         self._server.server_close()
+
+    def send(self, client, record):
+        if not self.secondsPerByte:
+            client.write(record)
+            return
+        try:
+            for byte in record:
+                client.write(bytes([byte]))
+                time.sleep(self.secondsPerByte)
+        except OSError:
+            pass  # it has gone
 
     def reply(self, call):
         xid, _, _, program, version, procedure, _, credentials = struct.unpack_from(">8I", call)

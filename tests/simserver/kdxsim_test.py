@@ -9,10 +9,11 @@ import struct
 import subprocess
 import sys
 import threading
+import time
 import unittest
 
 import pyvisa
-from kdxsim import KdxSim, portIsFree, requirePrograms
+from kdxsim import KdxSim, RegisteringPortMapper, portIsFree, requirePrograms
 
 PROGRAM = ""
 WITHOUT_PORT_RIGHT = ("setpriv", "--bounding-set=-net_bind_service", "--inh-caps=-net_bind_service")
@@ -28,6 +29,24 @@ def hangUpOnEverybody(listener):
             client, _ = listener.accept()
             client.setsockopt(socket.SOL_SOCKET, socket.SO_LINGER, struct.pack("ii", 1, 0))
             client.close()
+    except OSError:
+        pass  # the test is over
+
+
+def trickle(listener):
+    """Begins a reply to everybody and goes on with a byte a second."""
+    def toOne(client):
+        try:
+            client.send(struct.pack(">I", 0x80000000 | 28))
+            while True:
+                client.send(b"\x00")
+                time.sleep(1)
+        except OSError:
+            pass  # it has gone
+
+    try:
+        while True:
+            threading.Thread(target=toOne, args=(listener.accept()[0],), daemon=True).start()
     except OSError:
         pass  # the test is over
 
@@ -159,6 +178,47 @@ class Run(unittest.TestCase):
             socket.create_connection((second.address, second.port)).close()
             self.assertEqual(second.end(), 0)
             self.assertIn("did not take the registration", second.errors)
+            self.assertIn(f"port to the client: {second.port}", second.errors)
+            self.assertIn("--bind 127.0.0.2 and open TCPIP::127.0.0.2::INSTR", second.errors)
+
+    def testASecondOneAtTheAddressThatTheFirstNamesIsFound(self):
+        with KdxSim(PROGRAM) as first, KdxSim(PROGRAM, "--bind", "127.0.0.2", "--idn", "SECOND") as second:
+            device = pyvisa.ResourceManager("@py").open_resource("TCPIP::127.0.0.2::inst0::INSTR")
+            self.assertEqual(device.query("*IDN?"), "SECOND\n")
+            device.close()
+            self.assertEqual((first.end(), second.end()), (0, 0))
+
+    def testAPortMapperThatAnswersAByteASecondHoldsNothingUp(self):
+        with socket.create_server(("127.0.0.1", 111)) as other:
+            threading.Thread(target=trickle, args=(other,), daemon=True).start()
+            start = time.monotonic()
+            with KdxSim(PROGRAM) as sim:
+                self.assertLess(time.monotonic() - start, 5)
+                start = time.monotonic()
+                self.assertEqual(sim.end(), 0)
+                self.assertLess(time.monotonic() - start, 5)
+            other.shutdown(socket.SHUT_RDWR)
+
+    def testAPortMapperThatGetsThatSlowLaterDoesNotHoldUpTheEnd(self):
+        with RegisteringPortMapper() as mapper, KdxSim(PROGRAM) as sim:
+            self.assertIn("registered with the running port mapper", sim.ready)
+            mapper.secondsPerByte = 1
+            time.sleep(2.5)  # it looks after its registration every two seconds
+            start = time.monotonic()
+            self.assertEqual(sim.end(), 0)
+            self.assertLess(time.monotonic() - start, 5)
+
+    def testAPortMapperThatIsStartedAnewIsToldAgain(self):
+        with RegisteringPortMapper() as mapper, KdxSim(PROGRAM) as sim:
+            self.assertEqual(mapper.ports[0x0607AF], sim.port)
+            mapper.ports.clear()
+            for _ in range(100):
+                if 0x0607AF in mapper.ports and 0x0607B0 in mapper.ports:
+                    break
+                time.sleep(0.1)
+            self.assertEqual(mapper.ports.get(0x0607AF), sim.port)
+            self.assertEqual(sim.end(), 0)
+            self.assertEqual(mapper.ports, {})
 
     def testAPortMapperThatHangsUpDoesNoHarm(self):
         with socket.create_server(("127.0.0.1", 111)) as other:

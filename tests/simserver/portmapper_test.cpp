@@ -1,44 +1,13 @@
-#include "simserver/portmapper.h"
-
-#include "simserver/portannouncement.h"
-#include "simserver/rpcclient.h"
-#include "simserver/vxi11fixture.h"
+#include "simserver/portmappertest.h"
 
 #include <arpa/inet.h>
-#include <netinet/in.h>
 #include <poll.h>
-#include <rpc/pmap_prot.h>
 #include <sys/socket.h>
 
 #include <array>
-#include <functional>
-#include <map>
 
 namespace kdx::simserver {
 namespace {
-
-constexpr std::uint32_t kCore = DEVICE_CORE;
-constexpr std::uint32_t kAsync = DEVICE_ASYNC;
-
-std::string question(std::uint32_t program, std::uint32_t version, std::uint32_t protocol, std::uint32_t port = 0) {
-    return toXdr<pmap>({program, version, protocol, port}, xdr_pmap);
-}
-
-/// A loop that runs in a thread of its own while the object lives.
-class RunningLoop {
-public:
-    explicit RunningLoop(PollLoop& loop) : m_loop(loop), m_thread([&loop] { loop.run(); }) {}
-    RunningLoop(const RunningLoop&) = delete;
-    RunningLoop& operator=(const RunningLoop&) = delete;
-    ~RunningLoop() {
-        m_loop.stop();
-        m_thread.join();
-    }
-
-private:
-    PollLoop& m_loop;
-    std::thread m_thread;
-};
 
 class PortMapperTest : public ::testing::Test {
 protected:
@@ -115,113 +84,6 @@ TEST_F(PortMapperTest, AnswersOverUdpToo) {
     ::send(socket.number(), "nonsense", 8, 0);  // gets no answer and does no harm
     EXPECT_EQ(ask(writer.callMessage(PMAPPROC_GETPORT, question(kCore, 1, IPPROTO_TCP))).rest, word(4711));
     EXPECT_EQ(ask(newWriter.callMessage(3, {})).status, static_cast<std::uint32_t>(PROG_MISMATCH));
-}
-
-/// A port mapper with which others can register, as it runs on many machines.
-class RegisteringMapper final : public RpcProgram {
-public:
-    explicit RegisteringMapper(PollLoop& loop) : RpcProgram(PMAPPROG, PMAPVERS), server(loop, *this, "127.0.0.1", 0) {}
-
-    std::map<u_long, u_long> ports;  ///< by program; to be looked at while the loop stands
-    bool refuses = false;
-    RpcTcpServer server;
-
-protected:
-    void call(std::uint32_t procedure, std::string_view arguments, ConnectionId, const RpcReply& reply) override {
-        const XdrDecoded<pmap> asked(arguments, xdr_pmap);
-        u_long answer = 0;
-        if (procedure == PMAPPROC_SET && !refuses) answer = ports.emplace(asked->pm_prog, asked->pm_port).second;
-        if (procedure == PMAPPROC_UNSET) answer = ports.erase(asked->pm_prog);
-        if (procedure == PMAPPROC_GETPORT && ports.contains(asked->pm_prog)) answer = ports.at(asked->pm_prog);
-        reply({toXdr<u_long>(answer, xdr_u_long)});
-    }
-};
-
-using Ports = std::map<u_long, u_long>;
-
-class PortAnnouncementTest : public ::testing::Test {
-protected:
-    // Runs the other port mapper for as long as the action takes.
-    void whileOtherRuns(const std::function<void()>& action) {
-        const RunningLoop running(m_otherLoop);
-        action();
-    }
-    [[nodiscard]] unsigned short mapperPort() const { return m_other.server.port(); }
-
-    PollLoop m_loop;
-    PollLoop m_otherLoop;
-    RegisteringMapper m_other{m_otherLoop};
-    const std::vector<PortMapping> m_mappings{{kCore, 1, 4711}, {kAsync, 1, 4712}};
-};
-
-TEST_F(PortAnnouncementTest, AnswersItselfWhenThePortIsFree) {
-    unsigned short freePort = 0;
-    {
-        const PortMapper probe(m_loop, {}, "127.0.0.1", 0);
-        freePort = probe.port();
-    }
-    const PortAnnouncement announcement(m_loop, m_mappings, "127.0.0.1", freePort);
-    EXPECT_EQ(announcement.way(), PortAnnouncement::Way::OwnMapper);
-    EXPECT_EQ(announcement.problem(), "");
-    const RunningLoop running(m_loop);
-    RpcClient client(freePort, PMAPPROG, PMAPVERS);
-    EXPECT_EQ(client.results(PMAPPROC_GETPORT, question(kCore, 1, IPPROTO_TCP)), word(4711));
-}
-
-TEST_F(PortAnnouncementTest, RegistersWithTheOneThatRunsAndTakesItBackAtTheEnd) {
-    Ports registered;
-    whileOtherRuns([&] {
-        const PortAnnouncement announcement(m_loop, m_mappings, "127.0.0.1", mapperPort());
-        EXPECT_EQ(announcement.way(), PortAnnouncement::Way::Registered);
-        EXPECT_EQ(announcement.problem(), "");
-        RpcClient client(mapperPort(), PMAPPROG, PMAPVERS);
-        EXPECT_EQ(client.results(PMAPPROC_GETPORT, question(kCore, 1, IPPROTO_TCP)), word(4711));
-        EXPECT_EQ(client.results(PMAPPROC_GETPORT, question(kAsync, 1, IPPROTO_TCP)), word(4712));
-    });
-    EXPECT_EQ(m_other.ports, Ports{});
-}
-
-TEST_F(PortAnnouncementTest, DoesNotPushOutAnInstrumentThatIsRegisteredAndRuns) {
-    const FileDescriptor otherInstrument = listenTcp("127.0.0.1", 0);
-    const Ports before{{kAsync, localPort(otherInstrument)}};
-    m_other.ports = before;
-    whileOtherRuns([&] {
-        const PortAnnouncement announcement(m_loop, m_mappings, "127.0.0.1", mapperPort());
-        EXPECT_EQ(announcement.way(), PortAnnouncement::Way::None);
-        EXPECT_NE(announcement.problem().find("did not take the registration"), std::string::npos);
-    });
-    EXPECT_EQ(m_other.ports, before) << "nor does half a registration stay behind";
-}
-
-TEST_F(PortAnnouncementTest, ReplacesWhatACrashedProgramLeftBehind) {
-    unsigned short deadPort = 0;
-    {
-        const FileDescriptor crashed = listenTcp("127.0.0.1", 0);
-        deadPort = localPort(crashed);
-    }
-    m_other.ports = {{kCore, deadPort}};
-    whileOtherRuns([&] {
-        const PortAnnouncement announcement(m_loop, m_mappings, "127.0.0.1", mapperPort());
-        EXPECT_EQ(announcement.way(), PortAnnouncement::Way::Registered);
-        RpcClient client(mapperPort(), PMAPPROG, PMAPVERS);
-        EXPECT_EQ(client.results(PMAPPROC_GETPORT, question(kCore, 1, IPPROTO_TCP)), word(4711));
-    });
-}
-
-TEST_F(PortAnnouncementTest, SaysSoWhenTheRunningOneRefuses) {
-    m_other.refuses = true;
-    whileOtherRuns([&] {
-        const PortAnnouncement announcement(m_loop, m_mappings, "127.0.0.1", mapperPort());
-        EXPECT_EQ(announcement.way(), PortAnnouncement::Way::None);
-        EXPECT_NE(announcement.problem(), "");
-    });
-}
-
-TEST_F(PortAnnouncementTest, SaysSoWhenNobodyAnswersAndThePortIsTaken) {
-    const FileDescriptor taken = bindUdp("127.0.0.1", 0);  // the TCP port of the same number is free
-    const PortAnnouncement announcement(m_loop, m_mappings, "127.0.0.1", localPort(taken));
-    EXPECT_EQ(announcement.way(), PortAnnouncement::Way::None);
-    EXPECT_NE(announcement.problem().find("no port mapper runs"), std::string::npos);
 }
 
 }  // namespace

@@ -1,0 +1,44 @@
+#pragma once
+
+#include "simserver/portmapper.h"
+
+#include <chrono>
+#include <condition_variable>
+#include <mutex>
+#include <thread>
+#include <vector>
+
+namespace kdx::simserver {
+
+/// Programs registered with the port mapper that runs on this machine, as long as this object lives: a port mapper that
+/// is started anew has forgotten them, and is told again within seconds.
+class Registration {
+public:
+    /// Takes three seconds at most. @param lookAfterEvery how often the port mapper is asked whether it still knows.
+    Registration(std::vector<PortMapping> mappings, unsigned short mapperPort,
+                 std::chrono::milliseconds lookAfterEvery);
+    Registration(const Registration&) = delete;
+    Registration& operator=(const Registration&) = delete;
+    /// Takes the registration back, unless another program has it by now. Takes two seconds at most.
+    ~Registration();
+
+    [[nodiscard]] bool succeeded() const { return m_succeeded; }
+    /// False: nobody listens at the port mapper's port.
+    [[nodiscard]] bool mapperRuns() const { return m_mapperRuns; }
+
+private:
+    bool registerAll();
+    void keepRegistered();
+
+    std::vector<PortMapping> m_mappings;
+    unsigned short m_mapperPort;
+    std::chrono::milliseconds m_lookAfterEvery;
+    bool m_mapperRuns = false;
+    bool m_succeeded = false;
+    std::mutex m_mutex;
+    std::condition_variable m_ended;
+    bool m_ending = false;
+    std::thread m_keeper;
+};
+
+}  // namespace kdx::simserver
