@@ -1,5 +1,6 @@
 #include "simserver/portmapper.h"
 
+#include "simserver/localnetwork.h"
 #include "vxi11/xdr.h"
 
 #include <netinet/in.h>
@@ -8,12 +9,26 @@
 #include <sys/socket.h>
 
 #include <array>
+#include <cstring>
+#include <system_error>
 #include <utility>
 
 namespace kdx::simserver {
 namespace {
 
 constexpr ConnectionId kNoConnection = 0;
+constexpr unsigned kAnyInterface = 0;
+
+// The number of the interface that the datagram came by; 0 when the system has not said it.
+unsigned interfaceOf(msghdr& datagram) {
+    for (cmsghdr* part = CMSG_FIRSTHDR(&datagram); part != nullptr; part = CMSG_NXTHDR(&datagram, part)) {
+        if (part->cmsg_level != IPPROTO_IP || part->cmsg_type != IP_PKTINFO) continue;
+        in_pktinfo info{};
+        std::memcpy(&info, CMSG_DATA(part), sizeof info);
+        return static_cast<unsigned>(info.ipi_ifindex);
+    }
+    return 0;
+}
 
 }  // namespace
 
@@ -24,11 +39,34 @@ PortMapper::PortMapper(PollLoop& loop, std::vector<PortMapping> mappings, const 
       m_mappings(std::move(mappings)),
       m_tcp(loop, *this, address, port),
       m_udp(bindUdp(address, m_tcp.port())) {
-    m_loop.watch(m_udp.number(), POLLIN, [this](short) { answerDatagram(); });
+    m_loop.watch(m_udp.number(), POLLIN, [this](short) { answerDatagram(m_udp.number(), kAnyInterface); });
+    listenForBroadcasts(address);
 }
 
 PortMapper::~PortMapper() {
     m_loop.forget(m_udp.number());
+    for (const FileDescriptor& socket : m_broadcasts) m_loop.forget(socket.number());
+}
+
+// A socket at one address gets nothing that is sent to a broadcast address, by which clients look for instruments.
+// Where such a socket cannot be had the instrument is found by its address only.
+void PortMapper::listenForBroadcasts(const std::string& address) {
+    const auto network = networkOf(address);
+    if (!network) return;  // at all addresses at once the broadcasts come with the rest
+    const std::array places = {std::pair{network->broadcastAddress, kAnyInterface},
+                               std::pair{std::string("255.255.255.255"), network->interfaceIndex}};
+    for (const auto& [place, onlyInterface] : places) {
+        try {
+            FileDescriptor socket = bindUdpBroadcast(place, port());
+            const int number = socket.number();
+            const int on = 1;
+            if (::setsockopt(number, IPPROTO_IP, IP_PKTINFO, &on, sizeof on) != 0) continue;
+            m_loop.watch(number, POLLIN, [this, number, only = onlyInterface](short) { answerDatagram(number, only); });
+            m_broadcasts.push_back(std::move(socket));
+        } catch (const std::system_error&) {
+            continue;
+        }
+    }
 }
 
 void PortMapper::call(std::uint32_t procedure, std::string_view arguments, ConnectionId, const RpcReply& reply) {
@@ -42,15 +80,25 @@ void PortMapper::call(std::uint32_t procedure, std::string_view arguments, Conne
     reply({toXdr<u_long>(findPort(asked->pm_prog, asked->pm_prot), xdr_u_long)});
 }
 
-void PortMapper::answerDatagram() {
+// Answers come from the address that the instrument has, whatever address was asked.
+void PortMapper::answerDatagram(int socket, unsigned onlyInterface) {
     std::array<char, 8192> bytes;
     sockaddr_in client{};
-    socklen_t length = sizeof client;
-    auto* name = reinterpret_cast<sockaddr*>(&client);
-    const ssize_t count = ::recvfrom(m_udp.number(), bytes.data(), bytes.size(), 0, name, &length);
-    if (count < 0) return;
-    handle({bytes.data(), static_cast<std::size_t>(count)}, kNoConnection,
-           [&](const std::string& answer) { ::sendto(m_udp.number(), answer.data(), answer.size(), 0, name, length); });
+    iovec place{bytes.data(), bytes.size()};
+    alignas(cmsghdr) std::array<char, CMSG_SPACE(sizeof(in_pktinfo))> extra{};
+    msghdr datagram{};
+    datagram.msg_name = &client;
+    datagram.msg_namelen = sizeof client;
+    datagram.msg_iov = &place;
+    datagram.msg_iovlen = 1;
+    datagram.msg_control = extra.data();
+    datagram.msg_controllen = extra.size();
+    const ssize_t count = ::recvmsg(socket, &datagram, 0);
+    if (count < 0 || (onlyInterface != kAnyInterface && interfaceOf(datagram) != onlyInterface)) return;
+    handle({bytes.data(), static_cast<std::size_t>(count)}, kNoConnection, [&](const std::string& answer) {
+        ::sendto(m_udp.number(), answer.data(), answer.size(), 0, reinterpret_cast<const sockaddr*>(&client),
+                 sizeof client);
+    });
 }
 
 // The version is not compared: whoever asks for another one learns from the program itself which it has.

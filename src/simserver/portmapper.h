@@ -20,8 +20,9 @@ struct PortMapping {
     unsigned short port = 0;
 };
 
-/// A port mapper (version 2 of the protocol) over TCP and UDP that knows the given programs and itself. Others cannot
-/// register with it: its SET and UNSET answer "no". Versions 3 and 4 are refused, on which clients go back to 2.
+/// A port mapper (version 2 of the protocol) over TCP and UDP that knows the given programs and itself; it also answers
+/// what is asked of everybody in its address's network. Others cannot register with it: its SET and UNSET answer "no".
+/// Versions 3 and 4 are refused, on which clients go back to 2.
 class PortMapper final : public RpcProgram {
 public:
     /// Listens at once, answers while the loop runs. Throws std::system_error when it cannot have both ports.
@@ -36,7 +37,8 @@ protected:
     void call(std::uint32_t procedure, std::string_view arguments, ConnectionId from, const RpcReply& reply) override;
 
 private:
-    void answerDatagram();
+    void listenForBroadcasts(const std::string& address);
+    void answerDatagram(int socket, unsigned onlyInterface);
     [[nodiscard]] unsigned long findPort(unsigned long program, unsigned long protocol) const;
     [[nodiscard]] std::string dump() const;
 
@@ -44,6 +46,7 @@ private:
     std::vector<PortMapping> m_mappings;
     RpcTcpServer m_tcp;
     FileDescriptor m_udp;
+    std::vector<FileDescriptor> m_broadcasts;
 };
 
 }  // namespace kdx::simserver

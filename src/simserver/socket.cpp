@@ -14,7 +14,7 @@ namespace {
     throw std::system_error(errno, std::generic_category(), what);
 }
 
-FileDescriptor bound(int type, const std::string& address, unsigned short port) {
+FileDescriptor bound(int type, const std::string& address, unsigned short port, bool reuse) {
     const std::string place = address + ":" + std::to_string(port);
     sockaddr_in name{};
     name.sin_family = AF_INET;
@@ -26,9 +26,7 @@ FileDescriptor bound(int type, const std::string& address, unsigned short port) 
     FileDescriptor result(::socket(AF_INET, type | SOCK_NONBLOCK | SOCK_CLOEXEC, 0));
     if (!result.isOpen()) fail(place);
     const int on = 1;
-    // TCP only: there it lets a restart take the port over from dying connections, with UDP two programs could share
-    // it.
-    if (type == SOCK_STREAM && setsockopt(result.number(), SOL_SOCKET, SO_REUSEADDR, &on, sizeof on) != 0) fail(place);
+    if (reuse && setsockopt(result.number(), SOL_SOCKET, SO_REUSEADDR, &on, sizeof on) != 0) fail(place);
     if (::bind(result.number(), reinterpret_cast<const sockaddr*>(&name), sizeof name) != 0) fail(place);
     return result;
 }
@@ -36,13 +34,18 @@ FileDescriptor bound(int type, const std::string& address, unsigned short port) 
 }  // namespace
 
 FileDescriptor listenTcp(const std::string& address, unsigned short port) {
-    FileDescriptor result = bound(SOCK_STREAM, address, port);
+    // With TCP, reuse lets a restart take the port over from dying connections; with UDP two programs would share it.
+    FileDescriptor result = bound(SOCK_STREAM, address, port, true);
     if (::listen(result.number(), SOMAXCONN) != 0) fail(address + ":" + std::to_string(port));
     return result;
 }
 
 FileDescriptor bindUdp(const std::string& address, unsigned short port) {
-    return bound(SOCK_DGRAM, address, port);
+    return bound(SOCK_DGRAM, address, port, false);
+}
+
+FileDescriptor bindUdpBroadcast(const std::string& address, unsigned short port) {
+    return bound(SOCK_DGRAM, address, port, true);
 }
 
 unsigned short localPort(const FileDescriptor& socket) {

@@ -13,6 +13,10 @@ FileDescriptor listenTcp(const std::string& address, unsigned short port);
 /// Opens a UDP socket that never blocks; arguments and errors as listenTcp().
 FileDescriptor bindUdp(const std::string& address, unsigned short port);
 
+/// Opens a UDP socket that gets what is sent to a broadcast address, beside other programs that want it too.
+/// Otherwise as bindUdp().
+FileDescriptor bindUdpBroadcast(const std::string& address, unsigned short port);
+
 /// The port that a bound socket has. Throws std::system_error.
 unsigned short localPort(const FileDescriptor& socket);
 

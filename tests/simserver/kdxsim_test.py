@@ -220,6 +220,16 @@ class Run(unittest.TestCase):
             self.assertEqual(sim.end(), 0)
             self.assertEqual(mapper.ports, {})
 
+    def testItIsFoundByAskingEverybody(self):
+        with KdxSim(PROGRAM) as sim, socket.socket(socket.AF_INET, socket.SOCK_DGRAM) as client:
+            client.setsockopt(socket.SOL_SOCKET, socket.SO_BROADCAST, 1)
+            client.settimeout(5)
+            question = (7, 0, 2, 100000, 2, 3, 0, 0, 0, 0, 0x0607AF, 1, 6, 0)
+            client.sendto(struct.pack(">14I", *question), ("127.255.255.255", 111))
+            answer, address = client.recvfrom(100)
+            self.assertEqual(struct.unpack(">7I", answer), (7, 1, 0, 0, 0, 0, sim.port))
+            self.assertEqual(address, ("127.0.0.1", 111))
+
     def testAPortMapperThatHangsUpDoesNoHarm(self):
         with socket.create_server(("127.0.0.1", 111)) as other:
             threading.Thread(target=hangUpOnEverybody, args=(other,), daemon=True).start()

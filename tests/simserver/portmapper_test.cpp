@@ -1,10 +1,15 @@
 #include "simserver/portmappertest.h"
 
+#include "simserver/localnetwork.h"
+
 #include <arpa/inet.h>
+#include <ifaddrs.h>
+#include <net/if.h>
 #include <poll.h>
 #include <sys/socket.h>
 
 #include <array>
+#include <optional>
 
 namespace kdx::simserver {
 namespace {
@@ -84,6 +89,79 @@ TEST_F(PortMapperTest, AnswersOverUdpToo) {
     ::send(socket.number(), "nonsense", 8, 0);  // gets no answer and does no harm
     EXPECT_EQ(ask(writer.callMessage(PMAPPROC_GETPORT, question(kCore, 1, IPPROTO_TCP))).rest, word(4711));
     EXPECT_EQ(ask(newWriter.callMessage(3, {})).status, static_cast<std::uint32_t>(PROG_MISMATCH));
+}
+
+/// Asks by UDP whoever is at the place for the port of the core channel.
+std::optional<Reply> askAt(const std::string& place, unsigned short port, int timeoutMs) {
+    sockaddr_in name{};
+    name.sin_family = AF_INET;
+    name.sin_port = htons(port);
+    ::inet_pton(AF_INET, place.c_str(), &name.sin_addr);
+    const FileDescriptor socket(::socket(AF_INET, SOCK_DGRAM | SOCK_CLOEXEC, 0));
+    const int on = 1;
+    ::setsockopt(socket.number(), SOL_SOCKET, SO_BROADCAST, &on, sizeof on);
+    std::string call;
+    for (const std::uint32_t value : {7U, 0U, 2U, 100000U, 2U, 3U, 0U, 0U, 0U, 0U}) call += word(value);
+    call += question(kCore, 1, IPPROTO_TCP);
+    ::sendto(socket.number(), call.data(), call.size(), 0, reinterpret_cast<const sockaddr*>(&name), sizeof name);
+    std::array<char, 1000> bytes;
+    pollfd waited{socket.number(), POLLIN, 0};
+    if (::poll(&waited, 1, timeoutMs) != 1) return std::nullopt;
+    const ssize_t count = ::recv(socket.number(), bytes.data(), bytes.size(), MSG_DONTWAIT);
+    return parseReply({bytes.data(), static_cast<std::size_t>(std::max<ssize_t>(count, 0))});
+}
+
+TEST_F(PortMapperTest, AnswersWhatIsAskedOfEverybodyInItsNetwork) {
+    const auto reply = askAt("127.255.255.255", m_mapper.port(), 5000);
+    ASSERT_TRUE(reply);
+    EXPECT_EQ(reply->rest, word(4711));
+}
+
+TEST(PortMapper, TwoInOneNetworkBothAnswer) {
+    PollLoop loop;
+    const PortMapper one(loop, {{kCore, 1, 4711}}, "127.0.0.1", 0);
+    const PortMapper two(loop, {{kCore, 1, 4712}}, "127.0.0.2", one.port());
+    const RunningLoop running(loop);
+    EXPECT_TRUE(askAt("127.255.255.255", one.port(), 5000));
+    EXPECT_EQ(askAt("127.0.0.2", one.port(), 5000).value_or(Reply{}).rest, word(4712));
+}
+
+/// An address of this machine in a network with others; empty when it has none.
+std::string addressInANetwork() {
+    ifaddrs* first = nullptr;
+    if (::getifaddrs(&first) != 0) return {};
+    const std::unique_ptr<ifaddrs, decltype(&freeifaddrs)> list(first, &freeifaddrs);
+    for (const ifaddrs* entry = first; entry != nullptr; entry = entry->ifa_next) {
+        constexpr unsigned kWanted = IFF_UP | IFF_BROADCAST;
+        const bool fits = (entry->ifa_flags & kWanted) == kWanted && (entry->ifa_flags & IFF_LOOPBACK) == 0;
+        if (!fits || entry->ifa_addr == nullptr || entry->ifa_addr->sa_family != AF_INET) continue;
+        std::array<char, INET_ADDRSTRLEN> text{};
+        const auto* const name = reinterpret_cast<const sockaddr_in*>(entry->ifa_addr);
+        return ::inet_ntop(AF_INET, &name->sin_addr, text.data(), text.size());
+    }
+    return {};
+}
+
+TEST(PortMapper, AnswersWhatIsAskedOfEverybodyByItsInterfaceOnly) {
+    const std::string address = addressInANetwork();
+    if (address.empty()) GTEST_SKIP() << "this machine is in no network";
+    PollLoop loop;
+    const PortMapper there(loop, {{kCore, 1, 4711}}, address, 0);
+    const PortMapper here(loop, {{kCore, 1, 4712}}, "127.0.0.1", 0);
+    const RunningLoop running(loop);
+    for (const std::string& place :
+         {std::string("255.255.255.255"), networkOf(address).value_or(LocalNetwork{}).broadcastAddress}) {
+        EXPECT_EQ(askAt(place, there.port(), 5000).value_or(Reply{}).rest, word(4711)) << place;
+        EXPECT_FALSE(askAt(place, here.port(), 50)) << "nobody beyond this machine learns of it: " << place;
+    }
+}
+
+TEST(LocalNetwork, IsThatOfTheAddress) {
+    EXPECT_EQ(networkOf("127.0.0.1").value_or(LocalNetwork{}).broadcastAddress, "127.255.255.255");
+    EXPECT_EQ(networkOf("127.1.2.3").value_or(LocalNetwork{}).interfaceIndex, ::if_nametoindex("lo"));
+    EXPECT_FALSE(networkOf("0.0.0.0"));
+    EXPECT_FALSE(networkOf("198.51.100.1")) << "no address of this machine";
+    EXPECT_FALSE(networkOf("nonsense"));
 }
 
 }  // namespace
