@@ -110,7 +110,7 @@ RpcOutcome RpcChannel::receiveReply(Deadline deadline) {
             m_reply = std::move(*message);
             return RpcOutcome::Done;
         }
-        if (m_received.tooLong()) return close(RpcOutcome::Failed);
+        if (m_received.broken()) return close(RpcOutcome::Failed);
         if (!waitFor(m_socket.number(), POLLIN, deadline)) return RpcOutcome::TimedOut;
         const ssize_t got = recv(m_socket.number(), piece.data(), piece.size(), 0);
         if (got > 0) {

@@ -92,7 +92,7 @@ void RpcTcpServer::readCalls(ConnectionId id, Connection& connection) {
             return;
         }
     }
-    if (connection.reader.tooLong()) endInput(id, connection);
+    if (connection.reader.broken()) endInput(id, connection);
 }
 
 // What has been answered still goes out; what the program keeps for the client is given up.

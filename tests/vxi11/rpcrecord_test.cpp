@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include <chrono>
 #include <string>
 
 namespace kdx {
@@ -29,9 +30,43 @@ TEST(RpcRecord, RecordsComeOutInOrderHoweverTheBytesWereCut) {
 
 TEST(RpcRecord, FragmentsOfARecordArePutTogether) {
     RecordReader reader(100);
-    reader.feed("\x00\x00\x00\x03"s + "abc" + "\x00\x00\x00\x00"s + framed("de"));
+    reader.feed("\x00\x00\x00\x03"s + "abc" + framed("de"));
     EXPECT_EQ(reader.next(), "abcde");
-    EXPECT_FALSE(reader.tooLong());
+    EXPECT_FALSE(reader.broken());
+}
+
+TEST(RpcRecord, AnEmptyFragmentIsTheLastOneOrNone) {
+    RecordReader reader(100);
+    reader.feed("\x00\x00\x00\x03"s + "abc" + framed(""));
+    EXPECT_EQ(reader.next(), "abc");
+    reader.feed("\x00\x00\x00\x03"s + "abc" + "\x00\x00\x00\x00"s + framed("de"));
+    EXPECT_EQ(reader.next(), std::nullopt);
+    EXPECT_TRUE(reader.broken());
+}
+
+TEST(RpcRecord, HasBegunWithItsFirstByteUntilItIsComplete) {
+    RecordReader reader(100);
+    EXPECT_FALSE(reader.hasBegun());
+    const std::string bytes = "\x00\x00\x00\x01"s + "a" + framed("b");
+    for (const char byte : bytes) {
+        EXPECT_EQ(reader.next(), std::nullopt);
+        reader.feed({&byte, 1});
+        EXPECT_TRUE(reader.hasBegun());
+    }
+    EXPECT_EQ(reader.next(), "ab");
+    EXPECT_FALSE(reader.hasBegun());
+}
+
+TEST(RpcRecord, ManySmallFragmentsCostNoMoreThanTheirBytes) {
+    constexpr int kFragments = 200000;
+    std::string bytes;
+    for (int i = 0; i < kFragments; ++i) bytes += "\x00\x00\x00\x01x"s;
+    RecordReader reader(2 * kFragments);
+    const auto start = std::chrono::steady_clock::now();
+    reader.feed(bytes + framed(""));
+    EXPECT_EQ(reader.next().value_or("").size(), static_cast<std::size_t>(kFragments));
+    EXPECT_LT(std::chrono::steady_clock::now() - start, std::chrono::seconds(1))
+        << "the rest must not be moved each time";
 }
 
 TEST(RpcRecord, ALongerRecordIsRefusedAsSoonAsItIsAnnounced) {
@@ -40,14 +75,14 @@ TEST(RpcRecord, ALongerRecordIsRefusedAsSoonAsItIsAnnounced) {
     EXPECT_EQ(reader.next(), "12345");
     reader.feed("\x80\x00\x00\x06"s);
     EXPECT_EQ(reader.next(), std::nullopt);
-    EXPECT_TRUE(reader.tooLong());
+    EXPECT_TRUE(reader.broken());
 }
 
 TEST(RpcRecord, FragmentsCountTogetherForTheLimit) {
     RecordReader reader(5);
     reader.feed("\x00\x00\x00\x03"s + "abc" + "\x7f\xff\xff\xff"s);
     EXPECT_EQ(reader.next(), std::nullopt);
-    EXPECT_TRUE(reader.tooLong());
+    EXPECT_TRUE(reader.broken());
 }
 
 }  // namespace
