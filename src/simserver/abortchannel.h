@@ -11,6 +11,9 @@ class AbortChannel final : public RpcProgram {
 public:
     explicit AbortChannel(CoreChannel& core);
 
+    /// A client that has a link may want to abort a call on it at any time.
+    [[nodiscard]] bool mayBeSilent(ConnectionId connection) const override;
+
 protected:
     void call(std::uint32_t procedure, std::string_view arguments, ConnectionId from, const RpcReply& reply) override;
 

@@ -12,6 +12,7 @@
 
 #include <algorithm>
 #include <array>
+#include <limits>
 #include <utility>
 
 namespace kdx::simserver {
@@ -49,7 +50,8 @@ CoreChannel::CoreChannel(PollLoop& loop, sim::MessageDevice& device, Vxi11Option
     : RpcProgram(DEVICE_CORE, DEVICE_CORE_VERSION),
       m_device(device),
       m_options(std::move(options)),
-      m_calls(loop, [this](const WaitingCall& call) { return obstacle(call); }) {}
+      m_calls(
+          loop, [this](const WaitingCall& call) { return obstacle(call); }, m_options.longestWait) {}
 
 void CoreChannel::call(std::uint32_t procedure, std::string_view arguments, ConnectionId from, const RpcReply& reply) {
     const auto generically = [&](const char* name, std::function<ErrorCode(Link&)> action) {
@@ -136,12 +138,12 @@ void CoreChannel::createLink(const Create_LinkParms& parms, const std::string& n
     if (!isDeviceName(name)) return fail(vxi11::kDeviceNotAccessible);
     const bool withLock = parms.lockDevice != 0;
     const auto create = [this, from, reply, fail, name, withLock] {
-        if (m_links.size() >= m_options.maxLinks) {
+        if (!isRoomFor(from)) {
             fail(vxi11::kOutOfResources);
             return true;
         }
-        const LinkId id = ++m_lastLink;
-        m_links[id].owner = from;
+        const LinkId id = freeId();
+        m_links[id] = {.owner = from, .number = ++m_lastNumber, .input = {}, .output = {}};
         if (withLock) m_lockHolder = id;
         trace(id, withLock ? "opened with lock: " : "opened: ", name);
         reply(createLinkAnswer({vxi11::kNoError, id, m_abortPort, m_options.maxRecvSize}));
@@ -330,6 +332,29 @@ void CoreChannel::connectionClosed(ConnectionId connection) {
     m_calls.retry();
 }
 
+bool CoreChannel::mayBeSilent(ConnectionId connection) const {
+    const bool hasLink = std::any_of(m_links.begin(), m_links.end(),
+                                     [connection](const auto& entry) { return entry.second.owner == connection; });
+    return hasLink || m_calls.anyOf(connection);
+}
+
+std::size_t CoreChannel::linksOf(std::uint32_t peer) const {
+    return static_cast<std::size_t>(std::count_if(
+        m_links.begin(), m_links.end(), [peer](const auto& entry) { return peerOf(entry.second.owner) == peer; }));
+}
+
+bool CoreChannel::isRoomFor(ConnectionId connection) const {
+    return m_links.size() < m_options.maxLinks && linksOf(peerOf(connection)) < m_options.maxLinksOfOnePeer;
+}
+
+// Nobody can guess another one's, which is all that a call needs to be aborted.
+LinkId CoreChannel::freeId() {
+    std::uniform_int_distribution<LinkId> any(1, std::numeric_limits<std::int32_t>::max());
+    LinkId id = any(m_random);
+    while (m_links.contains(id)) id = any(m_random);
+    return id;
+}
+
 void CoreChannel::clear(Link& link) {
     link.input.clear();
     link.output.clear();
@@ -337,9 +362,9 @@ void CoreChannel::clear(Link& link) {
 }
 
 void CoreChannel::removeLink(LinkId id) {
-    m_links.erase(id);
     if (m_lockHolder == id) m_lockHolder.reset();
     trace(id, "closed");
+    m_links.erase(id);
 }
 
 // A link belongs to the connection it was made on; to others it does not exist.
@@ -355,7 +380,7 @@ ErrorCode CoreChannel::obstacle(const WaitingCall& call) {
 
 void CoreChannel::trace(LinkId link, std::string_view what, std::string_view text) const {
     if (!m_options.trace) return;
-    m_options.trace("link " + std::to_string(link) + " " + std::string(what) + printable(text));
+    m_options.trace("link " + std::to_string(m_links.at(link).number) + " " + std::string(what) + printable(text));
 }
 
 }  // namespace kdx::simserver

@@ -6,10 +6,12 @@
 #include "simserver/waitingcalls.h"
 
 #include <cstddef>
+#include <cstdint>
 #include <deque>
 #include <functional>
 #include <map>
 #include <optional>
+#include <random>
 #include <string>
 #include <string_view>
 
@@ -33,6 +35,9 @@ public:
     ErrorCode abort(LinkId link);
 
     void connectionClosed(ConnectionId connection) override;
+    [[nodiscard]] bool mayBeSilent(ConnectionId connection) const override;
+    /// How many links clients at that address have.
+    [[nodiscard]] std::size_t linksOf(std::uint32_t peer) const;
 
 protected:
     void call(std::uint32_t procedure, std::string_view arguments, ConnectionId from, const RpcReply& reply) override;
@@ -40,6 +45,7 @@ protected:
 private:
     struct Link {
         ConnectionId owner = 0;
+        unsigned long number = 0;  ///< for the trace: links count from 1
         MessageBuffer input;
         std::deque<std::string> output;  ///< response messages not read yet, the first perhaps in part
     };
@@ -55,6 +61,8 @@ private:
     ErrorCode unlock(LinkId id, ConnectionId from);
     ErrorCode destroyLink(LinkId id, ConnectionId from);
 
+    [[nodiscard]] bool isRoomFor(ConnectionId connection) const;
+    LinkId freeId();
     void clear(Link& link);
     void removeLink(LinkId id);
     Link* find(LinkId id, ConnectionId from);
@@ -65,7 +73,8 @@ private:
     Vxi11Options m_options;
     unsigned short m_abortPort = 0;
     std::map<LinkId, Link> m_links;
-    LinkId m_lastLink = 0;
+    unsigned long m_lastNumber = 0;
+    std::random_device m_random;
     std::optional<LinkId> m_lockHolder;
     WaitingCalls m_calls;
 };

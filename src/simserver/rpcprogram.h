@@ -9,8 +9,13 @@
 
 namespace kdx::simserver {
 
-/// Numbers the connections that calls come by.
+/// Names the connection that a call comes by. Its upper half is the client's IPv4 address.
 using ConnectionId = std::uint64_t;
+
+/// The address that the connection comes from: all that have it count as one peer.
+constexpr std::uint32_t peerOf(ConnectionId connection) {
+    return static_cast<std::uint32_t>(connection >> 32U);
+}
 
 /// What a procedure answers: its results in XDR, or why there are none.
 struct RpcAnswer {
@@ -37,6 +42,9 @@ public:
 
     /// The connection is gone: no reply reaches it any more.
     virtual void connectionClosed(ConnectionId) {}
+
+    /// Whether the client may keep its connection without a word: because something is kept for it here.
+    [[nodiscard]] virtual bool mayBeSilent(ConnectionId) const { return false; }
 
 protected:
     /// Carries out a procedure other than 0, which is the same for all programs.

@@ -5,16 +5,23 @@
 #include <poll.h>
 #include <sys/socket.h>
 
+#include <algorithm>
 #include <array>
 #include <cerrno>
 #include <new>
 #include <utility>
+#include <vector>
 
 namespace kdx::simserver {
 namespace {
 
+using std::chrono::steady_clock;
+
 // A client that does not fetch its replies gets no further calls served once this much is waiting for it.
 constexpr std::size_t kMostUnsent = std::size_t{1024} * 1024;
+
+// For so long nobody is accepted when the system has no descriptor left for him.
+constexpr std::chrono::seconds kRest{1};
 
 void setOption(int socket, int level, int option, int value) {
     setsockopt(socket, level, option, &value, sizeof value);
@@ -32,24 +39,65 @@ void setUp(int socket) {
 
 }  // namespace
 
-RpcTcpServer::RpcTcpServer(PollLoop& loop, RpcProgram& program, const std::string& address, unsigned short port)
-    : m_loop(loop), m_program(program), m_listener(listenTcp(address, port)) {
-    m_loop.watch(m_listener.number(), POLLIN, [this](short) { acceptClients(); });
+RpcTcpServer::RpcTcpServer(PollLoop& loop, RpcProgram& program, const std::string& address, unsigned short port,
+                           std::chrono::milliseconds patience)
+    : m_loop(loop), m_program(program), m_listener(listenTcp(address, port)), m_patience(patience) {
+    m_loop.watch(m_listener.number(), POLLIN, [this](short) { acceptClient(); });
+    closeStuck();
 }
 
 RpcTcpServer::~RpcTcpServer() {
+    m_loop.cancel(m_nextLook);
+    m_loop.cancel(m_rest);
     m_loop.forget(m_listener.number());
     for (const auto& [id, connection] : m_connections) m_loop.forget(connection.socket.number());
 }
 
-void RpcTcpServer::acceptClients() {
-    FileDescriptor socket(::accept4(m_listener.number(), nullptr, nullptr, SOCK_NONBLOCK | SOCK_CLOEXEC));
-    if (!socket.isOpen()) return;  // the client has given up meanwhile
+void RpcTcpServer::acceptClient() {
+    sockaddr_in name{};
+    socklen_t length = sizeof name;
+    FileDescriptor socket(
+        ::accept4(m_listener.number(), reinterpret_cast<sockaddr*>(&name), &length, SOCK_NONBLOCK | SOCK_CLOEXEC));
+    if (!socket.isOpen()) {
+        // Otherwise the client has given up meanwhile.
+        if (errno == EMFILE || errno == ENFILE || errno == ENOBUFS || errno == ENOMEM) restFromAccepting();
+        return;
+    }
+    const std::uint32_t peer = ntohl(name.sin_addr.s_addr);
+    if (connectionsOf(peer) >= kMostOfOnePeer) return;
     setUp(socket.number());
-    const ConnectionId id = ++m_lastId;
-    m_loop.watch(socket.number(), POLLIN, [this, id](short events) { serve(id, events); });
-    m_connections[id].socket = std::move(socket);
+    const ConnectionId id = ConnectionId{peer} << 32U | ++m_lastSerial;
+    Connection& connection = m_connections[id];
+    connection.socket = std::move(socket);
+    connection.movedOn = steady_clock::now();
+    m_loop.watch(connection.socket.number(), POLLIN, [this, id](short events) { serve(id, events); });
     if (m_connections.size() >= kMostConnections) m_loop.setEvents(m_listener.number(), 0);
+}
+
+// The client stays in the queue, and the listener would be ready at once again, ever after.
+void RpcTcpServer::restFromAccepting() {
+    m_loop.setEvents(m_listener.number(), 0);
+    m_loop.cancel(m_rest);
+    m_rest = m_loop.callAt(steady_clock::now() + kRest, [this] {
+        if (m_connections.size() < kMostConnections) m_loop.setEvents(m_listener.number(), POLLIN);
+    });
+}
+
+std::size_t RpcTcpServer::connectionsOf(std::uint32_t peer) const {
+    return static_cast<std::size_t>(std::count_if(m_connections.begin(), m_connections.end(),
+                                                  [peer](const auto& entry) { return peerOf(entry.first) == peer; }));
+}
+
+// Looks often enough that none stays much longer than it may.
+void RpcTcpServer::closeStuck() {
+    const auto now = steady_clock::now();
+    std::vector<ConnectionId> stuck;
+    for (const auto& [id, connection] : m_connections) {
+        const bool underWay = connection.reader.hasBegun() || !connection.unsent.empty();
+        if (now - connection.movedOn > m_patience && (underWay || !m_program.mayBeSilent(id))) stuck.push_back(id);
+    }
+    for (const ConnectionId id : stuck) close(id);
+    m_nextLook = m_loop.callAt(now + m_patience / 4, [this] { closeStuck(); });
 }
 
 void RpcTcpServer::serve(ConnectionId id, short events) {
@@ -83,8 +131,10 @@ void RpcTcpServer::readCalls(ConnectionId id, Connection& connection) {
         endInput(id, connection);
         return;
     }
+    if (!connection.reader.hasBegun()) connection.movedOn = steady_clock::now();
     connection.reader.feed({bytes.data(), static_cast<std::size_t>(count)});
     while (const auto record = connection.reader.next()) {
+        connection.movedOn = steady_clock::now();
         const bool isCall =
             m_program.handle(*record, id, [this, id](const std::string& reply) { sendRecord(id, reply); });
         if (!isCall) {
@@ -123,6 +173,7 @@ bool RpcTcpServer::sendUnsent(Connection& connection) {
             ::send(connection.socket.number(), connection.unsent.data(), connection.unsent.size(), MSG_NOSIGNAL);
         if (count < 0) return errno == EAGAIN || errno == EWOULDBLOCK || errno == EINTR;
         connection.unsent.erase(0, static_cast<std::size_t>(count));
+        connection.movedOn = steady_clock::now();
     }
     return true;
 }

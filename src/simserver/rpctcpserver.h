@@ -5,7 +5,9 @@
 #include "simserver/socket.h"
 #include "vxi11/rpcrecord.h"
 
+#include <chrono>
 #include <cstddef>
+#include <cstdint>
 #include <map>
 #include <string>
 
@@ -19,10 +21,16 @@ public:
     static constexpr std::size_t kLongestRecord = std::size_t{1024} * 1024;
     /// More clients than this wait until one has gone.
     static constexpr std::size_t kMostConnections = 128;
+    /// Of one address no more are taken, so that others find room.
+    static constexpr std::size_t kMostOfOnePeer = 96;
+    /// A connection that nothing moves on for so long is closed: a call is not sent to its end, a reply not fetched, or
+    /// none comes and the program keeps nothing for the client.
+    static constexpr std::chrono::milliseconds kPatience{60000};
 
     /// Listens at once; calls are served while the loop runs. Loop and program must outlive this.
     /// @param address IPv4 address in dotted form; port 0 takes any free one. Throws std::system_error.
-    RpcTcpServer(PollLoop& loop, RpcProgram& program, const std::string& address, unsigned short port);
+    RpcTcpServer(PollLoop& loop, RpcProgram& program, const std::string& address, unsigned short port,
+                 std::chrono::milliseconds patience = kPatience);
     RpcTcpServer(const RpcTcpServer&) = delete;
     RpcTcpServer& operator=(const RpcTcpServer&) = delete;
     ~RpcTcpServer();
@@ -35,8 +43,12 @@ private:
         RecordReader reader{kLongestRecord};
         std::string unsent;
         bool inputEnded = false;
+        PollLoop::TimePoint movedOn;
     };
-    void acceptClients();
+    void acceptClient();
+    void restFromAccepting();
+    [[nodiscard]] std::size_t connectionsOf(std::uint32_t peer) const;
+    void closeStuck();
     void serve(ConnectionId id, short events);
     void serveEvents(ConnectionId id, short events);
     void readCalls(ConnectionId id, Connection& connection);
@@ -50,7 +62,10 @@ private:
     RpcProgram& m_program;
     FileDescriptor m_listener;
     std::map<ConnectionId, Connection> m_connections;
-    ConnectionId m_lastId = 0;
+    std::uint32_t m_lastSerial = 0;
+    std::chrono::milliseconds m_patience;
+    PollLoop::TimerId m_nextLook;
+    PollLoop::TimerId m_rest;
 };
 
 }  // namespace kdx::simserver

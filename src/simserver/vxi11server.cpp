@@ -10,8 +10,8 @@ struct Vxi11Server::Parts {
     Parts(sim::MessageDevice& device, const Vxi11Options& options)
         : core(loop, device, options),
           abort(core),
-          abortServer(loop, abort, options.bindAddress, 0),
-          coreServer(loop, core, options.bindAddress, options.port) {
+          abortServer(loop, abort, options.bindAddress, 0, options.patience),
+          coreServer(loop, core, options.bindAddress, options.port, options.patience) {
         core.setAbortPort(abortServer.port());
     }
 

@@ -3,6 +3,7 @@
 #include "sim/messagedevice.h"
 #include "simserver/pollloop.h"
 
+#include <chrono>
 #include <cstddef>
 #include <functional>
 #include <memory>
@@ -19,6 +20,11 @@ struct Vxi11Options {
     /// flag on messages of more than 1024 bytes unless they have to send them in such pieces.
     std::size_t maxRecvSize = 1024;
     std::size_t maxLinks = 64;
+    std::size_t maxLinksOfOnePeer = 48;  ///< of all links that one address may have, so that others find room
+    /// Longest wait for a lock or an answer, whatever a call asks for.
+    std::chrono::milliseconds longestWait = std::chrono::minutes(10);
+    /// A client that keeps silent for so long without a link, or in the middle of a call, is cut off.
+    std::chrono::milliseconds patience = std::chrono::minutes(1);
     std::function<void(std::string_view)> trace = {};  ///< gets a line for each thing that happens on a link
 };
 

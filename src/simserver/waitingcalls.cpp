@@ -2,6 +2,7 @@
 
 #include "vxi11/numbers.h"
 
+#include <algorithm>
 #include <new>
 #include <utility>
 
@@ -9,12 +10,13 @@ namespace kdx::simserver {
 namespace {
 
 constexpr std::size_t kMostWaiting = 256;
+constexpr std::ptrdiff_t kMostWaitingOfOnePeer = 128;
 
 }  // namespace
 
 void WaitingCalls::start(WaitingCall call) {
     if (advance(call)) return;
-    if (m_calls.size() >= kMostWaiting) return call.fail(vxi11::kOutOfResources);
+    if (!isRoomFor(call.connection)) return call.fail(vxi11::kOutOfResources);
     m_calls.push_back(std::move(call));
     park(std::prev(m_calls.end()));
 }
@@ -57,6 +59,18 @@ void WaitingCalls::forget(ConnectionId connection) {
     }
 }
 
+bool WaitingCalls::anyOf(ConnectionId connection) const {
+    return std::any_of(m_calls.begin(), m_calls.end(),
+                       [connection](const WaitingCall& call) { return call.connection == connection; });
+}
+
+bool WaitingCalls::isRoomFor(ConnectionId connection) const {
+    const auto ofThePeer = std::count_if(m_calls.begin(), m_calls.end(), [connection](const WaitingCall& call) {
+        return peerOf(call.connection) == peerOf(connection);
+    });
+    return m_calls.size() < kMostWaiting && ofThePeer < kMostWaitingOfOnePeer;
+}
+
 // True: it is done and answered. False: it waits, for the lock until lockPassed, then for data.
 bool WaitingCalls::advance(WaitingCall& call) {
     const ErrorCode obstacle = m_gate(call);
@@ -85,7 +99,7 @@ bool WaitingCalls::advanceOrFail(WaitingCall& call) {
 
 void WaitingCalls::park(Calls::iterator call) {
     const bool forLock = !call->lockPassed;
-    const auto timeout = forLock ? call->lockTimeout : call->ioTimeout;
+    const auto timeout = std::min(forLock ? call->lockTimeout : call->ioTimeout, m_longest);
     call->timer = m_loop.callAt(std::chrono::steady_clock::now() + timeout, [this, call, forLock] {
         call->fail(forLock ? vxi11::kLockedByAnotherLink : vxi11::kIoTimeout);
         m_calls.erase(call);

@@ -33,8 +33,11 @@ public:
     /// Says what stands in a call's way: 4 when its link is gone, 11 when another link has the lock, else 0.
     using Gate = std::function<ErrorCode(const WaitingCall&)>;
 
-    WaitingCalls(PollLoop& loop, Gate gate) : m_loop(loop), m_gate(std::move(gate)) {}
+    /// @param longest no call waits longer for the lock, and then for data, whatever its time-outs are.
+    WaitingCalls(PollLoop& loop, Gate gate, std::chrono::milliseconds longest)
+        : m_loop(loop), m_gate(std::move(gate)), m_longest(longest) {}
 
+    /// Carries the call out or lets it wait; it fails with error 9 when too many wait, or too many of one address.
     void start(WaitingCall call);
     /// Lets those go on that can by now; to be called whenever links, lock or answers may have changed.
     void retry();
@@ -42,6 +45,7 @@ public:
     void abort(LinkId link);
     /// Forgets the calls of a connection, to which nothing can be replied any more.
     void forget(ConnectionId connection);
+    [[nodiscard]] bool anyOf(ConnectionId connection) const;
 
 private:
     using Calls = std::list<WaitingCall>;
@@ -49,9 +53,11 @@ private:
     bool advance(WaitingCall& call);
     bool advanceOrFail(WaitingCall& call);
     void park(Calls::iterator call);
+    [[nodiscard]] bool isRoomFor(ConnectionId connection) const;
 
     PollLoop& m_loop;
     Gate m_gate;
+    std::chrono::milliseconds m_longest;
     Calls m_calls;
 };
 

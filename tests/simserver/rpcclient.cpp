@@ -29,12 +29,16 @@ bool readable(int socket, int timeoutMs) {
 
 }  // namespace
 
-int connectTo(unsigned short port) {
+int connectTo(unsigned short port, const char* from) {
     sockaddr_in name{};
     name.sin_family = AF_INET;
     name.sin_port = htons(port);
     name.sin_addr.s_addr = htonl(INADDR_LOOPBACK);
     const int socket = ::socket(AF_INET, SOCK_STREAM | SOCK_CLOEXEC, 0);
+    sockaddr_in own{};
+    own.sin_family = AF_INET;
+    ::inet_pton(AF_INET, from, &own.sin_addr);
+    EXPECT_EQ(::bind(socket, reinterpret_cast<const sockaddr*>(&own), sizeof own), 0) << from;
     EXPECT_EQ(::connect(socket, reinterpret_cast<const sockaddr*>(&name), sizeof name), 0) << "port " << port;
     return socket;
 }
@@ -58,8 +62,8 @@ Reply parseReply(std::string_view message) {
     return reply;
 }
 
-RpcClient::RpcClient(unsigned short port, std::uint32_t program, std::uint32_t version)
-    : m_socket(connectTo(port)), m_program(program), m_version(version) {}
+RpcClient::RpcClient(unsigned short port, std::uint32_t program, std::uint32_t version, const char* from)
+    : m_socket(connectTo(port, from)), m_program(program), m_version(version) {}
 
 RpcClient::~RpcClient() {
     if (m_socket >= 0) ::close(m_socket);

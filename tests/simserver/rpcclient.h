@@ -11,8 +11,12 @@
 
 namespace kdx::simserver {
 
+inline constexpr const char* kThisMachine = "127.0.0.1";
+inline constexpr const char* kAnotherPeer = "127.0.0.2";  ///< an address of this machine too
+
 /// Connects to a port of this machine; fails the test when nobody listens. The caller closes the socket.
-int connectTo(unsigned short port);
+/// @param from the address that the other end sees.
+int connectTo(unsigned short port, const char* from = kThisMachine);
 
 /// A number as it stands in an RPC message.
 std::string word(std::uint32_t value);
@@ -31,7 +35,8 @@ struct Reply {
 /// An RPC client that sends what it is told, also what no proper client would, and waits only when asked to.
 class RpcClient {
 public:
-    explicit RpcClient(unsigned short port, std::uint32_t program = 0x0607AF, std::uint32_t version = 1);
+    explicit RpcClient(unsigned short port, std::uint32_t program = 0x0607AF, std::uint32_t version = 1,
+                       const char* from = kThisMachine);
     RpcClient(const RpcClient&) = delete;
     RpcClient& operator=(const RpcClient&) = delete;
     ~RpcClient();

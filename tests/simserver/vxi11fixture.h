@@ -106,6 +106,11 @@ public:
         const std::string bytes = results(create_link, linkArguments(name, withLock, lockTimeoutMs));
         return *XdrDecoded<Create_LinkResp>(bytes, xdr_Create_LinkResp);
     }
+    /// A client at another address than the others.
+    static std::unique_ptr<CoreClient> elsewhere(unsigned short port) {
+        return std::make_unique<CoreClient>(port, DEVICE_CORE, DEVICE_CORE_VERSION, kAnotherPeer);
+    }
+
     /// A link to inst0; fails the test when there is none to be had.
     long open() {
         const Create_LinkResp link = createLink("inst0");
@@ -137,6 +142,7 @@ protected:
     void SetUp() override {
         Vxi11Options options;
         options.maxLinks = 3;
+        adjust(options);
         options.trace = [this](std::string_view line) {
             const std::lock_guard guard(m_traceMutex);
             m_trace.emplace_back(line);
@@ -144,6 +150,8 @@ protected:
         m_server = std::make_unique<Vxi11Server>(m_device, options);
         m_thread = std::thread([this] { m_server->run(); });
     }
+    /// For a test that needs other options.
+    virtual void adjust(Vxi11Options&) {}
     void TearDown() override {
         m_server->stop();
         m_thread.join();

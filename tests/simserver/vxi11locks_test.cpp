@@ -234,14 +234,5 @@ TEST_F(Vxi11LockTest, ALinkThatIsDestroyedEndsItsWaitingRead) {
     EXPECT_EQ(CoreClient::readResult(reply->rest).error, 4);
 }
 
-TEST_F(Vxi11LockTest, CallsThatWaitAreLimited) {
-    for (int i = 0; i < 256; ++i) m_one->send(device_read, CoreClient::readArguments(m_linkOne, 100, kLong));
-    EXPECT_FALSE(m_one->receive(50));
-    m_one->send(device_read, CoreClient::readArguments(m_linkOne, 100, kLong));
-    const auto reply = m_one->receive();
-    ASSERT_TRUE(reply);
-    EXPECT_EQ(CoreClient::readResult(reply->rest).error, 9);
-}
-
 }  // namespace
 }  // namespace kdx::simserver

@@ -278,14 +278,14 @@ TEST_F(Vxi11ServerTest, AThousandClientsInTurnLeaveNothingBehind) {
 TEST_F(Vxi11ServerTest, MoreClientsThanTheLimitWaitForTheirTurn) {
     std::vector<std::unique_ptr<CoreClient>> clients;
     for (int i = 0; i < 128; ++i) {
-        clients.push_back(std::make_unique<CoreClient>(port()));
+        clients.push_back(i < 96 ? std::make_unique<CoreClient>(port()) : CoreClient::elsewhere(port()));
         clients.back()->results(NULLPROC, {});
     }
-    CoreClient late(port());
-    const auto xid = late.send(NULLPROC, {});
-    EXPECT_FALSE(late.receive(20));
+    const auto late = CoreClient::elsewhere(port());
+    const auto xid = late->send(NULLPROC, {});
+    EXPECT_FALSE(late->receive(20));
     clients.pop_back();
-    const auto reply = late.receive();
+    const auto reply = late->receive();
     ASSERT_TRUE(reply);
     EXPECT_EQ(reply->xid, xid);
 }
