@@ -31,6 +31,10 @@ class KdxSim:
         if self._process.poll() is None:
             self.end()
 
+    @property
+    def processId(self):
+        return self._process.pid
+
     def sendSignal(self, number):
         self._process.send_signal(number)
 
