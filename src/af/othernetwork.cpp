@@ -3,15 +3,10 @@
 #include <algorithm>
 
 #include "af/settings.h"
+#include "coder/fieldsizes.h"
 #include "settings/storedvalue.h"
 
 namespace kdx {
-
-namespace {
-
-constexpr std::size_t kPiLength = 4;
-
-}  // namespace
 
 void OtherNetwork::load(const Profile& profile) {
     pi = profile.read(setting::kEonPi.place);

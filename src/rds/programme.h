@@ -2,19 +2,17 @@
 
 #include <string>
 
+#include "coder/fieldsizes.h"
 #include "coder/step.h"
 
 namespace kdx {
 
 class Profile;
 
-/// Longest programme service name.
-inline constexpr std::size_t kPsLength = 8;
-
 /// The own programme's RDS data in a data set, each value as it is sent.
 struct Programme {
     std::string pi;  ///< as typed, also while it has not been sent yet
-    std::string ps;  ///< at most 8 characters; not padded
+    std::string ps;  ///< at most kPsLength characters; not padded
     std::string trafficProgramme = "0";
     std::string announcement = "0";
     std::string musicSpeech;  ///< "M" or "S"; "" where the data set says nothing

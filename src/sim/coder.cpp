@@ -4,6 +4,7 @@
 
 #include "base/codepage.h"
 #include "base/numbers.h"
+#include "coder/fieldsizes.h"
 #include "sim/parameters.h"
 #include "sim/scpi.h"
 
@@ -11,8 +12,6 @@ namespace kdx::sim {
 
 namespace {
 
-constexpr std::size_t kPsLength = 8;
-constexpr std::size_t kPiLength = 4;
 constexpr std::size_t kRadiotextLength = 64;
 constexpr std::size_t kGroupLength = 10;
 constexpr std::size_t kMostGroups = 256;

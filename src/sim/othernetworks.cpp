@@ -5,15 +5,12 @@
 
 #include "base/codepage.h"
 #include "base/numbers.h"
+#include "settings/captions.h"
 #include "sim/scpi.h"
 
 namespace kdx::sim {
 
 namespace {
-
-constexpr std::size_t kPiLength = 4;
-constexpr std::size_t kPsLength = 8;
-constexpr int kHighestPty = 31;
 
 ScpiError setPs(OtherNetwork& network, std::string_view value) {
     if (value.size() > kPsLength) return ScpiError::TooMuchData;
@@ -25,7 +22,7 @@ ScpiError setPs(OtherNetwork& network, std::string_view value) {
 ScpiError setPty(OtherNetwork& network, std::string_view value) {
     const auto pty = readWhole(value);
     if (!pty) return ScpiError::IllegalValue;
-    if (*pty < 0 || *pty > kHighestPty) return ScpiError::OutOfRange;
+    if (*pty < 0 || *pty >= kProgrammeTypes) return ScpiError::OutOfRange;
     network.pty = *pty;
     return ScpiError::None;
 }

@@ -5,6 +5,7 @@
 #include <string_view>
 #include <vector>
 
+#include "coder/fieldsizes.h"
 #include "sim/aflists.h"
 #include "sim/errorqueue.h"
 
@@ -13,7 +14,7 @@ namespace kdx::sim {
 /// One other programme that the coder announces.
 struct OtherNetwork {
     std::string pi;  ///< four hexadecimal digits, in capitals
-    std::string ps = std::string(8, ' ');
+    std::string ps = std::string(kPsLength, ' ');
     int pty = 0;
     bool tp = false;
     bool ta = false;

@@ -7,6 +7,7 @@
 
 #include "base/codepage.h"
 #include "base/numbers.h"
+#include "settings/captions.h"
 #include "sim/scpi.h"
 #include "sim/setup.h"
 
@@ -83,7 +84,7 @@ constexpr std::array kNumbers = {
 };
 
 constexpr std::array kWholes = {
-    WholeRow{"", "PTY", &Settings::pty, 0, 31, 2},
+    WholeRow{"", "PTY", &Settings::pty, 0, kProgrammeTypes - 1, 2},
     WholeRow{"", "DI", &Settings::decoderInfo, 0, 15, 1},
     WholeRow{"", "BIN", &Settings::testPattern, 0, 4, 1},
 };
