@@ -18,7 +18,7 @@ public:
     virtual void clear() = 0;
     /// The status byte of IEEE 488.2.
     /// @param messageAvailable whether the client has an answer to fetch: bit 4.
-    virtual unsigned char statusByte(bool messageAvailable) = 0;
+    [[nodiscard]] virtual unsigned char statusByte(bool messageAvailable) const = 0;
     /// Takes an error of the message exchange, which only the transport notices: -363, -410, -420, -430.
     virtual void report(ScpiError error) = 0;
 };

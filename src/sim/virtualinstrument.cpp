@@ -35,7 +35,7 @@ std::string VirtualInstrument::executeLine(std::string_view line) {
         if (trimmed(text).empty()) continue;
         m_status.answerBegun = !answers.empty();
         const Reply reply = executeUnit(readUnit(text), path);
-        if (reply.error != ScpiError::None) report(reply.error);
+        if (reply.error != ScpiError::None) m_status.report(reply.error);
         if (!reply.answer || deadlocked) continue;
         if (!answers.empty()) answers += ';';
         answers += *reply.answer;
@@ -43,7 +43,7 @@ std::string VirtualInstrument::executeLine(std::string_view line) {
         if (answers.size() < kLongestAnswer) continue;
         deadlocked = true;
         answers = std::string();
-        report(ScpiError::QueryDeadlocked);
+        m_status.report(ScpiError::QueryDeadlocked);
     }
     return answers.empty() ? answers : answers + '\n';
 }

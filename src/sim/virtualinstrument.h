@@ -8,6 +8,7 @@
 
 #include "sim/coder.h"
 #include "sim/errorqueue.h"
+#include "sim/messagedevice.h"
 #include "sim/setup.h"
 #include "sim/status.h"
 
@@ -24,7 +25,7 @@ inline constexpr const char* kDefaultIdentification = "KDX,KDX-X4,100001,1.00";
 /// The virtual generator with its stereo/RDS coder: reads program messages as the instrument does, keeps its state,
 /// answers its queries. Used inside the program and, over VXI-11, by the kdx-sim program. One call at a time: threads
 /// that share it take turns.
-class VirtualInstrument {
+class VirtualInstrument : public MessageDevice {
 public:
     /// @param clock what the coder's clock time runs by; must outlive the instrument.
     /// @param identification the answer to "*IDN?", without its line end.
@@ -36,7 +37,7 @@ public:
     /// @returns the answer with its line feed, or "" when the message asked nothing. Errors go to the error queue.
     /// Several answers of one line are joined by ";"; beyond 64 KiB there are none at all, and -430. A message of
     /// several lines is several messages.
-    std::string execute(std::string_view message);
+    std::string execute(std::string_view message) override;
 
     /// Hears of every command once it has been carried out or refused, its header in full.
     using UnitObserver = std::function<void(const CommandUnit& unit, ScpiError error)>;
@@ -45,14 +46,13 @@ public:
     /// A device clear: ends whatever the instrument is still doing for its clients, and by IEEE 488.2 leaves settings,
     /// memories, errors and event bits alone. Every command is complete when execute returns, so nothing is left to
     /// end here; unread answers and half-received messages are the transport's to drop.
-    void deviceClear() {}
+    void clear() override {}
 
     /// Queues an error, also one that only the transport notices (a client reads though nothing was asked: -420).
-    void report(ScpiError error) { m_status.report(error); }
+    void report(ScpiError error) override { m_status.report(error); }
 
     /// The status byte of IEEE 488.2, see Status.
-    /// @param messageAvailable whether the client has an answer to fetch, of which the transport knows.
-    [[nodiscard]] unsigned char statusByte(bool messageAvailable = false) const;
+    [[nodiscard]] unsigned char statusByte(bool messageAvailable) const override;
 
 private:
     std::string executeLine(std::string_view line);

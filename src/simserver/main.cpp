@@ -80,22 +80,19 @@ void declareOptions(CLI::App& commandLine, Options& options) {
     });
 }
 
-/// The virtual instrument as the server sees it.
-class InstrumentDevice final : public kdx::sim::MessageDevice {
+/// The virtual instrument, which may say in words what becomes of a message.
+class TracedInstrument final : public kdx::sim::VirtualInstrument {
 public:
-    /// @param trace gets in words what becomes of a message; null: nobody wants to know.
-    InstrumentDevice(const std::string& identification, kdx::simserver::LineWriter* trace)
-        : m_instrument(m_clock, identification), m_trace(trace) {
-        if (m_trace != nullptr) m_instrument.onUnit([this](const auto& unit, auto error) { explain(unit, error); });
+    /// @param trace gets the words; null: nobody wants to know.
+    TracedInstrument(const kdx::Clock& clock, const std::string& identification, kdx::simserver::LineWriter* trace)
+        : VirtualInstrument(clock, identification), m_trace(trace) {
+        if (m_trace != nullptr) onUnit([this](const auto& unit, auto error) { explain(unit, error); });
     }
     std::string execute(std::string_view message) override {
-        std::string answer = m_instrument.execute(message);
+        std::string answer = VirtualInstrument::execute(message);
         if (!m_words.empty()) m_trace->print("       " + kdx::printable(std::exchange(m_words, {})));
         return answer;
     }
-    void clear() override { m_instrument.deviceClear(); }
-    unsigned char statusByte(bool messageAvailable) override { return m_instrument.statusByte(messageAvailable); }
-    void report(kdx::sim::ScpiError error) override { m_instrument.report(error); }
 
 private:
     void explain(const kdx::sim::CommandUnit& unit, kdx::sim::ScpiError error) {
@@ -106,8 +103,6 @@ private:
         if (m_words.size() > kMost) m_words += "; ...";
     }
 
-    kdx::SystemClock m_clock;
-    kdx::sim::VirtualInstrument m_instrument;
     kdx::simserver::LineWriter* m_trace;
     std::string m_words;  // of the message under way
 };
@@ -157,8 +152,9 @@ int serve(const Options& options) {
         trace = std::make_unique<kdx::simserver::LineWriter>(STDOUT_FILENO);
         serverOptions.trace = [&trace](std::string_view line) { trace->print(line); };
     }
-    InstrumentDevice device(options.identification, trace.get());
-    kdx::simserver::Vxi11Server server(device, serverOptions);
+    const kdx::SystemClock clock;
+    TracedInstrument instrument(clock, options.identification, trace.get());
+    kdx::simserver::Vxi11Server server(instrument, serverOptions);
     endSignals.endRunOf(server);
     const kdx::simserver::PortAnnouncement announcement(server.loop(),
                                                         {{DEVICE_CORE, DEVICE_CORE_VERSION, server.corePort()},

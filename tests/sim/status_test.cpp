@@ -47,7 +47,7 @@ TEST_F(StatusTest, ResetBringsBackTheSettingsAndLeavesErrors) {
 
 TEST_F(StatusTest, DeviceClearLeavesSettingsAndErrorsAlone) {
     tell("FREQ 99.9MHZ;NONSENSE");
-    instrument.deviceClear();
+    instrument.clear();
     EXPECT_EQ(ask("FREQ?"), "99.9");
     EXPECT_EQ(error(), -113);
 }
@@ -72,18 +72,18 @@ TEST_F(StatusTest, EventEnableAndServiceEnableAreKeptThroughAReset) {
 }
 
 TEST_F(StatusTest, StatusByteTellsOfErrorsUntilTheyAreReadAndOfEventsThatAreEnabled) {
-    EXPECT_EQ(instrument.statusByte(), 0);
+    EXPECT_EQ(instrument.statusByte(false), 0);
     tell("NONSENSE");
-    EXPECT_EQ(instrument.statusByte(), 4);
+    EXPECT_EQ(instrument.statusByte(false), 4);
     tell("*ESE 16");
-    EXPECT_EQ(instrument.statusByte(), 4) << "a command error is not enabled";
+    EXPECT_EQ(instrument.statusByte(false), 4) << "a command error is not enabled";
     tell("*ESE 32");
-    EXPECT_EQ(instrument.statusByte(), 4 + 32);
+    EXPECT_EQ(instrument.statusByte(false), 4 + 32);
     EXPECT_EQ(ask("*STB?"), "36");
     EXPECT_EQ(error(), -113);
-    EXPECT_EQ(instrument.statusByte(), 32);
+    EXPECT_EQ(instrument.statusByte(false), 32);
     tell("*ESR?");
-    EXPECT_EQ(instrument.statusByte(), 0);
+    EXPECT_EQ(instrument.statusByte(false), 0);
 }
 
 TEST_F(StatusTest, StatusByteHasTheMasterSummaryOfWhatServiceIsEnabledFor) {

@@ -33,7 +33,7 @@ public:
         return {};
     }
     void clear() override { ++clears; }
-    unsigned char statusByte(bool messageAvailable) override { return messageAvailable ? 0x34 : 0x24; }
+    unsigned char statusByte(bool messageAvailable) const override { return messageAvailable ? 0x34 : 0x24; }
     void report(sim::ScpiError error) override {
         const std::lock_guard guard(m_mutex);
         m_errors.push_back(static_cast<int>(error));

@@ -11,7 +11,6 @@
 #include <vector>
 
 #include "link/lanvisa.h"
-#include "sim/messagedevice.h"
 #include "sim/virtualinstrument.h"
 #include "simserver/vxi11server.h"
 
@@ -39,19 +38,17 @@ public:
 
 private:
     /// Only the server's thread comes near the instrument itself.
-    class Device final : public sim::MessageDevice {
+    class Device final : public sim::VirtualInstrument {
     public:
-        explicit Device(const Clock& clock) : m_instrument(clock) {}
+        using VirtualInstrument::VirtualInstrument;
         std::string execute(std::string_view message) override {
             note(message);
-            return m_instrument.execute(message);
+            return VirtualInstrument::execute(message);
         }
-        void clear() override { m_instrument.deviceClear(); }
-        unsigned char statusByte(bool messageAvailable) override { return m_instrument.statusByte(messageAvailable); }
         void report(sim::ScpiError error) override {
             // The rest of an answer of more than 60 bytes is never fetched; the next command overtakes it.
             if (error != sim::ScpiError::QueryInterrupted) note(sim::errorText(error));
-            m_instrument.report(error);
+            VirtualInstrument::report(error);
         }
         std::vector<std::string> takeReceived() {
             const std::lock_guard guard(m_mutex);
@@ -63,7 +60,7 @@ private:
             const std::lock_guard guard(m_mutex);
             m_received.emplace_back(message);
         }
-        sim::VirtualInstrument m_instrument;
+
         std::mutex m_mutex;
         std::vector<std::string> m_received;
     };
