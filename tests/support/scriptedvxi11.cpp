@@ -56,13 +56,15 @@ void freeFields(bool_t (*coder)(XDR*, Fields*), Fields& fields) {
     coder(&xdr, &fields);
 }
 
-void sendAll(int descriptor, const std::string& bytes) {
+/// False when the client has gone, which is its right.
+bool sendAll(int descriptor, const std::string& bytes) {
     std::size_t sent = 0;
     while (sent < bytes.size()) {
         const ssize_t taken = send(descriptor, bytes.data() + sent, bytes.size() - sent, MSG_NOSIGNAL);
-        if (taken <= 0) return;  // the client has gone, which is its right
+        if (taken <= 0) return false;
         sent += static_cast<std::size_t>(taken);
     }
+    return true;
 }
 
 std::string record(const std::string& message) {
@@ -216,6 +218,12 @@ Reaction ScriptedVxi11::nextReaction(std::uint32_t procedure) {
     return reaction;
 }
 
+/// Waits, but for its own end.
+bool ScriptedVxi11::isOverWithin(std::chrono::milliseconds time) const {
+    pollfd wake{m_wake[0], POLLIN, 0};
+    return poll(&wake, 1, static_cast<int>(time.count())) != 0;
+}
+
 /// Serves one call; false when the connection is to be closed.
 bool ScriptedVxi11::handle(Connection& connection, std::string& message) {
     const int descriptor = connection.descriptor;
@@ -233,6 +241,7 @@ bool ScriptedVxi11::handle(Connection& connection, std::string& message) {
         reaction = nextReaction(procedure);
         reply = perform(procedure, reaction, &xdr, callNumber);
     }
+    if (reaction.kind != Reaction::Kind::RawForEver && isOverWithin(reaction.pause)) return false;
     switch (reaction.kind) {
         case Reaction::Kind::Answer:
             sendAll(descriptor, record(reply));
@@ -259,6 +268,13 @@ bool ScriptedVxi11::handle(Connection& connection, std::string& message) {
         case Reaction::Kind::Raw:
             sendAll(descriptor, reaction.raw.value_or(""));
             return true;
+        case Reaction::Kind::RawAndClose:
+            sendAll(descriptor, reaction.raw.value_or(""));
+            return false;
+        case Reaction::Kind::RawForEver:
+            sendAll(descriptor, reaction.raw.value_or(""));
+            while (sendAll(descriptor, reaction.again) && !isOverWithin(reaction.pause)) continue;
+            return false;
     }
     return false;
 }

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <chrono>
 #include <cstdint>
 #include <deque>
 #include <functional>
@@ -22,7 +23,9 @@ struct Reaction {
         Silence,
         StopReading,  ///< silence, and whatever follows stays in the network
         Close,        ///< hangs up
-        Raw           ///< sends `raw` and nothing else
+        Raw,          ///< sends `raw` and nothing else
+        RawAndClose,  ///< sends `raw` and hangs up
+        RawForEver    ///< sends `raw`, then `again` after each `pause`, until the client hangs up
     };
     Kind kind = Kind::Answer;
     long error = 0;                            ///< device error in the reply
@@ -30,6 +33,8 @@ struct Reaction {
     std::uint32_t acceptState = 0;             ///< of the remote procedure call
     std::optional<std::string> raw = {};       ///< for Raw; for a read: these bytes, whatever was asked for
     std::optional<std::uint32_t> number = {};  ///< port, or bytes taken over, instead of the true one
+    std::string again = {};                    ///< for RawForEver
+    std::chrono::milliseconds pause = {};      ///< before the answer, too
 };
 
 /// A VXI-11 device and its port mapper on one port of the loopback address, which behaves as told. Devices behind it:
@@ -88,6 +93,7 @@ private:
 
     void serve();
     bool serveConnection(Connection& connection);
+    bool isOverWithin(std::chrono::milliseconds time) const;
     bool handle(Connection& connection, std::string& message);
     std::string perform(std::uint32_t procedure, const Reaction& reaction, void* arguments, std::uint32_t callNumber);
     Reaction nextReaction(std::uint32_t procedure);
