@@ -79,7 +79,7 @@ TEST_P(LanVisaGarbage, IsReportedAndEndsTheConnection) {
 }
 
 /// A message of these 32-bit words, with its record mark.
-std::string message(std::initializer_list<std::uint32_t> words) {
+std::string message(const std::vector<std::uint32_t>& words) {
     std::string bytes;
     const auto append = [&bytes](std::uint32_t word) {
         for (const int shift : {24, 16, 8, 0}) bytes += static_cast<char>((word >> shift) & 0xFF);
@@ -87,6 +87,14 @@ std::string message(std::initializer_list<std::uint32_t> words) {
     append(0x80000000U | static_cast<std::uint32_t>(words.size() * 4));
     for (const std::uint32_t word : words) append(word);
     return bytes;
+}
+
+/// The answer "1" to a read, with a verifier of so many words.
+std::string withVerifier(std::uint32_t count) {
+    std::vector<std::uint32_t> words = {2, 1, 0, 1, 4 * count};
+    words.insert(words.end(), count, 0x01020304);
+    words.insert(words.end(), {0, 0, 4, 2, 0x310A0000});
+    return message(words);
 }
 
 // The read is the second call on its connection, so the number 2 is what its answer bears.
@@ -103,6 +111,7 @@ INSTANTIATE_TEST_SUITE_P(
         Garbage{"refused", message({2, 1, 1, 0, 2, 2}), visa::kInputOutput},
         Garbage{"unknown reply state", message({2, 1, 77}), visa::kInputOutput},
         Garbage{"verifier too long", message({2, 1, 0, 0, 0x7FFFFFFF, 0}), visa::kInputOutput},
+        Garbage{"verifier a word too long", withVerifier(101), visa::kInputOutput},
         Garbage{"procedure unknown there", message({2, 1, 0, 0, 0, 3}), visa::kInputOutput},
         Garbage{"unknown accept state", message({2, 1, 0, 0, 0, 0xFFFFFFFF}), visa::kInputOutput},
         Garbage{"no results", message({2, 1, 0, 0, 0, 0}), visa::kInputOutput},
@@ -115,6 +124,13 @@ TEST_F(LanVisaTest, AReplyMayBearAVerifier) {
     ASSERT_EQ(open(), visa::kSuccess);
     device.on(ScriptedVxi11::kRead, {.kind = Reaction::Kind::Raw,
                                      .raw = message({2, 1, 0, 1, 5, 0x01020304, 0x05000000, 0, 0, 4, 2, 0x310A0000})});
+    EXPECT_EQ(read(), visa::kSuccess);
+    EXPECT_EQ(got, "1\n");
+}
+
+TEST_F(LanVisaTest, AVerifierMayHaveTheLengthThatTheStandardAllows) {
+    ASSERT_EQ(open(), visa::kSuccess);
+    device.on(ScriptedVxi11::kRead, {.kind = Reaction::Kind::Raw, .raw = withVerifier(100)});
     EXPECT_EQ(read(), visa::kSuccess);
     EXPECT_EQ(got, "1\n");
 }

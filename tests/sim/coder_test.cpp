@@ -157,6 +157,22 @@ TEST_F(CoderTest, KeepsFiveAfListsOfMethodAAsTheyWereSent) {
     EXPECT_EQ(error(), 0);
     coder("AF=+,99.9");
     EXPECT_EQ(error(), -223);
+    coder("AF=N,99.9");
+    EXPECT_EQ(error(), 0) << "a new set finds room however many there were";
+    EXPECT_EQ(askCoder("AF1"), "\"99.9\"");
+    EXPECT_EQ(askCoder("AF5"), "\"\"");
+}
+
+TEST_F(CoderTest, KeepsTheChoiceThatItSwitchesOff) {
+    coder("SRC=2");
+    coder("SRC=0");
+    EXPECT_EQ(ask(":STEREO:SOURCE?;STATE?"), "SPEXT;0");
+    coder("PRE=2");
+    coder("PRE=0");
+    EXPECT_EQ(ask(":STEREO:AUDIO:PREEMPHASIS?;PREEMPHASIS:STATE?"), "75US;0");
+    coder("ARI-ID=3");
+    coder("ARI-ID=0");
+    EXPECT_EQ(ask(":STEREO:ARI:TYPE?;TYPE:STATE?"), "BKDK;0");
 }
 
 TEST_F(CoderTest, KeepsThePairsOfMethodB) {

@@ -195,6 +195,16 @@ TEST_F(ListNumber, ReachesFromOneToFive) {
 
 class StatusBits : public SimTest {};
 
+TEST_F(StatusBits, AreRoundedToAWholeNumber) {
+    for (const auto& [number, bits] : {std::pair{"1.4", "1"}, {"1.6", "2"}, {"255.4", "255"}, {"-0.4", "0"}}) {
+        tell(std::string("*ESE ") + number);
+        EXPECT_EQ(ask("*ESE?"), bits) << number;
+    }
+    EXPECT_EQ(error(), 0);
+    tell("*ESE 255.6");
+    EXPECT_EQ(error(), -222);
+}
+
 TEST_F(StatusBits, ReachToAByteAndAWordThoughNotAllOfThemCount) {
     tell("*SRE 255;:STAT:OPER:ENAB 65535;:STAT:QUES:ENAB 65535");
     EXPECT_EQ(error(), 0);

@@ -15,6 +15,7 @@ import unittest
 from kdxsim import KdxSim, portIsFree
 
 PROGRAM = ""
+IDENTIFICATION = b"M" * 300
 CORE = 0x0607AF
 NULL, CREATE_LINK, WRITE, READ = 0, 10, 11, 12
 END = 8
@@ -82,11 +83,11 @@ class Client:
 
 class ManyClients(unittest.TestCase):
     def setUp(self):
-        self.sim = self.enterContext(KdxSim(PROGRAM, "--idn", "ME"))
+        self.sim = self.enterContext(KdxSim(PROGRAM, "--idn", IDENTIFICATION.decode()))
 
     def tearDown(self):
         with Client(self.sim, "127.0.0.9") as client:
-            self.assertEqual(client.query(client.link(), b"*IDN?"), b"ME\n", "it goes on as ever")
+            self.assertEqual(client.query(client.link(), b"*IDN?"), IDENTIFICATION + b"\n", "it goes on as ever")
         self.assertEqual(self.sim.end(), 0)
         self.assertEqual(self.sim.errors, "")
 
@@ -147,7 +148,7 @@ class ManyClients(unittest.TestCase):
     def testFiveHundredOfOnePeerDoNotKeepOthersOut(self):
         clients = [Client(self.sim) for _ in range(500)]
         with Client(self.sim, "127.0.0.2") as other:
-            self.assertEqual(other.query(other.link(), b"*IDN?"), b"ME\n")
+            self.assertEqual(other.query(other.link(), b"*IDN?"), IDENTIFICATION + b"\n")
         served = 0
         for client in clients:
             try:
@@ -168,7 +169,7 @@ class ManyClients(unittest.TestCase):
             end = time.monotonic() + seconds
             while time.monotonic() < end:
                 start = time.monotonic()
-                self.assertEqual(other.query(link, b"*IDN?"), b"ME\n")
+                self.assertEqual(other.query(link, b"*IDN?"), IDENTIFICATION + b"\n")
                 longest = max(longest, time.monotonic() - start)
                 time.sleep(0.01)
         return longest
@@ -202,6 +203,19 @@ class ManyClients(unittest.TestCase):
             client.send(bytes(4) * 1000)
             with self.assertRaises(ConnectionError):
                 client.bytes(1)
+
+    def testAClientThatNeverFetchesItsRepliesTakesNoMemory(self):
+        before = self.kilobytes()
+        with Client(self.sim) as client:
+            link = client.link()
+            ask = call(WRITE, struct.pack(">4I", link, 2000, 0, END) + padded(b"*IDN?;*IDN?"))
+            pairs = (ask + call(READ, struct.pack(">6I", link, 1000, 2000, 0, 0, 0))) * 100
+            client.socket.settimeout(0.5)
+            with self.assertRaises(TimeoutError, msg="it is never made to wait"):
+                for _ in range(2000):  # 34 MB, for which there are 126 MB of answers
+                    client.send(pairs)
+            if not self.isChecked():
+                self.assertLess(self.kilobytes() - before, 8 * 1024)
 
     def testSlowSendersHoldUpNobodyAndCostLittle(self):
         clients = [Client(self.sim) for _ in range(90)]

@@ -91,6 +91,32 @@ TEST_F(MessageExchangeTest, AMessageOfTheLongestLengthIsCarriedOut) {
     EXPECT_EQ(m_device.errors(), Errors{});
 }
 
+TEST_F(MessageExchangeTest, AMessageOfOneByteMoreIsDropped) {
+    CoreClient client(port());
+    const long link = client.open();
+    for (int i = 0; i < 64; ++i) client.write(link, std::string(1024, 'x'), 0);
+    client.write(link, "x");
+    EXPECT_EQ(m_device.got(), Lines{});
+    EXPECT_EQ(m_device.errors(), Errors{-363});
+}
+
+TEST_F(MessageExchangeTest, AnswersOf64KibibytesAreKeptAndNoMore) {
+    CoreClient client(port());
+    const long link = client.open();
+    const auto ask = [&](std::size_t lastAnswer) {  // after 131 answers of 500 bytes
+        std::string messages;
+        for (int i = 0; i < 131; ++i) messages += "LONG?\n";
+        client.write(link, messages + std::string(lastAnswer - 1, 'x') + "?");
+    };
+    ask(36);
+    EXPECT_EQ(m_device.errors(), Errors{});
+    for (int i = 0; i < 131; ++i) EXPECT_EQ(client.read(link).data.size(), 500U);
+    EXPECT_EQ(client.read(link).data.size(), 36U);
+    ask(37);
+    EXPECT_EQ(m_device.errors(), Errors{-430});
+    EXPECT_EQ(client.read(link, 100, 10).error, 15);
+}
+
 TEST_F(MessageExchangeTest, ADeviceClearEndsAMessageThatIsTooLong) {
     CoreClient client(port());
     const long link = client.open();
