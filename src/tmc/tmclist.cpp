@@ -50,7 +50,12 @@ bool appendLine(const std::filesystem::path& file, std::string_view text, std::s
     const std::optional<std::string> content = readToChange(file);
     if (!content) return false;
     std::string bytes = *content;
-    if (!bytes.empty() && bytes.back() != '\n') bytes += kLineEnd;
+    // A carriage return at the end is half a line end: a whole one would add the return to the last entry's code.
+    if (bytes.ends_with('\r')) {
+        bytes += '\n';
+    } else if (!bytes.empty() && bytes.back() != '\n') {
+        bytes += kLineEnd;
+    }
     bytes += text;
     bytes += ';';
     bytes += code;

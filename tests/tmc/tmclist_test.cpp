@@ -104,6 +104,14 @@ TEST_F(TmcListTest, AppendingEndsALastLineThatHadNoEnd) {
     EXPECT_EQ(content(), "Stau;00101\r\nUnfall;00201\r\n");
 }
 
+TEST_F(TmcListTest, AppendingKeepsALastLineThatEndsInACarriageReturnOnly) {
+    write("Stau;00101\r");
+    const auto before = entries();
+    EXPECT_TRUE(appendToTmcList(file(), "Unfall", "00201"));
+    EXPECT_EQ(content(), "Stau;00101\r\nUnfall;00201\r\n");
+    EXPECT_EQ(entries()->front(), before->front());
+}
+
 TEST_F(TmcListTest, AFileThatCannotBeReplacedKeepsItsContent) {
     write("Stau;00101\r\n");
     fs::permissions(m_folder.data(),
