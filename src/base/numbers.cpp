@@ -1,8 +1,10 @@
 #include "base/numbers.h"
 
+#include <algorithm>
 #include <array>
 #include <charconv>
 #include <cmath>
+#include <cstdint>
 #include <limits>
 
 namespace kdx {
@@ -16,6 +18,21 @@ bool isDigit(char c) {
 std::size_t digitsEnd(std::string_view text, std::size_t from) {
     while (from < text.size() && isDigit(text[from])) ++from;
     return from;
+}
+
+/// Whether a number that no double can hold is too large; else it is too small. The power of ten of its first digit
+/// that is not 0 tells.
+bool isTooLarge(std::string_view number) {
+    const std::size_t mark = std::min(number.find_first_of("eE"), number.size());
+    const std::string_view digits = number.substr(0, mark);
+    const auto point = static_cast<std::int64_t>(std::min(digits.find('.'), digits.size()));
+    const auto first = static_cast<std::int64_t>(digits.find_first_of("123456789"));
+    std::string_view power = number.substr(std::min(mark + 1, number.size()));
+    if (power.starts_with('+')) power.remove_prefix(1);
+    std::int64_t exponent = 0;
+    const auto result = std::from_chars(power.data(), power.data() + power.size(), exponent);
+    if (result.ec == std::errc::result_out_of_range) return !power.starts_with('-');
+    return exponent > first - point;
 }
 
 std::string format(double value, std::chars_format form, int precision) {
@@ -42,20 +59,17 @@ double leadingNumber(std::string_view text) {
         end = fractionEnd;
     }
     if (!anyDigit) return 0.0;
-    bool negativeExponent = false;
     if (end < text.size() && (text[end] == 'e' || text[end] == 'E')) {
         std::size_t exponent = end + 1;
-        if (exponent < text.size() && (text[exponent] == '+' || text[exponent] == '-')) {
-            negativeExponent = text[exponent] == '-';
-            ++exponent;
-        }
+        if (exponent < text.size() && (text[exponent] == '+' || text[exponent] == '-')) ++exponent;
         const std::size_t exponentEnd = digitsEnd(text, exponent);
         if (exponentEnd > exponent) end = exponentEnd;
     }
     double value = 0.0;
-    const auto result = std::from_chars(text.data() + start, text.data() + end, value);
+    const std::string_view number = text.substr(start, end - start);
+    const auto result = std::from_chars(number.data(), number.data() + number.size(), value);
     if (result.ec == std::errc::result_out_of_range) {
-        value = negativeExponent ? 0.0 : std::numeric_limits<double>::infinity();
+        value = isTooLarge(number) ? std::numeric_limits<double>::infinity() : 0.0;
     }
     return negative ? -value : value;
 }

@@ -8,7 +8,7 @@ namespace kdx {
 /// The number a text begins with: leading blanks and tabs skipped, optional sign, digits, one point, an exponent when
 /// digits follow it; reading stops at the first character that does not fit. "67.5 x" gives 67.5, "87,6" gives 87,
 /// "" and "abc" give 0. The point is the decimal separator whatever the locale. A number too large for a double gives
-/// infinity.
+/// infinity, one too small 0.
 [[nodiscard]] double leadingNumber(std::string_view text);
 
 /// True for a text of decimal digits only (not empty).

@@ -5,6 +5,7 @@
 #include <clocale>
 #include <cmath>
 #include <ostream>
+#include <string>
 
 namespace kdx {
 namespace {
@@ -33,6 +34,21 @@ INSTANTIATE_TEST_SUITE_P(Values, LeadingNumber,
 TEST(LeadingNumberTest, ANumberTooLargeIsInfinite) {
     EXPECT_TRUE(std::isinf(leadingNumber("1e999")));
     EXPECT_LT(leadingNumber("-1e999"), 0);
+}
+
+TEST(LeadingNumberTest, ANumberTooSmallIsZeroHoweverItIsWritten) {
+    const std::string zeros(400, '0');
+    EXPECT_EQ(leadingNumber("0." + zeros + "1"), 0);
+    EXPECT_EQ(leadingNumber("-." + zeros + "1e+50"), 0);
+    EXPECT_EQ(leadingNumber("100e-99999999999999999999"), 0);
+    EXPECT_EQ(leadingNumber("0.0e99999999999999999999"), 0);
+}
+
+TEST(LeadingNumberTest, ANumberTooLargeIsInfiniteHoweverItIsWritten) {
+    const std::string zeros(400, '0');
+    EXPECT_TRUE(std::isinf(leadingNumber("1" + zeros)));
+    EXPECT_TRUE(std::isinf(leadingNumber("01" + zeros + "E-50")));
+    EXPECT_TRUE(std::isinf(leadingNumber("0.01e99999999999999999999")));
 }
 
 TEST(LeadingNumberTest, TheLocaleDoesNotMatter) {
