@@ -40,7 +40,7 @@ int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     demand(!(kdx::liesBetween(text, other, text) || kdx::liesBetween(text, text, other)), "limits do not lie between");
 
     const auto parameter = kdx::sim::readNumber(text);
-    demand(!parameter || !std::isnan(parameter->value), "a parameter is a number");
+    demand(!parameter || parameter->value == kdx::leadingNumber(kdx::sim::trimmed(text)), "a parameter is that number");
     const auto whole = kdx::sim::readWhole(text);
     demand(!whole || parameter || !kdx::isDecimal(text), "a whole number is a number");
     return 0;

@@ -151,16 +151,14 @@ std::string quoted(std::string_view text) {
 
 std::optional<NumberWithSuffix> readNumber(std::string_view text) {
     text = trimmed(text);
-    if (!text.empty() && text.front() == '+') text.remove_prefix(1);
-    const bool negative = !text.empty() && text.front() == '-';
-    const std::string_view digits = text.substr(negative ? 1 : 0);
+    const bool negative = text.starts_with('-');
+    const std::string_view digits = text.substr(negative || text.starts_with('+') ? 1 : 0);
     // from_chars would take "inf" and "nan" too.
     if (digits.empty() || (!isDecimal(digits.substr(0, 1)) && digits.front() != '.')) return std::nullopt;
     NumberWithSuffix number;
     const auto result = std::from_chars(digits.data(), digits.data() + digits.size(), number.value);
     if (result.ec == std::errc::invalid_argument) return std::nullopt;
-    // Too small for a number comes here as well: it is outside every range that does not reach down to 0 anyway.
-    if (result.ec == std::errc::result_out_of_range) number.value = std::numeric_limits<double>::infinity();
+    if (result.ec == std::errc::result_out_of_range) number.value = leadingNumber(digits);  // 0 or infinite
     if (negative) number.value = -number.value;
     number.suffix = trimmed(digits.substr(static_cast<std::size_t>(result.ptr - digits.data())));
     return number;

@@ -70,7 +70,7 @@ struct HeadAndTail {
 
 /// A decimal number and what follows it, blanks between them left out.
 struct NumberWithSuffix {
-    double value = 0;  ///< finite, or infinite when it is too large to be held
+    double value = 0;  ///< infinite when it is too large to be held, 0 when it is too small
     std::string_view suffix;
 };
 /// Nothing when the text does not begin with a number. The decimal separator is the point whatever the locale.

@@ -109,6 +109,12 @@ TEST_F(CommandReader, RoundsANumberForASwitch) {
     EXPECT_EQ(error(), 0);
 }
 
+TEST_F(CommandReader, TakesANumberTooSmallToBeHeldForZero) {
+    tell("STEREO:STAT 1e-400;:STEREO:PILOT:PHASE -1e-400DEG");
+    EXPECT_EQ(ask("STEREO:STAT?;PILOT:PHASE?"), "0;0");
+    EXPECT_EQ(error(), 0);
+}
+
 TEST_F(CommandReader, TakesUnitsWithABlankAndInAnyLetterCase) {
     tell(":STEREO:DEVIATION 67.5 kHz");
     EXPECT_EQ(askCoder("MPX-DEV"), "\"6750\"");

@@ -101,6 +101,7 @@ TEST_F(ErrorsTest, AreQueuedForSwitchesAndNumbersThatAreNone) {
                                         {"FREQ infMHZ", -224},
                                         {"FREQ -infMHZ", -224},
                                         {"FREQ --5MHZ", -224},
+                                        {"FREQ +-5MHZ", -224},
                                         {"FREQ 1,5MHZ", -108},
                                         {"FREQ 1e-400MHZ", -222},
                                         {":STEREO:EXTERNAL:IMP 50", -224},
