@@ -6,7 +6,7 @@
 namespace {
 
 using kdx::fuzz::demand;
-constexpr std::size_t kLongest = 1000;
+constexpr std::size_t kLongest = 100;
 
 std::vector<std::string> recordsOf(std::string_view stream, std::size_t piece, bool& tooLong) {
     kdx::RecordReader reader(kLongest);

@@ -1,4 +1,4 @@
-// What clients send to the VXI-11 server: records with calls of the core and the abort channel, by two connections.
+// What clients send to the VXI-11 server: calls of the core and the abort channel, by two connections.
 // Whatever they were, the next client is served.
 #include "harness.h"
 #include "instrumentdevice.h"
@@ -7,7 +7,6 @@
 #include "simserver/corechannel.h"
 #include "simserver/pollloop.h"
 #include "vxi11/numbers.h"
-#include "vxi11/rpcrecord.h"
 #include "vxi11/xdr.h"
 
 #include <vxi11.h>
@@ -54,25 +53,22 @@ void identify(simserver::CoreChannel& core, ConnectionId from) {
 int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     FuzzedDataProvider input(data, size);
     const auto senders = input.ConsumeIntegral<std::uint8_t>();
-    const std::string stream = input.ConsumeRemainingBytesAsString();
-
     fuzz::InstrumentDevice device;
     simserver::PollLoop loop;
     simserver::Vxi11Options options;
     options.trace = [](std::string_view line) { demand(!line.empty(), "a line of the trace says something"); };
     simserver::CoreChannel core(loop, device, options);
     simserver::AbortChannel abort(core);
-    RecordReader reader(std::size_t{64} * 1024);
-    reader.feed(stream);
     unsigned calls = 0, replies = 0;
-    while (const auto record = reader.next()) {
+    while (input.remaining_bytes() > 0) {
+        const std::string record = fuzz::nextText(input);
         const auto send = [&](const std::string& reply) {
             ++replies;
             demand(reply.size() >= 12 && xdrWord(reply, 4) == REPLY, "a reply is one");
         };
         const ConnectionId from = 1 + (senders >> (calls++ % 8) & 1U);
-        const bool forAbort = record->size() >= 16 && xdrWord(*record, 12) == DEVICE_ASYNC;
-        if (!(forAbort ? static_cast<simserver::RpcProgram&>(abort) : core).handle(*record, from, send)) break;
+        const bool forAbort = record.size() >= 16 && xdrWord(record, 12) == DEVICE_ASYNC;
+        if (!(forAbort ? static_cast<simserver::RpcProgram&>(abort) : core).handle(record, from, send)) break;
     }
     loop.callAt(std::chrono::steady_clock::now(), [&] { loop.stop(); });
     loop.run();  // calls that wait no time at all end here

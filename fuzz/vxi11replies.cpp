@@ -1,8 +1,9 @@
-// What a device and its port mapper send to the LAN client.
+// What a device and its port mapper send to the LAN client: replies as records, and bytes that need be none.
 #include "harness.h"
 
 #include "base/filedescriptor.h"
 #include "link/lanvisa.h"
+#include "vxi11/rpcrecord.h"
 
 #include <sys/socket.h>
 #include <unistd.h>
@@ -34,9 +35,11 @@ extern "C" int connect(int descriptor, const sockaddr* /*address*/, socklen_t /*
 
 int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     FuzzedDataProvider input(data, size);
-    const auto ofPortMapper = input.ConsumeIntegral<std::uint8_t>();
-    scripts = {input.ConsumeBytesAsString(ofPortMapper)};
-    scripts.push_back(input.ConsumeRemainingBytesAsString());
+    scripts = {kdx::framed(kdx::fuzz::nextText(input)), {}};
+    while (input.remaining_bytes() > 0) {
+        const std::string text = kdx::fuzz::nextText(input);
+        scripts.back() += input.remaining_bytes() > 0 ? kdx::framed(text) : text;  // the last bytes may be anything
+    }
 
     kdx::LanVisa visa;
     kdx::VisaHandle manager = 0, session = 0;
