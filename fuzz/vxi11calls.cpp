@@ -17,7 +17,14 @@ using namespace kdx;
 using fuzz::demand;
 using simserver::ConnectionId;
 
-constexpr std::size_t kHeader = 24;  // of a reply that was accepted
+constexpr std::size_t kHeader = 24;                     // of a reply that was accepted
+constexpr std::size_t kProcedureAt = 20, kLinkAt = 40;  // in a call without credentials
+
+/// The server numbers its links as it likes: by 1 an input means the first that it was given, by 2 the second.
+void setLink(std::string& record, const std::vector<std::string>& links) {
+    const std::uint32_t number = record.size() < kLinkAt + 4 ? 0 : xdrWord(record, kLinkAt);
+    if (number >= 1 && number <= links.size()) record.replace(kLinkAt, 4, links[number - 1]);
+}
 
 /// A call without credentials.
 template <class Arguments>
@@ -59,12 +66,16 @@ int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     options.trace = [](std::string_view line) { demand(!line.empty(), "a line of the trace says something"); };
     simserver::CoreChannel core(loop, device, options);
     simserver::AbortChannel abort(core);
+    std::vector<std::string> links;
     unsigned calls = 0, replies = 0;
     while (input.remaining_bytes() > 0) {
-        const std::string record = fuzz::nextText(input);
-        const auto send = [&](const std::string& reply) {
+        std::string record = fuzz::nextText(input);
+        setLink(record, links);
+        const bool creates = record.size() > kLinkAt && xdrWord(record, kProcedureAt) == create_link;
+        const auto send = [&, creates](const std::string& reply) {
             ++replies;
             demand(reply.size() >= 12 && xdrWord(reply, 4) == REPLY, "a reply is one");
+            if (creates && reply.size() == kHeader + 16) links.push_back(reply.substr(kHeader + 4, 4));
         };
         const ConnectionId from = 1 + (senders >> (calls++ % 8) & 1U);
         const bool forAbort = record.size() >= 16 && xdrWord(record, 12) == DEVICE_ASYNC;
