@@ -1,11 +1,12 @@
 // What clients send to the VXI-11 server: calls of the core and the abort channel, by two connections.
 // Whatever they were, the next client is served.
 #include "harness.h"
-#include "instrumentdevice.h"
 
+#include "sim/virtualinstrument.h"
 #include "simserver/abortchannel.h"
 #include "simserver/corechannel.h"
 #include "simserver/pollloop.h"
+#include "support/fakeclock.h"
 #include "vxi11/numbers.h"
 #include "vxi11/xdr.h"
 
@@ -60,7 +61,8 @@ void identify(simserver::CoreChannel& core, ConnectionId from) {
 int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     FuzzedDataProvider input(data, size);
     const auto senders = input.ConsumeIntegral<std::uint8_t>();
-    fuzz::InstrumentDevice device;
+    const test::FakeClock clock;
+    sim::VirtualInstrument device(clock);
     simserver::PollLoop loop;
     simserver::Vxi11Options options;
     options.trace = [](std::string_view line) { demand(!line.empty(), "a line of the trace says something"); };

@@ -46,7 +46,7 @@ int main(int argc, char** argv) {
     kdx::Session session(visa, state, data, captions, clock, [] {});
     kdx::TickerGroup tickers;
     const kdx::FolderClaim claim(data.path());
-    kdx::HMenue window({session, state, data, captions, clock, dialogs, tickers, claim, QString(), [] {}});
+    kdx::HMenue window({session, state, data, captions, clock, dialogs, tickers, claim, QString(), QString(), [] {}});
     window.startUp();
     window.show();
     CommandCounter counter(session.instrument);

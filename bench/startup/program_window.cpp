@@ -61,7 +61,7 @@ int main(int argc, char** argv) {
     kdx::Session session(visa, state, data, captions, clock, [] {});
     kdx::TickerGroup tickers;
     const kdx::FolderClaim claim(data.path());
-    kdx::HMenue window({session, state, data, captions, clock, dialogs, tickers, claim, QString(), [] {}});
+    kdx::HMenue window({session, state, data, captions, clock, dialogs, tickers, claim, QString(), QString(), [] {}});
     window.startUp();
     if (argc > 2 && std::strcmp(argv[2], "--count") == 0) {
         printCounts(window);

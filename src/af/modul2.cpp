@@ -13,7 +13,11 @@ void FillAfLists(QListWidget& list, QLabel& tuned, std::string_view listText) {
     if (!parts) return;
     tuned.setText(toText(parts->tuned));
     list.clear();
-    for (const std::string& frequency : parts->frequencies) list.addItem(toText(frequency));
+    for (const std::string& frequency : parts->frequencies) {
+        list.addItem(toText(frequency));
+        // A double quote would end the list for the coder.
+        if (frequency.find('"') != std::string::npos) list.item(list.count() - 1)->setForeground(Qt::red);
+    }
 }
 
 }  // namespace kdx

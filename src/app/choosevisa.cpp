@@ -3,6 +3,7 @@
 #include "app/options.h"
 #include "link/lanvisa.h"
 #include "link/libraryvisa.h"
+#include "settings/shownpath.h"
 #include "sim/simvisa.h"
 #include "sim/virtualinstrument.h"
 
@@ -24,7 +25,7 @@ ChosenVisa chooseVisa(const Options& options, const Clock& clock) {
     VisaLibrary library = loadVisaLibrary(options.visaLibrary.value_or(std::string()));
     if (library.visa) {
         chosen.visa = std::move(library.visa);
-        chosen.description = "VISA library " + library.file;
+        chosen.description = "VISA library " + shownPath(library.file);
         return chosen;
     }
     if (options.visaLibrary) {

@@ -104,13 +104,12 @@ int main(int argc, char** argv) {
     kdx::Session session(*link.visa, state, data, captions, clock, end);
     kdx::TickerGroup tickers;
     kdx::HMenue window({session, state, data, captions, clock, dialogs, tickers, claim,
-                        QString::fromStdString(link.description), end});
+                        QString::fromStdString(link.description), QString::fromStdString(problem), end});
     application.guarded(window.objectName(), [&] { window.startUp(); });
     if (options.tourFolder) {
         int result = EXIT_FAILURE;
         application.guarded(window.objectName(), [&] {
-            const QString folder = QString::fromStdString(*options.tourFolder);
-            result = kdx::makeTour(window, session.instrument, tourBoxes, folder, print);
+            result = kdx::makeTour(window, session.instrument, tourBoxes, *options.tourFolder, print);
         });
         return result;
     }

@@ -84,8 +84,7 @@ void GroupPage::Gruppe_Click(int number) {
 }
 
 void GroupPage::newList_Click() {
-    m_sequence.groups.clear();
-    m_sequence.composed = true;
+    m_sequence.startAnew();
     countAnew();
     showSequence();
 }

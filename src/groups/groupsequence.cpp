@@ -24,14 +24,21 @@ void GroupSequence::load(const Profile& profile) {
 void GroupSequence::setRead(std::string text) {
     groups = std::move(text);
     composed = false;
+    cut = groups.size() == kLongestValue;
+}
+
+void GroupSequence::startAnew() {
+    groups.clear();
+    composed = true;
+    cut = false;
 }
 
 bool GroupSequence::exceedsReading() const {
-    return groups.size() > kLongestValue || (!composed && groups.size() == kLongestValue);
+    return cut || groups.size() > kLongestValue;
 }
 
 bool GroupSequence::isToBeStored(const Profile& profile) const {
-    return composed || (!exceedsReading() && profile.read(setting::kGroupSequence.place) != groups);
+    return !cut && (composed || profile.read(setting::kGroupSequence.place) != groups);
 }
 
 void GroupSequence::appendSteps(Steps& steps) const {

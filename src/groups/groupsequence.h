@@ -27,13 +27,16 @@ inline constexpr int kTmcGroup = 8;
 struct GroupSequence {
     std::string groups;     ///< each followed by a comma
     bool composed = false;  ///< by the user, since it was read
+    bool cut = false;       ///< begins with a reading that may go on in its file
 
     void load(const Profile& profile);
     /// Takes over what was read.
     void setRead(std::string text);
+    /// Begins a new one.
+    void startAnew();
     /// Whether it is longer than a reading gives; true also for one that was read and may go on in its file.
     [[nodiscard]] bool exceedsReading() const;
-    /// Whether the set at work is to get it when it is sent.
+    /// Whether the set at work is to get it when it is sent; never what begins with a cut reading.
     [[nodiscard]] bool isToBeStored(const Profile& profile) const;
     /// Adds the sequence; no step without one.
     void appendSteps(Steps& steps) const;

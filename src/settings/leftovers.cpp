@@ -1,5 +1,7 @@
 #include "settings/leftovers.h"
 
+#include <algorithm>
+#include <array>
 #include <charconv>
 #include <chrono>
 #include <cstdint>
@@ -9,7 +11,9 @@
 #include <system_error>
 #include <vector>
 
+#include "base/codepage.h"
 #include "base/numbers.h"
+#include "settings/datafolder.h"
 #include "settings/durablefile.h"
 #include "settings/folderlock.h"
 #include "settings/shownpath.h"
@@ -22,6 +26,8 @@ namespace fs = std::filesystem;
 
 constexpr std::string_view kSuffix = ".kdx-rds-new";
 constexpr const char* kProbe = ".kdx-rds-writable";
+constexpr std::string_view kEarlierSuffix = ".new";  // of versions that named them NAME.COUNT.new
+constexpr std::array kFiles = {kGeneralSettings, kLanguageFile, kEventList, kLocationList};
 
 /// Takes the part behind the last point off the name.
 std::string_view takeExtension(std::string_view& name) {
@@ -44,9 +50,22 @@ std::optional<std::uint64_t> writerOf(std::string_view name) {
     return read.ec == std::errc() ? std::optional(number) : std::nullopt;
 }
 
+bool isEarlierLeftOver(std::string_view name) {
+    if (!name.ends_with(kEarlierSuffix)) return false;
+    name.remove_suffix(kEarlierSuffix.size());
+    if (!isDecimal(takeExtension(name))) return false;
+    const auto isName = [name](std::string_view file) { return equalNoCase(name, file); };
+    if (std::any_of(kFiles.begin(), kFiles.end(), isName)) return true;
+    for (const char* number : {"1", "2", "3", "4", "5"}) {
+        if (isName(dataSetFile(number))) return true;
+    }
+    return false;
+}
+
 bool isLeftOver(const fs::path& file) {
     const std::string name = shownPath(file.filename());
     if (name == kProbe) return true;  // needed for no longer than it takes to create it
+    if (isEarlierLeftOver(name)) return true;
     const auto writer = writerOf(name);
     return writer && !mayStillBeWritten(file, *writer);
 }

@@ -25,7 +25,7 @@ TMC_Listedit::TMC_Listedit(const PageContext& with, QWidget* parent) : QDialog(p
     auto* lists = row({arrangeList(Label1, List1, Event_Input_TXT, Event_Input_Nr, Event_Hinzu),
                        arrangeList(Label2, List2, Loc_INput_TXT1, Loc_Input_Nr, Loc_Hinzu)});
     lists->setSpacing(3 * kGap);
-    auto* whole = column({{lists, 1}, {Zuruek_Knopf, 0, Qt::AlignRight}});
+    auto* whole = column({{lists, 1}, row({kRoom, m_codeNote, space(2 * kGap), Zuruek_Knopf})});
     whole->setSpacing(2 * kGap);
     layOut(this, whole, 2 * kGap);
     label();
@@ -48,6 +48,8 @@ void TMC_Listedit::create() {
     m_book.spoken(List2, {623, "Locations"});
     Loc_INput_TXT1 = createInput("Loc_INput_TXT1", {621, "Location Text"}, &TMC_Listedit::Loc_INput_TXT1_Click);
     Loc_Input_Nr = createInput("Loc_Input_Nr", {620, "Location Nr"}, &TMC_Listedit::Loc_Input_Nr_Click);
+    // ISO 14819-3: an entry of a location table beyond that cannot be sent. It is taken all the same.
+    m_codeNote = captioned<QLabel>("LocationNote", {625, "Codes von Locations gehen von 1 bis 63487."}, this);
     Loc_Hinzu = clicked<QPushButton>("Loc_Hinzu", add, this, &TMC_Listedit::Loc_Hinzu_Click);
 
     Zuruek_Knopf = clicked<QPushButton>("Zuruek_Knopf", {616, "Exit"}, this, &TMC_Listedit::Zuruek_Knopf_Click);

@@ -68,6 +68,7 @@ private:
     ClickableLabel* Loc_INput_TXT1 = nullptr;
     ClickableLabel* Loc_Input_Nr = nullptr;
     QPushButton* Loc_Hinzu = nullptr;
+    QLabel* m_codeNote = nullptr;  // the end of the location table
     QPushButton* Zuruek_Knopf = nullptr;
 };
 

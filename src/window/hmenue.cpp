@@ -311,6 +311,7 @@ QStringList HMenue::notes() const {
         const QString text = captionText(m_s.captions, caption);
         notes += what.isEmpty() ? text : text.arg(what);
     };
+    if (!m_s.dataProblem.isEmpty()) notes += m_s.dataProblem;
     if (const QString missing = missingData(); !missing.isEmpty()) {
         note({322, "Nicht gefunden: %1"}, missing);
     } else if (!m_startNotice.isEmpty()) {

@@ -35,6 +35,7 @@ struct Surroundings {
     TickerGroup& tickers;
     const FolderClaim& claim;          ///< on the data folder
     QString linkDescription;           ///< how instruments are reached, for the about box
+    QString dataProblem;               ///< what is wrong with the data folder, in words; usually nothing
     std::function<void()> endProgram;  ///< ends the program at once
 };
 

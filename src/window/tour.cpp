@@ -1,15 +1,18 @@
 #include "window/tour.h"
 
+#include <QBuffer>
 #include <QCoreApplication>
-#include <QDir>
-#include <QFileInfo>
 #include <QPixmap>
 #include <QPushButton>
 #include <QTabWidget>
 
+#include <system_error>
+
 #include "base/printable.h"
 #include "coder/readback.h"
 #include "link/instrument.h"
+#include "settings/durablefile.h"
+#include "settings/shownpath.h"
 #include "ui/text.h"
 #include "window/hmenue.h"
 
@@ -17,10 +20,12 @@ namespace kdx {
 
 namespace {
 
-/// Not a link, a pipe or a device: what is behind them is not the tour's to overwrite, and nobody may read the pipe.
-bool isPlainOrMissing(const QString& file) {
-    const QFileInfo place(file);
-    return !place.isSymLink() && (place.isFile() || !place.exists());
+/// To a plain file only: what is behind a link is not the tour's to overwrite, and nobody may be reading a pipe.
+bool savePicture(const QPixmap& picture, const std::filesystem::path& file) {
+    QByteArray bytes;
+    QBuffer buffer(&bytes);
+    if (!buffer.open(QIODevice::WriteOnly) || !picture.save(&buffer, "PNG")) return false;
+    return emptyPlainFile(file) && appendToPlainFile(file, {bytes.constData(), static_cast<std::size_t>(bytes.size())});
 }
 
 /// Prints what is written and read while it lives, and counts the answers and what failed.
@@ -79,7 +84,7 @@ void TourDialogs::note(const QString& title, const QString& text) {
     m_print("!! " + title.toStdString() + ": " + text.simplified().toStdString());
 }
 
-int makeTour(HMenue& window, Instrument& instrument, const TourDialogs& dialogs, const QString& folder,
+int makeTour(HMenue& window, Instrument& instrument, const TourDialogs& dialogs, const std::filesystem::path& folder,
              const std::function<void(const std::string&)>& print) {
     if (instrument.isOpen()) window.GTL_Taste_Click();  // opened at the start already: the tour shows how
     TrafficPrinter traffic(instrument, print);
@@ -88,7 +93,9 @@ int makeTour(HMenue& window, Instrument& instrument, const TourDialogs& dialogs,
     window.INIT_Taste_Click();
 
     auto* pages = window.findChild<QTabWidget*>(QStringLiteral("SSTab1"));
-    if (!QDir().mkpath(folder)) ++failures;
+    std::error_code error;
+    std::filesystem::create_directories(folder, error);
+    if (error) ++failures;
     int pictures = 0;
     for (int page = 0; page < pages->count(); ++page) {
         pages->setCurrentIndex(page);
@@ -97,12 +104,12 @@ int makeTour(HMenue& window, Instrument& instrument, const TourDialogs& dialogs,
             ++failures;  // the program is to end
             break;
         }
-        const QString file = QDir(folder).filePath(QStringLiteral("page_%1.png").arg(page));
-        if (isPlainOrMissing(file) && window.grab().save(file)) {
+        const auto file = folder / ("page_" + std::to_string(page) + ".png");
+        if (savePicture(window.grab(), file)) {
             ++pictures;
         } else {
             ++failures;
-            print("!! cannot save " + file.toStdString());
+            print("!! cannot save " + shownPath(file));
         }
         for (const ReadBack& readBack : readBacks()) {
             auto* button = pages->widget(page)->findChild<QPushButton*>(QString::fromLatin1(readBack.button));

@@ -2,6 +2,7 @@
 
 #include <QString>
 
+#include <filesystem>
 #include <functional>
 #include <string>
 
@@ -34,7 +35,8 @@ private:
 /// Walks through the whole window as a user does: opens the session (which sends the data set), shows each page and
 /// saves a picture of it, presses every read-back button, and prints everything that passed.
 /// @returns 0 when the session opened, every picture was saved, every question was answered and no box showed.
-[[nodiscard]] int makeTour(HMenue& window, Instrument& instrument, const TourDialogs& dialogs, const QString& folder,
+[[nodiscard]] int makeTour(HMenue& window, Instrument& instrument, const TourDialogs& dialogs,
+                           const std::filesystem::path& folder,
                            const std::function<void(const std::string& line)>& print);
 
 }  // namespace kdx

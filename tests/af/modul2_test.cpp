@@ -32,6 +32,13 @@ TEST_F(FillAfListsTest, ANewListReplacesTheFormerOne) {
     EXPECT_EQ(rowsOf(list), Rows({"88.0"}));
 }
 
+TEST_F(FillAfListsTest, AnEntryWithADoubleQuoteIsRed) {
+    FillAfLists(list, tuned, "98.5,90.1\",94.3");
+    EXPECT_EQ(rowsOf(list), Rows({"90.1\"", "94.3"}));
+    EXPECT_EQ(list.item(0)->foreground().color(), QColor(Qt::red));
+    EXPECT_NE(list.item(1)->foreground().color(), QColor(Qt::red));
+}
+
 TEST_F(FillAfListsTest, AListWithoutACommaChangesNothing) {
     FillAfLists(list, tuned, "87.6,90.1");
     for (const char* text : {"", "100.1"}) {

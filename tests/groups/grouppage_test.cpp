@@ -264,6 +264,14 @@ TEST_F(LongGroupSequence, IsNotStoredAgainAsItWasRead) {
     EXPECT_EQ(folder.read(kSet1), stored);
 }
 
+TEST_F(LongGroupSequence, IsNotStoredWithAGroupMoreBehindTheCut) {
+    press({8});
+    EXPECT_NE(note(), "");
+    click("GS_Senden");
+    EXPECT_EQ(sent().size(), 1U);
+    EXPECT_EQ(folder.read(kSet1), stored);
+}
+
 TEST_F(LongGroupSequence, IsNotStoredInAnotherSetAsItWasRead) {
     setProfile("Datenset2.INI", "RDS", "GR_FOLGE", "0A,");
     state.CurrentDataSet = "2";

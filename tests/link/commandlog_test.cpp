@@ -82,13 +82,15 @@ TEST_F(CommandLogTest, APipeThatIsReadGetsNothing) {
     EXPECT_FALSE(m_log.isWritable());
 }
 
-TEST_F(CommandLogTest, AFolderOrADeviceInItsPlaceIsLeftAlone) {
+TEST_F(CommandLogTest, AFolderInItsPlaceIsLeftAlone) {
     fs::create_directory(place());
     writeAndEmpty();
     EXPECT_TRUE(fs::is_directory(place()));
     EXPECT_FALSE(m_log.isWritable());
-    fs::remove(place());
-    if (mknod(place().c_str(), S_IFCHR | 0600, makedev(1, 3)) != 0) return;  // needs an administrator
+}
+
+TEST_F(CommandLogTest, ADeviceInItsPlaceIsLeftAlone) {
+    if (mknod(place().c_str(), S_IFCHR | 0600, makedev(1, 3)) != 0) GTEST_SKIP() << "only an administrator makes one";
     m_log.empty();
     EXPECT_FALSE(m_log.isWritable());
 }

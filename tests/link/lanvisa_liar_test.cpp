@@ -45,6 +45,7 @@ protected:
     LanVisaLie() {
         options.ioTimeout = kIoTimeout;
         options.answerMargin = kMargin;
+        options.closeTimeout = kIoTimeout;
     }
     // Every time against a fresh connection: the one before may be given up.
     void openAnew() {

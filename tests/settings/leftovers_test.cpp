@@ -41,6 +41,15 @@ protected:
     test::TempFolder m_folder;
 };
 
+TEST_F(LeftoversTest, WhatEarlierVersionsLeftIsRemovedAndNothingElse) {
+    for (const char* name : {"Datenset1.INI.123456789.new", "RDS_Allg.INI.7.new", "Event.txt.12.new"})
+        m_folder.write(name, "half a fi");
+    const Names others = {"Datenset1.INI.new", "Datenset1.INI.a1.new", "Datenset6.INI.1.new", "notes.1.new", "1.new"};
+    for (const std::string& name : others) m_folder.write(name, "the user's");
+    sweepLeftovers(m_folder.data());
+    EXPECT_EQ(names(), others);
+}
+
 TEST_F(LeftoversTest, WhatKilledProgramsLeftIsRemoved) {
     m_folder.write("Datenset1.INI", "[RDS]\r\n");
     EXPECT_NE(leftByAKilledProgram("Datenset1.INI"), leftByAKilledProgram("RDS_Allg.INI"));

@@ -27,7 +27,7 @@ protected:
         session = std::make_unique<Session>(instrumentLink(), state, data, captions, clock, ask);
         tickers.setHeld(false);
         window = std::make_unique<HMenue>(Surroundings{*session, state, data, captions, clock, boxesOfWindow(), tickers,
-                                                       claim, QStringLiteral("scripted"), ask});
+                                                       claim, QStringLiteral("scripted"), QString(), ask});
         m_listener = std::make_unique<TrafficListener>(session->instrument, [this](const Traffic& traffic) {
             if (heard) heard(traffic);
         });

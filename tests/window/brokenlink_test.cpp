@@ -258,7 +258,7 @@ TEST_F(BrokenLinkTest, NoTimerTicksWhileTheBoxIsOpen) {
     LookingDialogs box;
     Session otherSession(*watched, state, data, captions, clock, [] {});
     TickerGroup otherTickers;
-    HMenue other({otherSession, state, data, captions, clock, box, otherTickers, claim, QString(), [] {}});
+    HMenue other({otherSession, state, data, captions, clock, box, otherTickers, claim, QString(), QString(), [] {}});
     other.startUp();
     other.INIT_Taste_Click();
     std::vector<int> active;

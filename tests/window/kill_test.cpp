@@ -87,7 +87,7 @@ protected:
         DataFolder killed(programFolder);
         Session work(visa, state, killed, captions, clock, [] {});
         window = std::make_unique<HMenue>(Surroundings{work, state, killed, captions, clock, dialogs, tickers, claim,
-                                                       QStringLiteral("scripted"), [] {}});
+                                                       QStringLiteral("scripted"), QString(), [] {}});
         window->startUp();
         window->show();
         openSession();

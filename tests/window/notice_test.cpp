@@ -15,7 +15,10 @@ class NoticeTest : public WindowTest {
 protected:
     NoticeTest() { folder.copyShipped(); }
     std::string notice() { return text("QuietLine"); }
-    void waitForRetry() { tick("UnsavedTimer"); }
+    void waitForRetry() {
+        EXPECT_EQ(window->findChild<QTimer*>(QStringLiteral("UnsavedTimer"))->interval(), 10'000);
+        tick("UnsavedTimer");
+    }
 };
 
 TEST_F(NoticeTest, ThereIsNoneWhenAllIsWell) {
@@ -93,6 +96,18 @@ TEST_F(QuoteTest, AValueWithADoubleQuoteIsToldAndMarkedUntilAnotherIsSent) {
     EXPECT_FALSE(isRed("PS_T"));
     click("PS_Taste");
     EXPECT_EQ(notice(), "");
+}
+
+TEST_F(QuoteTest, EveryTextThatGoesToTheCoderIsMarked) {
+    setDataSet1("RDS", "RTA", "say \"hello\"");
+    setDataSet1("RDS", "EON_PI", "D3C1");
+    setDataSet1("RDS", "EON_PS", "E\"ON");
+    setDataSet1("RDS", "AF_LISTE1", "98.5,90.1\"");
+    setDataSet1("RDS", "EON_AFB1", "98.5,90.1\"");
+    start();
+    EXPECT_TRUE(isRed("EON_PS_Text"));
+    openSession();
+    EXPECT_EQ(notice(), "Anführungszeichen beendet den Text: AF1, EON_AFB1, EON_PS, RT");
 }
 
 TEST_F(QuoteTest, ACraftedDataSetIsToldByItsKeysAndMarkedFromTheStart) {

@@ -310,7 +310,7 @@ TEST_F(StartUpTest, AMissingFolderWhoseNameIsNoUtf8IsTold) {
     captions.load("deutsch", "RDS");
     Session other(visa, state, odd, captions, clock, [] {});
     TickerGroup group;
-    HMenue shown({other, state, odd, captions, clock, dialogs, group, claim, QString(), [] {}});
+    HMenue shown({other, state, odd, captions, clock, dialogs, group, claim, QString(), QString(), [] {}});
     shown.startUp();
     EXPECT_TRUE(shown.findChild<QLabel*>(QStringLiteral("QuietLine"))->text().contains(QStringLiteral("\\xFCrgen")));
 }
