@@ -2,11 +2,11 @@
 
 #include <QMainWindow>
 
-#include <functional>
 #include <vector>
 
 #include "station/session.h"
 #include "ui/pagecontext.h"
+#include "window/surroundings.h"
 
 class QGroupBox;
 class QPushButton;
@@ -15,29 +15,12 @@ class QTabWidget;
 namespace kdx {
 
 class ConnectionBar;
-class FolderClaim;
 class LogView;
 class MainMenu;
 class Page;
 class ProgressLine;
 class StatusRow;
-class TickerGroup;
 class TrafficLog;
-
-/// What the window works with; everything is borrowed and outlives it.
-struct Surroundings {
-    Session& session;
-    ProgramState& state;
-    DataFolder& data;
-    Captions& captions;
-    Clock& clock;
-    Dialogs& dialogs;
-    TickerGroup& tickers;
-    const FolderClaim& claim;          ///< on the data folder
-    QString linkDescription;           ///< how instruments are reached, for the about box
-    QString dataProblem;               ///< what is wrong with the data folder, in words; usually nothing
-    std::function<void()> endProgram;  ///< ends the program at once
-};
 
 /// The one main window: owns the pages and what ties them together.
 class HMenue : public QMainWindow, private StepWatcher {

@@ -97,7 +97,9 @@ TEST_F(StatusTest, StatusByteHasTheMasterSummaryOfWhatServiceIsEnabledFor) {
 
 TEST_F(StatusTest, OperationAndQuestionableRegistersHaveNothingToTell) {
     for (const std::string group : {"STAT:OPER", "STATUS:QUESTIONABLE"}) {
-        EXPECT_EQ(ask(group + "?;:" + group + ":EVEN?;COND?;ENAB?"), "0;0;0;0");
+        std::string questions = group + "?;:";
+        questions.append(group).append(":EVEN?;COND?;ENAB?");
+        EXPECT_EQ(ask(questions), "0;0;0;0");
         tell(group + ":ENAB 32769");
         EXPECT_EQ(ask(group + ":ENABLE?"), "1") << "the highest bit is not used";
         tell(group + ":ENABLE 65536");

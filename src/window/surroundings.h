@@ -1,0 +1,33 @@
+#pragma once
+
+#include <QString>
+
+#include <functional>
+
+namespace kdx {
+
+class Captions;
+class Clock;
+class DataFolder;
+class Dialogs;
+class FolderClaim;
+struct ProgramState;
+struct Session;
+class TickerGroup;
+
+/// What the window works with; everything is borrowed and outlives it.
+struct Surroundings {
+    Session& session;
+    ProgramState& state;
+    DataFolder& data;
+    Captions& captions;
+    Clock& clock;
+    Dialogs& dialogs;
+    TickerGroup& tickers;
+    const FolderClaim& claim;          ///< on the data folder
+    QString linkDescription;           ///< how instruments are reached, for the about box
+    QString dataProblem;               ///< what is wrong with the data folder, in words; usually nothing
+    std::function<void()> endProgram;  ///< ends the program at once
+};
+
+}  // namespace kdx
