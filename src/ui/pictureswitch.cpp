@@ -19,14 +19,15 @@ namespace {
 
 constexpr int kPictureWidth = 32;
 constexpr int kPictureHeight = 16;
-constexpr std::size_t kLargestPicture = 1024 * 1024;  // bytes; what is longer is none
+constexpr std::size_t kLargestPicture = std::size_t{1024} * 1024;  // bytes; what is longer is none
 
 /// The picture of the file that is sharpest at the width; an empty one when none can be read.
 QPixmap loadPicture(const std::filesystem::path& file, int width) {
     std::optional<std::string> bytes = readFile(file);
     if (!bytes) return {};
     QBuffer buffer;
-    buffer.setData(bytes->data(), static_cast<int>(std::min(bytes->size(), kLargestPicture)));
+    bytes->resize(std::min(bytes->size(), kLargestPicture));
+    buffer.setData(QByteArray::fromStdString(*bytes));
     buffer.open(QIODevice::ReadOnly);
     QImageReader reader(&buffer);
     QImage best;

@@ -1,6 +1,7 @@
 /// A VISA library for the tests: one instrument, which takes commands and gives each back when it is read. A command
 /// that begins with "STATUS " makes the operation itself give the number that follows; so does a resource name.
 
+#include <algorithm>
 #include <cstdint>
 #include <cstdio>
 #include <cstdlib>
@@ -40,7 +41,7 @@ std::int32_t viOpenDefaultRM(Unsigned* resourceManager) {
 std::int32_t viRead(Unsigned session, unsigned char* buffer, Unsigned size, Unsigned* count) {
     if (session != kSession) return kInvalidObject;
     const Unsigned taken = held.size() < size ? static_cast<Unsigned>(held.size()) : size;
-    std::memcpy(buffer, held.data(), taken);
+    std::copy_n(held.data(), taken, buffer);
     held.erase(0, taken);
     *count = taken;
     return held.empty() ? 0 : 1073676294;

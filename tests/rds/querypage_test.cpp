@@ -97,10 +97,11 @@ TEST_P(EveryQueryButton, AsksInTurnAndLogsEachQuestionUnderItsName) {
     EXPECT_EQ(static_cast<std::size_t>(visa.reads), GetParam().asked.size());
     std::string log;
     for (const auto& [label, key] : GetParam().asked) {
-        const std::string head = rightmost(std::string(20, ' ') + label, 15) + "= ";
-        log += head + (GetParam().generator ? ":? " : ":STEREO:DIRECT? ") + "\"" + key + "\"\r\n";
-        log += head + "Answer \"" + padRight("\"1\"\n", 60) + "\"\r\n";
-        log += std::string(8, ' ') + "Anzeige= " + (GetParam().generator ? "\"1\"" : "1") + "\r\n";
+        const std::string head = rightmost(std::string(20, ' ').append(label), 15).append("= ");
+        log.append(head).append(GetParam().generator ? ":? " : ":STEREO:DIRECT? ");
+        log.append("\"").append(key).append("\"\r\n");
+        log.append(head).append("Answer \"").append(padRight("\"1\"\n", 60)).append("\"\r\n");
+        log.append(8, ' ').append("Anzeige= ").append(GetParam().generator ? "\"1\"" : "1").append("\r\n");
     }
     EXPECT_EQ(folder.read(kCommandLog), log);
 }

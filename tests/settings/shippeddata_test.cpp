@@ -106,9 +106,10 @@ protected:
 };
 
 TEST_F(ShippedData, EveryNumberHasATextInEveryLanguage) {
-    for (const char* language : kLanguages)
+    for (const char* language : kLanguages) {
         for (const int number : captionNumbers())
             EXPECT_THAT(text(language, number), Not(IsEmpty())) << language << " " << number;
+    }
 }
 
 TEST_F(ShippedData, TheThreeLanguagesHaveTheSameNumbers) {
@@ -139,9 +140,10 @@ TEST_F(ShippedData, ANumberBelowTheOwnTextsIsOneThatIsAskedFor) {
 
 TEST_F(ShippedData, EveryTextSurvivesReading) {
     const Sections all = sections(kLanguageFile);
-    for (const auto& [section, keys] : all)
+    for (const auto& [section, keys] : all) {
         for (const auto& [key, value] : keys)
             EXPECT_EQ(m_data.ReadIni(section, key, kLanguageFile), withoutQuotes(value)) << section << " " << key;
+    }
 }
 
 TEST_F(ShippedData, TheGroupHeadingFitsTheFixedCutOfEveryLanguage) {
@@ -162,10 +164,11 @@ TEST_F(ShippedData, TheOnAndOffWordsAreBare) {
 }
 
 TEST_F(ShippedData, TextsShownInLabelsAndBoxesHaveNoMnemonicMark) {
-    for (const char* language : kLanguages)
+    for (const char* language : kLanguages) {
         for (const int number : {21,  22,  40,  41,  56,  57,  74,  81,  83,  88,  139, 142, 143, 144, 161, 162,
                                  163, 164, 165, 166, 167, 168, 169, 192, 193, 210, 211, 213, 214, 216, 217, 220})
             EXPECT_EQ(text(language, number).find('&'), std::string::npos) << language << " " << number;
+    }
 }
 
 TEST_F(ShippedData, NineTabsFitBesideEachOther) {
@@ -305,12 +308,13 @@ TEST_P(ShippedDataSet, IsAWholeStation) {
 }
 
 TEST_P(ShippedDataSet, HasFiveWellFormedListsOfEachKind) {
-    for (const char* kind : {"AF_LISTE", "EON_AFB"})
+    for (const char* kind : {"AF_LISTE", "EON_AFB"}) {
         for (int list = 1; list <= 5; ++list) {
             const std::string text = read("RDS", kind + std::to_string(list));
             EXPECT_TRUE(isAfList(text)) << kind << list << "=" << text;
             EXPECT_LE(std::ranges::count(text, ','), 12) << "method B refuses more: " << text;
         }
+    }
 }
 
 TEST_P(ShippedDataSet, HasRfAndAudioValuesInsideItsLimits) {
@@ -383,9 +387,10 @@ TEST_F(ShippedData, ThePicturesAreIconsForOneAndTwoScreenScales) {
         const auto count = static_cast<unsigned char>(icon[4]);
         ASSERT_GE(icon.size(), 6U + 16U * count) << name;
         std::set<std::pair<int, int>> sizes;
-        for (std::size_t image = 0; image < count; ++image)
+        for (std::size_t image = 0; image < count; ++image) {
             sizes.insert(
                 {static_cast<unsigned char>(icon[6 + 16 * image]), static_cast<unsigned char>(icon[7 + 16 * image])});
+        }
         EXPECT_TRUE(sizes.contains({32, 16})) << name;
         EXPECT_TRUE(sizes.contains({64, 32})) << name;
     }

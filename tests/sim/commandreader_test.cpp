@@ -91,7 +91,8 @@ TEST_F(CommandReader, TakesTheWordsForTheEndsOfARangeAndTheDefault) {
         const std::string text = word;
         EXPECT_EQ(ask("FREQ? " + text), frequency);
         EXPECT_EQ(ask(":STEREO:PILOT:PHASE? " + text), phase);
-        tell("FREQ " + text + ";:STEREO:PILOT:PHASE " + text);
+        std::string both = "FREQ " + text;
+        tell(both.append(";:STEREO:PILOT:PHASE ").append(text));
         EXPECT_EQ(ask("FREQ?;:STEREO:PILOT:PHASE?"), std::string(frequency) + ";" + phase);
     }
     EXPECT_EQ(error(), 0);

@@ -61,7 +61,7 @@ TEST(RpcRecord, ManySmallFragmentsCostNoMoreThanTheirBytes) {
     constexpr int kFragments = 200000;
     std::string bytes;
     for (int i = 0; i < kFragments; ++i) bytes += "\x00\x00\x00\x01x"s;
-    RecordReader reader(2 * kFragments);
+    RecordReader reader(std::size_t{2} * kFragments);
     const auto start = std::chrono::steady_clock::now();
     reader.feed(bytes + framed(""));
     EXPECT_EQ(reader.next().value_or("").size(), static_cast<std::size_t>(kFragments));
