@@ -48,7 +48,10 @@ TEST_F(InstrumentTest, AStoppedSequenceSendsAsksAndLogsNothingMore) {
 
 TEST_F(InstrumentTest, OutsideASequenceNothingCanBeStopped) {
     visa.writeStatus = visa::kConnectionLost;
-    stopAtFailure = true;
+    instrument.onFailure([this](const std::string& text, bool) {
+        failures.push_back(text);
+        return true;
+    });
     instrument.Send2Gen("one");
     instrument.Send2Gen("two");
     EXPECT_EQ(failures.size(), 2U);

@@ -109,7 +109,7 @@ TEST_F(MessageExchangeTest, AnswersOf64KibibytesAreKeptAndNoMore) {
         client.write(link, messages + std::string(lastAnswer - 1, 'x') + "?");
     };
     ask(36);
-    EXPECT_EQ(m_device.errors(), Errors{});
+    ASSERT_EQ(m_device.errors(), Errors{});
     for (int i = 0; i < 131; ++i) EXPECT_EQ(client.read(link).data.size(), 500U);
     EXPECT_EQ(client.read(link).data.size(), 36U);
     ask(37);
