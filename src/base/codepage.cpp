@@ -59,6 +59,22 @@ std::string fromUtf8(std::string_view text) {
     return bytes;
 }
 
+std::string toUtf8(std::string_view text) {
+    std::string utf8;
+    for (const char c : text) {
+        const auto code = static_cast<unsigned>(fromCodePage(static_cast<unsigned char>(c)));
+        if (code < 0x80) {
+            utf8 += c;
+        } else if (code < 0x800) {
+            utf8 += {static_cast<char>(0xC0U | code >> 6U), static_cast<char>(0x80U | (code & 0x3FU))};
+        } else {
+            utf8 += {static_cast<char>(0xE0U | code >> 12U), static_cast<char>(0x80U | (code >> 6U & 0x3FU)),
+                     static_cast<char>(0x80U | (code & 0x3FU))};
+        }
+    }
+    return utf8;
+}
+
 bool inCodePage(char16_t codePoint) {
     return byteOf(codePoint) >= 0;
 }

@@ -1,0 +1,25 @@
+#pragma once
+
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace kdx {
+
+/// What a key of the key table stands for and which values the instrument takes for it, in words.
+struct KeyFacts {
+    std::string_view key;
+    std::string_view meaning;
+    std::string range;      ///< "0 to 31"; "" for a key whose value does not matter
+    bool isNumber = false;  ///< whether its values are numbers that can be counted up
+};
+
+/// The facts of every key, in the order of the key table.
+[[nodiscard]] const std::vector<KeyFacts>& keyFacts();
+
+/// Nothing when the instrument takes the value; else what is wrong in words, with the key, the value and what is legal.
+/// An unknown key is wrong too. Values are 8-bit Windows-1252; the sentence is UTF-8.
+[[nodiscard]] std::optional<std::string> wrongValue(std::string_view key, std::string_view value);
+
+}  // namespace kdx
