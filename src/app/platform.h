@@ -16,6 +16,12 @@ namespace kdx {
 /// Whether a window can be shown.
 [[nodiscard]] bool hasDisplay();
 
+/// Whether the standard error is a terminal.
+[[nodiscard]] bool errorIsTerminal();
+
+/// Whether the descriptor can be read without waiting; false for -1.
+[[nodiscard]] bool isReadable(int descriptor);
+
 /// From now on the system's requests to end the program (SIGTERM, SIGINT, SIGHUP) no longer end it at once: they make
 /// the descriptor that this gives readable. -1 when they cannot be had so.
 [[nodiscard]] int endRequests();

@@ -1,4 +1,5 @@
 #include <fcntl.h>
+#include <poll.h>
 #include <unistd.h>
 
 #include <array>
@@ -45,6 +46,15 @@ std::filesystem::path userFolder() {
 
 bool hasDisplay() {
     return !variable("DISPLAY").empty() || !variable("WAYLAND_DISPLAY").empty() || !variable("QT_QPA_PLATFORM").empty();
+}
+
+bool errorIsTerminal() {
+    return isatty(STDERR_FILENO) == 1;
+}
+
+bool isReadable(int descriptor) {
+    pollfd asked{descriptor, POLLIN, 0};
+    return descriptor >= 0 && poll(&asked, 1, 0) == 1;
 }
 
 int endRequests() {

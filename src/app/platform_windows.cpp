@@ -22,6 +22,14 @@ bool hasDisplay() {
     return true;
 }
 
+bool errorIsTerminal() {
+    return GetFileType(GetStdHandle(STD_ERROR_HANDLE)) == FILE_TYPE_CHAR;
+}
+
+bool isReadable(int /*descriptor*/) {
+    return false;  // there is none: see endRequests
+}
+
 int endRequests() {
     return -1;  // there the system closes the window
 }

@@ -245,6 +245,7 @@ std::optional<std::string> problem(const Row& row, std::string_view value) {
 const std::vector<KeyFacts>& keyFacts() {
     static const std::vector<KeyFacts> all = [] {
         std::vector<KeyFacts> facts;
+        facts.reserve(kRows.size());
         for (const Row& row : kRows)
             facts.push_back({row.key, row.meaning, range(row), row.kind == Kind::Whole || row.kind == Kind::Number});
         return facts;

@@ -2,6 +2,7 @@
 
 #include "base/codepage.h"
 #include "base/numbers.h"
+#include "link/instrument.h"
 #include "settings/captions.h"
 
 namespace kdx {
@@ -128,97 +129,106 @@ using Ask = const std::string&;
 
 }  // namespace
 
+std::vector<std::string> ask(Instrument& instrument, const ReadBack& readBack, const std::string& eonIdentifier) {
+    std::vector<std::string> answers;
+    for (const Query& query : readBack.queries(eonIdentifier)) {
+        answers.push_back(readBack.generator ? instrument.VRN_Abfrage(query.label, query.key)
+                                             : instrument.X4_Abfrage(query.label, query.key));
+    }
+    return answers;
+}
+
 const std::vector<ReadBack>& readBacks() {
     static const std::vector<ReadBack> all = {
         // "Stereo Mode??" bears two question marks; it reaches the log only.
-        {"Command1", "A R I ?", 134, false,
+        {"ari", "ARI signal: on, deviation, identification, area", "Command1", "A R I ?", 134, false,
          [](Ask) -> Queries {
              return {{"Ari ein/aus?", "ARI"}, {"ARI Hub?", "ARI-DEV"}, {"ARI mode?", "ARI-ID"}, {"BK?", "BK"}};
          },
          ari},
-        {"Command4", "AF ?", 126, false, afQueries, afLists},
-        {"Command5", "PS ?", 123, false,
+        {"af", "lists of alternative frequencies", "Command4", "AF ?", 126, false, afQueries, afLists},
+        {"ps", "programme service name", "Command5", "PS ?", 123, false,
          [](Ask) -> Queries {
              return {{"PS?", "PS"}};
          },
          asItStands},
-        {"Command6", "PI ?", 127, false,
+        {"pi", "programme identification", "Command6", "PI ?", 127, false,
          [](Ask) -> Queries {
              return {{"PI?", "PI"}};
          },
          asItStands},
-        {"Command7", "PTY ?", 124, false,
+        {"pty", "programme type", "Command7", "PTY ?", 124, false,
          [](Ask) -> Queries {
              return {{"PTY?", "PTY"}};
          },
          asItStands},
-        {"Command8", "RT ?", 125, false,
+        {"rt", "radiotext", "Command8", "RT ?", 125, false,
          [](Ask) -> Queries {
              return {{"RT?", "RT"}};
          },
          asItStands},
-        {"Command9", "Zeit ?", 130, false,
+        {"time", "clock time", "Command9", "Zeit ?", 130, false,
          [](Ask) -> Queries {
              return {{"CT?", "CT"}};
          },
          asItStands},
-        {"Command10", "Freq ?", 520, true,
+        {"frequency", "RF frequency", "Command10", "Freq ?", 520, true,
          [](Ask) -> Queries {
              return {{"Freq?", "FREQ"}};
          },
          [](const Answers& answers, const Captions&) { return answers[0] + " MHz"; }},
-        {"Command11", "FM Hub ?", 135, false,
+        {"deviation", "total deviation", "Command11", "FM Hub ?", 135, false,
          [](Ask) -> Queries {
              return {{"MPX Hub?", "MPX-DEV"}};
          },
          fmDeviation},
-        {"Command12", "FM Source ?", 136, false,
+        {"source", "source of the modulation", "Command12", "FM Source ?", 136, false,
          [](Ask) -> Queries {
              return {{"Mod Eingang?", "SRC"}};
          },
          [](const Answers& answers, const Captions&) { return "Mod Quelle: " + answers[0]; }},
-        {"Command13", "Pre.phase ?", 137, false,
+        {"preemphasis", "preemphasis", "Command13", "Pre.phase ?", 137, false,
          [](Ask) -> Queries {
              return {{"Preemphasis?", "PRE"}};
          },
          [](const Answers& answers, const Captions& captions) { return readback::preemphasis(answers[0], captions); }},
-        {"Command14", "Pilot-Ton ?", 132, false,
+        {"pilot", "pilot tone: on, deviation, phase", "Command14", "Pilot-Ton ?", 132, false,
          [](Ask) -> Queries {
              return {{"Pilot?", "PIL"}, {"Pilot Hub?", "PIL-DEV"}, {"Pilot Phase?", "PIL-PH"}};
          },
          pilot},
-        {"Command15", "Ster.-Mode ?", 133, false,
+        {"mode", "stereo mode", "Command15", "Ster.-Mode ?", 133, false,
          [](Ask) -> Queries {
              return {{"Stereo Mode??", "MODE"}};
          },
          asItStands},
-        {"Command16", "R D S ?", 131, false,
+        {"rds", "RDS subcarrier: on, deviation", "Command16", "R D S ?", 131, false,
          [](Ask) -> Queries {
              return {{"RDS?", "RDS"}, {"RDS-Hub?", "RDS-DEV"}};
          },
          rds},
-        {"Command17", "Gruppen ?", 122, false,
+        {"groups", "group sequence", "Command17", "Gruppen ?", 122, false,
          [](Ask) -> Queries {
              return {{"Gruppenfolge?", "GS"}};
          },
          asItStands},
-        {"Command18", "Impedanz ?", 138, false,
+        {"impedance", "input impedance", "Command18", "Impedanz ?", 138, false,
          [](Ask) -> Queries {
              return {{"Impedanz?", "IMP"}};
          },
          [](const Answers& answers, const Captions&) { return readback::impedance(answers[0]); }},
-        {"Command19", "EON  ?", 121, false, eonQueries, eon},
-        {"Command20", "M / S ?", 129, false,
+        {"eon", "other network", "Command19", "EON  ?", 121, false, eonQueries, eon},
+        {"ms", "music or speech", "Command20", "M / S ?", 129, false,
          [](Ask) -> Queries {
              return {{"M/S ?", "MS"}};
          },
          [](const Answers& answers, const Captions& captions) { return readback::musicSpeech(answers[0], captions); }},
-        {"Command21", "D I ?", 128, false,
+        {"di", "decoder information", "Command21", "D I ?", 128, false,
          [](Ask) -> Queries {
              return {{"Decoder?", "DI"}};
          },
          [](const Answers& answers, const Captions& captions) { return readback::decoderInfo(answers[0], captions); }},
-        {"Command22", "Pegel ?", 521, true,
+        {"level", "RF level", "Command22", "Pegel ?", 521, true,
          [](Ask) -> Queries {
              return {{"Pegel?", "POW"}};
          },

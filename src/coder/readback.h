@@ -6,6 +6,7 @@
 namespace kdx {
 
 class Captions;
+class Instrument;
 
 /// How an answer becomes the text that is shown. Texts are 8-bit Windows-1252; "" stands for a failed read.
 namespace readback {
@@ -30,6 +31,8 @@ struct Query {
 
 /// A read-back button: what it asks, and how the answers become the text that is shown.
 struct ReadBack {
+    const char* name;     ///< short, for who types it
+    const char* meaning;  ///< what it asks for, in English
     const char* button;
     const char* design;  ///< caption where the language file has none
     int caption;         ///< its caption number
@@ -37,6 +40,11 @@ struct ReadBack {
     std::vector<Query> (*queries)(const std::string& eonIdentifier);
     std::string (*words)(const std::vector<std::string>& answers, const Captions& captions);
 };
+
+/// Asks the instrument all questions of the button. @param eonIdentifier PI of the other network at work.
+/// @returns the answers in their order, "" for one that could not be read.
+[[nodiscard]] std::vector<std::string> ask(Instrument& instrument, const ReadBack& readBack,
+                                           const std::string& eonIdentifier);
 
 /// All twenty buttons, in the order of their names.
 [[nodiscard]] const std::vector<ReadBack>& readBacks();

@@ -248,7 +248,11 @@ std::optional<std::string> composeCommand(std::string_view key, std::string& val
     std::string command(row->command);
     if (row->route == Route::Eon) command.append(context.eonIdentifier).append(",");
     command.append(formatted(*row, value, context)).append(row->unit);
-    return row->route == Route::Scpi ? command : std::string(kCoderCommand).append("\"").append(command).append("\"");
+    return row->route == Route::Scpi ? command : coderCommand(command);
+}
+
+std::string coderCommand(std::string_view command) {
+    return std::string(kCoderCommand).append("\"").append(command).append("\"");
 }
 
 bool endsItsTextEarly(std::string_view command) {
@@ -267,12 +271,16 @@ void ParamSender::SendParam(const std::string& key, std::string& value, const st
     }
     const ParamContext context{m_state.eonIdentifier, m_state.shownClock, timeText(m_clock), dateText(m_clock.today())};
     const std::optional<std::string> command = composeCommand(key, value, context);
-    if (!command || m_instrument.isSequenceStopped()) return;
-    noteQuotes(key, *command);
-    m_instrument.WriteLog(key, "", *command);
+    if (command) sendCommand(key, *command);
+}
+
+void ParamSender::sendCommand(const std::string& key, const std::string& command) {
+    if (m_instrument.isSequenceStopped()) return;
+    noteQuotes(key, command);
+    m_instrument.WriteLog(key, "", command);
     // Gives the coder time to take one command before the next; without a session nothing is sent to it.
     if (m_state.InstrumentOnline) WaitMs(m_clock, kCommandPauseMs);
-    m_instrument.Send2Gen(*command);
+    m_instrument.Send2Gen(command);
 }
 
 void ParamSender::noteQuotes(const std::string& key, std::string_view command) {

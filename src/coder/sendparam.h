@@ -30,6 +30,9 @@ struct ParamContext {
 [[nodiscard]] std::optional<std::string> composeCommand(std::string_view key, std::string& value,
                                                         const ParamContext& context);
 
+/// The coder's command as the generator passes it on: inside ":STEREO:DIRECT " and double quotes.
+[[nodiscard]] std::string coderCommand(std::string_view command);
+
 /// Whether a text in the command holds a double quote: the coder takes the text for ended there and the instrument
 /// refuses the rest, or takes it for a command of its own.
 [[nodiscard]] bool endsItsTextEarly(std::string_view command);
@@ -53,6 +56,9 @@ public:
     void SendParam(const std::string& key, std::string& value);
     /// The same for a value that nobody keeps.
     void SendParam(const std::string& key, std::string&& value);
+
+    /// Logs a composed command under the key, waits 50 ms and writes it.
+    void sendCommand(const std::string& key, const std::string& command);
 
     /// Keys whose value went out last with a double quote in it.
     [[nodiscard]] const std::set<std::string>& quotedKeys() const { return m_quotedKeys; }

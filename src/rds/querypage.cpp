@@ -82,11 +82,8 @@ void QueryPage::Fragen_Schalter(bool on) {
 void QueryPage::ask(const ReadBack& readBack) {
     if (!m_with.state.InstrumentOnline) return;
     const CommandSequence sequence(m_with.instrument);
-    std::vector<std::string> answers;  // of this call: a box of a failed question lets another button be pressed
-    for (const Query& query : readBack.queries(m_with.state.eonIdentifier)) {
-        answers.push_back(readBack.generator ? m_with.instrument.VRN_Abfrage(query.label, query.key)
-                                             : m_with.instrument.X4_Abfrage(query.label, query.key));
-    }
+    // Kept here while they come: a box of a failed question lets another button be pressed.
+    std::vector<std::string> answers = kdx::ask(m_with.instrument, readBack, m_with.state.eonIdentifier);
     m_answers = std::move(answers);
     m_asked = &readBack;
     showAnswers();

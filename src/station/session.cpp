@@ -18,7 +18,7 @@ Session::Session(Visa& visa, ProgramState& state, DataFolder& data, const Captio
       m_source(profile) {}
 
 Session::~Session() {
-    if (instrument.isOpen()) instrument.close();
+    if (instrument.isOpen() && !m_kept) instrument.close();
 }
 
 void Session::load(const Profile& source) {

@@ -33,6 +33,8 @@ struct Session {
     bool sendDataSet();
     /// Closes the session.
     void close();
+    /// Lets an open session be when this goes: the instrument stays in remote.
+    void keepOpen() { m_kept = true; }
 
     Instrument instrument;
     ParamSender params;
@@ -45,6 +47,7 @@ private:
 
     ProgramState& m_state;
     Clock& m_clock;
+    bool m_kept = false;
     Profile m_source;
 };
 

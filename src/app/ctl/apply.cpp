@@ -1,0 +1,78 @@
+#include <CLI/CLI.hpp>
+
+#include <memory>
+
+#include "app/ctl/laboratory.h"
+#include "app/ctl/rehearsal.h"
+#include "base/codepage.h"
+#include "coder/sendparam.h"
+
+namespace kdx::ctl {
+
+namespace {
+
+struct Apply {
+    int dataSet = 1;
+    std::string file;
+    bool keepOpen = false;
+    bool dryRun = false;
+};
+
+/// Whether anything of the data set is not legal; each is told. What the data set does not say, and what the program
+/// has no command for, is sent empty as it always was.
+bool isLegal(Laboratory& laboratory, const Steps& steps) {
+    bool legal = true;
+    for (const Step& step : steps) {
+        std::string value = step.value;
+        if (step.kind != Step::Kind::Parameter || value.empty()) continue;
+        if (composeCommand(step.key, value, {}).value_or("").empty()) continue;
+        if (!laboratory.mayBeSent(step.key, step.value)) legal = false;
+    }
+    return legal;
+}
+
+int apply(Laboratory& laboratory, const Apply& what) {
+    Session& session = laboratory.session();
+    laboratory.state().CurrentDataSet = std::to_string(what.dataSet);
+    const std::string file = what.file.empty() ? dataSetFile(laboratory.state().CurrentDataSet)
+                                               : std::filesystem::absolute(what.file).string();
+    if (!laboratory.data().profile(file)) {
+        laboratory.output().problem(file + " cannot be read");
+        return kWrongCall;
+    }
+    session.load(Profile::ofFile(laboratory.data(), file));
+    const Steps steps = openingSteps(session.station);
+    if (!isLegal(laboratory, steps)) return kWrongCall;
+    if (what.dryRun) {
+        Rehearsal rehearsal(laboratory.data(), laboratory.captions());
+        rehearsal.apply(Profile::ofFile(laboratory.data(), file));
+        for (const std::string& command : rehearsal.commands()) {
+            laboratory.output().line(toUtf8(command));
+            laboratory.output().document["commands"].push_back(toUtf8(command));
+        }
+        return kDone;
+    }
+    if (!laboratory.open()) return kNoConnection;
+    session.sendOpening();
+    if (what.keepOpen) {
+        laboratory.keepOpen();
+    } else {
+        session.close();
+    }
+    return laboratory.result();
+}
+
+}  // namespace
+
+void addApply(CLI::App& app, Task& task) {
+    auto what = std::make_shared<Apply>();
+    CLI::App* command = app.add_subcommand("apply", "Send a whole data set, as opening the session in the window does");
+    auto* number = command->add_option("--data-set", what->dataSet, "the data set, 1 to 5")->check(CLI::Range(1, 5));
+    command->add_option("--file", what->file, "any data-set file instead")->type_name("FILE")->excludes(number);
+    command->add_flag("--keep-open", what->keepOpen, "leave the instrument in remote at the end");
+    command->add_flag("--dry-run", what->dryRun, "print the commands and send none");
+    command->footer("Example: kdx-ctl apply --data-set 2");
+    command->callback([what, &task] { task = [what](Laboratory& laboratory) { return apply(laboratory, *what); }; });
+}
+
+}  // namespace kdx::ctl

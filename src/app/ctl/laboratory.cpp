@@ -1,0 +1,159 @@
+#include "app/ctl/laboratory.h"
+
+#include "app/platform.h"
+#include "base/codepage.h"
+#include "base/numbers.h"
+#include "base/printable.h"
+#include "coder/keyfacts.h"
+#include "link/visastatus.h"
+#include "settings/dataplace.h"
+#include "settings/generalsettings.h"
+#include "sim/virtualinstrument.h"
+
+namespace kdx::ctl {
+
+namespace {
+
+std::filesystem::path appFolder(const Call& call, Output& output, const char* program) {
+    DataPlaces places;
+    if (call.program.appFolder) places.asked = *call.program.appFolder;
+    places.program = programFolder(program);
+    places.user = userFolder();
+    places.shipped = shippedFolder(places.program, KDX_SHIPPED_DATA);
+    std::string problem;
+    auto folder = chooseAppFolder(places, problem);
+    if (!problem.empty()) output.problem(problem);
+    return folder;
+}
+
+/// What the user can do about a status.
+std::string advice(VisaStatus status) {
+    switch (status) {
+        case visa::kTimeout:
+            return "The instrument keeps silent: look whether it is busy, or locked at its front panel.";
+        case visa::kConnectionLost:
+        case visa::kInputOutput:
+            return "Look whether it is switched on and the cable is plugged in, then try again.";
+        case visa::kResourceNotFound:
+            return "Look at the address, and whether the instrument is switched on.";
+        case visa::kLibraryNotFound:
+            return "GPIB needs an installed VISA library; --visa-library names one.";
+        case visa::kResourceLocked:
+            return "Another program holds it locked.";
+        default:
+            return "kdx-ctl -v shows every command with its status.";
+    }
+}
+
+}  // namespace
+
+Laboratory::Laboratory(const Call& call, Output& output, const char* program, int stop)
+    : m_call(call),
+      m_output(output),
+      m_stop(stop),
+      m_data(appFolder(call, output, program)),
+      m_captions(m_data),
+      m_link(chooseVisa(call.program, m_clock)) {
+    if (!m_link.visa) return;
+    m_session = std::make_unique<Session>(*m_link.visa, m_state, m_data, m_captions, m_clock, [this] {
+        // A data set that holds the key which ends the program: the rest is not sent.
+        m_output.problem("the key DS ended the run");
+        m_stopped = true;
+        m_session->transmitter.stop();
+    });
+    const Profile& profile = m_session->profile;
+    m_state.LogEnabled = leadingNumber(profile.read(setting::kCommandLogOn)) == 1;
+    m_captions.load(profile.read(setting::kLanguage), profile.read(setting::kStandard));
+    m_session->transmitter.setWatcher(this);
+    m_session->instrument.onFailure([this](const std::string&, bool) { return linkFailed(); });
+    m_session->instrument.addWatcher(*this);
+}
+
+Laboratory::~Laboratory() {
+    if (!m_session) return;
+    m_session->instrument.removeWatcher(*this);
+    m_session->instrument.onFailure(nullptr);
+}
+
+bool Laboratory::open() {
+    // A run goes on over midnight, whatever the window is to do.
+    m_clock.correctMidnight(true);
+    if (!m_session) {
+        m_output.problem(m_link.description);
+        return false;
+    }
+    const Profile& profile = m_session->profile;
+    std::string kind = profile.read(setting::kInterface);
+    std::string address = profile.read(kind == "TCPIP" ? setting::kLanAddress : setting::kGpibAddress);
+    if (m_call.lan) {
+        kind = "TCPIP";
+        address = *m_call.lan;
+        if (const auto comma = address.find(','); comma != std::string::npos) address.replace(comma, 1, "::");
+    } else if (m_call.gpib) {
+        kind = "IEC";
+        address = std::to_string(*m_call.gpib);
+    }
+    if (m_session->open(kind, address) == visa::kSuccess) return true;
+    const std::string place = kind == "TCPIP" ? address : "GPIB address " + address;
+    m_output.problem("no connection to " + place + ": " + statusText());
+    return false;
+}
+
+bool Laboratory::run(const Steps& steps) {
+    if (stopAsked()) return false;
+    return m_session->transmitter.run(steps) && result() == kDone;
+}
+
+bool Laboratory::goesOn() {
+    return !stopAsked() && (!m_failed || m_call.continues);
+}
+
+bool Laboratory::mayBeSent(const std::string& key, const std::string& value) {
+    if (m_call.force) return true;
+    const auto wrong = wrongValue(key, value);
+    if (wrong) m_output.problem(*wrong);
+    return !wrong;
+}
+
+void Laboratory::passed(const Traffic& traffic) {
+    if (traffic.kind == Traffic::Kind::Logged) return;
+    const bool written = traffic.kind == Traffic::Kind::Written;
+    const std::string text = toUtf8(printableLine(traffic.text, '.'));
+    if (m_call.verbose) {
+        const std::string status = traffic.status == 0 ? std::string() : "  [" + std::to_string(traffic.status) + "]";
+        m_output.line(timeText(m_clock) + (written ? " -> " : " <- ") + text + status);
+    }
+    m_output.document["traffic"].push_back(
+        {{"direction", written ? "written" : "read"}, {"text", text}, {"status", traffic.status}});
+}
+
+void Laboratory::stepGoesOut(const Step& step, std::size_t number, std::size_t total) {
+    if (number > 0) m_output.progress(number, total);
+    if (step.kind == Step::Kind::Refused)
+        m_output.problem(step.key + " is not sent: the coder cannot take so many frequencies with method B");
+    if (stopAsked()) m_session->transmitter.stop();
+}
+
+bool Laboratory::stopAsked() {
+    if (!m_stopped && isReadable(m_stop)) {
+        m_output.problem("stopped");
+        m_stopped = true;
+    }
+    return m_stopped;
+}
+
+/// @returns whether the rest is not to be sent.
+bool Laboratory::linkFailed() {
+    if (!m_failed) m_output.problem("the link to the instrument is broken: " + statusText());
+    m_failed = true;
+    return !m_call.continues;
+}
+
+std::string Laboratory::statusText() const {
+    const VisaStatus status = m_session->instrument.LastVisaStatus;
+    std::string words;
+    (void)describeStatus(status, words);
+    return words + " (" + std::to_string(status) + "). " + advice(status);
+}
+
+}  // namespace kdx::ctl

@@ -1,0 +1,71 @@
+#pragma once
+
+#include <memory>
+#include <optional>
+#include <string>
+
+#include "app/choosevisa.h"
+#include "app/ctl/call.h"
+#include "app/ctl/output.h"
+#include "base/clock.h"
+#include "settings/captions.h"
+#include "settings/datafolder.h"
+#include "settings/programstate.h"
+#include "station/session.h"
+
+namespace kdx::ctl {
+
+/// What the subcommands work with: the data folder, one session, and how failures are told. The session is closed
+/// however the program ends.
+class Laboratory : private TrafficWatcher, private StepWatcher {
+public:
+    /// @param program the name it was called by; @param stop a descriptor that is readable once the user wants to stop.
+    Laboratory(const Call& call, Output& output, const char* program, int stop);
+    ~Laboratory() override;
+    Laboratory(const Laboratory&) = delete;
+    Laboratory& operator=(const Laboratory&) = delete;
+
+    /// Opens the session; a failure is told. False then.
+    [[nodiscard]] bool open();
+    /// Sends the steps with progress; false when they were stopped or a command failed.
+    bool run(const Steps& steps);
+    /// After a command outside of steps: whether to go on with the next.
+    [[nodiscard]] bool goesOn();
+    /// kDone, or kFailed when anything failed or was stopped.
+    [[nodiscard]] int result() const { return m_failed || m_stopped ? kFailed : kDone; }
+    /// Checks a value against what is legal for the key; tells what is wrong, unless the call is to be forced.
+    [[nodiscard]] bool mayBeSent(const std::string& key, const std::string& value);
+    /// Lets the session be when the program ends.
+    void keepOpen() { m_session->keepOpen(); }
+
+    [[nodiscard]] const Call& call() const { return m_call; }
+    [[nodiscard]] Output& output() { return m_output; }
+    [[nodiscard]] DataFolder& data() { return m_data; }
+    [[nodiscard]] const Captions& captions() const { return m_captions; }
+    [[nodiscard]] ProgramState& state() { return m_state; }
+    [[nodiscard]] Session& session() { return *m_session; }
+
+private:
+    void passed(const Traffic& traffic) override;
+    void stepGoesOut(const Step& step, std::size_t number, std::size_t total) override;
+    void stepAnswered(const Step&, const std::string&) override {}
+    void stepsEnded() override { m_output.endProgress(); }
+
+    [[nodiscard]] bool stopAsked();
+    bool linkFailed();
+    [[nodiscard]] std::string statusText() const;
+
+    const Call& m_call;
+    Output& m_output;
+    int m_stop;
+    SystemClock m_clock;
+    DataFolder m_data;
+    ProgramState m_state;
+    Captions m_captions;
+    ChosenVisa m_link;
+    std::unique_ptr<Session> m_session;
+    bool m_failed = false;
+    bool m_stopped = false;
+};
+
+}  // namespace kdx::ctl

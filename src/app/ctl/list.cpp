@@ -1,0 +1,92 @@
+#include <CLI/CLI.hpp>
+
+#include <algorithm>
+#include <memory>
+
+#include "app/ctl/laboratory.h"
+#include "base/codepage.h"
+#include "coder/keyfacts.h"
+#include "coder/readback.h"
+#include "rds/settings.h"
+
+namespace kdx::ctl {
+
+namespace {
+
+using Rows = std::vector<std::vector<std::string>>;
+
+/// Characters of a UTF-8 text.
+std::size_t width(const std::string& text) {
+    return static_cast<std::size_t>(std::count_if(text.begin(), text.end(), [](char c) { return (c & 0xC0) != 0x80; }));
+}
+
+/// Prints the rows with their columns under each other.
+void print(const Output& output, const Rows& rows) {
+    std::vector<std::size_t> widths;
+    for (const auto& row : rows) {
+        widths.resize(std::max(widths.size(), row.size()));
+        for (std::size_t i = 0; i < row.size(); ++i) widths[i] = std::max(widths[i], width(row[i]));
+    }
+    for (const auto& row : rows) {
+        std::string line;
+        for (std::size_t i = 0; i < row.size(); ++i) {
+            line += row[i];
+            if (i + 1 < row.size()) line += std::string(widths[i] - width(row[i]) + 2, ' ');
+        }
+        output.line(line);
+    }
+}
+
+int listDataSets(Laboratory& laboratory) {
+    Rows rows;
+    nlohmann::json& listed = laboratory.output().document["data_sets"] = nlohmann::json::array();
+    for (int number = 1; number <= 5; ++number) {
+        const std::string file = dataSetFile(std::to_string(number));
+        if (!laboratory.data().profile(file)) continue;
+        const Profile profile = Profile::ofFile(laboratory.data(), file);
+        const std::string ps = toUtf8(profile.read(setting::kPs.place));
+        const std::string pi = toUtf8(profile.read(setting::kPi.place));
+        rows.push_back({std::to_string(number), ps, pi});
+        listed.push_back({{"number", number}, {"ps", ps}, {"pi", pi}});
+    }
+    print(laboratory.output(), rows);
+    return kDone;
+}
+
+int listKeys(Laboratory& laboratory) {
+    Rows rows;
+    nlohmann::json& listed = laboratory.output().document["keys"] = nlohmann::json::array();
+    for (const KeyFacts& facts : keyFacts()) {
+        rows.push_back({std::string(facts.key), std::string(facts.meaning), facts.range});
+        listed.push_back({{"key", facts.key}, {"meaning", facts.meaning}, {"range", facts.range}});
+    }
+    print(laboratory.output(), rows);
+    return kDone;
+}
+
+int listQueries(Laboratory& laboratory) {
+    Rows rows;
+    nlohmann::json& listed = laboratory.output().document["queries"] = nlohmann::json::array();
+    for (const ReadBack& readBack : readBacks()) {
+        rows.push_back({readBack.name, readBack.meaning});
+        listed.push_back({{"name", readBack.name}, {"meaning", readBack.meaning}});
+    }
+    print(laboratory.output(), rows);
+    return kDone;
+}
+
+}  // namespace
+
+void addList(CLI::App& app, Task& task) {
+    CLI::App* command = app.add_subcommand("list", "List the data sets with PS and PI, the keys, or the read-backs");
+    auto what = std::make_shared<std::string>("data-sets");
+    command->add_option("what", *what, "data-sets, keys or queries")
+        ->check(CLI::IsMember({"data-sets", "keys", "queries"}))
+        ->type_name("WHAT");
+    command->footer("Example: kdx-ctl list keys");
+    command->callback([what, &task] {
+        task = *what == "keys" ? listKeys : *what == "queries" ? listQueries : listDataSets;
+    });
+}
+
+}  // namespace kdx::ctl

@@ -1,0 +1,86 @@
+// The command line of kdx-ctl.
+#include <CLI/CLI.hpp>
+
+#include <cstdio>
+#include <exception>
+
+#include "app/ctl/call.h"
+#include "app/ctl/laboratory.h"
+#include "app/ctl/output.h"
+#include "app/platform.h"
+
+namespace {
+
+using kdx::ctl::Call;
+
+void addConnection(CLI::App& app, Call& call) {
+    auto* lan = app.add_option("--lan", call.lan, "the instrument's address, and its device name behind a comma")
+                    ->type_name("HOST[,DEVICE]");
+    auto* gpib =
+        app.add_option("--gpib", call.gpib, "the instrument's GPIB address")->check(CLI::Range(0, 30))->excludes(lan);
+    auto* library =
+        app.add_option("--visa-library", call.program.visaLibrary, "use this VISA library")->type_name("FILE");
+    app.add_flag("--simulate", call.program.simulate, "use the virtual instrument inside the program")
+        ->excludes(lan)
+        ->excludes(gpib)
+        ->excludes(library);
+    app.add_option("--app-folder", call.program.appFolder, "the program's folder; settings and texts are in DIR/Daten")
+        ->type_name("DIR");
+}
+
+void addManner(CLI::App& app, Call& call) {
+    app.add_flag("--json", call.json, "one JSON document instead of words");
+    auto* quiet = app.add_flag("-q,--quiet", call.quiet, "only results and problems");
+    app.add_flag("-v,--verbose", call.verbose, "every command and answer with its time and status")->excludes(quiet);
+    app.add_flag("--force", call.force, "send also values that are not legal");
+    app.add_flag("--continue", call.continues, "go on after a command that failed");
+}
+
+int run(const Call& call, const kdx::ctl::Task& task, const char* program) {
+    kdx::ctl::Output output(call);
+    int result = kdx::ctl::kFailed;
+    try {
+        kdx::ctl::Laboratory laboratory(call, output, program, kdx::endRequests());
+        result = task(laboratory);
+    } catch (const std::exception& error) {
+        output.problem(error.what());
+    }
+    output.finish(result);
+    return result;
+}
+
+int called(int argc, const char* const* argv) {
+    CLI::App app("Sets up what a KDX signal generator with stereo/RDS coder transmits, without a window.", "kdx-ctl");
+    app.set_version_flag("--version", "KDX-RDS " KDX_VERSION);
+    app.fallthrough();  // the options of the connection stand anywhere
+    app.require_subcommand(1);
+    Call call;
+    addConnection(app, call);
+    addManner(app, call);
+    kdx::ctl::Task task;
+    for (const auto add :
+         {kdx::ctl::addApply, kdx::ctl::addList, kdx::ctl::addQuery, kdx::ctl::addReplay, kdx::ctl::addSend}) {
+        add(app, task);
+    }
+    app.footer(
+        "Without --lan, --gpib or --simulate the instrument is the one of the general settings.\n"
+        "Exit codes: 0 done, 1 a command failed, 2 wrong call or unreadable file, 4 no connection.\n"
+        "kdx-ctl SUBCOMMAND --help says more.");
+    try {
+        app.parse(argc, argv);
+    } catch (const CLI::ParseError& error) {
+        return app.exit(error) == 0 ? kdx::ctl::kDone : kdx::ctl::kWrongCall;
+    }
+    return run(call, task, argv[0]);
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+    try {
+        return called(argc, argv);
+    } catch (const std::exception& error) {
+        std::fprintf(stderr, "kdx-ctl: %s\n", error.what());
+        return kdx::ctl::kFailed;
+    }
+}

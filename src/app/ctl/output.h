@@ -1,0 +1,37 @@
+#pragma once
+
+#include <cstddef>
+#include <string>
+
+#include <nlohmann/json.hpp>
+
+namespace kdx::ctl {
+
+struct Call;
+
+/// What kdx-ctl tells: plain words as they come, or one JSON document at the end; problems always in words on the
+/// standard error. Texts are UTF-8.
+class Output {
+public:
+    explicit Output(const Call& call) : m_call(call) {}
+
+    /// A line of the result; not with JSON.
+    void line(const std::string& text) const;
+    /// A line that only tells how it goes; not with JSON, not when the call is to be quiet.
+    void remark(const std::string& text) const;
+    void problem(const std::string& text);
+    /// Which command of how many goes out; only while the standard error is a terminal.
+    void progress(std::size_t number, std::size_t total);
+    void endProgress();
+
+    /// The document of --json; problems and the exit code are added to it.
+    nlohmann::json document = nlohmann::json::object();
+    /// Prints the document when the call wants it.
+    void finish(int exitCode);
+
+private:
+    const Call& m_call;
+    bool m_progressShown = false;
+};
+
+}  // namespace kdx::ctl

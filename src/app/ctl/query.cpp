@@ -1,0 +1,75 @@
+#include <CLI/CLI.hpp>
+
+#include <algorithm>
+#include <memory>
+
+#include "af/settings.h"
+#include "app/ctl/laboratory.h"
+#include "base/codepage.h"
+#include "coder/readback.h"
+#include "link/commandsequence.h"
+
+namespace kdx::ctl {
+
+namespace {
+
+struct Query {
+    std::vector<std::string> names;
+    bool raw = false;
+};
+
+const ReadBack* readBackOf(const std::string& name) {
+    const auto& all = readBacks();
+    const auto found = std::find_if(all.begin(), all.end(),
+                                    [&](const ReadBack& readBack) { return equalNoCase(readBack.name, name); });
+    return found == all.end() ? nullptr : &*found;
+}
+
+int query(Laboratory& laboratory, const Query& what) {
+    std::vector<const ReadBack*> asked;
+    for (const std::string& name : what.names) {
+        if (name == "all") {
+            for (const ReadBack& readBack : readBacks()) asked.push_back(&readBack);
+        } else if (const ReadBack* readBack = readBackOf(name)) {
+            asked.push_back(readBack);
+        } else {
+            laboratory.output().problem("there is no read-back " + name + "; kdx-ctl list queries names them");
+            return kWrongCall;
+        }
+    }
+    if (!laboratory.open()) return kNoConnection;
+    Session& session = laboratory.session();
+    laboratory.state().eonIdentifier = session.profile.read(setting::kEonPi.place);
+    nlohmann::json& answered = laboratory.output().document["answers"] = nlohmann::json::object();
+    for (const ReadBack* readBack : asked) {
+        if (!laboratory.goesOn()) break;
+        const CommandSequence sequence(session.instrument);
+        const auto answers = ask(session.instrument, *readBack, laboratory.state().eonIdentifier);
+        nlohmann::json bare = nlohmann::json::array();
+        for (const std::string& answer : answers) bare.push_back(toUtf8(answer));
+        const std::string words = toUtf8(readBack->words(answers, laboratory.captions()));
+        answered[readBack->name] = {{"words", words}, {"answers", bare}};
+        if (what.raw) {
+            for (const auto& answer : bare) laboratory.output().line(answer.get<std::string>());
+        } else {
+            laboratory.output().line(words);
+        }
+    }
+    session.close();
+    return laboratory.result();
+}
+
+}  // namespace
+
+void addQuery(CLI::App& app, Task& task) {
+    auto what = std::make_shared<Query>();
+    CLI::App* command = app.add_subcommand("query", "Read values back from the instrument, in words");
+    command->add_option("names", what->names, "read-backs (kdx-ctl list queries), or all")
+        ->required()
+        ->type_name("NAME");
+    command->add_flag("--raw", what->raw, "the bare answers, one a line");
+    command->footer("Example: kdx-ctl query ps pi rt");
+    command->callback([what, &task] { task = [what](Laboratory& laboratory) { return query(laboratory, *what); }; });
+}
+
+}  // namespace kdx::ctl

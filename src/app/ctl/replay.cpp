@@ -1,0 +1,56 @@
+#include <CLI/CLI.hpp>
+
+#include <memory>
+
+#include "app/ctl/laboratory.h"
+#include "coder/loggedcommands.h"
+#include "settings/profilefile.h"
+
+namespace kdx::ctl {
+
+namespace {
+
+struct Replay {
+    std::string log;
+    bool check = false;
+};
+
+int replay(Laboratory& laboratory, const Replay& what) {
+    const auto bytes = readFile(what.log);
+    if (!bytes) {
+        laboratory.output().problem(what.log + " cannot be read");
+        return kWrongCall;
+    }
+    const LoggedCommands logged = readLoggedCommands(*bytes);
+    for (const std::size_t line : logged.unreadableLines)
+        laboratory.output().problem(what.log + ", line " + std::to_string(line) + ": not a line of a command log");
+    if (!logged.unreadableLines.empty()) return kWrongCall;
+    laboratory.output().document["commands"] = logged.commands.size();
+    if (what.check) {
+        laboratory.output().line(std::to_string(logged.commands.size()) + " commands");
+        return kDone;
+    }
+    if (!laboratory.open()) return kNoConnection;
+    Session& session = laboratory.session();
+    std::size_t number = 0;
+    for (const auto& [key, command] : logged.commands) {
+        if (!laboratory.goesOn()) break;
+        laboratory.output().progress(++number, logged.commands.size());
+        session.params.sendCommand(key, command);
+    }
+    session.close();
+    return laboratory.result();
+}
+
+}  // namespace
+
+void addReplay(CLI::App& app, Task& task) {
+    auto what = std::make_shared<Replay>();
+    CLI::App* command = app.add_subcommand("replay", "Send the commands of a command log in their order");
+    command->add_option("log", what->log, "a command log (RDS_log.txt)")->required()->type_name("LOG");
+    command->add_flag("--check", what->check, "only read the log");
+    command->footer("Example: kdx-ctl replay Daten/RDS_log.txt");
+    command->callback([what, &task] { task = [what](Laboratory& laboratory) { return replay(laboratory, *what); }; });
+}
+
+}  // namespace kdx::ctl

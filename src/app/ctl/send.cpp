@@ -1,0 +1,72 @@
+#include <CLI/CLI.hpp>
+
+#include <memory>
+#include <utility>
+#include <vector>
+
+#include "af/settings.h"
+#include "app/ctl/laboratory.h"
+#include "base/codepage.h"
+#include "coder/sendparam.h"
+#include "settings/withoutcontrols.h"
+
+namespace kdx::ctl {
+
+namespace {
+
+struct Send {
+    std::vector<std::string> settings;
+    std::vector<std::string> raw;
+    std::vector<std::string> coder;
+};
+
+/// What is typed on a command line, as one line of the instrument's characters.
+std::string line(const std::string& utf8) {
+    return withoutControls(fromUtf8(utf8));
+}
+
+int send(Laboratory& laboratory, const Send& what) {
+    std::vector<std::pair<std::string, std::string>> settings;
+    bool legal = true;
+    for (const std::string& text : what.settings) {
+        const std::size_t equals = text.find('=');
+        if (equals == std::string::npos) {
+            laboratory.output().problem(text + " is not KEY=VALUE");
+            return kWrongCall;
+        }
+        settings.emplace_back(text.substr(0, equals), line(text.substr(equals + 1)));
+        legal = laboratory.mayBeSent(settings.back().first, settings.back().second) && legal;
+    }
+    if (!legal) return kWrongCall;
+    if (!laboratory.open()) return kNoConnection;
+    Session& session = laboratory.session();
+    laboratory.state().eonIdentifier = session.profile.read(setting::kEonPi.place);
+    for (const auto& [key, value] : settings) {
+        // Commands about the other network are led by the one of the data set, unless one was just sent.
+        if (key == setting::kEonPi.sendKey) laboratory.state().eonIdentifier = value;
+        if (laboratory.goesOn()) session.params.SendParam(key, std::string(value));
+    }
+    const auto sendCommand = [&](const std::string& command) {
+        if (laboratory.goesOn()) session.params.sendCommand({}, command);
+    };
+    for (const std::string& command : what.raw) sendCommand(line(command));
+    for (const std::string& command : what.coder) sendCommand(coderCommand(line(command)));
+    session.close();
+    return laboratory.result();
+}
+
+}  // namespace
+
+void addSend(CLI::App& app, Task& task) {
+    auto what = std::make_shared<Send>();
+    CLI::App* command = app.add_subcommand("send", "Send single settings by their keys, or commands as they stand");
+    command->add_option("settings", what->settings, "keys of the key table (kdx-ctl list keys) with their values")
+        ->type_name("KEY=VALUE");
+    command->add_option("--raw", what->raw, "an instrument command as it stands")->type_name("TEXT");
+    command->add_option("--coder", what->coder, "a coder command")->type_name("TEXT");
+    command->require_option(1, 0);
+    command->footer("Example: kdx-ctl send PS=MESSTURM TP=1 HF-Frequenz=98.5");
+    command->callback([what, &task] { task = [what](Laboratory& laboratory) { return send(laboratory, *what); }; });
+}
+
+}  // namespace kdx::ctl

@@ -1,0 +1,296 @@
+"""The program kdx-ctl as a script meets it: subcommands, what they send and print, exit codes.
+
+Usage: ctl_test.py PATH-OF-KDX-CTL PATH-OF-KDX-RDS PATH-OF-KDX-SIM
+"""
+
+import json
+import os
+import pathlib
+import re
+import shutil
+import signal
+import socket
+import subprocess
+import sys
+import tempfile
+import threading
+import time
+import unittest
+
+CTL = RDS = SIM = ""
+DATA = pathlib.Path(__file__).parents[2] / "Daten"
+DONE, FAILED, WRONG_CALL, NO_CONNECTION = 0, 1, 2, 4
+
+
+class Ctl(unittest.TestCase):
+    def setUp(self):
+        self.folder = pathlib.Path(tempfile.mkdtemp(prefix="kdx-ctl-test-"))
+        self.addCleanup(shutil.rmtree, self.folder)
+        shutil.copytree(DATA, self.folder / "Daten")
+
+    def command(self, *arguments):
+        return [CTL, "--app-folder", str(self.folder), *arguments]
+
+    def ctl(self, *arguments, expect=DONE, timeout=100):
+        run = subprocess.run(self.command(*arguments), capture_output=True, text=True, timeout=timeout)
+        self.assertEqual(run.returncode, expect, run.stdout + run.stderr)
+        return run
+
+    def simulated(self, *arguments, **how):
+        return self.ctl("--simulate", *arguments, **how)
+
+    def sent(self, *arguments, **how):
+        """The commands that a call writes to the virtual instrument."""
+        document = json.loads(self.simulated("--json", *arguments, **how).stdout)
+        return [passed["text"] for passed in document["traffic"] if passed["direction"] == "written"]
+
+    def write(self, name, text):
+        (self.folder / name).write_bytes(text.encode("cp1252"))
+        return str(self.folder / name)
+
+
+class Calls(Ctl):
+    def testAWrongCallIsToldWithExitCode2(self):
+        for call in ((), ("nonsense",), ("send",), ("query",), ("apply", "--data-set", "6"), ("list", "nothing"),
+                     ("--gpib", "31", "query", "ps"), ("--lan", "a", "--gpib", "3", "query", "ps"),
+                     ("apply", "--data-set", "1", "--file", "x")):
+            with self.subTest(call):
+                run = self.ctl(*call, expect=WRONG_CALL)
+                self.assertNotEqual(run.stderr, "")
+                self.assertEqual(run.stdout, "")
+
+    def testHelpOfEachSubcommandHasAnExample(self):
+        overview = self.ctl("--help").stdout
+        for name in ("apply", "list", "query", "replay", "send"):
+            self.assertIn(name, overview)
+            self.assertIn("Example: kdx-ctl " + name, self.ctl(name, "--help").stdout)
+
+    def testNoWindowToolkitIsLinked(self):
+        libraries = subprocess.run(["ldd", CTL], capture_output=True, text=True, check=True).stdout
+        self.assertIn("libc.so", libraries)
+        self.assertNotIn("Qt", libraries)
+
+    def testAnInstrumentThatIsNotThereIsExitCode4(self):
+        run = self.ctl("--lan", "127.0.0.9", "query", "ps", expect=NO_CONNECTION)
+        self.assertIn("no connection to 127.0.0.9", run.stderr)
+        self.assertIn("-1073807343", run.stderr)
+
+    def testAGpibAddressNeedsALibrary(self):
+        run = self.ctl("--gpib", "28", "query", "ps", expect=NO_CONNECTION)
+        self.assertIn("GPIB address 28", run.stderr)
+
+    def testAVisaLibraryThatCannotBeLoadedIsExitCode4(self):
+        run = self.ctl("--visa-library", str(self.folder / "none.so"), "query", "ps", expect=NO_CONNECTION)
+        self.assertIn("none.so", run.stderr)
+
+
+class Lists(Ctl):
+    def testTheDataSetsWithPsAndPi(self):
+        lines = self.ctl("list").stdout.splitlines()
+        self.assertEqual(len(lines), 5)
+        self.assertEqual(lines[0].split(), ["1", "MESSTURM", "D7A1"])
+        listed = json.loads(self.ctl("list", "--json").stdout)["data_sets"]
+        self.assertEqual(listed[1], {"number": 2, "ps": "TALWELLE", "pi": "D7A2"})
+
+    def testTheKeysWithMeaningAndRange(self):
+        keys = json.loads(self.ctl("list", "keys", "--json").stdout)["keys"]
+        self.assertEqual(len(keys), 60)
+        self.assertIn({"key": "PTY", "meaning": "programme type", "range": "0 to 31"}, keys)
+        self.assertRegex(self.ctl("list", "keys").stdout, r"(?m)^PTY +programme type +0 to 31$")
+
+    def testTheReadBacks(self):
+        self.assertEqual(len(self.ctl("list", "queries").stdout.splitlines()), 20)
+
+
+class Apply(Ctl):
+    def testADryRunPrintsTheCommandsAndSendsNone(self):
+        lines = self.ctl("--lan", "127.0.0.9", "apply", "--data-set", "2", "--dry-run").stdout.splitlines()
+        self.assertEqual(lines[0], "*IDN?")
+        self.assertIn(':STEREO:DIRECT "PS=TALWELLE"', lines)
+
+    def testWhatIsSentIsWhatADryRunPrints(self):
+        printed = self.ctl("apply", "--data-set", "3", "--dry-run").stdout.splitlines()
+        self.assertEqual(self.sent("apply", "--data-set", "3"), printed)
+
+    def testItIsByteForByteWhatTheWindowSends(self):
+        """The window opens data set 1: every other set is put in its place, beside the carrier that set 1 keeps."""
+        carrier = re.search(rb"(?ms)^\[VRN\].*?(?=^\[|\Z)", (DATA / "Datenset1.INI").read_bytes())[0]
+        for number in "12345":
+            applied = self.ctl("apply", "--data-set", number, "--dry-run").stdout.splitlines()
+            other = self.folder / ("window" + number)
+            shutil.copytree(DATA, other / "Daten")
+            dataSet = (DATA / f"Datenset{number}.INI").read_bytes()
+            if number != "1":
+                dataSet = re.sub(rb"(?ms)^\[VRN\].*?(?=^\[|\Z)", b"", dataSet) + b"\r\n" + carrier
+            (other / "Daten" / "Datenset1.INI").write_bytes(dataSet)
+            tour = subprocess.run([RDS, "--simulate", "--app-folder", str(other), "--tour", str(other / "tour")],
+                                  stdout=subprocess.PIPE, timeout=100,
+                                  env=dict(os.environ, HOME=str(self.folder), QT_QPA_PLATFORM="offscreen"))
+            shown = [line[3:].decode() for line in tour.stdout.splitlines() if line.startswith(b"-> ")]
+            self.assertGreater(len(applied), 30)
+            # The tour leaves out the blanks at a command's end.
+            self.assertEqual(shown[:len(applied)], [line.rstrip() for line in applied], f"data set {number}")
+
+    def testAnyFileCanBeSent(self):
+        file = self.write("lab.ini", "[RDS]\r\nPS=Käse\r\nPI=1234\r\n")
+        lines = self.ctl("apply", "--file", file, "--dry-run").stdout.splitlines()
+        self.assertIn(':STEREO:DIRECT "PS=Käse    "', lines)
+        self.assertIn(':STEREO:DIRECT "PI=1234"', lines)
+
+    def testAFileThatCannotBeReadIsExitCode2(self):
+        run = self.simulated("apply", "--file", str(self.folder / "missing.ini"), expect=WRONG_CALL)
+        self.assertIn("missing.ini cannot be read", run.stderr)
+        self.simulated("apply", "--file", str(self.folder), expect=WRONG_CALL)
+
+    def testIllegalValuesAreNamedAndNothingIsSent(self):
+        file = self.write("bad.ini", '[RDS]\r\nPS=A"B\r\nPI=XYZ1\r\nPTY=77\r\n')
+        run = self.simulated("-v", "apply", "--file", file, expect=WRONG_CALL)
+        self.assertEqual(run.stdout, "")
+        for key in ("PS", "PI", "PTY"):
+            self.assertIn(f"kdx-ctl: {key} cannot be", run.stderr)
+        self.assertIn(':STEREO:DIRECT "PS=A"B     "', self.sent("--force", "apply", "--file", file))
+
+
+class Send(Ctl):
+    def testKeysGoThroughTheDispatcher(self):
+        self.assertEqual(self.sent("send", "PS=Käse", "TP=1", "HF-Frequenz=98.5", "EON_PI=D3C1", "EON_TA=1"),
+                         [':STEREO:DIRECT "PS=Käse    "', ":stereo:rds:traffic:program ON", "FREQ 98.5MHZ",
+                          ':STEREO:DIRECT "EON-PI=D3C1"', ':STEREO:DIRECT "EON-TA=D3C1,1"'])
+
+    def testCommandsGoAsTheyStand(self):
+        self.assertEqual(self.sent("send", "--raw", "FREQ 99 MHz", "--coder", "PTY=07"),
+                         ["FREQ 99 MHz", ':STEREO:DIRECT "PTY=07"'])
+
+    def testLineBreaksCopiedAlongEndNoCommand(self):
+        self.assertEqual(self.sent("send", "PS=RADIO\n", "--raw", "FREQ 99 MHZ\r\n*RST"),
+                         [':STEREO:DIRECT "PS=RADIO   "', "FREQ 99 MHZ *RST"])
+
+    def testIllegalValuesAreNamedBeforeAnythingIsSent(self):
+        run = self.simulated("-v", "send", "TP=1", "HF-Frequenz=98,5", "NOKEY=1", expect=WRONG_CALL)
+        self.assertEqual(run.stdout, "")
+        self.assertIn('HF-Frequenz cannot be "98,5": it has a decimal comma. Legal: 0.1 to 1040 MHz', run.stderr)
+        self.assertIn("there is no key NOKEY", run.stderr)
+        self.assertEqual(self.sent("--force", "send", "HF-Frequenz=98,5"), ["FREQ 98,5MHZ"])
+
+    def testWhatIsNoSettingIsToldWithExitCode2(self):
+        self.assertIn("PS is not KEY=VALUE", self.simulated("send", "PS", expect=WRONG_CALL).stderr)
+
+    def testTheLogTellsWhatWasSent(self):
+        self.simulated("send", "PS=RADIO")
+        self.assertEqual((self.folder / "Daten" / "RDS_log.txt").read_bytes(),
+                         b'             PS= ":STEREO:DIRECT "PS=RADIO   ""\r\n')
+
+
+class Query(Ctl):
+    def testWordsAndBareAnswers(self):
+        self.assertEqual(self.simulated("query", "ps", "PI").stdout, "KDX-X4  \n1000\n")
+        self.assertEqual(self.simulated("query", "ari").stdout, "ARI aus\nARI Hub: 3500 Hz\naus\nA\n")
+        self.assertEqual(self.simulated("query", "--raw", "ari").stdout, "0\n350\n0\nA\n")
+
+    def testAllTwenty(self):
+        document = json.loads(self.simulated("query", "all", "--json").stdout)
+        self.assertEqual(len(document["answers"]), 20)
+        self.assertEqual(document["answers"]["frequency"], {"words": "100 MHz", "answers": ["100"]})
+
+    def testAnUnknownNameIsExitCode2(self):
+        self.assertIn("no read-back nothing", self.simulated("query", "ps", "nothing", expect=WRONG_CALL).stderr)
+
+
+class Replay(Ctl):
+    LOG = ('             TP= ":stereo:rds:traffic:program ON"\r\n'
+           '            PS?= :STEREO:DIRECT? "PS"\r\n'
+           '            PS?= Answer ""RADIO   "\n       "\r\n'
+           '             PS= ":STEREO:DIRECT "PS=RADIO   ""\r\n')
+
+    def testTheCommandsGoOutInTheirOrder(self):
+        self.assertEqual(self.sent("replay", self.write("log.txt", self.LOG)),
+                         [":stereo:rds:traffic:program ON", ':STEREO:DIRECT "PS=RADIO   "'])
+
+    def testWhatWasLoggedOnceIsSentOnceMore(self):
+        first = self.sent("apply", "--data-set", "4")
+        log = self.folder / "first.txt"
+        shutil.move(self.folder / "Daten" / "RDS_log.txt", log)
+        again = self.sent("replay", str(log))
+        self.assertEqual(again, [text for text in first if "?" not in text])
+
+    def testCheckOnlyReads(self):
+        self.assertEqual(self.simulated("-v", "replay", "--check", self.write("log.txt", self.LOG)).stdout,
+                         "2 commands\n")
+
+    def testALineThatCannotBeReadIsNamedAndNothingIsSent(self):
+        log = self.write("log.txt", self.LOG + "what is this\r\n" + self.LOG + "PS=1\r\n")
+        run = self.simulated("-v", "replay", log, expect=WRONG_CALL)
+        self.assertEqual(run.stdout, "")
+        self.assertIn("line 5: not a line of a command log", run.stderr)
+        self.assertIn("line 10: not a line of a command log", run.stderr)
+
+    def testAMissingLogIsExitCode2(self):
+        self.simulated("replay", str(self.folder / "none"), expect=WRONG_CALL)
+
+
+class OverTheNetwork(Ctl):
+    """Against kdx-sim as a process of its own; in a network of its own where the system permits that."""
+
+    def setUp(self):
+        super().setUp()
+        self.sim = subprocess.Popen([SIM, "--bind", "127.0.0.1"], stdout=subprocess.PIPE, text=True)
+        self.addCleanup(self.sim.stdout.close)
+        self.addCleanup(self.sim.wait)
+        self.addCleanup(self.sim.kill)
+        self.assertIn("127.0.0.1", self.sim.stdout.readline())
+
+    def lan(self, *arguments, **how):
+        return self.ctl("--lan", "127.0.0.1", *arguments, **how)
+
+    def testWhatIsSentIsReadBack(self):
+        self.lan("send", "PS=TESTTURM", "PI=ABCD", "HF-Frequenz=98.5")
+        self.assertEqual(self.lan("query", "ps", "pi", "frequency").stdout, "TESTTURM\nABCD\n98.5 MHz\n")
+
+    def testTheAddressOfTheGeneralSettingsIsTheDefault(self):
+        self.assertEqual(self.ctl("query", "ps").stdout, "KDX-X4  \n")
+
+    def testADeviceNameIsGivenBehindAComma(self):
+        self.assertEqual(self.ctl("--lan", "127.0.0.1,inst0", "query", "ps").stdout, "KDX-X4  \n")
+        self.ctl("--lan", "127.0.0.1,nothing", "query", "ps", expect=NO_CONNECTION)
+
+    def killInTheMiddle(self, *options):
+        process = subprocess.Popen(self.command("--lan", "127.0.0.1", "-v", *options, "apply"),
+                                   stdout=subprocess.PIPE, stderr=subprocess.PIPE, text=True)
+        for line in process.stdout:
+            if "PS=" in line:
+                break
+        self.sim.kill()
+        rest, problems = process.communicate(timeout=100)
+        return process.returncode, rest.splitlines(), problems
+
+    def testABrokenLinkIsToldOnceAndEndsTheRun(self):
+        code, rest, problems = self.killInTheMiddle()
+        self.assertEqual(code, FAILED)
+        self.assertEqual(problems.count("the link to the instrument is broken"), 1, problems)
+        self.assertRegex(problems, r"\(-\d+\)\. Look whether it is switched on")
+        self.assertLess(len(rest), 5)
+
+    def testARunToBeContinuedGoesOnOverABrokenLink(self):
+        code, rest, problems = self.killInTheMiddle("--continue")
+        self.assertEqual(code, FAILED)
+        self.assertEqual(problems.count("the link to the instrument is broken"), 1, problems)
+        self.assertGreater(len(rest), 10)
+
+    def testARequestToEndStopsAfterTheRunningCommand(self):
+        for request in (signal.SIGINT, signal.SIGTERM):
+            process = subprocess.Popen(self.command("--lan", "127.0.0.1", "-v", "apply"),
+                                       stdout=subprocess.PIPE, stderr=subprocess.PIPE, text=True)
+            for line in process.stdout:
+                if "PS=" in line:
+                    break
+            process.send_signal(request)
+            rest, problems = process.communicate(timeout=100)
+            self.assertEqual((process.returncode, problems), (FAILED, "kdx-ctl: stopped\n"))
+            self.assertLess(len(rest.splitlines()), 5)
+        self.assertEqual(self.lan("query", "pi").stdout, "D7A1\n")
+
+
+if __name__ == "__main__":
+    CTL, RDS, SIM = sys.argv[1:4]
+    del sys.argv[1:4]
+    unittest.main()
