@@ -311,6 +311,7 @@ TEST(Vxi11Server, CanBeStoppedByASignalHandler) {
     server.run();
     killer.join();
     ::sigaction(SIGUSR1, &former, nullptr);
+    toStop = nullptr;
 }
 
 TEST(Vxi11Server, AnAddressOrPortThatCannotBeHadIsAnError) {
