@@ -172,6 +172,13 @@ TEST_F(RdsPageTest, AnEmptyDataSetLeavesEntriesEmptyAndOptionsUnchosen) {
     EXPECT_EQ(find("RT_Text1")->toolTip(), QString());
 }
 
+TEST_F(RdsPageTest, TheLastEntriesOfTheListsCanBeStored) {
+    folder.write("Datenset1.INI", "[RDS]\r\nDI=15\r\nPTY=31\r\n");
+    load();
+    EXPECT_TRUE(checked("DI_Opt_15"));
+    EXPECT_EQ(find<QComboBox>("PTY_Combo1")->currentIndex(), 31);
+}
+
 TEST_F(RdsPageTest, NumbersOutsideTheListsChooseNothing) {
     for (const char* number : {"32", "-1", "1e300", "99999999999"}) {
         folder.write("Datenset1.INI", std::string("[RDS]\r\nDI=") + number + "\r\nPTY=" + number + "\r\n");

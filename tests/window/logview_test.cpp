@@ -70,6 +70,26 @@ TEST_F(LogViewTest, AFailureShowsItsStatus) {
     EXPECT_EQ(cell(1, TrafficLog::Status), "-1073807194");
 }
 
+TEST_F(LogViewTest, FailuresAndTextsThatEndEarlyAreRed) {
+    open();
+    const auto isRed = [this](int row) {
+        const QVariant colour = table->model()->index(row, TrafficLog::Text).data(Qt::ForegroundRole);
+        return colour.isValid() && colour.value<QBrush>().color() == Qt::red;
+    };
+    type("PS_T", "RADIO");
+    click("PS_Taste");
+    type("PS_T", "A\"B");
+    click("PS_Taste");
+    ASSERT_EQ(rows(), 4);  // a log line before each command
+    EXPECT_FALSE(isRed(1));
+    EXPECT_TRUE(isRed(3));
+    dialogs.expectedMessages = 1;
+    visa.writeStatus = visa::kConnectionLost;
+    type("PS_T", "RADIO");
+    click("PS_Taste");
+    EXPECT_TRUE(isRed(5));
+}
+
 TEST_F(LogViewTest, TheFilterKeepsWhatContainsItsText) {
     open();
     click("Store_Taste_0");

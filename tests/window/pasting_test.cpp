@@ -2,6 +2,7 @@
 
 #include <QClipboard>
 #include <QInputDialog>
+#include <QListWidget>
 
 #include <ostream>
 
