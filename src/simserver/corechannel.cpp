@@ -143,7 +143,7 @@ void CoreChannel::createLink(const Create_LinkParms& parms, const std::string& n
             return true;
         }
         const LinkId id = freeId();
-        m_links[id] = {.owner = from, .number = ++m_lastNumber, .input = {}, .output = {}};
+        m_links[id] = {.owner = from, .number = ++m_lastNumber, .input = {}, .overtakes = false, .output = {}};
         if (withLock) m_lockHolder = id;
         trace(id, withLock ? "opened with lock: " : "opened: ", name);
         reply(createLinkAnswer({vxi11::kNoError, id, m_abortPort, m_options.maxRecvSize}));
@@ -183,24 +183,16 @@ void CoreChannel::write(const Device_WriteParms& parms, ConnectionId from, const
 // One write may bring several messages, each with an answer of its own. A new one discards what nobody has fetched of
 // the answers to those before, so that client and device agree again.
 void CoreChannel::carryOut(LinkId id, Link& link, std::string_view bytes, bool end) {
-    bool overtakes = !link.input.hasBegun() && !link.output.empty();
+    if (!link.input.hasBegun()) link.overtakes = !link.output.empty();
     const MessageBuffer::Taken taken = link.input.take(bytes, end);
-    if (taken.overrun) {
-        trace(id, "message too long, dropped");
-        m_device.report(sim::ScpiError::InputBufferOverrun);
-    }
     std::size_t unread = 0;
     for (const std::string& answer : link.output) unread += answer.size();
     bool deadlocked = false;
     for (const std::string& message : taken.messages) {
         trace(id, "< ", message);
         if (sim::trimmed(message).empty()) continue;
-        if (std::exchange(overtakes, false)) {
-            trace(id, "answer dropped that nobody has fetched");
-            link.output.clear();
-            unread = 0;
-            m_device.report(sim::ScpiError::QueryInterrupted);
-        }
+        dropOvertaken(id, link);
+        if (link.output.empty()) unread = 0;
         std::string answer = m_device.execute(message);
         if (answer.empty()) continue;
         trace(id, "> ", answer);
@@ -213,6 +205,17 @@ void CoreChannel::carryOut(LinkId id, Link& link, std::string_view bytes, bool e
         }
         if (!deadlocked) link.output.push_back(std::move(answer));
     }
+    if (!taken.overrun) return;
+    dropOvertaken(id, link);
+    trace(id, "message too long, dropped");
+    m_device.report(sim::ScpiError::InputBufferOverrun);
+}
+
+void CoreChannel::dropOvertaken(LinkId id, Link& link) {
+    if (!std::exchange(link.overtakes, false) || link.output.empty()) return;
+    trace(id, "answer dropped that nobody has fetched");
+    link.output.clear();
+    m_device.report(sim::ScpiError::QueryInterrupted);
 }
 
 void CoreChannel::read(const Device_ReadParms& parms, ConnectionId from, const RpcReply& reply) {

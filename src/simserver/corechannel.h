@@ -47,12 +47,14 @@ private:
         ConnectionId owner = 0;
         unsigned long number = 0;  ///< for the trace: links count from 1
         MessageBuffer input;
+        bool overtakes = false;          ///< the message under way began while answers were unread
         std::deque<std::string> output;  ///< response messages not read yet, the first perhaps in part
     };
 
     void createLink(const Create_LinkParms& parms, const std::string& name, ConnectionId from, const RpcReply& reply);
     void write(const Device_WriteParms& parms, ConnectionId from, const RpcReply& reply);
     void carryOut(LinkId id, Link& link, std::string_view bytes, bool end);
+    void dropOvertaken(LinkId id, Link& link);
     void read(const Device_ReadParms& parms, ConnectionId from, const RpcReply& reply);
     void lock(const Device_LockParms& parms, ConnectionId from, const RpcReply& reply);
     void readStatusByte(const Device_GenericParms& parms, ConnectionId from, const RpcReply& reply);

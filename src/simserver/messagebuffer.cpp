@@ -18,7 +18,7 @@ MessageBuffer::Taken MessageBuffer::take(std::string_view bytes, bool end) {
             taken.overrun = true;
         }
         if (!m_dropping) m_message += c;
-        if (c == '\n' && !isText) finish();
+        if (c == '\n' && !isText && !m_dropping) finish();
     }
     if (end) finish();
     return taken;

@@ -17,7 +17,7 @@ public:
 
     struct Taken {
         std::vector<std::string> messages;  ///< complete ones, with the line feed that ended them
-        bool overrun = false;               ///< a message has become too long: it is dropped, and the rest of it too
+        bool overrun = false;               ///< a message, the last one, has become too long: all is dropped up to END
     };
     /// @param end whether END came with the last of the bytes.
     Taken take(std::string_view bytes, bool end);

@@ -81,6 +81,18 @@ TEST_F(MessageExchangeTest, AMessageThatIsTooLongIsDroppedToItsEndAndOneError) {
     EXPECT_EQ(m_device.errors(), Errors{-363});
 }
 
+TEST_F(MessageExchangeTest, ALineFeedInsideAMessageThatIsTooLongDoesNotEndIt) {
+    CoreClient client(port());
+    const long link = client.open();
+    for (int i = 0; i < 64; ++i) client.write(link, std::string(1024, 'x'), 0);
+    client.write(link, "x\n*RST\n", 0);
+    client.write(link, "TAIL?\n");
+    EXPECT_EQ(m_device.got(), Lines{});
+    EXPECT_EQ(m_device.errors(), Errors{-363});
+    client.write(link, "NAME?");
+    EXPECT_EQ(client.read(link).data, "NAME\n");
+}
+
 TEST_F(MessageExchangeTest, AMessageOfTheLongestLengthIsCarriedOut) {
     CoreClient client(port());
     const long link = client.open();
@@ -139,6 +151,39 @@ TEST_F(MessageExchangeTest, ANewMessageDiscardsAnAnswerThatNobodyFetched) {
     client.write(link, "COMMAND");
     EXPECT_EQ(client.read(link, 100, 10).error, 15);
     EXPECT_EQ(m_device.errors(), (Errors{-410, -410, -420}));
+}
+
+TEST_F(MessageExchangeTest, ANewMessageInPiecesDiscardsAnAnswerThatNobodyFetched) {
+    CoreClient client(port());
+    const long link = client.open();
+    client.write(link, "OLD?");
+    client.write(link, "N", 0);
+    client.write(link, "E", 0);
+    EXPECT_EQ(m_device.errors(), Errors{}) << "it may still be fetched";
+    client.write(link, "W?");
+    EXPECT_EQ(m_device.errors(), Errors{-410});
+    EXPECT_EQ(client.read(link), (ReadResult{0, 4, "NEW\n"}));
+}
+
+TEST_F(MessageExchangeTest, AnAnswerFetchedBetweenThePiecesOfTheNextMessageIsNotInterrupted) {
+    CoreClient client(port());
+    const long link = client.open();
+    client.write(link, "OLD?");
+    client.write(link, "NE", 0);
+    EXPECT_EQ(client.read(link).data, "OLD\n");
+    client.write(link, "W?");
+    EXPECT_EQ(client.read(link).data, "NEW\n");
+    EXPECT_EQ(m_device.errors(), Errors{});
+}
+
+TEST_F(MessageExchangeTest, AMessageThatIsTooLongDiscardsAnAnswerThatNobodyFetched) {
+    CoreClient client(port());
+    const long link = client.open();
+    client.write(link, "OLD?");
+    for (int i = 0; i < 64; ++i) client.write(link, std::string(1024, 'x'), 0);
+    client.write(link, "x?");
+    EXPECT_EQ(m_device.errors(), (Errors{-410, -363}));
+    EXPECT_EQ(client.read(link, 100, 10).error, 15);
 }
 
 TEST_F(MessageExchangeTest, MoreAnswersThanCanBeKeptAreAllDropped) {
