@@ -19,7 +19,8 @@ struct LanOptions {
     /// For a whole write or read; the VISA standard's default.
     std::chrono::milliseconds ioTimeout{2000};
     /// How much longer than the device itself we wait for its answer, since its own report of a time-out must reach us.
-    std::chrono::milliseconds answerMargin{500};
+    /// Below a quarter of ioTimeout: with what is done besides, no call lasts longer than a time-out and a quarter.
+    std::chrono::milliseconds answerMargin{400};
     /// For the device to let go of a link that is given up whatever it answers: somebody waits for the program to end.
     std::chrono::milliseconds closeTimeout{500};
     std::uint16_t portMapperPort = 111;

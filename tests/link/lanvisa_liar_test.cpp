@@ -40,6 +40,11 @@ std::string tinyFragments() {
     return fragments;
 }
 
+TEST(LanOptionsTest, TheProgramsOwnTimesLeaveRoomWithinATimeOutAndAQuarter) {
+    const LanOptions options;
+    EXPECT_LE(options.ioTimeout + options.answerMargin + 50ms, options.ioTimeout * 5 / 4);
+}
+
 class LanVisaLie : public LanVisaTest, public ::testing::WithParamInterface<Lie> {
 protected:
     LanVisaLie() {
