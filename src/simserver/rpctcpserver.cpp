@@ -40,8 +40,8 @@ void setUp(int socket) {
 }  // namespace
 
 RpcTcpServer::RpcTcpServer(PollLoop& loop, RpcProgram& program, const std::string& address, unsigned short port,
-                           std::chrono::milliseconds patience)
-    : m_loop(loop), m_program(program), m_listener(listenTcp(address, port)), m_patience(patience) {
+                           SilenceLimits limits)
+    : m_loop(loop), m_program(program), m_listener(listenTcp(address, port)), m_limits(std::move(limits)) {
     m_loop.watch(m_listener.number(), POLLIN, [this](short) { acceptClient(); });
     closeStuck();
 }
@@ -69,7 +69,7 @@ void RpcTcpServer::acceptClient() {
     const ConnectionId id = ConnectionId{peer} << 32U | ++m_lastSerial;
     Connection& connection = m_connections[id];
     connection.socket = std::move(socket);
-    connection.movedOn = steady_clock::now();
+    connection.movedOn = m_limits.now();
     m_loop.watch(connection.socket.number(), POLLIN, [this, id](short events) { serve(id, events); });
     if (m_connections.size() >= kMostConnections) m_loop.setEvents(m_listener.number(), 0);
 }
@@ -90,14 +90,15 @@ std::size_t RpcTcpServer::connectionsOf(std::uint32_t peer) const {
 
 // Looks often enough that none stays much longer than it may.
 void RpcTcpServer::closeStuck() {
-    const auto now = steady_clock::now();
+    const auto now = m_limits.now();
     std::vector<ConnectionId> stuck;
     for (const auto& [id, connection] : m_connections) {
         const bool underWay = connection.reader.hasBegun() || !connection.unsent.empty();
-        if (now - connection.movedOn > m_patience && (underWay || !m_program.mayBeSilent(id))) stuck.push_back(id);
+        const bool mayBeSilent = !underWay && m_program.mayBeSilent(id);
+        if (now - connection.movedOn > (mayBeSilent ? m_limits.longestSilence : m_limits.patience)) stuck.push_back(id);
     }
     for (const ConnectionId id : stuck) close(id);
-    m_nextLook = m_loop.callAt(now + m_patience / 4, [this] { closeStuck(); });
+    m_nextLook = m_loop.callAt(steady_clock::now() + m_limits.patience / 4, [this] { closeStuck(); });
 }
 
 void RpcTcpServer::serve(ConnectionId id, short events) {
@@ -131,10 +132,10 @@ void RpcTcpServer::readCalls(ConnectionId id, Connection& connection) {
         endInput(id, connection);
         return;
     }
-    if (!connection.reader.hasBegun()) connection.movedOn = steady_clock::now();
+    if (!connection.reader.hasBegun()) connection.movedOn = m_limits.now();
     connection.reader.feed({bytes.data(), static_cast<std::size_t>(count)});
     while (const auto record = connection.reader.next()) {
-        connection.movedOn = steady_clock::now();
+        connection.movedOn = m_limits.now();
         const bool isCall =
             m_program.handle(*record, id, [this, id](const std::string& reply) { sendRecord(id, reply); });
         if (!isCall) {
@@ -167,13 +168,13 @@ void RpcTcpServer::sendRecord(ConnectionId id, const std::string& record) {
     updateEvents(connection);
 }
 
-bool RpcTcpServer::sendUnsent(Connection& connection) {
+bool RpcTcpServer::sendUnsent(Connection& connection) const {
     while (!connection.unsent.empty()) {
         const ssize_t count =
             ::send(connection.socket.number(), connection.unsent.data(), connection.unsent.size(), MSG_NOSIGNAL);
         if (count < 0) return errno == EAGAIN || errno == EWOULDBLOCK || errno == EINTR;
         connection.unsent.erase(0, static_cast<std::size_t>(count));
-        connection.movedOn = steady_clock::now();
+        connection.movedOn = m_limits.now();
     }
     return true;
 }

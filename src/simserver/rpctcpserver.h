@@ -8,10 +8,21 @@
 #include <chrono>
 #include <cstddef>
 #include <cstdint>
+#include <functional>
 #include <map>
 #include <string>
 
 namespace kdx::simserver {
+
+/// How long a client of a server may keep silent.
+struct SilenceLimits {
+    /// A connection that nothing moves on for so long is closed: a call is not sent to its end, a reply not
+    /// fetched, or none comes and the program keeps nothing for the client.
+    std::chrono::milliseconds patience = std::chrono::minutes(1);
+    /// The same where the program keeps something for the client.
+    std::chrono::milliseconds longestSilence = std::chrono::hours(12);
+    std::function<PollLoop::TimePoint()> now = std::chrono::steady_clock::now;
+};
 
 /// Serves an RPC program on a TCP port to any number of clients at once; none of them can hold up another. When memory
 /// runs out over a call, its connection is closed and the others go on.
@@ -23,14 +34,11 @@ public:
     static constexpr std::size_t kMostConnections = 128;
     /// Of one address no more are taken, so that others find room.
     static constexpr std::size_t kMostOfOnePeer = 96;
-    /// A connection that nothing moves on for so long is closed: a call is not sent to its end, a reply not fetched, or
-    /// none comes and the program keeps nothing for the client.
-    static constexpr std::chrono::milliseconds kPatience{60000};
 
     /// Listens at once; calls are served while the loop runs. Loop and program must outlive this.
     /// @param address IPv4 address in dotted form; port 0 takes any free one. Throws std::system_error.
     RpcTcpServer(PollLoop& loop, RpcProgram& program, const std::string& address, unsigned short port,
-                 std::chrono::milliseconds patience = kPatience);
+                 SilenceLimits limits = {});
     RpcTcpServer(const RpcTcpServer&) = delete;
     RpcTcpServer& operator=(const RpcTcpServer&) = delete;
     ~RpcTcpServer();
@@ -54,7 +62,7 @@ private:
     void readCalls(ConnectionId id, Connection& connection);
     void endInput(ConnectionId id, Connection& connection);
     void sendRecord(ConnectionId id, const std::string& record);
-    static bool sendUnsent(Connection& connection);
+    bool sendUnsent(Connection& connection) const;
     void updateEvents(const Connection& connection);
     void close(ConnectionId id);
 
@@ -63,7 +71,7 @@ private:
     FileDescriptor m_listener;
     std::map<ConnectionId, Connection> m_connections;
     std::uint32_t m_lastSerial = 0;
-    std::chrono::milliseconds m_patience;
+    SilenceLimits m_limits;
     PollLoop::TimerId m_nextLook;
     PollLoop::TimerId m_rest;
 };

@@ -5,13 +5,20 @@
 #include "simserver/rpctcpserver.h"
 
 namespace kdx::simserver {
+namespace {
+
+SilenceLimits limitsOf(const Vxi11Options& options) {
+    return {.patience = options.patience, .longestSilence = options.longestSilence, .now = options.now};
+}
+
+}  // namespace
 
 struct Vxi11Server::Parts {
     Parts(sim::MessageDevice& device, const Vxi11Options& options)
         : core(loop, device, options),
           abort(core),
-          abortServer(loop, abort, options.bindAddress, 0, options.patience),
-          coreServer(loop, core, options.bindAddress, options.port, options.patience) {
+          abortServer(loop, abort, options.bindAddress, 0, limitsOf(options)),
+          coreServer(loop, core, options.bindAddress, options.port, limitsOf(options)) {
         core.setAbortPort(abortServer.port());
     }
 

@@ -25,6 +25,10 @@ struct Vxi11Options {
     std::chrono::milliseconds longestWait = std::chrono::minutes(10);
     /// A client that keeps silent for so long without a link, or in the middle of a call, is cut off.
     std::chrono::milliseconds patience = std::chrono::minutes(1);
+    /// So is one that keeps silent for so long with a link: or two addresses could keep all of them for ever.
+    std::chrono::milliseconds longestSilence = std::chrono::hours(12);
+    /// The time that silence is measured by.
+    std::function<PollLoop::TimePoint()> now = std::chrono::steady_clock::now;
     std::function<void(std::string_view)> trace = {};  ///< gets a line for each thing that happens on a link
 };
 

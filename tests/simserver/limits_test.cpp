@@ -107,6 +107,35 @@ TEST_F(PatienceTest, LastsForAClientThatHasALinkOrWaitsForOne) {
     EXPECT_EQ(waiting->receive().value_or(Reply{}).rest.substr(0, 4), word(0));
 }
 
+class SilenceTest : public PatienceTest {
+protected:
+    std::atomic<std::chrono::hours> m_passed = 0h;
+
+private:
+    void adjust(Vxi11Options& options) override {
+        options.patience = 400ms;  // it looks four times as often
+        options.now = [this] { return std::chrono::steady_clock::now() + m_passed.load(); };
+    }
+};
+
+TEST_F(SilenceTest, LastsForHoursThoughNotForEver) {
+    CoreClient client(port());
+    RpcClient abort(m_server->abortPort(), DEVICE_ASYNC, DEVICE_ASYNC_VERSION);
+    ASSERT_EQ(client.error(device_lock, CoreClient::lockArguments(client.open())), 0);
+    m_passed = 11h;
+    std::this_thread::sleep_for(250ms);
+    EXPECT_EQ(client.results(NULLPROC, {}), "") << "which begins anew with it";
+    m_passed = 22h;
+    std::this_thread::sleep_for(250ms);
+    const auto waiting = CoreClient::elsewhere(port());
+    waiting->send(create_link, CoreClient::linkArguments("inst0", true, 60000));
+    EXPECT_FALSE(waiting->receive(100));
+    m_passed = 24h;
+    EXPECT_TRUE(client.isClosedByServer());
+    EXPECT_TRUE(abort.isClosedByServer());
+    EXPECT_EQ(waiting->receive().value_or(Reply{}).rest.substr(0, 4), word(0)) << "the lock has gone with the link";
+}
+
 TEST_F(PatienceTest, EndsWithACallThatTricklesIn) {
     CoreClient client(port());
     client.open();
