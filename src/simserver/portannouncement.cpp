@@ -22,7 +22,8 @@ std::string freeLoopbackAddress(unsigned short mapperPort) {
 
 std::string problemText(const std::string& place, const std::error_code& reason, bool mapperRuns,
                         unsigned short mapperPort, unsigned short instrumentPort) {
-    const std::string byPort = "name its port to the client: " + std::to_string(instrumentPort) + ".";
+    const std::string byPort = "name its port to the client: " + std::to_string(instrumentPort) +
+                               ". Registering with a port mapper is tried again every few seconds.";
     std::string text = "Clients that ask for the port will not find this instrument: ";
     if (mapperRuns) {
         text +=

@@ -17,7 +17,7 @@ public:
     enum class Way {
         OwnMapper,   ///< we answer the questions ourselves
         Registered,  ///< a running port mapper knows the programs
-        None         ///< nobody tells clients the port; see problem()
+        None         ///< nobody tells clients the port yet; see problem()
     };
 
     static constexpr std::chrono::milliseconds kLookAfterEvery{2000};
@@ -31,6 +31,7 @@ public:
     PortAnnouncement(const PortAnnouncement&) = delete;
     PortAnnouncement& operator=(const PortAnnouncement&) = delete;
 
+    /// As it was at the start: with None the registration is tried again, every `lookAfterEvery`.
     [[nodiscard]] Way way() const { return m_way; }
     /// For the user: why clients cannot find the programs, how they reach them all the same, and what to do about it.
     /// Empty unless way() is None.

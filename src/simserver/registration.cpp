@@ -41,18 +41,20 @@ bool add(MapperClient& mapper, const PortMapping& mapping) {
 Registration::Registration(std::vector<PortMapping> mappings, unsigned short mapperPort,
                            std::chrono::milliseconds lookAfterEvery)
     : m_mappings(std::move(mappings)), m_mapperPort(mapperPort), m_lookAfterEvery(lookAfterEvery) {
-    m_succeeded = registerAll();
-    if (m_succeeded) m_keeper = std::thread([this] { keepRegistered(); });
+    MapperClient mapper(m_mapperPort, steady_clock::now() + kTimeToRegister);
+    m_mapperRuns = mapper.isConnected();
+    m_succeeded = m_registered = registerAll(mapper);
+    m_keeper = std::thread([this] { keepRegistered(); });
 }
 
 Registration::~Registration() {
-    if (!m_succeeded) return;
     {
         const std::lock_guard guard(m_mutex);
         m_ending = true;
     }
     m_ended.notify_all();
     m_keeper.join();
+    if (!m_registered) return;
     MapperClient mapper(m_mapperPort, steady_clock::now() + kTimeToTakeBack);
     for (const PortMapping& mapping : m_mappings) {
         if (mapper.portOf(mapping) == mapping.port) mapper.remove(mapping);
@@ -60,11 +62,10 @@ Registration::~Registration() {
 }
 
 // All of them or none.
-bool Registration::registerAll() {
-    MapperClient mapper(m_mapperPort, steady_clock::now() + kTimeToRegister);
-    m_mapperRuns = mapper.isConnected();
+bool Registration::registerAll(MapperClient& mapper) {
+    if (!mapper.isConnected()) return false;
     for (std::size_t i = 0; i < m_mappings.size(); ++i) {
-        if (m_mapperRuns && add(mapper, m_mappings[i])) continue;
+        if (add(mapper, m_mappings[i])) continue;
         for (std::size_t taken = 0; taken < i; ++taken) mapper.remove(m_mappings[taken]);
         return false;
     }
@@ -76,8 +77,12 @@ void Registration::keepRegistered() {
     while (!m_ended.wait_for(guard, m_lookAfterEvery, [this] { return m_ending; })) {
         guard.unlock();
         MapperClient mapper(m_mapperPort, steady_clock::now() + kTimeToLookAfter);
-        for (const PortMapping& mapping : m_mappings) {
-            if (mapper.portOf(mapping) == 0U) mapper.add(mapping);
+        if (m_registered) {
+            for (const PortMapping& mapping : m_mappings) {
+                if (mapper.portOf(mapping) == 0U) mapper.add(mapping);
+            }
+        } else {
+            m_registered = registerAll(mapper);
         }
         guard.lock();
     }

@@ -10,8 +10,10 @@
 
 namespace kdx::simserver {
 
-/// Programs registered with the port mapper that runs on this machine, as long as this object lives: a port mapper that
-/// is started anew has forgotten them, and is told again within seconds.
+class MapperClient;
+
+/// Programs registered with the port mapper that runs on this machine, as long as this object lives: one that does not
+/// take them now, is started later, or is started anew and has forgotten them, is told again within seconds.
 class Registration {
 public:
     /// Takes three seconds at most. @param lookAfterEvery how often the port mapper is asked whether it still knows.
@@ -22,12 +24,13 @@ public:
     /// Takes the registration back, unless another program has it by now. Takes two seconds at most.
     ~Registration();
 
+    /// At first, that is: it is tried again as long as it has not.
     [[nodiscard]] bool succeeded() const { return m_succeeded; }
-    /// False: nobody listens at the port mapper's port.
+    /// False: nobody listened at the port mapper's port.
     [[nodiscard]] bool mapperRuns() const { return m_mapperRuns; }
 
 private:
-    bool registerAll();
+    bool registerAll(MapperClient& mapper);
     void keepRegistered();
 
     std::vector<PortMapping> m_mappings;
@@ -35,6 +38,7 @@ private:
     std::chrono::milliseconds m_lookAfterEvery;
     bool m_mapperRuns = false;
     bool m_succeeded = false;
+    bool m_registered = false;  ///< by now; while the keeper runs only it looks at this
     std::mutex m_mutex;
     std::condition_variable m_ended;
     bool m_ending = false;

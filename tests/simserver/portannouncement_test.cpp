@@ -32,6 +32,7 @@ protected:
     }
 };
 
+using std::chrono::milliseconds;
 using Ports = std::map<u_long, u_long>;
 
 class PortAnnouncementTest : public ::testing::Test {
@@ -47,6 +48,16 @@ protected:
         const unsigned short port = mapperPort();
         m_other.reset();
         return port;
+    }
+
+    // Within ten seconds, that is; the abort channel is registered last.
+    static bool isRegisteredSoon(unsigned short mapperPort) {
+        RpcClient client(mapperPort, PMAPPROG, PMAPVERS);
+        for (int i = 0; i < 1000; ++i) {
+            if (client.results(PMAPPROC_GETPORT, question(kAsync, 1, IPPROTO_TCP)) == word(4712)) return true;
+            std::this_thread::sleep_for(milliseconds(10));
+        }
+        return false;
     }
 
     PollLoop m_loop;
@@ -117,8 +128,8 @@ TEST_F(PortAnnouncementTest, SaysHowTheInstrumentIsReachedAllTheSame) {
 TEST_F(PortAnnouncementTest, RegistersAgainWithAPortMapperThatHasForgottenEverything) {
     std::unique_ptr<PortAnnouncement> announcement;
     whileOtherRuns([&] {
-        announcement = std::make_unique<PortAnnouncement>(m_loop, m_mappings, "127.0.0.1", mapperPort(),
-                                                          std::chrono::milliseconds(10));
+        announcement =
+            std::make_unique<PortAnnouncement>(m_loop, m_mappings, "127.0.0.1", mapperPort(), milliseconds(10));
         EXPECT_EQ(announcement->way(), PortAnnouncement::Way::Registered);
     });
     const Ports everything{{kCore, 4711}, {kAsync, 4712}};
@@ -129,16 +140,43 @@ TEST_F(PortAnnouncementTest, RegistersAgainWithAPortMapperThatHasForgottenEveryt
     {
         const RunningLoop running(nextLoop);
         RpcClient client(next.server.port(), PMAPPROG, PMAPVERS);
-        std::string registered;
-        for (int i = 0; i < 1000 && registered != word(4712); ++i) {
-            std::this_thread::sleep_for(std::chrono::milliseconds(10));
-            registered = client.results(PMAPPROC_GETPORT, question(kAsync, 1, IPPROTO_TCP));
-        }
-        EXPECT_EQ(registered, word(4712));
+        EXPECT_TRUE(isRegisteredSoon(next.server.port()));
         EXPECT_EQ(client.results(PMAPPROC_GETPORT, question(kCore, 1, IPPROTO_TCP)), word(4711));
         announcement.reset();
     }
     EXPECT_EQ(next.ports, Ports{});
+}
+
+TEST_F(PortAnnouncementTest, RegistersWithAPortMapperThatIsStartedLater) {
+    const unsigned short port = mapperPortOnceFreed();
+    std::unique_ptr<PortAnnouncement> announcement;
+    {
+        const FileDescriptor taken = bindUdp("127.0.0.1", port);  // so that none of our own can be had
+        announcement = std::make_unique<PortAnnouncement>(m_loop, m_mappings, "127.0.0.1", port, milliseconds(10));
+    }
+    EXPECT_EQ(announcement->way(), PortAnnouncement::Way::None);
+    EXPECT_NE(announcement->problem().find("tried again every few seconds"), std::string::npos)
+        << announcement->problem();
+    PollLoop nextLoop;
+    RegisteringMapper next(nextLoop, port);
+    {
+        const RunningLoop running(nextLoop);
+        EXPECT_TRUE(isRegisteredSoon(port));
+        announcement.reset();
+    }
+    EXPECT_EQ(next.ports, Ports{});
+}
+
+TEST_F(PortAnnouncementTest, RegistersWhenTheOneThatWasRegisteredHasGone) {
+    auto otherInstrument = std::make_unique<FileDescriptor>(listenTcp("127.0.0.1", 0));
+    m_other->ports = {{kAsync, localPort(*otherInstrument)}};
+    whileOtherRuns([&] {
+        const PortAnnouncement announcement(m_loop, m_mappings, "127.0.0.1", mapperPort(), milliseconds(10));
+        EXPECT_EQ(announcement.way(), PortAnnouncement::Way::None);
+        otherInstrument.reset();
+        EXPECT_TRUE(isRegisteredSoon(mapperPort()));
+    });
+    EXPECT_EQ(m_other->ports, Ports{});
 }
 
 TEST_F(PortAnnouncementTest, LeavesARegistrationAloneThatIsAnotherOnesByNow) {
