@@ -2,6 +2,7 @@
 
 #include "base/clock.h"
 #include "base/printable.h"
+#include "settings/withoutcontrols.h"
 #include "sim/virtualinstrument.h"
 #include "simserver/linewriter.h"
 #include "simserver/portannouncement.h"
@@ -153,7 +154,7 @@ int serve(const Options& options) {
         serverOptions.trace = [&trace](std::string_view line) { trace->print(line); };
     }
     const kdx::SystemClock clock;
-    TracedInstrument instrument(clock, options.identification, trace.get());
+    TracedInstrument instrument(clock, kdx::withoutControls(options.identification), trace.get());
     kdx::simserver::Vxi11Server server(instrument, serverOptions);
     endSignals.endRunOf(server);
     const kdx::simserver::PortAnnouncement announcement(server.loop(),

@@ -167,6 +167,12 @@ class Run(unittest.TestCase):
                 device.close()
                 self.assertEqual(sim.end(), 0)
 
+    def testAnIdentificationIsALineWithoutControlCharacters(self):
+        with KdxSim(PROGRAM, "--idn", "\tA\nB\x01\x7f") as sim:
+            device = pyvisa.ResourceManager("@py").open_resource("TCPIP::127.0.0.1::inst0::INSTR")
+            self.assertEqual(device.query("*IDN?"), "A B\n")
+            device.close()
+
     def testTheLastOfTwoEqualOptionsCounts(self):
         with KdxSim(PROGRAM, "--bind", "nonsense", "--bind", "127.0.0.2") as sim:
             self.assertEqual(sim.address, "127.0.0.2")
@@ -179,6 +185,7 @@ class Run(unittest.TestCase):
             self.assertEqual(second.end(), 0)
             self.assertIn("did not take the registration", second.errors)
             self.assertIn(f"port to the client: {second.port}", second.errors)
+            self.assertIn("tried again every few seconds", second.errors)
             self.assertIn("--bind 127.0.0.2 and open TCPIP::127.0.0.2::INSTR", second.errors)
 
     def testASecondOneAtTheAddressThatTheFirstNamesIsFound(self):
