@@ -157,6 +157,15 @@ std::optional<double> namedNumber(const NumberRow& row, std::string_view word) {
     return std::nullopt;
 }
 
+// The same for a choice between numbers, which stand in rising order; the count of it.
+std::optional<int> namedNumber(const ChoiceRow& row, std::string_view word) {
+    if (!std::all_of(row.words.begin(), row.words.end(), isDecimal)) return std::nullopt;
+    if (wordMatches("MINimum", word)) return 1;
+    if (wordMatches("MAXimum", word)) return static_cast<int>(row.words.size());
+    if (wordMatches("DEFault", word)) return Settings().*row.value;
+    return std::nullopt;
+}
+
 std::optional<bool> onOrOff(std::string_view value) {
     if (equalNoCase(value, "ON")) return true;
     if (equalNoCase(value, "OFF")) return false;
@@ -197,6 +206,10 @@ ScpiError setGenerator(const WholeRow& row, std::string_view value, Settings& se
 }
 
 ScpiError setGenerator(const ChoiceRow& row, std::string_view value, Settings& settings) {
+    if (const auto named = namedNumber(row, value)) {
+        settings.*row.value = *named;
+        return ScpiError::None;
+    }
     const auto word = std::find(row.words.begin(), row.words.end(), bare(value));
     if (word == row.words.end()) return errorOfValue(value);
     settings.*row.value = static_cast<int>(word - row.words.begin()) + 1;
@@ -249,8 +262,12 @@ std::string askGenerator(const WholeRow& row, const Settings& settings) {
     return text.size() < row.digits ? std::string(row.digits - text.size(), '0') + text : text;
 }
 
+std::string wordOf(const ChoiceRow& row, int count) {
+    return std::string(row.words[static_cast<std::size_t>(count - 1)]);
+}
+
 std::string askGenerator(const ChoiceRow& row, const Settings& settings) {
-    return std::string(row.words[static_cast<std::size_t>(settings.*row.value - 1)]);
+    return wordOf(row, settings.*row.value);
 }
 
 std::string askCoder(const SwitchRow& row, const Settings& settings) {
@@ -294,6 +311,9 @@ ScpiError setFromCoder(const Parameter& parameter, std::string_view value, Instr
 Reply generatorAnswer(const Parameter& parameter, std::string_view argument, const InstrumentSettings& settings) {
     if (argument.empty()) {
         return {ScpiError::None, std::visit([&](const auto* row) { return askGenerator(*row, settings); }, parameter)};
+    }
+    if (const auto* const choice = std::get_if<const ChoiceRow*>(&parameter)) {
+        if (const auto named = namedNumber(**choice, argument)) return {ScpiError::None, wordOf(**choice, *named)};
     }
     const auto* const number = std::get_if<const NumberRow*>(&parameter);
     if (number == nullptr) return {ScpiError::ParameterNotAllowed, std::nullopt};

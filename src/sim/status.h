@@ -8,7 +8,7 @@ namespace kdx::sim {
 
 /// The instrument's status reporting by IEEE 488.2 and SCPI: errors, events, what of them is enabled, and the byte that
 /// sums it up. Nothing happens in this instrument that the operation and questionable registers could tell of, so of
-/// these there are only the enable registers.
+/// these there is only what clients set.
 class Status {
 public:
     /// Queues an error and notes its kind as an event.
@@ -31,8 +31,14 @@ public:
     void setServiceEnable(int bits);
 
     int eventEnable = 0;
-    int operationEnable = 0;
-    int questionableEnable = 0;
+    /// What clients set of the operation or the questionable register group.
+    struct Group {
+        int enable = 0;
+        int positiveTransition = 32767;
+        int negativeTransition = 0;
+    };
+    Group operation;
+    Group questionable;
     /// An answer has begun to be put together: to a question of the message under way it is one that waits.
     bool answerBegun = false;
 

@@ -102,6 +102,24 @@ TEST_F(CommandReader, TakesTheWordsForTheEndsOfARangeAndTheDefault) {
     EXPECT_EQ(error(), -224);
 }
 
+TEST_F(CommandReader, TakesTheWordsForTheEndsWhereThereIsAChoiceOfNumbersToo) {
+    const std::string impedance = ":STEREO:EXTERNAL:IMP";
+    for (const auto& [word, ohms] :
+         {std::pair{"MAX", "100000"}, {"DEF", "600"}, {"maximum", "100000"}, {"MIN", "600"}}) {
+        EXPECT_EQ(ask(impedance + "? " + word), ohms);
+        tell(impedance + " " + word);
+        EXPECT_EQ(ask(impedance + "?"), ohms);
+    }
+    EXPECT_EQ(error(), 0);
+    for (const auto& [message, code] : {std::pair{impedance + " MAXI", -224},
+                                        {impedance + "? MAXI", -108},
+                                        {":STEREO:SOURCE MAX", -224},
+                                        {":STEREO:SOURCE? MAX", -108}}) {
+        EXPECT_EQ(tell(message), "") << message;
+        EXPECT_EQ(error(), code) << message;
+    }
+}
+
 TEST_F(CommandReader, RoundsANumberForASwitch) {
     for (const auto& [number, state] : {std::pair{"1", "1"}, {"0.4", "0"}, {"0.6", "1"}, {"-0.4", "0"}, {"2", "1"}}) {
         tell(std::string(":OUTPUT:STATE ") + number);

@@ -109,6 +109,38 @@ TEST_F(StatusTest, OperationAndQuestionableRegistersHaveNothingToTell) {
     EXPECT_EQ(ask("STAT:OPER:ENAB?;:STAT:QUES:ENAB?"), "0;0");
 }
 
+TEST_F(StatusTest, TransitionFiltersAreKeptUntilThePreset) {
+    for (const std::string group : {"STAT:OPER", "STATUS:QUESTIONABLE"}) {
+        EXPECT_EQ(ask(group + ":PTR?;NTR?"), "32767;0") << group;
+        tell(group + ":PTRansition 5;NTRANSITION 65535");
+        EXPECT_EQ(ask(group + ":PTR?;NTR?"), "5;32767") << "the highest bit is not used";
+        tell("*RST;*CLS");
+        EXPECT_EQ(ask(group + ":PTR?;NTR?"), "5;32767") << group;
+        for (const char* command : {":PTR 65536", ":NTR -1"}) {
+            tell(group + command);
+            EXPECT_EQ(error(), -222) << command;
+        }
+    }
+    tell("STAT:OPER:PTR 6");
+    EXPECT_EQ(ask("STAT:OPER:PTR?;:STAT:QUES:PTR?"), "6;5") << "each has its own";
+    tell("STATUS:PRESET");
+    EXPECT_EQ(ask("STAT:OPER:PTR?;NTR?;:STAT:QUES:PTR?;NTR?"), "32767;0;32767;0");
+    EXPECT_EQ(error(), 0);
+}
+
+TEST_F(StatusTest, RegistersTakeTheWordsForTheEndsOfARangeAndForTheDefault) {
+    tell("*ESE MAX;*SRE maximum;:STAT:OPER:ENAB MAX;:STAT:QUES:NTR MAX;PTR MIN");
+    EXPECT_EQ(ask("*ESE?;*SRE?;:STAT:OPER:ENAB?;:STAT:QUES:NTR?;PTR?"), "255;191;32767;32767;0");
+    tell("*ESE MIN;*SRE DEF;:STAT:OPER:ENAB DEFAULT;:STAT:QUES:NTR DEF;PTR DEF");
+    EXPECT_EQ(ask("*ESE?;*SRE?;:STAT:OPER:ENAB?;:STAT:QUES:NTR?;PTR?"), "0;0;0;0;32767");
+    EXPECT_EQ(ask("*ESE? MAX;*SRE? MAX;:STAT:OPER:ENAB? MAX;:STAT:QUES:PTR? MIN;PTR? DEF"), "255;191;32767;0;32767");
+    EXPECT_EQ(error(), 0);
+    for (const auto& [message, code] : {std::pair{"*ESE MAXI", -224}, {"*ESE? 5", -108}, {"*ESR? MAX", -108}}) {
+        EXPECT_EQ(tell(message), "") << message;
+        EXPECT_EQ(error(), code) << message;
+    }
+}
+
 TEST_F(StatusTest, DriversGetTheAnswersTheyExpect) {
     EXPECT_EQ(ask("*TST?"), "0");
     EXPECT_EQ(ask("SYST:VERS?"), "1999.0");
