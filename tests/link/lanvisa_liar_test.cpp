@@ -19,21 +19,6 @@ struct Lie {
     friend void PrintTo(const Lie& lie, std::ostream* out) { *out << lie.name; }
 };
 
-/// Record mark of one fragment, the last one of its record, that claims to have so many bytes.
-std::string claims(std::uint32_t length) {
-    std::string mark;
-    for (const unsigned shift : {24U, 16U, 8U, 0U}) mark += static_cast<char>(((0x80000000U | length) >> shift) & 0xFF);
-    return mark;
-}
-
-/// A whole answer that bears another call's number.
-std::string answerTo(std::uint32_t call) {
-    std::string message(24, '\0');
-    message[3] = static_cast<char>(call);
-    message[7] = 1;  // a reply
-    return claims(24) + message;
-}
-
 std::string tinyFragments() {
     std::string fragments;
     for (int i = 0; i < 10000; ++i) fragments.append("\0\0\0\1x", 5);

@@ -369,6 +369,18 @@ DeafPort::~DeafPort() {
     close(m_listener);
 }
 
+std::string claims(std::uint32_t length) {
+    std::string mark;
+    appendWord(mark, kLastFragment | length);
+    return mark;
+}
+
+std::string answerTo(std::uint32_t call) {
+    std::string message;
+    for (const std::uint32_t word : {call, 1U, 0U, 0U, 0U, 0U}) appendWord(message, word);  // 1: a reply
+    return record(message);
+}
+
 std::uint16_t closedPort() {
     std::uint16_t port = 0;
     close(listenOnLoopback(1, 0, port));

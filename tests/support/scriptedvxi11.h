@@ -130,6 +130,12 @@ private:
     std::uint16_t m_port = 0;
 };
 
+/// Record mark of one fragment, the last one of its record, that claims to have so many bytes.
+std::string claims(std::uint32_t length);
+
+/// A whole answer that bears another call's number.
+std::string answerTo(std::uint32_t call);
+
 /// A loopback port where nobody listens.
 std::uint16_t closedPort();
 

@@ -23,8 +23,11 @@ protected:
     void startOn(std::uint16_t port, const char* host = "127.0.0.1") {
         setGeneral("ADRESSEN", "KDX_TCPIP", host);
         end();
-        link = std::make_unique<LanVisa>(
-            LanOptions{.connectTimeout = 200ms, .ioTimeout = 200ms, .answerMargin = 100ms, .portMapperPort = port});
+        link = std::make_unique<LanVisa>(LanOptions{.connectTimeout = 200ms,
+                                                    .ioTimeout = 200ms,
+                                                    .answerMargin = 100ms,
+                                                    .closeTimeout = 200ms,
+                                                    .portMapperPort = port});
         start();
     }
     /// Opens the session, in which the device is asked for its name and for the networks that it knows.
@@ -156,6 +159,84 @@ TEST_F(LanSessionTest, ALostConnectionIsToldAndTheSessionCanBeOpenedAgain) {
     EXPECT_EQ(device.opened().size(), 2U);
     EXPECT_NE(readBackWith("\"MESSTURM\"\n").find("MESSTURM"), std::string::npos);
 }
+
+constexpr const char* kTimeout = "-1073807339";
+constexpr const char* kError = "-1073807298";
+
+/// What a device sends that does not want the program to get on.
+struct Lie {
+    const char* name;
+    Reaction reaction;
+    const char* statusOfRead;
+    const char* statusOfOpening;
+    friend void PrintTo(const Lie& lie, std::ostream* out) { *out << lie.name; }
+};
+
+class LyingInstrument : public LanSessionTest, public ::testing::WithParamInterface<Lie> {
+protected:
+    LyingInstrument() { startOn(liar->port()); }
+
+    static void behave(ScriptedVxi11& honest) {
+        honest.answer("KDX,TEST\n");
+        honest.answer("\" \"\n");
+    }
+    void expectBoxInTime(const char* button, std::uint32_t procedure, const std::string& words) {
+        for (int i = 0; i < 5; ++i) liar->on(procedure, GetParam().reaction);
+        dialogs.expectedMessages = 1;
+        const auto begin = steady_clock::now();
+        click(button);
+        EXPECT_LT(steady_clock::now() - begin, 900ms);  // connect, I/O and close time-outs are 200, 300 and 200 ms
+        EXPECT_EQ(lastBox(), words);
+    }
+    /// A device that keeps to the rules, at the same address.
+    void expectThatAnHonestOneIsOpened() {
+        const std::uint16_t port = liar->port();
+        liar.reset();
+        ScriptedVxi11 honest(port);
+        behave(honest);
+        openSession();
+        EXPECT_TRUE(state.InstrumentOnline);
+        EXPECT_EQ(window->windowTitle().trimmed(), QStringLiteral("KDX,TEST"));
+        honest.answer("\"MESSTURM\"\n");
+        click("Command5");
+        EXPECT_NE(text("gelesen").find("MESSTURM"), std::string::npos);
+        end();
+        EXPECT_EQ(honest.destroyed().size(), 1U);
+    }
+
+    std::unique_ptr<ScriptedVxi11> liar = std::make_unique<ScriptedVxi11>();
+};
+
+TEST_P(LyingInstrument, IsToldInTimeWhenAValueIsReadBackAndTheWindowGoesOn) {
+    behave(*liar);
+    openSession();
+    ASSERT_TRUE(state.InstrumentOnline);
+    expectBoxInTime("Command5", ScriptedVxi11::kRead, std::string("Fehler: ") + GetParam().statusOfRead);
+    click("GTL_Taste");
+    expectThatAnHonestOneIsOpened();
+}
+
+TEST_P(LyingInstrument, IsToldInTimeWhenTheSessionIsOpenedAndTheWindowGoesOn) {
+    expectBoxInTime("INIT_Taste", ScriptedVxi11::kCreateLink,
+                    std::string("Please Check Device! ") + GetParam().statusOfOpening);
+    EXPECT_FALSE(state.InstrumentOnline);
+    expectThatAnHonestOneIsOpened();
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    EveryLie, LyingInstrument,
+    ::testing::Values(
+        Lie{"a byte a second",
+            {.kind = Reaction::Kind::RawForEver, .raw = claims(1000), .again = "x", .pause = 1s},
+            kTimeout,
+            kTimeout},
+        Lie{"a huge claim", {.kind = Reaction::Kind::Raw, .raw = claims(0x7FFFFFFF)}, kError, kError},
+        // The opening is the first call itself.
+        Lie{"answers to the first call without end",
+            {.kind = Reaction::Kind::RawForEver, .again = answerTo(1)},
+            kTimeout,
+            kError},
+        Lie{"an answer to a later call", {.kind = Reaction::Kind::Raw, .raw = answerTo(9999)}, kError, kError}));
 
 TEST_F(LanSessionTest, AnIdentificationOfAnyLengthBecomesTheTitle) {
     for (const auto& [bytes, title] :
