@@ -185,5 +185,29 @@ TEST_F(EverySetting, OfTheGeneratorPageArrives) {
     expectAllUsed(8);
 }
 
+/// 26 frequencies that begin with the tuned one: 129 characters or more.
+std::string longList(int tuned) {
+    std::string list = std::to_string(tuned) + ".5";
+    for (int i = 0; i < 25; ++i) list += "," + std::to_string(88 + i % 10) + ".9";
+    return list;
+}
+
+// A read takes 60 bytes; what an answer has beyond them is dropped with the next command, so that every question gets
+// the beginning of its own answer. (The virtual instrument inside the program keeps it.)
+TEST_F(EverySetting, ListsLongerThanAReadAreCutAndTheRestIsDroppedWithTheNextQuestion) {
+    std::string shown;
+    for (int list = 1; list <= 5; ++list) {
+        const std::string frequencies = longList(87 + list);
+        observer.tell(std::string(R"(:STEREO:DIRECT "AF=)") + (list == 1 ? "N," : "+,") + frequencies + '"');
+        shown += (list == 1 ? "AF" : "\nAF") + std::to_string(list) + ": " + frequencies.substr(0, 58);
+    }
+    EXPECT_EQ(observer.askCoder("AF5"), longList(92));
+    click("Command4");
+    EXPECT_EQ(text("gelesen"), shown);
+    click("Command6");
+    EXPECT_EQ(text("gelesen"), observer.askCoder("PI")) << "nothing is left over";
+    EXPECT_EQ(observer.errors(), Lines(5, R"(-410,"Query INTERRUPTED")"));
+}
+
 }  // namespace
 }  // namespace kdx::test
