@@ -387,12 +387,10 @@ TEST_F(ShippedData, ThePicturesAreIconsForOneAndTwoScreenScales) {
         const auto count = static_cast<unsigned char>(icon[4]);
         ASSERT_GE(icon.size(), 6U + 16U * count) << name;
         std::set<std::pair<int, int>> sizes;
-        for (std::size_t image = 0; image < count; ++image) {
-            sizes.insert(
-                {static_cast<unsigned char>(icon[6 + 16 * image]), static_cast<unsigned char>(icon[7 + 16 * image])});
+        for (std::size_t at = 6; at < 6U + 16U * count; at += 16) {
+            sizes.insert({static_cast<unsigned char>(icon[at]), static_cast<unsigned char>(icon[at + 1])});
         }
-        EXPECT_TRUE(sizes.contains({32, 16})) << name;
-        EXPECT_TRUE(sizes.contains({64, 32})) << name;
+        EXPECT_TRUE(sizes.contains({32, 16}) && sizes.contains({64, 32})) << name;
     }
     EXPECT_NE(bytes(kPictureOn), bytes(kPictureOff));
 }
