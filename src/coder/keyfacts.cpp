@@ -14,18 +14,18 @@ namespace kdx {
 namespace {
 
 enum class Kind {
-    Ignored,    ///< the value does not matter
-    Word,       ///< one of the words
-    Whole,      ///< a whole number within the limits
-    Number,     ///< a decimal number within the limits
-    Text,       ///< at most `highest` characters that RDS has
-    Identifier  ///< a PI: four hexadecimal digits
-    ,
-    Frequencies,  ///< "N," or "+," and a list of MHz
-    PlainList,    ///< a list of MHz
-    Groups,       ///< "0A,2A"
-    Message,      ///< two digits, a comma and ten hexadecimal digits
-    Clock,        ///< "OFF", "AUS" or anything else
+    Ignored,         ///< the value does not matter
+    Word,            ///< one of the words
+    Whole,           ///< a whole number within the limits
+    Number,          ///< a decimal number within the limits
+    Text,            ///< at most `highest` characters that RDS has
+    Identifier,      ///< a PI: four hexadecimal digits
+    Frequencies,     ///< "N," or "+," and a list of MHz
+    PlainList,       ///< a list of MHz
+    Groups,          ///< "0A,2A"
+    Message,         ///< two digits, a comma and ten hexadecimal digits
+    TrafficMessage,  ///< the same, the first hexadecimal digit a single bit
+    Clock,           ///< "OFF", "AUS" or anything else
 };
 
 struct Row {
@@ -72,7 +72,7 @@ constexpr std::array kRows = {
     Row{"GROUPSEQ_TN", "group sequence", Kind::Groups},
     Row{"STORE", "stores the set-up in a memory of the coder", Kind::Whole, 1, 5},
     Row{"ODA", "group 3A of an open data application", Kind::Message},
-    Row{"TMC", "traffic message, group 8A", Kind::Message},
+    Row{"TMC", "traffic message, group 8A", Kind::TrafficMessage},
     Row{"TEST_M", "test mode: 0 ends it", Kind::Whole, 0, 4},
     Row{"TEST_D", "test pattern", Kind::Whole, 0, 4},
     Row{"EON_PI", "other network: its PI", Kind::Identifier},
@@ -195,6 +195,8 @@ std::string range(const Row& row) {
             return "groups 0A to 15B with commas between, at most 256: 0A,0A,2A";
         case Kind::Message:
             return "two digits, a comma and ten hexadecimal digits: 02,0B90E400CC";
+        case Kind::TrafficMessage:
+            return "two digits, a comma, 0 or 1 and nine hexadecimal digits: 02,0B90E400CC";
         case Kind::Clock:
             return "OFF, or anything else for the time";
     }
@@ -236,6 +238,8 @@ std::optional<std::string> problem(const Row& row, std::string_view value) {
         }
         case Kind::Message:
             return unless(isMessage(value));
+        case Kind::TrafficMessage:
+            return unless(isMessage(value) && value[3] <= '1');
     }
     return std::nullopt;
 }
