@@ -115,5 +115,9 @@ int main(int argc, char** argv) {
     }
     if (application.isEnding()) return EXIT_SUCCESS;  // asked for while a box of the start was open
     window.show();
-    return kdx::Application::exec();
+    const int result = kdx::Application::exec();
+    data.retryUnsaved();  // while there is still somebody to tell
+    if (const auto unsaved = data.unsavedFile())
+        std::fprintf(stderr, "kdx-rds: what was changed last in %s could not be saved.\n", unsaved->c_str());
+    return result;
 }

@@ -4,6 +4,11 @@
 #include "ui/caption.h"
 #include "ui/text.h"
 
+#include <QComboBox>
+#include <QListView>
+#include <QProxyStyle>
+#include <QStyleFactory>
+
 #include <stdexcept>
 #include <string>
 #include <utility>
@@ -33,9 +38,31 @@ int ShownList::rowCount(const QModelIndex& parent) const {
 }
 
 QVariant ShownList::data(const QModelIndex& index, int role) const {
+    // Said here: the list of a combo box does not go by the font that it was given.
+    if (role == Qt::FontRole) return m_font;
     // A combo box shows the text it would edit.
     if (!index.isValid() || (role != Qt::DisplayRole && role != Qt::EditRole)) return {};
     return toText(m_entries[static_cast<std::size_t>(index.row())]);
+}
+
+void openAsScrolledList(QComboBox& combo) {
+    class Style final : public QProxyStyle {
+    public:
+        Style() : QProxyStyle(QStyleFactory::create(QStringLiteral("Fusion"))) {}
+        int styleHint(StyleHint hint, const QStyleOption* option, const QWidget* widget,
+                      QStyleHintReturn* returned) const override {
+            return hint == SH_ComboBox_Popup ? 0 : QProxyStyle::styleHint(hint, option, widget, returned);
+        }
+    };
+    constexpr int kEntries = 20;
+    auto* style = new Style;
+    style->setParent(&combo);
+    combo.setStyle(style);
+    combo.setMaxVisibleItems(kEntries);
+    if (auto* list = qobject_cast<QListView*>(combo.view())) {
+        list->setUniformItemSizes(true);  // else every entry is measured too before the first is shown
+        list->setVerticalScrollBarPolicy(Qt::ScrollBarAsNeeded);
+    }
 }
 
 QFont fixedPitch(const QString& family) {

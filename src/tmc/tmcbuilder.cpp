@@ -7,7 +7,7 @@
 #include "ui/layouts.h"
 #include "ui/text.h"
 
-#include <QListView>
+#include <QAbstractItemView>
 
 namespace kdx {
 
@@ -71,7 +71,7 @@ void TmcBuilder::createLists() {
     for (QComboBox* combo : {TMC_Event_Combo, TMC_Loc_Combo}) {
         combo->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
         combo->setMinimumContentsLength(20);
-        qobject_cast<QListView*>(combo->view())->setUniformItemSizes(true);  // a long list opens at once
+        openAsScrolledList(*combo);
         combo->view()->setFont(fixedPitch(QStringLiteral("Courier New")));
     }
     for (ValueLabel* number : {TMC_Event_Hex_Label, TMC_Local_Hex_Label}) number->makeRoomFor(kHexDigits);

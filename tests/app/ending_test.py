@@ -89,6 +89,19 @@ class Ending(unittest.TestCase):
         self.assertLess(time.monotonic() - asked, 30)
         self.assertEqual(self.record(folder), ["open TCPIP::dead::INSTR", "write", "close"])
 
+    def testWhatCouldNotBeSavedIsToldAtTheEnd(self):
+        folder = self.folder("locked", "lab", "MANUAL")
+        settings = folder / "Daten" / "RDS_Allg.INI"
+        # Without a state of the pilot tone the start stores one.
+        settings.write_bytes(re.sub(rb"(?m)^PILOT=.*\r\n", b"", settings.read_bytes()))
+        settings.chmod(0o444)
+        process = self.start(folder)
+        self.waitFor(process, (folder / "Daten" / "RDS_log.txt").exists)  # comes after that
+        time.sleep(1)
+        process.terminate()
+        self.assertEqual(process.wait(PATIENCE), 0)
+        self.assertIn("changed last in RDS_Allg.INI could not be saved", process.stdout.read())
+
     def testWhoSwitchedTheHangUpOffKeepsTheProgram(self):
         folder = self.folder("nohup", "dead")
         process = self.start(folder, preexec_fn=lambda: signal.signal(signal.SIGHUP, signal.SIG_IGN))

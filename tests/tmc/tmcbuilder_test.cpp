@@ -1,5 +1,6 @@
 #include "tmcpagetest.h"
 
+#include <QAbstractItemView>
 #include <QCheckBox>
 
 namespace kdx::test {
@@ -17,6 +18,21 @@ TEST_F(TmcBuilderTest, NothingIsComposedAtTheStart) {
     EXPECT_FALSE(checked("Tmc_richtung_0"));
     EXPECT_FALSE(checked("Tmc_richtung_1"));
     EXPECT_EQ(text("TMC_Gr8_Label"), "-000000000");
+}
+
+TEST_F(TmcBuilderTest, ALongListOpensAsAScrolledListOfSomeEntries) {
+    std::string lines;
+    for (int i = 0; i < 100'000; ++i) lines += "Ort;" + std::to_string(i) + "\r\n";
+    folder.write("Location.txt", lines);
+    page->reloadLists();
+    page->show();
+    auto* combo = find<QComboBox>("TMC_Loc_Combo");
+    combo->showPopup();
+    const QWidget* list = combo->view();
+    EXPECT_TRUE(list->isVisible());
+    EXPECT_GT(list->height(), 10 * list->fontMetrics().height());
+    EXPECT_LT(list->height(), 30 * list->fontMetrics().height());
+    combo->hidePopup();
 }
 
 TEST_F(TmcBuilderTest, ExtentAndDurationOfferZeroToSevenAndShowZero) {
