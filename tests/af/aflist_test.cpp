@@ -3,19 +3,15 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include "frequencylists.h"
+
 #include <ostream>
 
 namespace kdx {
 namespace {
 
+using test::listOf;
 using ::testing::ElementsAre;
-
-/// A list with the given count of AFs: "98.5,90.0,90.1,...".
-std::string listOf(std::size_t count) {
-    std::string list = "98.5";
-    for (std::size_t i = 0; i < count; ++i) list += ",90." + std::to_string(i % 10);
-    return list;
-}
 
 struct Rewriting {
     const char* list;

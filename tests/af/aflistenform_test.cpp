@@ -15,9 +15,8 @@
 namespace kdx {
 namespace {
 
+using test::kSet1;
 using test::Lines;
-
-constexpr const char* kSet1 = "Datenset1.INI";
 
 class EditorTest : public test::PageTest {
 protected:

@@ -3,24 +3,16 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include "frequencylists.h"
 #include "support/linkfixture.h"
 
 namespace kdx {
 namespace {
 
+using test::listOf;
+using test::parameter;
 using ::testing::ElementsAre;
 using ::testing::IsEmpty;
-
-/// A tuned frequency with the given count of AFs.
-std::string listOf(std::size_t count) {
-    std::string list = "98.5";
-    for (std::size_t i = 0; i < count; ++i) list += ",90.1";
-    return list;
-}
-
-Step parameter(const char* key, const std::string& value) {
-    return {Step::Kind::Parameter, key, value};
-}
 
 class AfListSetTest : public ::testing::Test, protected test::Bench {
 protected:

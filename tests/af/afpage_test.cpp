@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include "frequencylists.h"
 #include "support/listrows.h"
 #include "support/pagetest.h"
 
@@ -13,9 +14,9 @@ namespace kdx {
 namespace {
 
 using test::direct;
+using test::kSet1;
 using test::Lines;
-
-constexpr const char* kSet1 = "Datenset1.INI";
+using test::listOf;
 
 class AfPageTest : public test::PageTest {
 protected:
@@ -31,12 +32,6 @@ protected:
             if (checked(("AFList_Opt_" + std::to_string(i)).c_str())) return i;
         }
         return -1;
-    }
-    /// "98.5" and the given count of AFs.
-    static std::string listOf(int count) {
-        std::string list = "98.5";
-        for (int i = 0; i < count; ++i) list += ",90." + std::to_string(i % 10);
-        return list;
     }
     static std::string pairsOf(int count) {
         std::string list = "98.5";

@@ -17,6 +17,7 @@ std::string caseName(const ::testing::TestParamInfo<Case>& tested) {
     return tested.param.name;
 }
 
+using test::parameter;
 using ::testing::ElementsAre;
 
 using Networks = std::vector<std::string>;
@@ -77,10 +78,6 @@ INSTANTIATE_TEST_SUITE_P(Answers, FirstNetwork,
                                            TextCase{"FirstCharacterIsSkipped", "D3C2", "3C2"},
                                            TextCase{"OneCharacter", "D", ""}, TextCase{"FailedQuery", "", ""}),
                          caseName<TextCase>);
-
-Step parameter(const char* key, const std::string& value) {
-    return {Step::Kind::Parameter, key, value};
-}
 
 class OtherNetworkTest : public ::testing::Test, protected test::Bench {
 protected:

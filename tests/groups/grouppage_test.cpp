@@ -9,9 +9,8 @@ namespace kdx {
 namespace {
 
 using test::direct;
+using test::kSet1;
 using test::Lines;
-
-constexpr const char* kSet1 = "Datenset1.INI";
 
 std::string repeated(const std::string& text, int times) {
     std::string all;

@@ -30,10 +30,6 @@ protected:
     Programme programme;
 };
 
-Step parameter(const char* key, const char* value) {
-    return {.key = key, .value = value};
-}
-
 TEST_F(ProgrammeTest, IsReadFromTheDataSetAndSentInItsFixedOrder) {
     load("PS=ABCDEFGHIJ\r\nPI=d3c\r\nRTA=News\r\nRTB=Second\r\nMS=M\r\nDI=5\r\nPTY=3\r\n");
     EXPECT_EQ(steps(),

@@ -37,7 +37,6 @@ protected:
         state.InstrumentOnline = true;
         transmitter.setWatcher(&recorder);
     }
-    static Step parameter(const char* key, const char* value) { return {Step::Kind::Parameter, key, value}; }
 
     Transmitter transmitter{instrument, params};
     Recorder recorder{visa};

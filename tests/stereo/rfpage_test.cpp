@@ -49,7 +49,6 @@ protected:
         }
     }
 
-    static constexpr const char* kSet1 = "Datenset1.INI";
     Carrier carrier;
     RfPage page{context, carrier, nullptr};
 };

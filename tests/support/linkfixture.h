@@ -6,6 +6,7 @@
 #include <vector>
 
 #include "coder/sendparam.h"
+#include "coder/step.h"
 #include "link/instrument.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
@@ -19,6 +20,9 @@ namespace kdx::test {
 
 using Lines = std::vector<std::string>;
 
+/// The file of data set 1.
+inline constexpr const char* kSet1 = "Datenset1.INI";
+
 /// A coder command as it goes to the instrument.
 inline std::string direct(const std::string& command) {
     return ":STEREO:DIRECT \"" + command + "\"";
@@ -26,6 +30,11 @@ inline std::string direct(const std::string& command) {
 /// A question to the coder as it goes to the instrument.
 inline std::string coder(const std::string& query) {
     return ":STEREO:DIRECT? \"" + query + "\"";
+}
+
+/// The step of a parameter.
+inline Step parameter(const char* key, const std::string& value) {
+    return {.key = key, .value = value};
 }
 
 /// Hands what passes on the link to a function.
