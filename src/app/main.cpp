@@ -54,6 +54,13 @@ void endWhenAsked(kdx::Application& application) {
     });
 }
 
+/// Tries a last time to save what could not be, while there is still somebody to tell.
+void saveTheRest(kdx::DataFolder& data) {
+    data.retryUnsaved();
+    if (const auto unsaved = data.unsavedFile())
+        std::fprintf(stderr, "kdx-rds: what was changed last in %s could not be saved.\n", unsaved->c_str());
+}
+
 }  // namespace
 
 int main(int argc, char** argv) {
@@ -111,13 +118,12 @@ int main(int argc, char** argv) {
         application.guarded(window.objectName(), [&] {
             result = kdx::makeTour(window, session.instrument, tourBoxes, *options.tourFolder, print);
         });
+        saveTheRest(data);
         return result;
     }
     if (application.isEnding()) return EXIT_SUCCESS;  // asked for while a box of the start was open
     window.show();
     const int result = kdx::Application::exec();
-    data.retryUnsaved();  // while there is still somebody to tell
-    if (const auto unsaved = data.unsavedFile())
-        std::fprintf(stderr, "kdx-rds: what was changed last in %s could not be saved.\n", unsaved->c_str());
+    saveTheRest(data);
     return result;
 }

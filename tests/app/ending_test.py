@@ -89,12 +89,24 @@ class Ending(unittest.TestCase):
         self.assertLess(time.monotonic() - asked, 30)
         self.assertEqual(self.record(folder), ["open TCPIP::dead::INSTR", "write", "close"])
 
-    def testWhatCouldNotBeSavedIsToldAtTheEnd(self):
+    def lockedFolder(self):
+        """One whose general settings cannot be written, though the start has something to store."""
         folder = self.folder("locked", "lab", "MANUAL")
         settings = folder / "Daten" / "RDS_Allg.INI"
         # Without a state of the pilot tone the start stores one.
         settings.write_bytes(re.sub(rb"(?m)^PILOT=.*\r\n", b"", settings.read_bytes()))
         settings.chmod(0o444)
+        return folder
+
+    def testTheTourTellsAtItsEndWhatCouldNotBeSaved(self):
+        folder = self.lockedFolder()
+        process = self.start(folder, "--tour", str(folder / "pictures"))
+        printed = process.communicate(timeout=PATIENCE)[0]
+        self.assertEqual(process.returncode, 0, printed)
+        self.assertIn("changed last in RDS_Allg.INI could not be saved", printed)
+
+    def testWhatCouldNotBeSavedIsToldAtTheEnd(self):
+        folder = self.lockedFolder()
         process = self.start(folder)
         self.waitFor(process, (folder / "Daten" / "RDS_log.txt").exists)  # comes after that
         time.sleep(1)
