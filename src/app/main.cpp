@@ -54,6 +54,27 @@ void endWhenAsked(kdx::Application& application) {
     });
 }
 
+/// Lets the instrument go also when exit() ends the program, as Qt calls it when the display is lost: what main owns is
+/// not destroyed then.
+class EndsWithProgram {
+public:
+    explicit EndsWithProgram(kdx::Session& session) {
+        owned() = &session;
+        (void)std::atexit([] {
+            if (owned() != nullptr) owned()->letGo();
+        });
+    }
+    ~EndsWithProgram() { owned() = nullptr; }
+    EndsWithProgram(const EndsWithProgram&) = delete;
+    EndsWithProgram& operator=(const EndsWithProgram&) = delete;
+
+private:
+    static kdx::Session*& owned() {
+        static kdx::Session* session = nullptr;
+        return session;
+    }
+};
+
 /// Tries a last time to save what could not be, while there is still somebody to tell.
 void saveTheRest(kdx::DataFolder& data) {
     data.retryUnsaved();
@@ -109,6 +130,7 @@ int main(int argc, char** argv) {
     });
     const auto end = [&application] { application.end(); };
     kdx::Session session(*link.visa, state, data, captions, clock, end);
+    const EndsWithProgram letGo(session);
     kdx::TickerGroup tickers;
     kdx::HMenue window({session, state, data, captions, clock, dialogs, tickers, claim,
                         QString::fromStdString(link.description), QString::fromStdString(problem), end});

@@ -36,9 +36,9 @@ class Ending(unittest.TestCase):
         settings.write_bytes(text)
         return folder
 
-    def start(self, folder, *options, **how):
-        environment = dict(os.environ, HOME=str(self.home), QT_QPA_PLATFORM="offscreen",
-                           KDX_VISA_RECORD=str(folder / "record"))
+    def start(self, folder, *options, display=None, **how):
+        shown = {"QT_QPA_PLATFORM": "xcb", "DISPLAY": display} if display else {"QT_QPA_PLATFORM": "offscreen"}
+        environment = dict(os.environ, HOME=str(self.home), KDX_VISA_RECORD=str(folder / "record"), **shown)
         process = subprocess.Popen([PROGRAM, "--visa-library", LIBRARY, "--app-folder", str(folder), *options],
                                    stdout=subprocess.PIPE, stderr=subprocess.STDOUT, text=True, env=environment, **how)
         self.addCleanup(process.stdout.close)
@@ -76,6 +76,21 @@ class Ending(unittest.TestCase):
                 self.assertEqual(self.record(folder)[0], "open TCPIP::lab::INSTR")
                 self.assertEqual(self.record(folder)[-1], "close")
                 self.assertEqual(self.record(folder).count("close"), 1)
+
+    @unittest.skipUnless(shutil.which("Xvfb"), "no Xvfb")
+    def testTheLossOfTheDisplayClosesTheSession(self):
+        server = subprocess.Popen(["Xvfb", "-displayfd", "1", "-nolisten", "tcp"], stdout=subprocess.PIPE,
+                                  stderr=subprocess.DEVNULL, text=True)
+        self.addCleanup(server.stdout.close)
+        self.addCleanup(server.wait)
+        self.addCleanup(server.kill)
+        folder = self.folder("display", "lab")
+        process = self.start(folder, display=":" + server.stdout.readline().strip())
+        self.waitForTheFirstWrite(folder, process)
+        server.kill()
+        self.assertNotEqual(process.wait(PATIENCE), 0)
+        self.assertEqual(self.record(folder)[-1], "close")
+        self.assertEqual(self.record(folder).count("close"), 1)
 
     def testABoxOverADeadInstrumentIsClosedAndTheRestIsNotSent(self):
         folder = self.folder("box", "dead")
