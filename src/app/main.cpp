@@ -17,6 +17,7 @@
 #include "settings/folderlock.h"
 #include "settings/leftovers.h"
 #include "settings/programstate.h"
+#include "settings/shownpath.h"
 #include "sim/virtualinstrument.h"
 #include "station/session.h"
 #include "ui/application.h"
@@ -87,7 +88,7 @@ void saveTheRest(kdx::DataFolder& data) {
 int main(int argc, char** argv) {
     const kdx::Options options = kdx::parseOptions({argv + 1, argv + argc});
     if (!options.error.empty()) {
-        std::fprintf(stderr, "kdx-rds: %s\nTry kdx-rds --help.\n", options.error.c_str());
+        std::fprintf(stderr, "kdx-rds: %s\nTry kdx-rds --help.\n", kdx::shownPath(options.error).c_str());
         return kUsageError;
     }
     if (options.help) {

@@ -84,6 +84,25 @@ class Calls(Ctl):
         self.assertIn("none.so", run.stderr)
 
 
+    def testNoControlCharacterIsPrinted(self):
+        """What the terminal would take for a command: in a name of a file, a key, an address."""
+        bad = b"x\x1b[2J\xff"
+        log = self.folder / os.fsdecode(bad)
+        log.write_bytes(b"no log\n")
+        for call in (("--visa-library", bad, "query", "ps"), ("--simulate", "apply", "--file", bad),
+                     ("--simulate", "replay", bad), ("--simulate", "replay", os.fsencode(log)),
+                     ("--simulate", "send", bad), ("--simulate", "send", bad + b"=1"),
+                     ("--simulate", "send", b"PS=" + bad + b'"'), ("--simulate", "send", "--coder", bad + b'"'),
+                     ("--simulate", "query", bad), ("--simulate", "list", bad),
+                     ("--lan", b"127.0.0.9,x\x1b[2J", "query", "ps"), ("--simulate", "query", "ps", b"--" + bad)):
+            with self.subTest(call):
+                run = subprocess.run(self.command(*call), capture_output=True, timeout=100)
+                self.assertIn(run.returncode, (WRONG_CALL, NO_CONNECTION))
+                self.assertIn(b"[2J", run.stderr)
+                self.assertEqual([byte for byte in run.stdout + run.stderr if byte < 0x20 and byte != 0x0A], [])
+                run.stderr.decode()
+
+
 class Lists(Ctl):
     def testTheDataSetsWithPsAndPi(self):
         lines = self.ctl("list").stdout.splitlines()
@@ -130,6 +149,11 @@ class Apply(Ctl):
             self.assertGreater(len(applied), 30)
             # The tour leaves out the blanks at a command's end.
             self.assertEqual(shown[:len(applied)], [line.rstrip() for line in applied], f"data set {number}")
+
+    def testADryRunPrintsNoControlCharacter(self):
+        file = self.write("lab.ini", "[RDS]\r\nPS=A\x1bB\r\n")
+        run = self.ctl("--force", "apply", "--file", file, "--dry-run")
+        self.assertIn(':STEREO:DIRECT "PS=A.B     "\n', run.stdout)
 
     def testAnyFileCanBeSent(self):
         file = self.write("lab.ini", "[RDS]\r\nPS=Käse\r\nPI=1234\r\n")

@@ -5,6 +5,7 @@
 #include "app/ctl/laboratory.h"
 #include "app/ctl/rehearsal.h"
 #include "base/codepage.h"
+#include "base/printable.h"
 #include "coder/sendparam.h"
 
 namespace kdx::ctl {
@@ -47,7 +48,7 @@ int apply(Laboratory& laboratory, const Apply& what) {
         Rehearsal rehearsal(laboratory.data(), laboratory.captions());
         rehearsal.apply(Profile::ofFile(laboratory.data(), file));
         for (const std::string& command : rehearsal.commands()) {
-            laboratory.output().line(toUtf8(command));
+            laboratory.output().line(toUtf8(printable(command, '.')));
             laboratory.output().document["commands"].push_back(toUtf8(command));
         }
         return kDone;

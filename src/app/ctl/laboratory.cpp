@@ -8,6 +8,7 @@
 #include "link/visastatus.h"
 #include "settings/dataplace.h"
 #include "settings/generalsettings.h"
+#include "settings/withoutcontrols.h"
 #include "sim/virtualinstrument.h"
 
 namespace kdx::ctl {
@@ -87,7 +88,7 @@ bool Laboratory::open() {
     std::string address = profile.read(kind == "TCPIP" ? setting::kLanAddress : setting::kGpibAddress);
     if (m_call.lan) {
         kind = "TCPIP";
-        address = *m_call.lan;
+        address = withoutControls(*m_call.lan);
         if (const auto comma = address.find(','); comma != std::string::npos) address.replace(comma, 1, "::");
     } else if (m_call.gpib) {
         kind = "IEC";

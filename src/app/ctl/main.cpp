@@ -8,6 +8,7 @@
 #include "app/ctl/laboratory.h"
 #include "app/ctl/output.h"
 #include "app/platform.h"
+#include "settings/shownpath.h"
 
 namespace {
 
@@ -66,6 +67,9 @@ int called(int argc, const char* const* argv) {
         "Without --lan, --gpib or --simulate the instrument is the one of the general settings.\n"
         "Exit codes: 0 done, 1 a command failed, 2 wrong call or unreadable file, 4 no connection.\n"
         "kdx-ctl SUBCOMMAND --help says more.");
+    app.failure_message([](const CLI::App*, const CLI::Error& error) {
+        return kdx::shownPath(error.what()) + "\nRun with --help for more information.\n";
+    });
     try {
         app.parse(argc, argv);
     } catch (const CLI::ParseError& error) {

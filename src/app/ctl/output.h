@@ -19,7 +19,7 @@ public:
     void line(const std::string& text) const;
     /// A line that only tells how it goes; not with JSON, not when the call is to be quiet.
     void remark(const std::string& text) const;
-    void problem(const std::string& text);
+    void problem(const std::string& problem);
     /// Which command of how many goes out; only while the standard error is a terminal.
     void progress(std::size_t number, std::size_t total);
     void endProgress();
