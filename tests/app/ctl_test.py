@@ -189,6 +189,13 @@ class Send(Ctl):
         self.assertEqual(self.sent("send", "PS=RADIO\n", "--raw", "FREQ 99 MHZ\r\n*RST"),
                          [':STEREO:DIRECT "PS=RADIO   "', "FREQ 99 MHZ *RST"])
 
+    def testACoderCommandThatADoubleQuoteEndsIsRefused(self):
+        run = self.simulated("-v", "send", "TP=1", "--coder", 'PS=x";*RST', expect=WRONG_CALL)
+        self.assertEqual(run.stdout, "")
+        self.assertIn('the coder command PS=x";*RST cannot be sent: a double quote ends it early', run.stderr)
+        self.assertEqual(self.sent("--force", "send", "--coder", 'PS=x";*RST'), [':STEREO:DIRECT "PS=x";*RST"'])
+        self.assertEqual(self.sent("send", "--raw", ':STEREO:DIRECT "PS=x";*RST'), [':STEREO:DIRECT "PS=x";*RST'])
+
     def testIllegalValuesAreNamedBeforeAnythingIsSent(self):
         run = self.simulated("-v", "send", "TP=1", "HF-Frequenz=98,5", "NOKEY=1", expect=WRONG_CALL)
         self.assertEqual(run.stdout, "")
@@ -247,6 +254,16 @@ class Replay(Ctl):
         self.assertEqual(run.stdout, "")
         self.assertIn("line 5: not a line of a command log", run.stderr)
         self.assertIn("line 10: not a line of a command log", run.stderr)
+
+    def testALineThatADoubleQuoteEndsIsNamedAndNothingIsSent(self):
+        bad = ':STEREO:DIRECT "PS=x";*RST"'
+        log = self.write("log.txt", self.LOG + f'             PS= "{bad}"\r\n')
+        for options in ((), ("--check",)):
+            run = self.simulated("-v", "replay", *options, log, expect=WRONG_CALL)
+            self.assertEqual(run.stdout, "")
+            self.assertEqual(run.stderr.count("\n"), 1)
+            self.assertIn("line 5: a double quote ends the coder command early", run.stderr)
+        self.assertEqual(self.sent("--force", "replay", log)[-1], bad)
 
     def testAMissingLogIsExitCode2(self):
         self.simulated("replay", str(self.folder / "none"), expect=WRONG_CALL)
