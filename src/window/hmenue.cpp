@@ -320,11 +320,8 @@ QStringList HMenue::notes() const {
     const auto unsaved = m_s.data.unsavedFile();
     const auto unreadable = m_s.data.unreadableFile();
     if (unreadable && unreadable != unsaved) note({325, "Nicht lesbar: %1"}, toText(*unreadable));
-    if (unsaved) {
-        note({312, "Nicht gespeichert: %1"}, toText(*unsaved));
-    } else if (!m_s.session.instrument.log.isWritable()) {
-        note({312, "Nicht gespeichert: %1"}, toText(kCommandLog));
-    }
+    if (unsaved) note({312, "Nicht gespeichert: %1"}, toText(*unsaved));
+    if (!m_s.session.instrument.log.isWritable()) note({312, "Nicht gespeichert: %1"}, toText(kCommandLog));
     if (m_s.claim.isShared()) note({326, "Ein anderes Programm nutzt dieselben Daten"});
     QStringList quoted;
     for (const std::string& key : m_s.session.params.quotedKeys()) quoted += toText(key);

@@ -102,6 +102,11 @@ class Calls(Ctl):
                 self.assertEqual([byte for byte in run.stdout + run.stderr if byte < 0x20 and byte != 0x0A], [])
                 run.stderr.decode()
 
+    def testALogThatCannotBeWrittenIsToldOnce(self):
+        (self.folder / "Daten" / "RDS_log.txt").mkdir()
+        run = self.simulated("send", "PS=RADIO", "TP=1")
+        self.assertRegex(run.stderr, r"^kdx-ctl: the command log .*RDS_log\.txt cannot be written\n$")
+
 
 class Lists(Ctl):
     def testTheDataSetsWithPsAndPi(self):

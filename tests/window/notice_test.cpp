@@ -40,6 +40,15 @@ TEST_F(NoticeTest, ALogThatLeadsElsewhereIsToldAlsoWithLoggingOff) {
     EXPECT_EQ(notice(), "");
 }
 
+TEST_F(NoticeTest, SettingsAndALogThatCannotBeWrittenAreBothTold) {
+    std::filesystem::create_directory(folder.data() / kCommandLog);
+    folder.write("Datenset1.INI", "\xFF\xFE");
+    start();
+    openSession();
+    click("PS_Taste");
+    EXPECT_EQ(notice(), "Nicht gespeichert: Datenset1.INI  -  Nicht gespeichert: RDS_log.txt");
+}
+
 TEST_F(NoticeTest, PipesInThePlaceOfFilesDelayNothing) {
     for (const char* file : {kCommandLog, kPictureOn, kPictureOff, kEventList, "Datenset1.INI"}) {
         std::filesystem::remove(folder.data() / file);

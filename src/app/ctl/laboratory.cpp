@@ -1,5 +1,7 @@
 #include "app/ctl/laboratory.h"
 
+#include <utility>
+
 #include "app/platform.h"
 #include "base/codepage.h"
 #include "base/numbers.h"
@@ -68,6 +70,10 @@ Laboratory::Laboratory(const Call& call, Output& output, const char* program, in
     m_session->transmitter.setWatcher(this);
     m_session->instrument.onFailure([this](const std::string&, bool) { return linkFailed(); });
     m_session->instrument.addWatcher(*this);
+    m_session->instrument.log.onChange([this, told = false]() mutable {
+        if (m_session->instrument.log.isWritable() || std::exchange(told, true)) return;
+        m_output.problem("the command log " + m_data.file(kCommandLog).string() + " cannot be written");
+    });
 }
 
 Laboratory::~Laboratory() {
