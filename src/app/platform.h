@@ -22,6 +22,9 @@ namespace kdx {
 /// Whether the descriptor can be read without waiting; false for -1.
 [[nodiscard]] bool isReadable(int descriptor);
 
+/// From now on writing to a pipe that nobody reads any more fails, instead of ending the program.
+void surviveBrokenPipes();
+
 /// From now on the system's requests to end the program (SIGTERM, SIGINT, SIGHUP) no longer end it at once: they make
 /// the descriptor that this gives readable. -1 when they cannot be had so.
 [[nodiscard]] int endRequests();

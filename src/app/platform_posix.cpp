@@ -57,6 +57,10 @@ bool isReadable(int descriptor) {
     return descriptor >= 0 && poll(&asked, 1, 0) == 1;
 }
 
+void surviveBrokenPipes() {
+    std::signal(SIGPIPE, SIG_IGN);
+}
+
 int endRequests() {
     std::array<int, 2> ends{};
     if (pipe(ends.data()) != 0) return -1;

@@ -295,6 +295,23 @@ class OverTheNetwork(Ctl):
     def testTheAddressOfTheGeneralSettingsIsTheDefault(self):
         self.assertEqual(self.ctl("query", "ps").stdout, "KDX-X4  \n")
 
+    def testAnAddressCopiedWithItsLineEnd(self):
+        self.assertEqual(self.ctl("--lan", "127.0.0.1\r\n", "query", "ps").stdout, "KDX-X4  \n")
+
+    def testAReaderThatGoesAwayStopsNothing(self):
+        process = subprocess.Popen(self.command("--lan", "127.0.0.1", "-v", "apply", "--data-set", "2"),
+                                   stdout=subprocess.PIPE, stderr=subprocess.PIPE, text=True)
+        process.stdout.readline()
+        process.stdout.close()
+        with process.stderr:
+            self.assertEqual(process.stderr.read(), "")
+        self.assertEqual(process.wait(100), DONE)
+        names = ("ps", "groups", "eon", "frequency")
+        cut = self.lan("query", *names).stdout
+        self.lan("apply", "--data-set", "2")
+        self.assertEqual(cut, self.lan("query", *names).stdout)
+        self.assertIn("TALWELLE", cut)
+
     def testADeviceNameIsGivenBehindAComma(self):
         self.assertEqual(self.ctl("--lan", "127.0.0.1,inst0", "query", "ps").stdout, "KDX-X4  \n")
         self.ctl("--lan", "127.0.0.1,nothing", "query", "ps", expect=NO_CONNECTION)

@@ -83,7 +83,7 @@ Laboratory::~Laboratory() {
 }
 
 bool Laboratory::open() {
-    // A run goes on over midnight, whatever the window is to do.
+    // A run goes on over midnight, whatever the general settings say of the window: nobody sits by a script.
     m_clock.correctMidnight(true);
     if (!m_session) {
         m_output.problem(m_link.description);

@@ -38,6 +38,8 @@ void addManner(CLI::App& app, Call& call) {
 }
 
 int run(const Call& call, const kdx::ctl::Task& task, const char* program) {
+    // Who does not want to read on stops nothing that is half sent.
+    kdx::surviveBrokenPipes();
     kdx::ctl::Output output(call);
     int result = kdx::ctl::kFailed;
     try {
