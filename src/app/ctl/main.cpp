@@ -58,8 +58,8 @@ int called(int argc, const char* const* argv) {
     addConnection(app, call);
     addManner(app, call);
     kdx::ctl::Task task;
-    for (const auto add :
-         {kdx::ctl::addApply, kdx::ctl::addList, kdx::ctl::addQuery, kdx::ctl::addReplay, kdx::ctl::addSend}) {
+    for (const auto add : {kdx::ctl::addApply, kdx::ctl::addDiff, kdx::ctl::addList, kdx::ctl::addQuery,
+                           kdx::ctl::addRead, kdx::ctl::addReplay, kdx::ctl::addSend}) {
         add(app, task);
     }
     app.footer(

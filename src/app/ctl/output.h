@@ -2,6 +2,7 @@
 
 #include <cstddef>
 #include <string>
+#include <vector>
 
 #include <nlohmann/json.hpp>
 
@@ -20,6 +21,9 @@ public:
     /// A line that only tells how it goes; not with JSON, not when the call is to be quiet.
     void remark(const std::string& text) const;
     void problem(const std::string& text);
+    using Rows = std::vector<std::vector<std::string>>;
+    /// Lines of the result with their columns under each other.
+    void table(const Rows& rows) const;
     /// Which command of how many goes out; only while the standard error is a terminal.
     void progress(std::size_t number, std::size_t total);
     void endProgress();
