@@ -61,7 +61,7 @@ NotKept notKept(DataFolder& data, const Captions& captions, const Profile& sourc
     const SentValues sent(source);
     NotKept result;
     std::copy_if(readout.begin(), readout.end(), std::back_inserter(result.unsent), [&](const Reading& reading) {
-        return reading.value.value_or("") != "" && !sent.hold(reading.key, reading.network);
+        return !reading.value.value_or("").empty() && !sent.hold(reading.key, reading.network);
     });
     result.changed = differences(rehearsal.readOut(), readout);
     std::erase_if(result.changed, [&](const Difference& d) { return !sent.hold(d.key, d.network); });

@@ -93,9 +93,8 @@ public:
                   pilotPhaseSetting(storedPosition(value, kLowestPilotPhase, kHighestPilotPhase)));
         }
         for (const Deviation& deviation : kDeviations) {
-            if (key == deviation.setting.sendKey)
-                write(deviation.setting.place,
-                      deviationSetting(deviation, storedPosition(value, 0, deviation.highest)));
+            if (key != deviation.setting.sendKey) continue;
+            write(deviation.setting.place, deviationSetting(deviation, storedPosition(value, 0, deviation.highest)));
         }
     }
 

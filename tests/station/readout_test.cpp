@@ -56,9 +56,10 @@ struct Laboratory {
 
 std::string names(const Differences& differing) {
     std::string text;
-    for (const auto& [key, network, wanted, present] : differing)
-        text += key + " " + network + ": wanted " + wanted.value_or("(none)") + ", present " +
-                present.value_or("(none)") + "\n";
+    for (const auto& [key, network, wanted, present] : differing) {
+        text.append(key).append(" ").append(network).append(": wanted ").append(wanted.value_or("(none)"));
+        text.append(", present ").append(present.value_or("(none)")).append("\n");
+    }
     return text;
 }
 
