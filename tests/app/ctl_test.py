@@ -59,6 +59,14 @@ class Calls(Ctl):
                 self.assertNotEqual(run.stderr, "")
                 self.assertEqual(run.stdout, "")
 
+    def testATimeoutIsAPlainNumberOfSeconds(self):
+        for wrong in ("0", "0.05", "601", "2,5", "nan", "inf", "-1", "1e1", "0x1", "", "soon"):
+            with self.subTest(wrong):
+                run = self.ctl("--simulate", "--timeout", wrong, "query", "ps", expect=WRONG_CALL)
+                self.assertIn("0.1 to 600", run.stderr)
+        for right in ("0.1", "2.5", "600"):
+            self.ctl("--simulate", "--timeout", right, "query", "ps")
+
     def testHelpOfEachSubcommandHasAnExample(self):
         overview = self.ctl("--help").stdout
         for name in ("apply", "list", "query", "replay", "send"):
@@ -275,6 +283,29 @@ class OverTheNetwork(Ctl):
         self.assertEqual(code, FAILED)
         self.assertEqual(problems.count("the link to the instrument is broken"), 1, problems)
         self.assertGreater(len(rest), 10)
+
+    def secondsToNoticeSilence(self, *options):
+        """How long a read takes when the instrument falls silent in the middle."""
+        process = subprocess.Popen(self.command("--lan", "127.0.0.1", "-v", *options, "query", "all"),
+                                   stdout=subprocess.PIPE, stderr=subprocess.PIPE, text=True)
+        process.stdout.readline()
+        self.sim.send_signal(signal.SIGSTOP)
+        began = time.monotonic()
+        problem = process.stderr.readline()
+        took = time.monotonic() - began
+        _, rest = process.communicate(timeout=100)
+        self.sim.send_signal(signal.SIGCONT)
+        self.assertEqual(process.returncode, FAILED)
+        self.assertRegex(problem, r"time-out.*\(-1073807339\).*keeps silent")
+        self.assertEqual(rest, "")
+        return took
+
+    def testHowLongAnAnswerMayTakeCanBeSaid(self):
+        self.assertLess(self.secondsToNoticeSilence("--timeout", "0.5"), 1.5)
+        self.assertGreater(self.secondsToNoticeSilence("--timeout", "3"), 2.9)
+
+    def testAnAnswerMayTakeTwoSecondsElse(self):
+        self.assertTrue(1.9 < self.secondsToNoticeSilence() < 3)
 
     def testARequestToEndStopsAfterTheRunningCommand(self):
         for request in (signal.SIGINT, signal.SIGTERM):

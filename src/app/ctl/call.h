@@ -18,6 +18,7 @@ class Laboratory;
 inline constexpr int kDone = 0;
 inline constexpr int kFailed = 1;        ///< a command failed, or the run was stopped
 inline constexpr int kWrongCall = 2;     ///< the call cannot be understood, or a file cannot be read
+inline constexpr int kDifferent = 3;     ///< done, and what was compared differs, or there are warnings
 inline constexpr int kNoConnection = 4;  ///< the instrument cannot be reached
 
 /// What holds for every subcommand.
