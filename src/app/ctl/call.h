@@ -44,5 +44,6 @@ void addList(CLI::App& app, Task& task);
 void addQuery(CLI::App& app, Task& task);
 void addReplay(CLI::App& app, Task& task);
 void addSend(CLI::App& app, Task& task);
+void addShell(CLI::App& app, Task& task);
 
 }  // namespace kdx::ctl

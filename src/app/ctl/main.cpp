@@ -35,7 +35,7 @@ void addTimeout(CLI::App& app, Call& call) {
            "--timeout",
            [&call](const std::string& text) {
                using namespace std::chrono_literals;
-               call.program.answerTime = kdx::parseDuration(text + "s");
+               call.program.answerTime = kdx::parseDuration(text + " s");
                if (!call.program.answerTime || *call.program.answerTime < 100ms || *call.program.answerTime > 600s)
                    throw CLI::ValidationError("--timeout", "takes 0.1 to 600 seconds, not \"" + text + "\"");
            },
@@ -74,8 +74,8 @@ int called(int argc, const char* const* argv) {
     addTimeout(app, call);
     addManner(app, call);
     kdx::ctl::Task task;
-    for (const auto add :
-         {kdx::ctl::addApply, kdx::ctl::addList, kdx::ctl::addQuery, kdx::ctl::addReplay, kdx::ctl::addSend}) {
+    for (const auto add : {kdx::ctl::addApply, kdx::ctl::addList, kdx::ctl::addQuery, kdx::ctl::addReplay,
+                           kdx::ctl::addSend, kdx::ctl::addShell}) {
         add(app, task);
     }
     app.footer(
