@@ -59,10 +59,19 @@ class Calls(Ctl):
                 self.assertNotEqual(run.stderr, "")
                 self.assertEqual(run.stdout, "")
 
+    def testATimeoutIsAPlainNumberOfSeconds(self):
+        for wrong in ("0", "0.05", "601", "2,5", "nan", "inf", "-1", "1e1", "0x1", "500m", "", "soon"):
+            with self.subTest(wrong):
+                run = self.ctl("--simulate", "--timeout", wrong, "query", "ps", expect=WRONG_CALL)
+                self.assertIn("0.1 to 600", run.stderr)
+        for right in ("0.1", "2.5", "600"):
+            self.ctl("--simulate", "--timeout", right, "query", "ps")
+
     def testHelpOfEachSubcommandHasAnExample(self):
         overview = self.ctl("--help").stdout
-        for name in ("apply", "list", "query", "replay", "send"):
-            self.assertIn(name, overview)
+        names = re.findall(r"(?m)^  ([a-z]+) ", overview.split("Subcommands:")[1])
+        self.assertGreaterEqual(len(names), 6)
+        for name in names:
             self.assertIn("Example: kdx-ctl " + name, self.ctl(name, "--help").stdout)
 
     def testNoWindowToolkitIsLinked(self):
@@ -156,6 +165,10 @@ class Send(Ctl):
         self.assertEqual(self.sent("send", "PS=Käse", "TP=1", "HF-Frequenz=98.5", "EON_PI=D3C1", "EON_TA=1"),
                          [':STEREO:DIRECT "PS=Käse    "', ":stereo:rds:traffic:program ON", "FREQ 98.5MHZ",
                           ':STEREO:DIRECT "EON-PI=D3C1"', ':STEREO:DIRECT "EON-TA=D3C1,1"'])
+
+    def testAnOptionTakesOneTextAndTheRestAreSettings(self):
+        self.assertEqual(self.sent("send", "--raw", "FREQ 99 MHz", "TP=1", "--raw", "*CLS", "PTY=7"),
+                         [":stereo:rds:traffic:program ON", ':STEREO:DIRECT "PTY=07"', "FREQ 99 MHz", "*CLS"])
 
     def testCommandsGoAsTheyStand(self):
         self.assertEqual(self.sent("send", "--raw", "FREQ 99 MHz", "--coder", "PTY=07"),
@@ -330,6 +343,29 @@ class OverTheNetwork(Ctl):
         self.assertEqual(code, FAILED)
         self.assertEqual(problems.count("the link to the instrument is broken"), 1, problems)
         self.assertGreater(len(rest), 10)
+
+    def secondsToNoticeSilence(self, *options):
+        """How long a read takes when the instrument falls silent in the middle."""
+        process = subprocess.Popen(self.command("--lan", "127.0.0.1", "-v", *options, "query", "all"),
+                                   stdout=subprocess.PIPE, stderr=subprocess.PIPE, text=True)
+        process.stdout.readline()
+        self.sim.send_signal(signal.SIGSTOP)
+        began = time.monotonic()
+        problem = process.stderr.readline()
+        took = time.monotonic() - began
+        _, rest = process.communicate(timeout=100)
+        self.sim.send_signal(signal.SIGCONT)
+        self.assertEqual(process.returncode, FAILED)
+        self.assertRegex(problem, r"time-out.*\(-1073807339\).*keeps silent")
+        self.assertEqual(rest, "")
+        return took
+
+    def testHowLongAnAnswerMayTakeCanBeSaid(self):
+        self.assertLess(self.secondsToNoticeSilence("--timeout", "0.5"), 1.5)
+        self.assertGreater(self.secondsToNoticeSilence("--timeout", "3"), 2.9)
+
+    def testAnAnswerMayTakeTwoSecondsElse(self):
+        self.assertTrue(1.9 < self.secondsToNoticeSilence() < 3)
 
     def testARequestToEndStopsAfterTheRunningCommand(self):
         for request in (signal.SIGINT, signal.SIGTERM):

@@ -69,6 +69,14 @@ std::int32_t viStatusDesc(Unsigned object, Signed status, char* description) {
 }
 #endif
 
+#ifndef KDX_WITHOUT_ATTRIBUTES
+std::int32_t viSetAttribute(Unsigned object, Unsigned attribute, std::uintptr_t value) {
+    if (object != kSession) return kInvalidObject;
+    held += " " + std::to_string(attribute) + "=" + std::to_string(value);
+    return value == 6667 ? kInvalidObject : 0;
+}
+#endif
+
 std::int32_t viWrite(Unsigned session, const unsigned char* bytes, Unsigned count, Unsigned* written) {
     if (session != kSession) return kInvalidObject;
     held.assign(reinterpret_cast<const char*>(bytes), count);

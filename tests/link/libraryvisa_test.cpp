@@ -56,6 +56,34 @@ TEST_F(LibraryVisaTest, OpensWithTheArgumentsAsTheyStand) {
     EXPECT_THAT(read(), StartsWith("TCPIP:: x ::INSTR 1 2500"));
 }
 
+TEST(LibraryVisaTime, IsSetForEachSession) {
+    using namespace std::chrono_literals;
+    for (const std::string& file : {kComplete, kWide}) {
+        const VisaLibrary library = loadVisaLibrary(file, 2500ms);
+        ASSERT_NE(library.visa, nullptr) << library.reason;
+        VisaHandle manager = 0, session = 0;
+        library.visa->viOpenDefaultRM(manager);
+        ASSERT_EQ(library.visa->viOpen(manager, "GPIB0::28::INSTR", 0, 0, session), 0);
+        std::string answer(60, ' ');
+        std::int32_t count = 0;
+        library.visa->viRead(session, answer, count);
+        EXPECT_THAT(answer, StartsWith("GPIB0::28::INSTR 0 0 1073676314=2500 "));
+    }
+}
+
+TEST(LibraryVisaTime, ThatTheLibraryDoesNotTakeIsAFailedOpening) {
+    using namespace std::chrono_literals;
+    const VisaLibrary library = loadVisaLibrary(kComplete, 6667ms);
+    VisaHandle manager = 0, session = 0;
+    library.visa->viOpenDefaultRM(manager);
+    EXPECT_EQ(library.visa->viOpen(manager, "GPIB0::28::INSTR", 0, 0, session), visa::kInvalidObject);
+}
+
+TEST(LibraryVisaTime, NeedsALibraryThatCanSetIt) {
+    EXPECT_NE(loadVisaLibrary(kWordless).visa, nullptr);
+    EXPECT_THAT(loadVisaLibrary(kWordless, std::chrono::milliseconds(100)).reason, HasSubstr("lacks viSetAttribute"));
+}
+
 TEST_F(LibraryVisaTest, StatusesOfAllKindsComeThrough) {
     EXPECT_EQ(library.visa->viOpen(manager, "STATUS -1073807343", 0, 0, session), -1073807343);
     EXPECT_EQ(library.visa->viOpen(manager, "STATUS 1073676413", 0, 0, session), 1073676413);

@@ -46,5 +46,6 @@ void addQuery(CLI::App& app, Task& task);
 void addRead(CLI::App& app, Task& task);
 void addReplay(CLI::App& app, Task& task);
 void addSend(CLI::App& app, Task& task);
+void addShell(CLI::App& app, Task& task);
 
 }  // namespace kdx::ctl

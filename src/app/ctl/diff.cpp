@@ -44,7 +44,7 @@ int diff(Laboratory& laboratory, const Diff& what) {
         laboratory.output().remark(left.empty() ? "all of it is mended" : "what differs still:");
         tellDifferences(laboratory.output(), "left", left);
     }
-    laboratory.session().close();
+    laboratory.close();
     if (laboratory.result() != kDone) return laboratory.result();
     return left.empty() ? kDone : kDifferent;
 }

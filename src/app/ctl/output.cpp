@@ -30,8 +30,8 @@ void Output::remark(const std::string& text) const {
 void Output::problem(const std::string& text) {
     endProgress();
     std::fflush(stdout);
-    std::fprintf(stderr, "kdx-ctl: %s\n", text.c_str());
-    document["problems"].push_back(text);
+    std::fprintf(stderr, "kdx-ctl: %s%s\n", m_place.c_str(), text.c_str());
+    note(text);
 }
 
 void Output::table(const Rows& rows) const {
@@ -63,9 +63,23 @@ void Output::endProgress() {
 
 void Output::finish(int exitCode) {
     endProgress();
-    if (!m_call.json) return;
+    if (!m_call.json || m_linewise) return;
     document["exit_code"] = exitCode;
     std::puts(document.dump(2, ' ', false, nlohmann::json::error_handler_t::replace).c_str());
+}
+
+void Output::beginLine(std::size_t number, const std::string& place) {
+    document = {{"line", number}};
+    m_place = place;
+}
+
+bool Output::endLine(int exitCode) {
+    m_place.clear();
+    if (m_call.json) {
+        document["exit_code"] = exitCode;
+        std::puts(document.dump(-1, ' ', false, nlohmann::json::error_handler_t::replace).c_str());
+    }
+    return std::fflush(stdout) == 0 && std::ferror(stdout) == 0;
 }
 
 }  // namespace kdx::ctl

@@ -48,7 +48,7 @@ int read(Laboratory& laboratory, const std::string& into) {
     if (!laboratory.open()) return kNoConnection;
     const CommandSequence sequence(laboratory.session().instrument);
     const Readout readout = readOut(laboratory.session().instrument);
-    laboratory.session().close();
+    laboratory.close();
     if (laboratory.result() != kDone) return laboratory.result();
     ProfileText text(*before);
     keep(readout, text);
