@@ -73,12 +73,17 @@ private:
     struct UnsavedFile {
         std::string name;
         std::vector<Setting> settings;
+        // The file's content and the same with the settings, made once: a large file is not copied for each read.
+        mutable std::shared_ptr<const ProfileText> content;
+        mutable std::shared_ptr<const ProfileText> changed;
     };
     using Notice = std::pair<std::optional<std::string>, std::optional<std::string>>;
 
     UnsavedFile& unsavedPart(std::string_view fileName);
     [[nodiscard]] bool save(const UnsavedFile& unsaved);
     [[nodiscard]] bool changeFile(const UnsavedFile& unsaved);
+    [[nodiscard]] static std::shared_ptr<const ProfileText> changed(const UnsavedFile& unsaved,
+                                                                    const std::shared_ptr<const ProfileText>& content);
     [[nodiscard]] std::shared_ptr<const ProfileText> load(std::string_view fileName,
                                                           const std::filesystem::path& path) const;
     [[nodiscard]] Notice notice() const { return {unsavedFile(), unreadableFile()}; }

@@ -176,6 +176,22 @@ TEST(ReadFileTest, GivesNothingForWhatIsNoFile) {
     EXPECT_EQ(readFile("/dev/zero"), std::nullopt);
 }
 
+TEST(FileHoldsTest, ComparesEveryByteAndTheLength) {
+    const test::TempFolder folder;
+    const std::string bytes(200'000, 'x');
+    const auto file = folder.data() / "a.ini";
+    folder.write("a.ini", bytes);
+    EXPECT_TRUE(fileHolds(file, bytes));
+    EXPECT_FALSE(fileHolds(file, bytes + "x"));
+    EXPECT_FALSE(fileHolds(file, bytes.substr(1)));
+    EXPECT_FALSE(fileHolds(file, bytes.substr(1) + "y"));
+    EXPECT_FALSE(fileHolds(file, ""));
+    folder.write("a.ini", "");
+    EXPECT_TRUE(fileHolds(file, ""));
+    EXPECT_FALSE(fileHolds(folder.data() / "missing.ini", ""));
+    EXPECT_FALSE(fileHolds(folder.data(), ""));
+}
+
 TEST(ReadToChangeTest, GivesTheBytesOfAFileAndNoneOfOneYetToBeMade) {
     const test::TempFolder folder;
     folder.write("a.ini", "PS=A");

@@ -70,6 +70,16 @@ TEST_F(UnsavedTest, AReadGivesItMeanwhileByTheRulesOfReading) {
     EXPECT_EQ(read("PS"), "");
 }
 
+TEST_F(UnsavedTest, ReadsMeanwhileCopyTheFileOnceOnly) {
+    lock();
+    write("PS", "NEW");
+    const auto first = m_data.profile(kFile);
+    EXPECT_EQ(m_data.profile(kFile), first);
+    write("PS", "NEWER");
+    EXPECT_EQ(m_data.profile(kFile)->value("RDS", "PS"), "NEWER");
+    EXPECT_EQ(first->value("RDS", "PS"), "NEW") << "what was handed out stays as it is";
+}
+
 TEST_F(UnsavedTest, OfSeveralValuesOfAKeyTheLastIsKept) {
     lock();
     write("PS", "FIRST");
