@@ -68,7 +68,9 @@ std::shared_ptr<const ProfileText> DataFolder::profile(std::string_view fileName
     if (unsaved == m_unsaved.end()) return text;
     std::error_code error;
     const fs::file_status status = fs::status(path, error);
-    if (fs::exists(status) && !fs::is_regular_file(status)) return nullptr;  // a folder reads as nothing
+    // Users expect to read what they wrote, but with a folder in the file's place the operating system was seen to give
+    // nothing even then, and so do we; the value is not lost, it goes out once the folder is gone.
+    if (fs::exists(status) && !fs::is_regular_file(status)) return nullptr;
     return changed(*unsaved, text);
 }
 

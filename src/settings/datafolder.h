@@ -47,8 +47,8 @@ public:
     [[nodiscard]] std::shared_ptr<const ProfileText> profile(std::string_view fileName) const;
 
     /// Writes one key at once; creates the file and the section if needed. A failure changes nothing on disk, throws
-    /// nothing and opens no box: the value is kept, is what a read gives meanwhile, and goes with the next write to the
-    /// same file or with retryUnsaved().
+    /// nothing and opens no box: the value is kept, is what a read gives meanwhile (but nothing for a folder), and goes
+    /// with the next write to the same file or with retryUnsaved().
     void WriteIni(std::string_view section, std::string_view key, std::string_view value, std::string_view fileName);
 
     /// Tries to write what could not be written so far, and looks again at what could not be read.

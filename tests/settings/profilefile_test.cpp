@@ -60,6 +60,7 @@ TEST(ProfileTextTest, TheMarkOfAUtf8FileIsPassedOverAndKept) {
     EXPECT_EQ(written(marked, "RDS", "PS", "X"), mark + "[RDS]\r\nPS=X\r\n");
     EXPECT_EQ(written(marked, "FM", "ARI", "1"), marked + "[FM]\r\nARI=1\r\n");
     EXPECT_EQ(written(mark, "RDS", "PS", "X"), mark + "[RDS]\r\nPS=X\r\n");
+    EXPECT_EQ(ProfileText(mark + "[RDS]\r\nPS=F\xC3\x9CNF\r\n").value("RDS", "PS"), "F\xC3\x9CNF") << "8-bit text";
     EXPECT_EQ(ProfileText("[RDS]\r\n" + mark + "PS=RADIO\r\n").value("RDS", "PS"), "") << "only where a file begins";
 }
 

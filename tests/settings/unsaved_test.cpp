@@ -127,13 +127,18 @@ TEST_F(UnsavedTest, AFolderThatComesBackGetsEverything) {
     EXPECT_EQ(m_folder.read(kFile), "[RDS]\r\nPS=NEW\r\nPI=D3C0\r\n");
 }
 
-TEST_F(UnsavedTest, AFolderInTheFilesPlaceReadsAsNothingAllTheSame) {
-    fs::create_directory(m_folder.data() / "a.ini");
-    m_data.WriteIni("M", "a", "1", "a.ini");
-    EXPECT_EQ(m_data.ReadIni("M", "a", "a.ini"), "");
-    fs::remove(m_folder.data() / "a.ini");
+TEST_F(UnsavedTest, AFolderInTheFilesPlaceReadsAsNothingAndGivesTheValueBackWhenItGoes) {
+    const fs::path file = m_folder.data() / kGeneralSettings;
+    fs::create_directory(file);
+    m_data.WriteIni("BUS", "INTERFACE", "IEC", kGeneralSettings);
+    EXPECT_EQ(m_data.ReadIni("BUS", "INTERFACE", kGeneralSettings), "");
+    EXPECT_EQ(m_data.unsavedFile(), kGeneralSettings);
+    EXPECT_TRUE(fs::is_directory(file));
+    fs::remove(file);
+    EXPECT_EQ(m_data.ReadIni("BUS", "INTERFACE", kGeneralSettings), "IEC") << "kept meanwhile";
     m_data.retryUnsaved();
-    EXPECT_EQ(m_data.ReadIni("M", "a", "a.ini"), "1");
+    EXPECT_EQ(m_data.unsavedFile(), std::nullopt);
+    EXPECT_EQ(m_folder.read(kGeneralSettings), "[BUS]\r\nINTERFACE=IEC\r\n");
 }
 
 TEST_F(UnsavedTest, AFileInUtf16IsToldAndLeftAlone) {
