@@ -145,7 +145,10 @@ std::optional<std::string> DataFolder::unsavedFile() const {
 }
 
 std::optional<std::string> DataFolder::unreadableFile() const {
-    return m_unreadable.empty() ? std::nullopt : std::optional(m_unreadable.back());
+    const auto unsaved = unsavedFile();
+    const auto found = std::find_if(m_unreadable.rbegin(), m_unreadable.rend(),
+                                    [&](const std::string& name) { return !unsaved || !equalNoCase(name, *unsaved); });
+    return found == m_unreadable.rend() ? std::nullopt : std::optional(*found);
 }
 
 /// The file's content on disk; notes whether there is one that cannot be read.

@@ -58,7 +58,7 @@ public:
     [[nodiscard]] std::optional<std::string> unsavedFile() const;
 
     /// Name of the file last found to be there but without settings that can be read: UTF-16 text, a folder, a file
-    /// without rights. Such a file is never written.
+    /// without rights. Such a file is never written. The one of unsavedFile() is left out: it is told as that.
     [[nodiscard]] std::optional<std::string> unreadableFile() const;
 
     /// Called whenever unsavedFile() or unreadableFile() changes.

@@ -173,6 +173,14 @@ TEST_F(UnsavedTest, AFolderInAFilesPlaceIsUnreadable) {
     EXPECT_EQ(m_data.unreadableFile(), std::nullopt) << "a missing file is no fault";
 }
 
+TEST_F(UnsavedTest, AFileThatCouldNotBeWrittenHidesNoOtherThatCannotBeRead) {
+    for (const char* name : {"a.ini", "b.ini"}) fs::create_directory(m_folder.data() / name);
+    EXPECT_EQ(m_data.ReadIni("M", "a", "a.ini"), "");
+    m_data.WriteIni("M", "a", "1", "b.ini");
+    EXPECT_EQ(m_data.unsavedFile(), "b.ini");
+    EXPECT_EQ(m_data.unreadableFile(), "a.ini");
+}
+
 TEST_F(UnsavedTest, FilesThatCanBeReadOrAreMissingAreNotTold) {
     EXPECT_EQ(read("PS"), "OLD");
     EXPECT_EQ(m_data.ReadIni("BUS", "INTERFACE", kGeneralSettings), "");
