@@ -1,12 +1,12 @@
 #include "app/ctl/laboratory.h"
 
+#include "app/appfolder.h"
 #include "app/platform.h"
 #include "base/codepage.h"
 #include "base/numbers.h"
 #include "base/printable.h"
 #include "coder/keyfacts.h"
 #include "link/visastatus.h"
-#include "settings/dataplace.h"
 #include "settings/generalsettings.h"
 #include "sim/virtualinstrument.h"
 
@@ -14,14 +14,9 @@ namespace kdx::ctl {
 
 namespace {
 
-std::filesystem::path appFolder(const Call& call, Output& output, const char* program) {
-    DataPlaces places;
-    if (call.program.appFolder) places.asked = *call.program.appFolder;
-    places.program = programFolder(program);
-    places.user = userFolder();
-    places.shipped = shippedFolder(places.program, KDX_SHIPPED_DATA);
+std::filesystem::path folderOf(const Call& call, Output& output, const char* program) {
     std::string problem;
-    auto folder = chooseAppFolder(places, problem);
+    auto folder = appFolder(call.program, program, problem);
     if (!problem.empty()) output.problem(problem);
     return folder;
 }
@@ -51,7 +46,7 @@ Laboratory::Laboratory(const Call& call, Output& output, const char* program, in
     : m_call(call),
       m_output(output),
       m_stop(stop),
-      m_data(appFolder(call, output, program)),
+      m_data(folderOf(call, output, program)),
       m_captions(m_data),
       m_link(chooseVisa(call.program, m_clock)) {
     if (!m_link.visa) return;
@@ -97,11 +92,6 @@ bool Laboratory::open() {
     const std::string place = kind == "TCPIP" ? address : "GPIB address " + address;
     m_output.problem("no connection to " + place + ": " + statusText());
     return false;
-}
-
-bool Laboratory::run(const Steps& steps) {
-    if (stopAsked()) return false;
-    return m_session->transmitter.run(steps) && result() == kDone;
 }
 
 bool Laboratory::goesOn() {

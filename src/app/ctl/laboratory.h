@@ -27,8 +27,6 @@ public:
 
     /// Opens the session; a failure is told. False then.
     [[nodiscard]] bool open();
-    /// Sends the steps with progress; false when they were stopped or a command failed.
-    bool run(const Steps& steps);
     /// After a command outside of steps: whether to go on with the next.
     [[nodiscard]] bool goesOn();
     /// kDone, or kFailed when anything failed or was stopped.
