@@ -1,13 +1,13 @@
 #include "app/ctl/laboratory.h"
 
 #include "af/settings.h"
+#include "app/appfolder.h"
 #include "app/platform.h"
 #include "base/codepage.h"
 #include "base/numbers.h"
 #include "base/printable.h"
 #include "coder/keyfacts.h"
 #include "link/visastatus.h"
-#include "settings/dataplace.h"
 #include "settings/generalsettings.h"
 #include "sim/virtualinstrument.h"
 
@@ -15,14 +15,9 @@ namespace kdx::ctl {
 
 namespace {
 
-std::filesystem::path appFolder(const Call& call, Output& output, const char* program) {
-    DataPlaces places;
-    if (call.program.appFolder) places.asked = *call.program.appFolder;
-    places.program = programFolder(program);
-    places.user = userFolder();
-    places.shipped = shippedFolder(places.program, KDX_SHIPPED_DATA);
+std::filesystem::path folderOf(const Call& call, Output& output, const char* program) {
     std::string problem;
-    auto folder = chooseAppFolder(places, problem);
+    auto folder = appFolder(call.program, program, problem);
     if (!problem.empty()) output.problem(problem);
     return folder;
 }
@@ -52,7 +47,7 @@ Laboratory::Laboratory(const Call& call, Output& output, const char* program, in
     : m_call(call),
       m_output(output),
       m_stop(stop),
-      m_data(appFolder(call, output, program)),
+      m_data(folderOf(call, output, program)),
       m_captions(m_data),
       m_link(chooseVisa(call.program, m_clock)) {
     if (!m_link.visa) return;
@@ -130,11 +125,6 @@ void Laboratory::nextTask() {
 bool Laboratory::pause(std::chrono::milliseconds duration) {
     waitReadable(m_stop, duration);
     return !isStopped();
-}
-
-bool Laboratory::run(const Steps& steps) {
-    if (isStopped()) return false;
-    return m_session->transmitter.run(steps) && result() == kDone;
 }
 
 bool Laboratory::goesOn() {

@@ -35,8 +35,6 @@ public:
     void nextTask();
     /// Waits; false when the user wants to stop, at once then.
     bool pause(std::chrono::milliseconds duration);
-    /// Sends the steps with progress; false when they were stopped or a command failed.
-    bool run(const Steps& steps);
     /// After a command outside of steps: whether to go on with the next.
     [[nodiscard]] bool goesOn();
     /// kDone, or kFailed when anything failed or was stopped.
