@@ -10,6 +10,7 @@
 #include "rds/settings.h"
 #include "settings/profilefile.h"
 #include "settings/storedvalue.h"
+#include "settings/withoutcontrols.h"
 #include "stereo/deviation.h"
 #include "stereo/settings.h"
 
@@ -113,7 +114,7 @@ void keep(const Readout& readout, ProfileText& text) {
     for (const Reading& reading : readout) {
         if (network.empty()) network = reading.network;
         if (reading.value && (reading.network.empty() || reading.network == network))
-            keeper.keep(reading.key, *reading.value);
+            keeper.keep(reading.key, withoutControls(*reading.value));
     }
     if (!network.empty()) return;
     for (const Setting& setting : kAsRead) {

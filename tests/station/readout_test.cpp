@@ -221,6 +221,15 @@ TEST_F(ReadoutTest, TheFileKeepsWhatItHeldBesides) {
     EXPECT_THAT(folder.read("Gelesen.INI"), ::testing::StartsWith("; Notiz\r\n"));
 }
 
+TEST_F(ReadoutTest, LineBreaksInAnAnswerBecomeNoSettings) {
+    Readout readout = lab.readout();
+    for (Reading& reading : readout) {
+        if (reading.key == "PS") reading.value = "A\rPI=FFFF";
+    }
+    kept(readout);
+    EXPECT_EQ(profile("Gelesen.INI", "RDS", "PI"), "1000");
+}
+
 TEST_F(ReadoutTest, BlanksAtTheEdgeAndQuotesComeBack) {
     for (const char* text : {"  AB", "'AB'", " A' B"}) {
         lab.send("PS", text);
