@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <array>
 #include <set>
+#include <stdexcept>
 #include <string_view>
 #include <utility>
 
@@ -194,8 +195,11 @@ public:
 
     void add(const std::string& key, std::string value, const std::string& network = {}) {
         const ParamContext context{.eonIdentifier = network, .clockText = {}, .time = {}, .date = {}};
-        const std::string command = composeCommand(key, value, context).value_or("");
-        if (!command.empty() && !endsItsTextEarly(command)) addText(key, command);
+        try {
+            const std::string command = composeCommand(key, value, context).value_or("");
+            if (!command.empty() && !endsItsTextEarly(command)) addText(key, command);
+        } catch (const std::overflow_error&) {  // a number that no instrument has: it does not come back
+        }
     }
     void addText(const std::string& key, std::string command) { m_commands.push_back({key, std::move(command)}); }
 
