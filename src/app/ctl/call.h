@@ -40,6 +40,7 @@ using Task = std::function<int(Laboratory&)>;
 using AddSubcommand = void (*)(CLI::App& app, Task& task);
 
 void addApply(CLI::App& app, Task& task);
+void addFind(CLI::App& app, Task& task);
 void addList(CLI::App& app, Task& task);
 void addQuery(CLI::App& app, Task& task);
 void addReplay(CLI::App& app, Task& task);

@@ -1,6 +1,5 @@
 #include <CLI/CLI.hpp>
 
-#include <algorithm>
 #include <memory>
 
 #include "app/ctl/laboratory.h"
@@ -15,28 +14,6 @@ namespace {
 
 using Rows = std::vector<std::vector<std::string>>;
 
-/// Characters of a UTF-8 text.
-std::size_t width(const std::string& text) {
-    return static_cast<std::size_t>(std::count_if(text.begin(), text.end(), [](char c) { return (c & 0xC0) != 0x80; }));
-}
-
-/// Prints the rows with their columns under each other.
-void print(const Output& output, const Rows& rows) {
-    std::vector<std::size_t> widths;
-    for (const auto& row : rows) {
-        widths.resize(std::max(widths.size(), row.size()));
-        for (std::size_t i = 0; i < row.size(); ++i) widths[i] = std::max(widths[i], width(row[i]));
-    }
-    for (const auto& row : rows) {
-        std::string line;
-        for (std::size_t i = 0; i < row.size(); ++i) {
-            line += row[i];
-            if (i + 1 < row.size()) line += std::string(widths[i] - width(row[i]) + 2, ' ');
-        }
-        output.line(line);
-    }
-}
-
 int listDataSets(Laboratory& laboratory) {
     Rows rows;
     nlohmann::json& listed = laboratory.output().document["data_sets"] = nlohmann::json::array();
@@ -49,7 +26,7 @@ int listDataSets(Laboratory& laboratory) {
         rows.push_back({std::to_string(number), ps, pi});
         listed.push_back({{"number", number}, {"ps", ps}, {"pi", pi}});
     }
-    print(laboratory.output(), rows);
+    laboratory.output().table(rows);
     return kDone;
 }
 
@@ -60,7 +37,7 @@ int listKeys(Laboratory& laboratory) {
         rows.push_back({std::string(facts.key), std::string(facts.meaning), facts.range});
         listed.push_back({{"key", facts.key}, {"meaning", facts.meaning}, {"range", facts.range}});
     }
-    print(laboratory.output(), rows);
+    laboratory.output().table(rows);
     return kDone;
 }
 
@@ -71,7 +48,7 @@ int listQueries(Laboratory& laboratory) {
         rows.push_back({readBack.name, readBack.meaning});
         listed.push_back({{"name", readBack.name}, {"meaning", readBack.meaning}});
     }
-    print(laboratory.output(), rows);
+    laboratory.output().table(rows);
     return kDone;
 }
 

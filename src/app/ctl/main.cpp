@@ -74,8 +74,8 @@ int called(int argc, const char* const* argv) {
     addTimeout(app, call);
     addManner(app, call);
     kdx::ctl::Task task;
-    for (const auto add : {kdx::ctl::addApply, kdx::ctl::addList, kdx::ctl::addQuery, kdx::ctl::addReplay,
-                           kdx::ctl::addSend, kdx::ctl::addShell}) {
+    for (const auto add : {kdx::ctl::addApply, kdx::ctl::addFind, kdx::ctl::addList, kdx::ctl::addQuery,
+                           kdx::ctl::addReplay, kdx::ctl::addSend, kdx::ctl::addShell}) {
         add(app, task);
     }
     app.footer(

@@ -1,11 +1,21 @@
 #include "app/ctl/output.h"
 
+#include <algorithm>
 #include <cstdio>
 
 #include "app/ctl/call.h"
 #include "app/platform.h"
 
 namespace kdx::ctl {
+
+namespace {
+
+/// Characters of a UTF-8 text.
+std::size_t width(const std::string& text) {
+    return static_cast<std::size_t>(std::count_if(text.begin(), text.end(), [](char c) { return (c & 0xC0) != 0x80; }));
+}
+
+}  // namespace
 
 void Output::line(const std::string& text) const {
     if (m_call.json) return;
@@ -15,6 +25,22 @@ void Output::line(const std::string& text) const {
 
 void Output::remark(const std::string& text) const {
     if (!m_call.quiet) line(text);
+}
+
+void Output::table(const std::vector<std::vector<std::string>>& rows) const {
+    std::vector<std::size_t> widths;
+    for (const auto& row : rows) {
+        widths.resize(std::max(widths.size(), row.size()));
+        for (std::size_t i = 0; i < row.size(); ++i) widths[i] = std::max(widths[i], width(row[i]));
+    }
+    for (const auto& row : rows) {
+        std::string text;
+        for (std::size_t i = 0; i < row.size(); ++i) {
+            text += row[i];
+            if (i + 1 < row.size()) text += std::string(widths[i] - width(row[i]) + 2, ' ');
+        }
+        line(text);
+    }
 }
 
 void Output::problem(const std::string& text) {

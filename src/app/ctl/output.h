@@ -2,6 +2,7 @@
 
 #include <cstddef>
 #include <string>
+#include <vector>
 
 #include <nlohmann/json.hpp>
 
@@ -19,6 +20,8 @@ public:
     void line(const std::string& text) const;
     /// A line that only tells how it goes; not with JSON, not when the call is to be quiet.
     void remark(const std::string& text) const;
+    /// Lines of the result with their columns under each other.
+    void table(const std::vector<std::vector<std::string>>& rows) const;
     void problem(const std::string& text);
     /// A problem that is known already: for the document only.
     void note(const std::string& text) { document["problems"].push_back(text); }
