@@ -16,6 +16,14 @@ ChosenVisa::~ChosenVisa() = default;
 ChosenVisa::ChosenVisa(ChosenVisa&& other) noexcept = default;
 ChosenVisa& ChosenVisa::operator=(ChosenVisa&& other) noexcept = default;
 
+LanOptions lanOptions(const Options& options) {
+    LanOptions lan;
+    if (!options.answerTime) return lan;
+    lan.ioTimeout = *options.answerTime;
+    lan.answerMargin = std::min(lan.answerMargin, lan.ioTimeout / 5);
+    return lan;
+}
+
 ChosenVisa chooseVisa(const Options& options, const Clock& clock) {
     ChosenVisa chosen;
     if (options.simulate) {
@@ -34,12 +42,7 @@ ChosenVisa chooseVisa(const Options& options, const Clock& clock) {
         chosen.description = "The VISA library cannot be used: " + library.reason;
         return chosen;
     }
-    LanOptions lan;
-    if (options.answerTime) {
-        lan.ioTimeout = *options.answerTime;
-        lan.answerMargin = std::min(lan.answerMargin, lan.ioTimeout / 5);
-    }
-    chosen.visa = std::make_unique<LanVisa>(lan);
+    chosen.visa = std::make_unique<LanVisa>(lanOptions(options));
     chosen.description = "Built-in LAN client (VXI-11); no VISA library found:\n" + library.reason;
     return chosen;
 }

@@ -28,6 +28,9 @@ struct Operations {
                                             std::uint32_t* written);
     std::int32_t(KDX_LIBRARY_CALL* viRead)(Argument session, unsigned char* buffer, Argument size,
                                            std::uint32_t* count);
+    std::int32_t(KDX_LIBRARY_CALL* viFindRsrc)(Argument resourceManager, char* expression, std::uint32_t* list,
+                                               std::uint32_t* count, char* description);
+    std::int32_t(KDX_LIBRARY_CALL* viFindNext)(Argument list, char* description);
     std::int32_t(KDX_LIBRARY_CALL* viSetAttribute)(Argument object, Argument attribute, Argument value);
 };
 
@@ -107,6 +110,27 @@ public:
         return status;
     }
 
+    std::vector<std::string> findResources() override {
+        std::vector<std::string> found;
+        VisaHandle manager = 0;
+        if (m_call.viFindRsrc == nullptr || m_call.viFindNext == nullptr || viOpenDefaultRM(manager) < 0) return found;
+        std::string expression = "?*INSTR";
+        std::array<char, 1024> name{};  // the standard asks for 256
+        Result list, count;
+        VisaStatus status =
+            m_call.viFindRsrc(argument(manager), expression.data(), list.room(), count.room(), name.data());
+        const bool listed = status >= 0;
+        constexpr std::size_t kMost = 1000;  // a library that never comes to an end
+        for (; status >= 0 && found.size() < std::min<std::size_t>(kMost, count.value());
+             status = m_call.viFindNext(list.value(), name.data())) {
+            name.back() = '\0';
+            found.emplace_back(name.data());
+        }
+        if (listed) m_call.viClose(list.value());
+        viClose(manager);
+        return found;
+    }
+
     VisaStatus viClose(VisaHandle object) override { return m_call.viClose(argument(object)); }
 
 private:
@@ -134,6 +158,8 @@ std::unique_ptr<Visa> load(const std::filesystem::path& path, AnswerTime answerT
     find(*library, "viWrite", operations.viWrite, missing);
     find(*library, "viRead", operations.viRead, missing);
     if (answerTime) find(*library, "viSetAttribute", operations.viSetAttribute, missing);
+    operations.viFindRsrc = library->function<decltype(operations.viFindRsrc)>("viFindRsrc");        // may lack
+    operations.viFindNext = library->function<decltype(operations.viFindNext)>("viFindNext");        // may lack
     operations.viStatusDesc = library->function<decltype(operations.viStatusDesc)>("viStatusDesc");  // may lack
     if (!missing.empty()) {
         reason = "not a VISA library, it lacks " + missing;

@@ -16,6 +16,7 @@ namespace {
 using ::testing::AllOf;
 using ::testing::ElementsAre;
 using ::testing::HasSubstr;
+using ::testing::IsEmpty;
 using ::testing::Not;
 using ::testing::StartsWith;
 
@@ -54,6 +55,20 @@ TEST_F(LibraryVisaTest, TellsWhichFileWasLoaded) {
 TEST_F(LibraryVisaTest, OpensWithTheArgumentsAsTheyStand) {
     ASSERT_EQ(library.visa->viOpen(manager, "TCPIP:: x ::INSTR", 1, 2500, session), 0);
     EXPECT_THAT(read(), StartsWith("TCPIP:: x ::INSTR 1 2500"));
+}
+
+TEST(LibraryVisaList, NamesTheInstrumentsThatTheLibraryKnows) {
+    for (const std::string& file : {kComplete, kWide}) {
+        EXPECT_THAT(loadVisaLibrary(file).visa->findResources(),
+                    ElementsAre("GPIB0::28::INSTR", "ASRL1::INSTR", "TCPIP0::127.0.0.1::inst0::INSTR"));
+    }
+    ::setenv("KDX_FAKE_VISA_EMPTY", "1", 1);
+    EXPECT_THAT(loadVisaLibrary(kComplete).visa->findResources(), IsEmpty());
+    ::unsetenv("KDX_FAKE_VISA_EMPTY");
+}
+
+TEST(LibraryVisaList, IsEmptyWhereTheLibraryCannotSay) {
+    EXPECT_THAT(loadVisaLibrary(kWordless).visa->findResources(), IsEmpty());
 }
 
 TEST(LibraryVisaTime, IsSetForEachSession) {

@@ -41,6 +41,7 @@ using AddSubcommand = void (*)(CLI::App& app, Task& task);
 
 void addApply(CLI::App& app, Task& task);
 void addDiff(CLI::App& app, Task& task);
+void addFind(CLI::App& app, Task& task);
 void addList(CLI::App& app, Task& task);
 void addQuery(CLI::App& app, Task& task);
 void addRead(CLI::App& app, Task& task);

@@ -48,6 +48,8 @@ public:
 
     /// Readable once the user wants to stop.
     [[nodiscard]] int stop() const { return m_stop; }
+    /// What instruments are reached by; null when a library that was asked for cannot be used.
+    [[nodiscard]] Visa* visa() const { return m_link.visa.get(); }
     [[nodiscard]] const Call& call() const { return m_call; }
     [[nodiscard]] Output& output() { return m_output; }
     [[nodiscard]] DataFolder& data() { return m_data; }
