@@ -117,6 +117,7 @@ std::vector<std::string> discoverLanInstruments(const Discovery& how) {
     ask(socket.number(), *call, how);
     gather(socket.number(), question, begin + how.wait, how, found);
     std::vector<std::string> addresses;
+    addresses.reserve(found.size());
     for (const std::uint32_t address : found) addresses.push_back(dotted(address));
     return addresses;
 }

@@ -35,8 +35,10 @@ void addListed(Visa& visa, std::vector<Found>& found) {
                    (parts.device.empty() || equalNoCase(parts.device, LanResource().device));
         });
         if (known) continue;
-        const std::string device = onLan && !parts.device.empty() ? "," + std::string(parts.device) : std::string();
-        found.push_back({resource, (onLan ? "--lan " : "--gpib ") + address + device, &visa});
+        std::string option = onLan ? "--lan " : "--gpib ";
+        option += address;
+        if (onLan && !parts.device.empty()) option.append(",").append(parts.device);
+        found.push_back({resource, option, &visa});
     }
 }
 
