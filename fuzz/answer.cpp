@@ -1,5 +1,6 @@
 // Answers of the instrument to the questions of the read-back buttons: bytes and statuses of any kind.
 #include "harness.h"
+#include "madeupvisa.h"
 
 #include "coder/readback.h"
 #include "link/instrument.h"
@@ -8,44 +9,10 @@
 #include "settings/programstate.h"
 #include "support/fakeclock.h"
 
-#include <algorithm>
-
-namespace {
-
-using kdx::fuzz::demand;
-
-/// An instrument that answers with the input's texts, one a question, and its statuses.
-class MadeUpVisa final : public kdx::Visa {
-public:
-    explicit MadeUpVisa(FuzzedDataProvider& input) : m_input(input) {}
-    kdx::VisaStatus viOpenDefaultRM(kdx::VisaHandle&) override { return kdx::visa::kSuccess; }
-    kdx::VisaStatus viStatusDesc(kdx::VisaHandle, kdx::VisaStatus, std::string&) override { return nextStatus(); }
-    kdx::VisaStatus viOpen(kdx::VisaHandle, const std::string&, std::uint32_t, std::uint32_t,
-                           kdx::VisaHandle&) override {
-        return kdx::visa::kSuccess;
-    }
-    kdx::VisaStatus viWrite(kdx::VisaHandle, std::span<const char>, std::int32_t&) override { return nextStatus(); }
-    kdx::VisaStatus viRead(kdx::VisaHandle, std::span<char> buffer, std::int32_t& count) override {
-        const std::string answer = m_input.ConsumeRandomLengthString(buffer.size());
-        std::copy(answer.begin(), answer.end(), buffer.begin());
-        count = static_cast<std::int32_t>(answer.size());
-        return nextStatus();
-    }
-    kdx::VisaStatus viClose(kdx::VisaHandle) override { return nextStatus(); }
-
-private:
-    kdx::VisaStatus nextStatus() {
-        return m_input.PickValueInArray({kdx::visa::kSuccess, kdx::visa::kMaxCountReached, kdx::visa::kTimeout});
-    }
-
-    FuzzedDataProvider& m_input;
-};
-
-}  // namespace
-
 int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
+    using kdx::fuzz::demand;
     FuzzedDataProvider input(data, size);
-    MadeUpVisa visa(input);
+    kdx::fuzz::MadeUpVisa visa(input);
     kdx::ProgramState state;
     kdx::DataFolder files("/nonexistent");
     const kdx::Captions captions(files);

@@ -3,17 +3,10 @@
 #include <chrono>
 #include <cstdio>
 
-#include "base/clock.h"
-#include "settings/captions.h"
-#include "settings/datafolder.h"
-#include "settings/folderlock.h"
-#include "settings/programstate.h"
+#include "benchedprogram.h"
 #include "sim/simvisa.h"
 #include "sim/virtualinstrument.h"
-#include "station/session.h"
 #include "ui/application.h"
-#include "ui/qtdialogs.h"
-#include "ui/ticker.h"
 #include "window/hmenue.h"
 
 namespace {
@@ -36,20 +29,14 @@ int main(int argc, char** argv) {
     if (argc < 2) return 2;
     qputenv("QT_QPA_PLATFORM", "offscreen");
     kdx::Application application(argc, argv);
-    kdx::SystemClock clock;
-    kdx::DataFolder data(argv[1]);
-    kdx::ProgramState state;
-    kdx::Captions captions(data);
-    kdx::QtDialogs dialogs(captions);
+    const kdx::SystemClock clock;
     kdx::sim::VirtualInstrument instrument(clock);
     kdx::sim::SimVisa visa(instrument);
-    kdx::Session session(visa, state, data, captions, clock, [] {});
-    kdx::TickerGroup tickers;
-    const kdx::FolderClaim claim(data.path());
-    kdx::HMenue window({session, state, data, captions, clock, dialogs, tickers, claim, QString(), QString(), [] {}});
+    kdx::BenchedProgram program(argv[1], visa);
+    kdx::HMenue window(program.surroundings());
     window.startUp();
     window.show();
-    CommandCounter counter(session.instrument);
+    CommandCounter counter(program.session.instrument);
     const auto start = std::chrono::steady_clock::now();
     window.INIT_Taste_Click();
     const std::chrono::duration<double, std::milli> taken = std::chrono::steady_clock::now() - start;

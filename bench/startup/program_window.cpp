@@ -14,17 +14,10 @@
 #include <cstdio>
 #include <cstring>
 
-#include "base/clock.h"
+#include "benchedprogram.h"
 #include "firstpaint.h"
 #include "link/lanvisa.h"
-#include "settings/captions.h"
-#include "settings/datafolder.h"
-#include "settings/folderlock.h"
-#include "settings/programstate.h"
-#include "station/session.h"
 #include "ui/application.h"
-#include "ui/qtdialogs.h"
-#include "ui/ticker.h"
 #include "window/hmenue.h"
 
 namespace {
@@ -52,16 +45,9 @@ void printCounts(const QWidget& window) {
 int main(int argc, char** argv) {
     if (argc < 2) return 2;
     kdx::Application application(argc, argv);
-    kdx::SystemClock clock;
-    kdx::DataFolder data(argv[1]);
-    kdx::ProgramState state;
-    kdx::Captions captions(data);
-    kdx::QtDialogs dialogs(captions);
     kdx::LanVisa visa;
-    kdx::Session session(visa, state, data, captions, clock, [] {});
-    kdx::TickerGroup tickers;
-    const kdx::FolderClaim claim(data.path());
-    kdx::HMenue window({session, state, data, captions, clock, dialogs, tickers, claim, QString(), QString(), [] {}});
+    kdx::BenchedProgram program(argv[1], visa);
+    kdx::HMenue window(program.surroundings());
     window.startUp();
     if (argc > 2 && std::strcmp(argv[2], "--count") == 0) {
         printCounts(window);

@@ -12,6 +12,7 @@ class VirtualInstrument;
 namespace kdx {
 
 class Clock;
+struct LanOptions;
 struct Options;
 
 /// The instrument link that was chosen, and why, in words for the user.
@@ -24,6 +25,9 @@ struct ChosenVisa {
     ChosenVisa(ChosenVisa&& other) noexcept;
     ChosenVisa& operator=(ChosenVisa&& other) noexcept;
 };
+
+/// The times of the built-in LAN client as they were asked for.
+[[nodiscard]] LanOptions lanOptions(const Options& options);
 
 /// The virtual instrument when it is asked for; else the VISA library asked for; else an installed one; else the
 /// built-in LAN client.

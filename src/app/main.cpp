@@ -3,17 +3,16 @@
 
 #include <cstdio>
 #include <cstdlib>
-#include <filesystem>
 #include <string>
 #include <vector>
 
+#include "app/appfolder.h"
 #include "app/choosevisa.h"
 #include "app/options.h"
 #include "app/platform.h"
 #include "base/clock.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
-#include "settings/dataplace.h"
 #include "settings/folderlock.h"
 #include "settings/leftovers.h"
 #include "settings/programstate.h"
@@ -33,15 +32,6 @@ constexpr int kUsageError = 2;
 
 void print(const std::string& line) {
     std::puts(line.c_str());
-}
-
-std::filesystem::path appFolder(const kdx::Options& options, const char* program, std::string& problem) {
-    kdx::DataPlaces places;
-    if (options.appFolder) places.asked = *options.appFolder;
-    places.program = kdx::programFolder(program);
-    places.user = kdx::userFolder();
-    places.shipped = kdx::shippedFolder(places.program, KDX_SHIPPED_DATA);
-    return kdx::chooseAppFolder(places, problem);
 }
 
 /// Ends the program when the operating system asks for it.
@@ -116,7 +106,7 @@ int main(int argc, char** argv) {
     kdx::Application application(argc, argv);
     endWhenAsked(application);
     std::string problem;
-    kdx::DataFolder data(appFolder(options, argv[0], problem));
+    kdx::DataFolder data(kdx::appFolder(options, argv[0], problem));
     if (!problem.empty()) std::fprintf(stderr, "kdx-rds: %s\n", problem.c_str());
     kdx::sweepLeftovers(data.path());
     const kdx::FolderClaim claim(data.path());

@@ -1,16 +1,18 @@
 #pragma once
 
+#include <chrono>
 #include <optional>
 #include <string>
 #include <vector>
 
 namespace kdx {
 
-/// What the command line of kdx-rds asked for.
+/// What the command line asked for.
 struct Options {
-    std::optional<std::string> appFolder;    ///< the program's folder; data in its sub-folder "Daten"
-    std::optional<std::string> visaLibrary;  ///< the VISA library to load
-    std::optional<std::string> tourFolder;   ///< make the tour and leave the pictures there
+    std::optional<std::string> appFolder;                 ///< the program's folder; data in its sub-folder "Daten"
+    std::optional<std::string> visaLibrary;               ///< the VISA library to load
+    std::optional<std::string> tourFolder;                ///< make the tour and leave the pictures there
+    std::optional<std::chrono::milliseconds> answerTime;  ///< how long an answer may take; only kdx-ctl asks for it
     bool simulate = false;
     bool help = false;
     bool version = false;

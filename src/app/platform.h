@@ -1,6 +1,10 @@
 #pragma once
 
+#include <chrono>
+#include <cstddef>
 #include <filesystem>
+#include <optional>
+#include <span>
 
 namespace kdx {
 
@@ -16,11 +20,20 @@ namespace kdx {
 /// Whether a window can be shown.
 [[nodiscard]] bool hasDisplay();
 
-/// Whether the standard error is a terminal.
+/// Whether the standard error, the standard input, the standard output is a terminal.
 [[nodiscard]] bool errorIsTerminal();
+[[nodiscard]] bool inputIsTerminal();
+[[nodiscard]] bool outputIsTerminal();
 
 /// Whether the descriptor can be read without waiting; false for -1.
 [[nodiscard]] bool isReadable(int descriptor);
+
+/// Waits until the descriptor can be read, or the time is over; for -1 until the time is over.
+void waitReadable(int descriptor, std::chrono::milliseconds time);
+
+/// Reads what the standard input has, waiting for it. @returns how many bytes, 0 at its end; nothing when the other
+/// descriptor can be read before. @throws std::system_error when the input cannot be read.
+[[nodiscard]] std::optional<std::size_t> readInput(std::span<char> room, int unless);
 
 /// From now on writing to a pipe that nobody reads any more fails, instead of ending the program.
 void surviveBrokenPipes();

@@ -52,9 +52,42 @@ bool errorIsTerminal() {
     return isatty(STDERR_FILENO) == 1;
 }
 
+bool inputIsTerminal() {
+    return isatty(STDIN_FILENO) == 1;
+}
+
+bool outputIsTerminal() {
+    return isatty(STDOUT_FILENO) == 1;
+}
+
 bool isReadable(int descriptor) {
     pollfd asked{descriptor, POLLIN, 0};
     return descriptor >= 0 && poll(&asked, 1, 0) == 1;
+}
+
+void waitReadable(int descriptor, std::chrono::milliseconds time) {
+    using Clock = std::chrono::steady_clock;
+    const auto end = Clock::now() + time;
+    pollfd asked{descriptor, POLLIN, 0};  // a negative one is passed over
+    for (;;) {
+        const auto left = std::chrono::ceil<std::chrono::milliseconds>(end - Clock::now()).count();
+        if (left <= 0 || poll(&asked, 1, static_cast<int>(left)) > 0) return;
+    }
+}
+
+std::optional<std::size_t> readInput(std::span<char> room, int unless) {
+    for (;;) {
+        std::array asked{pollfd{STDIN_FILENO, POLLIN, 0}, pollfd{unless, POLLIN, 0}};
+        if (poll(asked.data(), asked.size(), -1) < 0) {
+            if (errno != EINTR) throw std::system_error(errno, std::generic_category(), "standard input");
+            continue;
+        }
+        if (asked[1].revents != 0) return std::nullopt;
+        const ssize_t got = read(STDIN_FILENO, room.data(), room.size());
+        if (got >= 0) return static_cast<std::size_t>(got);
+        if (errno != EINTR && errno != EAGAIN)
+            throw std::system_error(errno, std::generic_category(), "standard input");
+    }
 }
 
 void surviveBrokenPipes() {

@@ -26,8 +26,27 @@ bool errorIsTerminal() {
     return GetFileType(GetStdHandle(STD_ERROR_HANDLE)) == FILE_TYPE_CHAR;
 }
 
+bool inputIsTerminal() {
+    return GetFileType(GetStdHandle(STD_INPUT_HANDLE)) == FILE_TYPE_CHAR;
+}
+
+bool outputIsTerminal() {
+    return GetFileType(GetStdHandle(STD_OUTPUT_HANDLE)) == FILE_TYPE_CHAR;
+}
+
 bool isReadable(int /*descriptor*/) {
     return false;  // there is none: see endRequests
+}
+
+void waitReadable(int /*descriptor*/, std::chrono::milliseconds time) {
+    Sleep(static_cast<DWORD>(time.count()));
+}
+
+std::optional<std::size_t> readInput(std::span<char> room, int /*unless*/) {
+    DWORD got = 0;
+    const HANDLE input = GetStdHandle(STD_INPUT_HANDLE);
+    if (!ReadFile(input, room.data(), static_cast<DWORD>(room.size()), &got, nullptr)) return 0;  // closed
+    return got;
 }
 
 void surviveBrokenPipes() {

@@ -59,6 +59,25 @@ std::string fromUtf8(std::string_view text) {
     return bytes;
 }
 
+bool isUtf8(std::string_view text) {
+    // The least code point that takes so many bytes: a longer form of a smaller one is none.
+    constexpr std::array<unsigned, 5> kLeast = {0, 0, 0x80, 0x800, 0x10000};
+    for (std::size_t at = 0; at < text.size();) {
+        const auto lead = static_cast<unsigned char>(text[at]);
+        const std::size_t length = lead < 0x80 ? 1 : lead < 0xC0 ? 0 : lead < 0xE0 ? 2 : lead < 0xF0 ? 3 : 4;
+        if (length == 0 || length > text.size() - at) return false;
+        unsigned code = length == 1 ? lead : lead & (0x7FU >> length);
+        for (const char next : text.substr(at + 1, length - 1)) {
+            if ((static_cast<unsigned char>(next) & 0xC0U) != 0x80) return false;
+            code = code << 6U | (static_cast<unsigned char>(next) & 0x3FU);
+        }
+        const bool surrogate = code >= 0xD800 && code <= 0xDFFF;
+        if (code < kLeast[length] || code > 0x10FFFF || surrogate || lead > 0xF4) return false;
+        at += length;
+    }
+    return true;
+}
+
 std::string toUtf8(std::string_view text) {
     std::string utf8;
     for (const char c : text) {

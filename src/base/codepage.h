@@ -15,6 +15,9 @@ namespace kdx {
 /// UTF-8 text in Windows-1252; '?' for each character or stray byte that the code page does not have.
 [[nodiscard]] std::string fromUtf8(std::string_view text);
 
+/// Whether the bytes are whole characters of UTF-8.
+[[nodiscard]] bool isUtf8(std::string_view text);
+
 /// Windows-1252 text in UTF-8.
 [[nodiscard]] std::string toUtf8(std::string_view text);
 

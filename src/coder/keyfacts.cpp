@@ -7,7 +7,10 @@
 
 #include "base/codepage.h"
 #include "base/numbers.h"
+#include "base/split.h"
+#include "coder/fieldsizes.h"
 #include "coder/rdscharacters.h"
+#include "settings/captions.h"
 
 namespace kdx {
 
@@ -42,21 +45,18 @@ constexpr std::string_view kFlag = "0 1";
 constexpr double kLowestAlternative = 87.5;
 constexpr double kLowestTuned = 86;
 constexpr double kHighestFrequency = 108;
-constexpr std::size_t kMessageDigits = 10;
-constexpr int kHighestGroup = 15;
-constexpr std::size_t kMostGroups = 256;
 
 // The limits are the instrument's; a deviation counts tens of hertz.
 constexpr std::array kRows = {
-    Row{"PS", "programme service name", Kind::Text, 0, 8},
+    Row{"PS", "programme service name", Kind::Text, 0, kPsLength},
     Row{"PI", "programme identification", Kind::Identifier},
-    Row{"PTY", "programme type", Kind::Whole, 0, 31},
+    Row{"PTY", "programme type", Kind::Whole, 0, kProgrammeTypes - 1},
     Row{"TP", "traffic programme", Kind::Word, 0, 0, {}, kFlag},
     Row{"TA", "traffic announcement", Kind::Word, 0, 0, {}, kFlag},
     Row{"MS", "music or speech", Kind::Word, 0, 0, {}, "M S"},
     Row{"DI", "decoder information", Kind::Whole, 0, 15},
-    Row{"RT", "radiotext, ten times", Kind::Text, 0, 64},
-    Row{"RTA", "radiotext, five times, other A/B flag", Kind::Text, 0, 64},
+    Row{"RT", "radiotext, ten times", Kind::Text, 0, kRadiotextLength},
+    Row{"RTA", "radiotext, five times, other A/B flag", Kind::Text, 0, kRadiotextLength},
     Row{"DEL_RT", "clears the radiotext", Kind::Ignored},
     Row{"UHR", "clock time as the window shows it", Kind::Clock},
     Row{"ZEIT", "clock time of the PC", Kind::Ignored},
@@ -76,8 +76,8 @@ constexpr std::array kRows = {
     Row{"TEST_M", "test mode: 0 ends it", Kind::Whole, 0, 4},
     Row{"TEST_D", "test pattern", Kind::Whole, 0, 4},
     Row{"EON_PI", "other network: its PI", Kind::Identifier},
-    Row{"EON_PS", "other network: programme service name", Kind::Text, 0, 8},
-    Row{"EON_PTY", "other network: programme type", Kind::Whole, 0, 31},
+    Row{"EON_PS", "other network: programme service name", Kind::Text, 0, kPsLength},
+    Row{"EON_PTY", "other network: programme type", Kind::Whole, 0, kProgrammeTypes - 1},
     Row{"EON_TP", "other network: traffic programme", Kind::Word, 0, 0, {}, kFlag},
     Row{"EON_TA", "other network: traffic announcement", Kind::Word, 0, 0, {}, kFlag},
     Row{"EON_AFA", "other network: alternative frequencies, method A", Kind::PlainList},
@@ -110,16 +110,6 @@ constexpr std::array kRows = {
     Row{"NF-Frequenz", "frequency of the audio generator", Kind::Number, 0.02, 80, "kHz"},
 };
 
-std::vector<std::string_view> split(std::string_view text, char separator) {
-    std::vector<std::string_view> parts;
-    for (;;) {
-        const std::size_t end = text.find(separator);
-        parts.push_back(text.substr(0, end));
-        if (end == std::string_view::npos) return parts;
-        text.remove_prefix(end + 1);
-    }
-}
-
 /// The number that fills the text, with a decimal point; nothing for anything else.
 std::optional<double> wholeText(std::string_view text) {
     double value = 0;
@@ -145,7 +135,7 @@ bool isGroup(std::string_view group) {
 
 /// The tuned frequency may lie below the band of the alternatives, also where method B repeats it.
 bool isFrequencyList(std::string_view text) {
-    const auto frequencies = split(text, ',');
+    const auto frequencies = split(text, ",");
     return std::all_of(frequencies.begin(), frequencies.end(), [&](std::string_view frequency) {
         const bool tuned = wholeText(frequency) == wholeText(frequencies.front());
         return isWithin(frequency, tuned ? kLowestTuned : kLowestAlternative, kHighestFrequency);
@@ -157,12 +147,12 @@ bool isLedFrequencyList(std::string_view text) {
 }
 
 bool isMessage(std::string_view text) {
-    return text.size() == 3 + kMessageDigits && isDecimal(text.substr(0, 2)) && text[2] == ',' &&
-           isHex(text.substr(3), kMessageDigits);
+    return text.size() == 3 + kGroupDigits && isDecimal(text.substr(0, 2)) && text[2] == ',' &&
+           isHex(text.substr(3), kGroupDigits);
 }
 
 std::string joinedWords(std::string_view words) {
-    const auto all = split(words, ' ');
+    const auto all = split(words, " ");
     std::string text;
     for (std::size_t i = 0; i < all.size(); ++i) {
         if (i > 0) text += i + 1 == all.size() ? " or " : ", ";
@@ -192,7 +182,7 @@ std::string range(const Row& row) {
         case Kind::PlainList:
             return "frequencies in MHz with commas between: 98.5,87.6,107.9";
         case Kind::Groups:
-            return "groups 0A to 15B with commas between, at most 256: 0A,0A,2A";
+            return "groups 0A to 15B with commas between, at most " + std::to_string(kMostGroups) + ": 0A,0A,2A";
         case Kind::Message:
             return "two digits, a comma and ten hexadecimal digits: 02,0B90E400CC";
         case Kind::TrafficMessage:
@@ -211,7 +201,7 @@ std::optional<std::string> problem(const Row& row, std::string_view value) {
         case Kind::Clock:
             return std::nullopt;
         case Kind::Word: {
-            const auto words = split(row.words, ' ');
+            const auto words = split(row.words, " ");
             return unless(std::find(words.begin(), words.end(), value) != words.end());
         }
         case Kind::Whole:
@@ -227,13 +217,13 @@ std::optional<std::string> problem(const Row& row, std::string_view value) {
             return unless(value.size() <= static_cast<std::size_t>(row.highest));
         }
         case Kind::Identifier:
-            return unless(isHex(value, 4));
+            return unless(isHex(value, kPiLength));
         case Kind::Frequencies:
             return unless(isLedFrequencyList(value));
         case Kind::PlainList:
             return unless(isFrequencyList(value));
         case Kind::Groups: {
-            const auto groups = split(value, ',');
+            const auto groups = split(value, ",");
             return unless(groups.size() <= kMostGroups && std::all_of(groups.begin(), groups.end(), isGroup));
         }
         case Kind::Message:

@@ -53,13 +53,35 @@ std::string Instrument::ReadFromGen() {
     if (!m_state.InstrumentOnline) return kNoSessionAnswer;
     if (m_sequenceStopped) return kReadError;
     std::string answer(kAnswerLength, ' ');
-    LastVisaStatus = m_visa.viRead(InstrSession, answer, LastRetCount);
-    notify(Traffic::Kind::Read, answer, LastVisaStatus);
-    // A completed read normally reports a positive completion code (count reached, terminator seen): no failure.
-    if (LastVisaStatus < 0) {
-        fail();
-        return kReadError;
-    }
+    if (read(answer)) return answer;
+    fail();
+    return kReadError;
+}
+
+/// A completed read normally reports a positive completion code (count reached, terminator seen): no failure.
+bool Instrument::read(std::string& buffer) {
+    LastVisaStatus = m_visa.viRead(InstrSession, buffer, LastRetCount);
+    notify(Traffic::Kind::Read, buffer, LastVisaStatus);
+    return LastVisaStatus >= 0;
+}
+
+std::optional<std::string> Instrument::ask(const std::string& question, bool mayBeSilent) {
+    constexpr std::size_t kLongestAnswer = 65536;  // one that never ends is none
+    Send2Gen(question);
+    WriteLog("", question, "");
+    WaitMs(m_clock, kCommandPauseMs);
+    std::string answer;
+    do {
+        if (!m_state.InstrumentOnline || m_sequenceStopped) return std::nullopt;
+        std::string piece(kAnswerLength, ' ');
+        if (!read(piece)) {
+            if (LastVisaStatus != visa::kTimeout || !mayBeSilent) fail();
+            return std::nullopt;
+        }
+        answer += piece.substr(0, static_cast<std::size_t>(LastRetCount));
+    } while (LastVisaStatus == visa::kMaxCountReached && answer.size() < kLongestAnswer);
+    answer = cutAtLineFeed(answer);
+    WriteLog("", "Answer ", answer);
     return answer;
 }
 

@@ -2,6 +2,7 @@
 
 #include <cstdint>
 #include <functional>
+#include <optional>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -28,7 +29,7 @@ public:
     /// runs the user may want to stop it: true then.
     using InterfaceError = std::function<bool(const std::string& text, bool sequenceRuns)>;
 
-    /// @param captions gives the query texts 142 ("display"), 143 ("no answer") and 144 ("empty").
+    /// @param captions gives the texts 142 ("display"), 143 ("no answer") and 144 ("empty").
     Instrument(Visa& visa, ProgramState& state, const DataFolder& data, const Captions& captions, Clock& clock)
         : log(data), m_visa(visa), m_state(state), m_captions(captions), m_clock(clock) {}
 
@@ -63,6 +64,9 @@ public:
     /// Asks the generator for one value; `command` is the header without its question mark.
     std::string VRN_Abfrage(const std::string& label, const std::string& command);
 
+    /// Asks with the question as it goes to the instrument; gives the whole answer without line end, or nothing.
+    /// @param mayBeSilent no answer in time is no failure: not every instrument knows every question.
+    std::optional<std::string> ask(const std::string& question, bool mayBeSilent);
     /// True when the user stopped the running sequence: until it ends nothing is written, read or logged.
     [[nodiscard]] bool isSequenceStopped() const { return m_sequenceStopped; }
     /// Stops the running sequence, if any.
@@ -78,6 +82,7 @@ private:
     friend class CommandSequence;
 
     void fail();
+    [[nodiscard]] bool read(std::string& buffer);
     void notify(Traffic::Kind kind, std::string text, VisaStatus status = 0) const;
 
     Visa& m_visa;

@@ -29,7 +29,15 @@ struct Operations {
                                             std::uint32_t* written);
     std::int32_t(KDX_LIBRARY_CALL* viRead)(Argument session, unsigned char* buffer, Argument size,
                                            std::uint32_t* count);
+    std::int32_t(KDX_LIBRARY_CALL* viFindRsrc)(Argument resourceManager, char* expression, std::uint32_t* list,
+                                               std::uint32_t* count, char* description);
+    std::int32_t(KDX_LIBRARY_CALL* viFindNext)(Argument list, char* description);
+    std::int32_t(KDX_LIBRARY_CALL* viSetAttribute)(Argument object, Argument attribute, Argument value);
 };
+
+using AnswerTime = std::optional<std::chrono::milliseconds>;
+
+constexpr Argument kTimeoutAttribute = 0x3FFF001A;  // VI_ATTR_TMO_VALUE, in milliseconds
 
 /// Room for a number that the library gives back. A library whose types have 64 bits writes eight bytes, of which the
 /// lower half is the number.
@@ -53,8 +61,8 @@ Argument argument(VisaHandle handle) {
 /// The installed VISA library.
 class LibraryVisa final : public Visa {
 public:
-    LibraryVisa(std::unique_ptr<SharedLibrary> library, const Operations& operations)
-        : m_library(std::move(library)), m_call(operations) {}
+    LibraryVisa(std::unique_ptr<SharedLibrary> library, const Operations& operations, AnswerTime answerTime)
+        : m_library(std::move(library)), m_call(operations), m_answerTime(answerTime) {}
 
     VisaStatus viOpenDefaultRM(VisaHandle& resourceManager) override {
         Result handle(static_cast<std::uint32_t>(resourceManager));
@@ -79,7 +87,11 @@ public:
         const VisaStatus status =
             m_call.viOpen(argument(resourceManager), name.data(), accessMode, openTimeoutMs, handle.room());
         session = static_cast<VisaHandle>(handle.value());
-        return status;
+        if (status < 0 || !m_answerTime) return status;
+        const VisaStatus set =
+            m_call.viSetAttribute(argument(session), kTimeoutAttribute, static_cast<Argument>(m_answerTime->count()));
+        if (set < 0) viClose(session);
+        return set < 0 ? set : status;
     }
 
     VisaStatus viWrite(VisaHandle session, std::span<const char> bytes, std::int32_t& written) override {
@@ -99,11 +111,33 @@ public:
         return status;
     }
 
+    std::vector<std::string> findResources() override {
+        std::vector<std::string> found;
+        VisaHandle manager = 0;
+        if (m_call.viFindRsrc == nullptr || m_call.viFindNext == nullptr || viOpenDefaultRM(manager) < 0) return found;
+        std::string expression = "?*INSTR";
+        std::array<char, 1024> name{};  // the standard asks for 256
+        Result list, count;
+        VisaStatus status =
+            m_call.viFindRsrc(argument(manager), expression.data(), list.room(), count.room(), name.data());
+        const bool listed = status >= 0;
+        constexpr std::size_t kMost = 1000;  // a library that never comes to an end
+        for (; status >= 0 && found.size() < std::min<std::size_t>(kMost, count.value());
+             status = m_call.viFindNext(list.value(), name.data())) {
+            name.back() = '\0';
+            found.emplace_back(name.data());
+        }
+        if (listed) m_call.viClose(list.value());
+        viClose(manager);
+        return found;
+    }
+
     VisaStatus viClose(VisaHandle object) override { return m_call.viClose(argument(object)); }
 
 private:
     std::unique_ptr<SharedLibrary> m_library;
     Operations m_call;
+    AnswerTime m_answerTime;
 };
 
 /// Looks one operation up; notes the name of a missing one.
@@ -113,7 +147,8 @@ void find(const SharedLibrary& library, const char* name, Function& operation, s
     if (operation == nullptr) missing += (missing.empty() ? "" : ", ") + std::string(name);
 }
 
-std::unique_ptr<Visa> load(const std::filesystem::path& path, std::string& file, std::string& reason) {
+std::unique_ptr<Visa> load(const std::filesystem::path& path, AnswerTime answerTime, std::string& file,
+                           std::string& reason) {
     std::unique_ptr<SharedLibrary> library = SharedLibrary::load(path, reason);
     if (!library) return nullptr;
     Operations operations{};
@@ -123,13 +158,16 @@ std::unique_ptr<Visa> load(const std::filesystem::path& path, std::string& file,
     find(*library, "viClose", operations.viClose, missing);
     find(*library, "viWrite", operations.viWrite, missing);
     find(*library, "viRead", operations.viRead, missing);
+    if (answerTime) find(*library, "viSetAttribute", operations.viSetAttribute, missing);
+    operations.viFindRsrc = library->function<decltype(operations.viFindRsrc)>("viFindRsrc");        // may lack
+    operations.viFindNext = library->function<decltype(operations.viFindNext)>("viFindNext");        // may lack
     operations.viStatusDesc = library->function<decltype(operations.viStatusDesc)>("viStatusDesc");  // may lack
     if (!missing.empty()) {
         reason = "not a VISA library, it lacks " + missing;
         return nullptr;
     }
     file = library->file();
-    return std::make_unique<LibraryVisa>(std::move(library), operations);
+    return std::make_unique<LibraryVisa>(std::move(library), operations, answerTime);
 }
 
 /// A file that is there is meant as such when the user names it, though the system would look for a bare name
@@ -142,11 +180,11 @@ std::filesystem::path asFile(const std::string& name) {
 
 }  // namespace
 
-VisaLibrary loadFirstVisaLibrary(std::span<const std::string> names) {
+VisaLibrary loadFirstVisaLibrary(std::span<const std::string> names, AnswerTime answerTime) {
     VisaLibrary result;
     for (const std::string& name : names) {
         std::string cause;
-        result.visa = load(name, result.file, cause);
+        result.visa = load(name, answerTime, result.file, cause);
         if (result.visa) break;
         // The system's own message may begin with the name.
         if (!cause.starts_with(name)) cause.insert(0, name + ": ");
@@ -156,10 +194,10 @@ VisaLibrary loadFirstVisaLibrary(std::span<const std::string> names) {
     return result;
 }
 
-VisaLibrary loadVisaLibrary(const std::string& path) {
+VisaLibrary loadVisaLibrary(const std::string& path, AnswerTime answerTime) {
     // The usual names stay bare: what lies in the folder that the program happens to be started in is not installed.
-    if (path.empty()) return loadFirstVisaLibrary(usualVisaLibraryNames());
-    return loadFirstVisaLibrary(std::array{asFile(path).string()});
+    if (path.empty()) return loadFirstVisaLibrary(usualVisaLibraryNames(), answerTime);
+    return loadFirstVisaLibrary(std::array{asFile(path).string()}, answerTime);
 }
 
 }  // namespace kdx

@@ -2,7 +2,9 @@
 
 #include "link/visa.h"
 
+#include <chrono>
 #include <memory>
+#include <optional>
 #include <span>
 #include <string>
 #include <vector>
@@ -19,10 +21,12 @@ struct VisaLibrary {
 
 /// Loads the first of these libraries that can be loaded and has the operations; the description of statuses may be
 /// missing, then ours stand in. A bare name is looked for only where the system keeps its libraries.
-VisaLibrary loadFirstVisaLibrary(std::span<const std::string> names);
+/// @param answerTime how long an answer may take; the library's own time if left out
+VisaLibrary loadFirstVisaLibrary(std::span<const std::string> names,
+                                 std::optional<std::chrono::milliseconds> answerTime = {});
 
 /// Loads that library and no other; with an empty text, the first of the usual names that will do.
 /// @param path a file, or a bare name that the system finds where it keeps its libraries
-VisaLibrary loadVisaLibrary(const std::string& path);
+VisaLibrary loadVisaLibrary(const std::string& path, std::optional<std::chrono::milliseconds> answerTime = {});
 
 }  // namespace kdx

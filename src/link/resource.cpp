@@ -2,6 +2,7 @@
 
 #include "base/codepage.h"
 #include "base/numbers.h"
+#include "base/split.h"
 
 #include <algorithm>
 #include <vector>
@@ -9,16 +10,6 @@
 namespace kdx {
 
 namespace {
-
-std::vector<std::string_view> splitAtDoubleColons(std::string_view text) {
-    std::vector<std::string_view> parts;
-    for (;;) {
-        const std::size_t end = text.find("::");
-        parts.push_back(text.substr(0, end));
-        if (end == std::string_view::npos) return parts;
-        text.remove_prefix(end + 2);
-    }
-}
 
 bool isInterface(std::string_view part, std::string_view keyword) {
     if (!equalNoCase(part.substr(0, keyword.size()), keyword)) return false;
@@ -38,7 +29,7 @@ bool isGpibAddress(std::string_view part) {
 }  // namespace
 
 Resource parseResource(std::string_view text) {
-    const std::vector<std::string_view> parts = splitAtDoubleColons(text);
+    const std::vector<std::string_view> parts = split(text, "::");
     Resource resource;
     resource.kind = kindOf(parts.front());
     if (resource.kind == Resource::Kind::Unknown || parts.size() < 3 || parts.size() > 4) return resource;

@@ -16,12 +16,6 @@ namespace kdx {
 
 namespace {
 
-constexpr std::size_t kFixedCallBytes = 256;          // call header and all fields of fixed length, with room to spare
-constexpr std::uint32_t kLargestVerifier = 400;       // of the RPC standard
-constexpr std::uint32_t kIsCall = 0, kIsReply = 1;    // message types
-constexpr std::uint32_t kAccepted = 0, kSuccess = 0;  // reply and accept states
-constexpr std::uint32_t kProgramUnavailable = 1, kProgramMismatch = 2;
-
 /// False at the deadline, at the latest.
 bool waitFor(int descriptor, short event, Deadline deadline) {
     for (;;) {
@@ -63,23 +57,13 @@ RpcOutcome RpcChannel::call(std::uint32_t procedure, std::size_t variableBytes, 
                             const Coder& results, Deadline deadline) {
     if (!m_socket.isOpen()) return RpcOutcome::Lost;
     ++m_lastCall;
-    if (!encodeCall(procedure, variableBytes, arguments)) return RpcOutcome::Failed;
+    const auto message = rpcCall({m_lastCall, m_program, m_version, procedure}, variableBytes, arguments);
+    if (!message) return RpcOutcome::Failed;
+    m_request = framed(*message);
     RpcOutcome outcome = send(deadline);
     if (outcome == RpcOutcome::Done) outcome = receiveReply(deadline);
-    if (outcome == RpcOutcome::Done) outcome = decodeReply(results);
-    return outcome;
-}
-
-bool RpcChannel::encodeCall(std::uint32_t procedure, std::size_t variableBytes, const Coder& arguments) {
-    std::string message(kFixedCallBytes + variableBytes, '\0');
-    XDR xdr;
-    xdrmem_create(&xdr, message.data(), static_cast<u_int>(message.size()), XDR_ENCODE);
-    // RPC version 2, and neither credentials nor verifier.
-    std::array<std::uint32_t, 10> header = {m_lastCall, kIsCall, 2, m_program, m_version, procedure, 0, 0, 0, 0};
-    for (std::uint32_t& field : header) xdr_uint32_t(&xdr, &field);
-    if (!arguments(&xdr)) return false;
-    m_request = framed(std::string_view(message).substr(0, xdr_getpos(&xdr)));
-    return true;
+    if (outcome == RpcOutcome::Done) outcome = readRpcReply(m_reply, results);
+    return outcome == RpcOutcome::Unavailable || outcome == RpcOutcome::Failed ? close(outcome) : outcome;
 }
 
 RpcOutcome RpcChannel::send(Deadline deadline) {
@@ -119,22 +103,6 @@ RpcOutcome RpcChannel::receiveReply(Deadline deadline) {
             return close(RpcOutcome::Lost);
         }
     }
-}
-
-RpcOutcome RpcChannel::decodeReply(const Coder& results) {
-    XDR xdr;
-    xdrmem_create(&xdr, m_reply.data(), static_cast<u_int>(m_reply.size()), XDR_DECODE);
-    std::uint32_t number = 0, type = 0, state = 0, flavour = 0, verifierLength = 0, accepted = 0;
-    std::array<char, kLargestVerifier> verifier;
-    if (!xdr_uint32_t(&xdr, &number) || !xdr_uint32_t(&xdr, &type) || type != kIsReply || !xdr_uint32_t(&xdr, &state) ||
-        state != kAccepted || !xdr_uint32_t(&xdr, &flavour) || !xdr_uint32_t(&xdr, &verifierLength) ||
-        verifierLength > kLargestVerifier || !xdr_opaque(&xdr, verifier.data(), verifierLength) ||
-        !xdr_uint32_t(&xdr, &accepted)) {
-        return close(RpcOutcome::Failed);
-    }
-    if (accepted == kProgramUnavailable || accepted == kProgramMismatch) return close(RpcOutcome::Unavailable);
-    if (accepted != kSuccess || !results(&xdr)) return close(RpcOutcome::Failed);
-    return RpcOutcome::Done;
 }
 
 RpcOutcome RpcChannel::close(RpcOutcome because) {

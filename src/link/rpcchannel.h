@@ -2,27 +2,15 @@
 
 #include "base/filedescriptor.h"
 #include "link/deadline.h"
+#include "link/rpcmessage.h"
 #include "vxi11/rpcrecord.h"
 
-#include <rpc/types.h>
-#include <rpc/xdr.h>
-
 #include <cstdint>
-#include <functional>
 #include <string>
 
 struct sockaddr_in;
 
 namespace kdx {
-
-/// How a remote call ended.
-enum class RpcOutcome {
-    Done,
-    TimedOut,     ///< no answer in time
-    Lost,         ///< the peer closed the connection, or nobody is there any more
-    Unavailable,  ///< the peer does not serve the program
-    Failed,       ///< the peer refused the call or answered something that is no answer
-};
 
 /// Remote procedure calls (ONC RPC version 2) over one TCP connection: one program, one call at a time.
 /// The messages are put together with libtirpc's XDR; the connection is kept here, because a client of libtirpc starts
@@ -35,8 +23,7 @@ public:
     /// Connects to the port of that address. False when nobody takes the connection until the deadline.
     bool connect(const sockaddr_in& address, std::uint16_t port, Deadline deadline);
 
-    /// Writes (or reads) the fields of a message; false when they do not fit.
-    using Coder = std::function<bool(XDR*)>;
+    using Coder = RpcCoder;
 
     /// Calls one procedure.
     /// @param variableBytes how many bytes of texts and data are among the arguments
@@ -48,10 +35,8 @@ public:
 private:
     static constexpr std::size_t kLargestReply = std::size_t{128} * 1024;  // twice the most that is ever asked for
 
-    bool encodeCall(std::uint32_t procedure, std::size_t variableBytes, const Coder& arguments);
     RpcOutcome send(Deadline deadline);
     RpcOutcome receiveReply(Deadline deadline);
-    RpcOutcome decodeReply(const Coder& results);
     RpcOutcome close(RpcOutcome because);
 
     std::uint32_t m_program;

@@ -3,6 +3,7 @@
 #include <cstdint>
 #include <span>
 #include <string>
+#include <vector>
 
 namespace kdx {
 
@@ -28,7 +29,7 @@ constexpr VisaStatus kLibraryNotFound = -1073807202;      // BFFF009E: no librar
 constexpr VisaStatus kConnectionLost = -1073807194;       // BFFF00A6
 }  // namespace visa
 
-/// The six operations of the VISA standard that the program needs, under their published names.
+/// The operations of the VISA standard that the program needs, under their published names.
 class Visa {
 public:
     virtual ~Visa() = default;
@@ -46,6 +47,8 @@ public:
     virtual VisaStatus viRead(VisaHandle session, std::span<char> buffer, std::int32_t& count) = 0;
     /// Closes a session or a resource manager.
     virtual VisaStatus viClose(VisaHandle object) = 0;
+    /// The instruments that the implementation knows of, as resource strings (viFindRsrc, viFindNext); most know none.
+    [[nodiscard]] virtual std::vector<std::string> findResources() { return {}; }
 };
 
 }  // namespace kdx

@@ -68,10 +68,10 @@ std::shared_ptr<const ProfileText> DataFolder::profile(std::string_view fileName
     if (unsaved == m_unsaved.end()) return text;
     std::error_code error;
     const fs::file_status status = fs::status(path, error);
-    if (fs::exists(status) && !fs::is_regular_file(status)) return nullptr;  // a folder reads as nothing
-    auto merged = std::make_shared<ProfileText>(text ? *text : ProfileText());
-    for (const Setting& setting : unsaved->settings) merged->setValue(setting.section, setting.key, setting.value);
-    return merged;
+    // Users expect to read what they wrote, but with a folder in the file's place the operating system was seen to give
+    // nothing even then, and so do we; the value is not lost, it goes out once the folder is gone.
+    if (fs::exists(status) && !fs::is_regular_file(status)) return nullptr;
+    return changed(*unsaved, text);
 }
 
 void DataFolder::WriteIni(std::string_view section, std::string_view key, std::string_view value,
@@ -86,6 +86,7 @@ void DataFolder::WriteIni(std::string_view section, std::string_view key, std::s
     } else {
         same->value = value;
     }
+    unsaved.changed.reset();
     if (save(unsaved)) m_unsaved.pop_back();
     tellChange(before);
 }
@@ -101,7 +102,7 @@ void DataFolder::retryUnsaved() {
 DataFolder::UnsavedFile& DataFolder::unsavedPart(std::string_view fileName) {
     const auto found = std::find_if(m_unsaved.begin(), m_unsaved.end(),
                                     [&](const UnsavedFile& part) { return equalNoCase(part.name, fileName); });
-    if (found == m_unsaved.end()) return m_unsaved.emplace_back(UnsavedFile{std::string(fileName), {}});
+    if (found == m_unsaved.end()) return m_unsaved.emplace_back(UnsavedFile{std::string(fileName), {}, {}, {}});
     std::rotate(found, found + 1, m_unsaved.end());
     m_unsaved.back().name = fileName;
     return m_unsaved.back();
@@ -121,9 +122,22 @@ bool DataFolder::changeFile(const UnsavedFile& unsaved) {
         return before && before->holds(setting.section, setting.key, setting.value);
     };
     if (std::all_of(unsaved.settings.begin(), unsaved.settings.end(), isHeld)) return true;  // spare the disk
-    ProfileText text = before ? *before : ProfileText();
-    for (const Setting& setting : unsaved.settings) text.setValue(setting.section, setting.key, setting.value);
-    return replaceFile(path, text.bytes());
+    const auto after = changed(unsaved, before);
+    if (!replaceFile(path, after->bytes())) return false;
+    m_profiles.written(path, after);
+    return true;
+}
+
+/// The content with the settings that it lacks; content may be none.
+std::shared_ptr<const ProfileText> DataFolder::changed(const UnsavedFile& unsaved,
+                                                       const std::shared_ptr<const ProfileText>& content) {
+    if (!unsaved.changed || unsaved.content != content) {
+        auto text = std::make_shared<ProfileText>(content ? content->toBeChanged() : ProfileText());
+        for (const Setting& setting : unsaved.settings) text->setValue(setting.section, setting.key, setting.value);
+        unsaved.content = content;
+        unsaved.changed = std::move(text);
+    }
+    return unsaved.changed;
 }
 
 std::optional<std::string> DataFolder::unsavedFile() const {
@@ -131,7 +145,10 @@ std::optional<std::string> DataFolder::unsavedFile() const {
 }
 
 std::optional<std::string> DataFolder::unreadableFile() const {
-    return m_unreadable.empty() ? std::nullopt : std::optional(m_unreadable.back());
+    const auto unsaved = unsavedFile();
+    const auto found = std::find_if(m_unreadable.rbegin(), m_unreadable.rend(),
+                                    [&](const std::string& name) { return !unsaved || !equalNoCase(name, *unsaved); });
+    return found == m_unreadable.rend() ? std::nullopt : std::optional(*found);
 }
 
 /// The file's content on disk; notes whether there is one that cannot be read.

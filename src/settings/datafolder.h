@@ -47,8 +47,8 @@ public:
     [[nodiscard]] std::shared_ptr<const ProfileText> profile(std::string_view fileName) const;
 
     /// Writes one key at once; creates the file and the section if needed. A failure changes nothing on disk, throws
-    /// nothing and opens no box: the value is kept, is what a read gives meanwhile, and goes with the next write to the
-    /// same file or with retryUnsaved().
+    /// nothing and opens no box: the value is kept, is what a read gives meanwhile (but nothing for a folder), and goes
+    /// with the next write to the same file or with retryUnsaved().
     void WriteIni(std::string_view section, std::string_view key, std::string_view value, std::string_view fileName);
 
     /// Tries to write what could not be written so far, and looks again at what could not be read.
@@ -58,7 +58,7 @@ public:
     [[nodiscard]] std::optional<std::string> unsavedFile() const;
 
     /// Name of the file last found to be there but without settings that can be read: UTF-16 text, a folder, a file
-    /// without rights. Such a file is never written.
+    /// without rights. Such a file is never written. The one of unsavedFile() is left out: it is told as that.
     [[nodiscard]] std::optional<std::string> unreadableFile() const;
 
     /// Called whenever unsavedFile() or unreadableFile() changes.
@@ -73,12 +73,17 @@ private:
     struct UnsavedFile {
         std::string name;
         std::vector<Setting> settings;
+        // The file's content and the same with the settings, made once: a large file is not copied for each read.
+        mutable std::shared_ptr<const ProfileText> content;
+        mutable std::shared_ptr<const ProfileText> changed;
     };
     using Notice = std::pair<std::optional<std::string>, std::optional<std::string>>;
 
     UnsavedFile& unsavedPart(std::string_view fileName);
     [[nodiscard]] bool save(const UnsavedFile& unsaved);
     [[nodiscard]] bool changeFile(const UnsavedFile& unsaved);
+    [[nodiscard]] static std::shared_ptr<const ProfileText> changed(const UnsavedFile& unsaved,
+                                                                    const std::shared_ptr<const ProfileText>& content);
     [[nodiscard]] std::shared_ptr<const ProfileText> load(std::string_view fileName,
                                                           const std::filesystem::path& path) const;
     [[nodiscard]] Notice notice() const { return {unsavedFile(), unreadableFile()}; }

@@ -5,6 +5,20 @@
 
 namespace kdx {
 
+namespace {
+
+constexpr std::string_view kMultiplexSection = "FM";
+constexpr std::string_view kCarrierSection = "VRN";
+
+}  // namespace
+
+Profile Profile::ofFile(DataFolder& data, const std::filesystem::path& file) {
+    Profile profile(data, nullptr, file.string());
+    const auto text = data.profile(profile.m_file);
+    profile.m_wholeSetup = text != nullptr && text->anyKey(kMultiplexSection, [](std::string_view) { return true; });
+    return profile;
+}
+
 std::string Profile::read(const Place& place) const {
     return m_data->ReadIni(place.section, place.key, fileOf(place));
 }
@@ -19,6 +33,8 @@ void Profile::write(const Place& place, std::string_view value) {
 }
 
 std::string Profile::fileOf(const Place& place) const {
+    const std::string_view section = place.section;
+    if (m_wholeSetup && (section == kMultiplexSection || section == kCarrierSection)) return m_file;
     switch (place.file) {
         case KeptIn::General:
             return kGeneralSettings;

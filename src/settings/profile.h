@@ -36,10 +36,10 @@ public:
     [[nodiscard]] static Profile followingDataSet(DataFolder& data, const std::string& number) {
         return {data, &number, {}};
     }
-    /// The same with any file in the place of a data set's. @param file absolute, or relative to the data folder.
-    [[nodiscard]] static Profile ofFile(DataFolder& data, const std::filesystem::path& file) {
-        return {data, nullptr, file.string()};
-    }
+    /// The same with any file in the place of a data set's. One that has a section "FM" holds a whole set-up: the
+    /// multiplex, which data sets leave to the general settings, and the carrier come from there too.
+    /// @param file absolute, or relative to the data folder.
+    [[nodiscard]] static Profile ofFile(DataFolder& data, const std::filesystem::path& file);
 
     /// "" when nothing is there.
     [[nodiscard]] std::string read(const Place& place) const;
@@ -55,6 +55,7 @@ private:
     DataFolder* m_data;
     const std::string* m_dataSet;
     std::string m_file;
+    bool m_wholeSetup = false;
 };
 
 }  // namespace kdx

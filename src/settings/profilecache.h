@@ -16,6 +16,9 @@ public:
     /// The file's present content; nothing when it is missing, cannot be read or is UTF-16 text.
     [[nodiscard]] std::shared_ptr<const ProfileText> load(const std::filesystem::path& file);
 
+    /// Keeps what the file was just replaced with: as long as it is read so, it need not be searched anew.
+    void written(const std::filesystem::path& file, std::shared_ptr<const ProfileText> text);
+
 private:
     struct Entry {
         std::optional<FileIdentity> identity;  // nothing: the file may have changed without showing it

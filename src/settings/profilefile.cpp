@@ -46,9 +46,33 @@ std::size_t endOfKeys(std::string_view bytes, const ProfileLine& header) {
     return end;
 }
 
+/// Hands over the file's bytes piece by piece until they are not wanted. False when that was not to the end.
+bool readPieces(const std::filesystem::path& file, const std::function<bool(std::string_view piece)>& take) {
+    // Only real files: a folder cannot be read, and a pipe or device in the file's place could block for ever.
+    std::error_code error;
+    if (!std::filesystem::is_regular_file(file, error)) return false;
+    std::ifstream stream(file, std::ios::binary);
+    if (!stream) return false;
+    std::array<char, std::size_t{64} * 1024> piece{};
+    while (stream) {
+        stream.read(piece.data(), piece.size());
+        if (!take({piece.data(), static_cast<std::size_t>(stream.gcount())})) return false;
+    }
+    return stream.eof() && !stream.bad();
+}
+
 }  // namespace
 
 ProfileText::ProfileText(std::string bytes) : m_bytes(std::move(bytes)) {}
+
+ProfileText ProfileText::toBeChanged() const {
+    constexpr std::size_t kRoom = 1024;
+    ProfileText copy;
+    copy.m_bytes.reserve(m_bytes.size() + kRoom);
+    copy.m_bytes = m_bytes;
+    copy.m_index = m_index;
+    return copy;
+}
 
 const ProfileIndex& ProfileText::index() const {
     if (!m_index) m_index = std::make_shared<const ProfileIndex>(m_bytes);
@@ -95,15 +119,19 @@ void ProfileText::setValue(std::string_view section, std::string_view key, std::
         std::string replaced = assignment(keyOf(textOf(m_bytes, *line)), value);  // the key keeps its spelling
         if (line->next == line->end) replaced += kLineEnd;                        // the file's last line had none
         m_bytes.replace(line->begin, line->end - line->begin, replaced);
+        m_index.reset();
     } else {
         const auto header = index().header(m_bytes, section);
         std::string added = assignment(key, value).append(kLineEnd);
         if (!header) added.insert(0, std::string("[").append(section).append("]").append(kLineEnd));
         const std::size_t at = header ? endOfKeys(m_bytes, *header) : m_bytes.size();
         if (at > firstLine(m_bytes) && !isLineEnd(m_bytes[at - 1])) added.insert(0, kLineEnd);
+        // At the end, as in a file that says nothing yet, every other line stays where it was found.
+        const auto longer = at == m_bytes.size() ? std::make_shared<ProfileIndex>(index()) : nullptr;
         m_bytes.insert(at, added);
+        if (longer) longer->addLines(m_bytes, at);
+        m_index = longer;
     }
-    m_index.reset();
 }
 
 bool isUtf16(std::string_view bytes) {
@@ -111,21 +139,24 @@ bool isUtf16(std::string_view bytes) {
 }
 
 std::optional<std::string> readFile(const std::filesystem::path& file) {
-    // Only real files: a folder cannot be read, and a pipe or device in the file's place could block for ever.
-    std::error_code error;
-    if (!std::filesystem::is_regular_file(file, error)) return std::nullopt;
-    std::ifstream stream(file, std::ios::binary);
-    if (!stream) return std::nullopt;
     std::string bytes;
-    std::array<char, std::size_t{64} * 1024> part{};
+    std::error_code error;
     const std::uintmax_t size = std::filesystem::file_size(file, error);
     if (!error) bytes.reserve(size + 1);
-    while (stream) {
-        stream.read(part.data(), part.size());
-        bytes.append(part.data(), static_cast<std::size_t>(stream.gcount()));
-    }
-    if (stream.bad() || !stream.eof()) return std::nullopt;
-    return bytes;
+    const bool read = readPieces(file, [&](std::string_view piece) {
+        bytes.append(piece);
+        return true;
+    });
+    return read ? std::optional(std::move(bytes)) : std::nullopt;
+}
+
+bool fileHolds(const std::filesystem::path& file, std::string_view bytes) {
+    const bool begins = readPieces(file, [&](std::string_view piece) {
+        const bool equal = bytes.starts_with(piece);
+        if (equal) bytes.remove_prefix(piece.size());
+        return equal;
+    });
+    return begins && bytes.empty();
 }
 
 std::optional<std::string> readToChange(const std::filesystem::path& file) {

@@ -22,6 +22,9 @@ class ProfileText {
 public:
     explicit ProfileText(std::string bytes = {});
 
+    /// A copy with room for more, so that a large file is not copied again when a value is added.
+    [[nodiscard]] ProfileText toBeChanged() const;
+
     /// Value of the first key of that name in the first section of that name; "" when missing or empty. One outer
     /// pair of equal quotes is taken off, then the value is cut at `longest` characters.
     [[nodiscard]] std::string value(std::string_view section, std::string_view key,
@@ -54,6 +57,9 @@ private:
 
 /// The file's bytes, or nothing when it is missing or cannot be read.
 [[nodiscard]] std::optional<std::string> readFile(const std::filesystem::path& file);
+
+/// Whether the file can be read and has these bytes and no more; a large one is compared without being held.
+[[nodiscard]] bool fileHolds(const std::filesystem::path& file, std::string_view bytes);
 
 /// The file's bytes, to be changed and written back: "" for one yet to be made, nothing for one that is there but
 /// cannot be read, as writing it would lose what is in it.

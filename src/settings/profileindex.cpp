@@ -32,15 +32,18 @@ std::uint32_t hashOf(std::uint32_t section, std::string_view name) {
 }  // namespace
 
 ProfileIndex::ProfileIndex(std::string_view bytes) {
-    std::uint32_t headers = 0;
+    addLines(bytes, firstLine(bytes));
+}
+
+void ProfileIndex::addLines(std::string_view bytes, std::size_t begin) {
     ProfileLine line;
-    for (ProfileLines lines(bytes, firstLine(bytes)); lines.next(line);) {
+    for (ProfileLines lines(bytes, begin); lines.next(line);) {
         const std::string_view text = textOf(bytes, line);
         if (saysNothing(text)) continue;
         if (isHeader(text)) {
-            add(sectionOf(text), {line.begin, kHeaders, ++headers});
-        } else if (headers > 0) {
-            add(keyOf(text), {line.begin, headers, 0});
+            add(sectionOf(text), {line.begin, kHeaders, ++m_headers});
+        } else if (m_headers > 0) {
+            add(keyOf(text), {line.begin, m_headers, 0});
         }
     }
 }

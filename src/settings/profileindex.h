@@ -16,6 +16,9 @@ class ProfileIndex {
 public:
     explicit ProfileIndex(std::string_view bytes);
 
+    /// Adds what was put behind the bytes it was made of. @param begin their length.
+    void addLines(std::string_view bytes, std::size_t begin);
+
     [[nodiscard]] std::optional<ProfileLine> header(std::string_view bytes, std::string_view section) const;
     [[nodiscard]] std::optional<ProfileLine> key(std::string_view bytes, std::string_view section,
                                                  std::string_view key) const;
@@ -38,6 +41,7 @@ private:
     [[nodiscard]] const Entry* find(std::string_view bytes, std::uint32_t section, std::string_view name) const;
 
     std::array<Bucket, 256> m_buckets;
+    std::uint32_t m_headers = 0;  // so many so far
 };
 
 }  // namespace kdx

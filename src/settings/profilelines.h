@@ -32,7 +32,8 @@ private:
     std::size_t m_nextLf = 0;
 };
 
-/// Where the first line begins: behind the mark with which some editors begin UTF-8 files.
+/// Where the first line begins: behind the mark with which some editors begin UTF-8 files. A file that such an editor
+/// saved would lose its first section otherwise; its values are 8-bit text all the same.
 [[nodiscard]] std::size_t firstLine(std::string_view bytes);
 
 /// Without blanks, tabs and vertical tabs at either end.

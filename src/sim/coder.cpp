@@ -12,11 +12,7 @@ namespace kdx::sim {
 
 namespace {
 
-constexpr std::size_t kRadiotextLength = 64;
-constexpr std::size_t kGroupLength = 10;
-constexpr std::size_t kMostGroups = 256;
 constexpr int kHighestRadiotextNumber = 255;
-constexpr int kHighestGroup = 15;
 
 bool isGroup(std::string_view group) {
     if (group.empty() || (group.back() != 'A' && group.back() != 'B')) return false;
@@ -27,7 +23,7 @@ bool isGroup(std::string_view group) {
 // Two digits, a comma and ten characters, which is what 3A and 8A have in common; gives the ten characters.
 std::optional<std::string_view> groupContents(std::string_view value) {
     const auto [number, contents] = cutAt(value, ',');
-    if (number.size() != 2 || !isDecimal(number) || !contents || contents->size() != kGroupLength) return std::nullopt;
+    if (number.size() != 2 || !isDecimal(number) || !contents || contents->size() != kGroupDigits) return std::nullopt;
     return contents;
 }
 

@@ -6,6 +6,7 @@
 #include <cstdint>
 
 #include "base/codepage.h"
+#include "coder/fieldsizes.h"
 
 namespace kdx::simserver {
 
@@ -48,9 +49,8 @@ private:
 
 // "02," and ten characters, all hexadecimal digits.
 constexpr std::size_t kGroupPrefix = 3;
-constexpr std::size_t kGroupLength = 10;
 bool isGroup(std::string_view value) {
-    return value.size() == kGroupPrefix + kGroupLength && value[2] == ',' && isHex(value.substr(kGroupPrefix));
+    return value.size() == kGroupPrefix + kGroupDigits && value[2] == ',' && isHex(value.substr(kGroupPrefix));
 }
 
 std::string describeTrafficMessage(std::string_view value) {

@@ -10,8 +10,11 @@
 #include "settings/profilefile.h"
 
 #include <algorithm>
+#include <filesystem>
 #include <optional>
 #include <string>
+#include <system_error>
+#include <utility>
 
 namespace kdx {
 
@@ -57,12 +60,25 @@ void PictureSwitch::showState(bool on) {
     update();
 }
 
+void PictureSwitch::tryAgain() {
+    if (m_pictureStale || !m_picture.isNull()) return;
+    load();  // also while its page is hidden: what is told about it holds for that too
+    update();
+}
+
+void PictureSwitch::load() {
+    const char* const name = isChecked() ? kPictureOn : kPictureOff;
+    const auto file = m_data.file(name);
+    m_picture = loadPicture(file, static_cast<int>(kPictureWidth * devicePixelRatioF()));
+    m_pictureStale = false;
+    std::error_code error;
+    const bool broken = m_picture.isNull() && std::filesystem::exists(file, error);  // a missing one is no fault
+    const QString before = std::exchange(m_brokenPicture, broken ? QString(QLatin1String(name)) : QString());
+    if (m_brokenPicture != before) emit brokenPictureChanged();
+}
+
 void PictureSwitch::paintEvent(QPaintEvent* /*event*/) {
-    if (m_pictureStale) {
-        const auto file = m_data.file(isChecked() ? kPictureOn : kPictureOff);
-        m_picture = loadPicture(file, static_cast<int>(kPictureWidth * devicePixelRatioF()));
-        m_pictureStale = false;
-    }
+    if (m_pictureStale) load();
     QPainter painter(this);
     painter.setRenderHints(QPainter::Antialiasing | QPainter::SmoothPixmapTransform);
     if (!isEnabled()) painter.setOpacity(0.5);

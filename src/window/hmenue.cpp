@@ -26,6 +26,7 @@
 #include "ui/controls.h"
 #include "ui/dialogs.h"
 #include "ui/page.h"
+#include "ui/pictureswitch.h"
 #include "ui/statusrow.h"
 #include "ui/text.h"
 #include "ui/ticker.h"
@@ -74,6 +75,7 @@ HMenue::HMenue(const Surroundings& surroundings)
     // Every setting was stored when it changed: nothing is left to do at the end.
     connect(m_connection, &ConnectionBar::endRequested, this, [this] { m_s.endProgram(); });
     createPages();
+    watchPictures();
     createMenu();
     arrange();
     m_s.session.transmitter.setWatcher(this);
@@ -87,6 +89,7 @@ HMenue::HMenue(const Surroundings& surroundings)
     connect(retry, &QTimer::timeout, this, [this] {
         m_s.data.retryUnsaved();
         m_s.session.instrument.log.retry();
+        for (PictureSwitch* button : findChildren<PictureSwitch*>()) button->tryAgain();
         showNotice();  // another program on the same data comes and goes
     });
     retry->start(kRetryInterval);
@@ -126,6 +129,12 @@ void HMenue::createPages() {
             SSTab1->setCurrentIndex((SSTab1->currentIndex() + step + SSTab1->count()) % SSTab1->count());
         });
     }
+}
+
+void HMenue::watchPictures() {
+    // Queued: a picture is loaded while its switch is painted, when no other control may change.
+    for (const PictureSwitch* button : findChildren<PictureSwitch*>())
+        connect(button, &PictureSwitch::brokenPictureChanged, this, &HMenue::showNotice, Qt::QueuedConnection);
 }
 
 void HMenue::createMenu() {
@@ -317,10 +326,13 @@ QStringList HMenue::notes() const {
     } else if (!m_startNotice.isEmpty()) {
         notes += m_startNotice;
     }
-    const auto unsaved = m_s.data.unsavedFile();
-    const auto unreadable = m_s.data.unreadableFile();
-    if (unreadable && unreadable != unsaved) note({325, "Nicht lesbar: %1"}, toText(*unreadable));
-    if (unsaved) note({312, "Nicht gespeichert: %1"}, toText(*unsaved));
+    QStringList unreadable;
+    if (const auto file = m_s.data.unreadableFile()) unreadable += toText(*file);
+    for (const PictureSwitch* button : findChildren<PictureSwitch*>()) unreadable += button->brokenPicture();
+    unreadable.removeAll(QString());
+    unreadable.removeDuplicates();
+    if (!unreadable.isEmpty()) note({325, "Nicht lesbar: %1"}, unreadable.join(QStringLiteral(", ")));
+    if (const auto unsaved = m_s.data.unsavedFile()) note({312, "Nicht gespeichert: %1"}, toText(*unsaved));
     if (!m_s.session.instrument.log.isWritable()) note({312, "Nicht gespeichert: %1"}, toText(kCommandLog));
     if (m_s.claim.isShared()) note({326, "Ein anderes Programm nutzt dieselben Daten"});
     QStringList quoted;

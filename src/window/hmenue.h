@@ -60,6 +60,7 @@ private:
     void Mnu_Info_Log_Click();
     void loadPages();
     void showSessionOpen(bool open);
+    void watchPictures();
     void showNotice();
     [[nodiscard]] QStringList notes() const;
     [[nodiscard]] QString missingData() const;

@@ -19,7 +19,7 @@ import unittest
 
 CTL = RDS = SIM = ""
 DATA = pathlib.Path(__file__).parents[2] / "Daten"
-DONE, FAILED, WRONG_CALL, NO_CONNECTION = 0, 1, 2, 4
+DONE, FAILED, WRONG_CALL, DIFFERENT, NO_CONNECTION = 0, 1, 2, 3, 4
 
 
 class Ctl(unittest.TestCase):
@@ -59,10 +59,19 @@ class Calls(Ctl):
                 self.assertNotEqual(run.stderr, "")
                 self.assertEqual(run.stdout, "")
 
+    def testATimeoutIsAPlainNumberOfSeconds(self):
+        for wrong in ("0", "0.05", "601", "2,5", "nan", "inf", "-1", "1e1", "0x1", "500m", "", "soon"):
+            with self.subTest(wrong):
+                run = self.ctl("--simulate", "--timeout", wrong, "query", "ps", expect=WRONG_CALL)
+                self.assertIn("0.1 to 600", run.stderr)
+        for right in ("0.1", "2.5", "600"):
+            self.ctl("--simulate", "--timeout", right, "query", "ps")
+
     def testHelpOfEachSubcommandHasAnExample(self):
         overview = self.ctl("--help").stdout
-        for name in ("apply", "list", "query", "replay", "send"):
-            self.assertIn(name, overview)
+        names = re.findall(r"(?m)^  ([a-z]+) ", overview.split("Subcommands:")[1])
+        self.assertGreaterEqual(len(names), 6)
+        for name in names:
             self.assertIn("Example: kdx-ctl " + name, self.ctl(name, "--help").stdout)
 
     def testNoWindowToolkitIsLinked(self):
@@ -186,6 +195,10 @@ class Send(Ctl):
                          [':STEREO:DIRECT "PS=Käse    "', ":stereo:rds:traffic:program ON", "FREQ 98.5MHZ",
                           ':STEREO:DIRECT "EON-PI=D3C1"', ':STEREO:DIRECT "EON-TA=D3C1,1"'])
 
+    def testAnOptionTakesOneTextAndTheRestAreSettings(self):
+        self.assertEqual(self.sent("send", "--raw", "FREQ 99 MHz", "TP=1", "--raw", "*CLS", "PTY=7"),
+                         [":stereo:rds:traffic:program ON", ':STEREO:DIRECT "PTY=07"', "FREQ 99 MHz", "*CLS"])
+
     def testCommandsGoAsTheyStand(self):
         self.assertEqual(self.sent("send", "--raw", "FREQ 99 MHz", "--coder", "PTY=07"),
                          ["FREQ 99 MHz", ':STEREO:DIRECT "PTY=07"'])
@@ -274,6 +287,48 @@ class Replay(Ctl):
         self.simulated("replay", str(self.folder / "none"), expect=WRONG_CALL)
 
 
+class Read(Ctl):
+    def testTheFileIsADataSetThatApplyTakes(self):
+        file = str(self.folder / "Gelesen.INI")
+        run = self.simulated("read", "--into", file, expect=DIFFERENT)
+        self.assertIn("STEREO_MODE=3", run.stdout)
+        self.assertIn('HF:PEGEL:STATE is "OFF" and does not come back', run.stderr)
+        self.assertIn('":STEREO:DIRECT "PS=KDX-X4  ""', ['"' + text + '"' for text in self.sent("apply", "--file", file)])
+
+    def testTheDocumentNamesWhatIsNotKept(self):
+        file = str(self.folder / "Gelesen.INI")
+        document = json.loads(self.simulated("--json", "read", "--into", file, expect=DIFFERENT).stdout)
+        self.assertEqual(document["not_kept"], ["RT_N", "HF:PEGEL:STATE"])
+        self.assertEqual(document["not_sent_by_a_data_set"]["STEREO_MODE"], "3")
+
+    def testWhatTheFileHoldsBesidesStays(self):
+        file = self.write("Gelesen.INI", "; Prüfstand\r\n[RDS]\r\nPS=ALT\r\nRTB=Zweiter\r\n")
+        self.simulated("read", "--into", file, expect=DIFFERENT)
+        text = pathlib.Path(file).read_bytes().decode("cp1252")
+        self.assertTrue(text.startswith("; Prüfstand\r\n[RDS]\r\nPS=KDX-X4\r\nRTB=Zweiter\r\n"), text)
+
+    def testAPlaceThatCannotBeWrittenIsTold(self):
+        (self.folder / "folder.INI").mkdir()
+        self.assertIn("no settings file", self.simulated("read", "--into", str(self.folder / "folder.INI"),
+                                                         expect=WRONG_CALL).stderr)
+        self.assertIn("cannot be written", self.simulated("read", "--into", str(self.folder / "none" / "a.INI"),
+                                                          expect=FAILED).stderr)
+
+
+class Diff(Ctl):
+    def testDifferencesAreATableAndExitCode3(self):
+        run = self.simulated("diff", "--data-set", "2", expect=DIFFERENT)
+        self.assertRegex(run.stdout, r'(?m)^PS +"TALWELLE" +"KDX-X4" +programme service name$')
+
+    def testFixSendsWhatDiffersAndTellsWhatIsLeft(self):
+        written = self.sent("diff", "--data-set", "2", "--fix")
+        self.assertIn(':STEREO:DIRECT "PS=TALWELLE"', written)
+        self.assertNotIn(':STEREO:DIRECT "TA=0"', written)
+
+    def testAFileThatCannotBeReadIsExitCode2(self):
+        self.simulated("diff", "--file", str(self.folder / "none.INI"), expect=WRONG_CALL)
+
+
 class OverTheNetwork(Ctl):
     """Against kdx-sim as a process of its own; in a network of its own where the system permits that."""
 
@@ -316,6 +371,19 @@ class OverTheNetwork(Ctl):
         self.assertEqual(self.ctl("--lan", "127.0.0.1,inst0", "query", "ps").stdout, "KDX-X4  \n")
         self.ctl("--lan", "127.0.0.1,nothing", "query", "ps", expect=NO_CONNECTION)
 
+    def testWhatIsReadAndAppliedDiffersInNothing(self):
+        file = str(self.folder / "Gelesen.INI")
+        self.lan("apply", "--data-set", "4")
+        self.assertEqual(self.lan("diff", "--data-set", "4").stdout, "")
+        self.lan("read", "--into", file)
+        self.lan("send", "PS=ANDERS", "TA=1", "HF-Pegel=20")
+        changed = json.loads(self.lan("--json", "diff", "--file", file, expect=DIFFERENT).stdout)["differences"]
+        self.assertEqual([row["setting"] for row in changed], ["PS", "TA", "HF-Pegel"])
+        self.lan("diff", "--file", file, "--fix")
+        self.lan("send", "PI=ABCD")
+        self.lan("apply", "--file", file)
+        self.assertEqual(self.lan("diff", "--file", file).stdout, "")
+
     def killInTheMiddle(self, *options):
         process = subprocess.Popen(self.command("--lan", "127.0.0.1", "-v", *options, "apply"),
                                    stdout=subprocess.PIPE, stderr=subprocess.PIPE, text=True)
@@ -338,6 +406,29 @@ class OverTheNetwork(Ctl):
         self.assertEqual(code, FAILED)
         self.assertEqual(problems.count("the link to the instrument is broken"), 1, problems)
         self.assertGreater(len(rest), 10)
+
+    def secondsToNoticeSilence(self, *options):
+        """How long a read takes when the instrument falls silent in the middle."""
+        process = subprocess.Popen(self.command("--lan", "127.0.0.1", "-v", *options, "query", "all"),
+                                   stdout=subprocess.PIPE, stderr=subprocess.PIPE, text=True)
+        process.stdout.readline()
+        self.sim.send_signal(signal.SIGSTOP)
+        began = time.monotonic()
+        problem = process.stderr.readline()
+        took = time.monotonic() - began
+        _, rest = process.communicate(timeout=100)
+        self.sim.send_signal(signal.SIGCONT)
+        self.assertEqual(process.returncode, FAILED)
+        self.assertRegex(problem, r"time-out.*\(-1073807339\).*keeps silent")
+        self.assertEqual(rest, "")
+        return took
+
+    def testHowLongAnAnswerMayTakeCanBeSaid(self):
+        self.assertLess(self.secondsToNoticeSilence("--timeout", "0.5"), 1.5)
+        self.assertGreater(self.secondsToNoticeSilence("--timeout", "3"), 2.9)
+
+    def testAnAnswerMayTakeTwoSecondsElse(self):
+        self.assertTrue(1.9 < self.secondsToNoticeSilence() < 3)
 
     def testARequestToEndStopsAfterTheRunningCommand(self):
         for request in (signal.SIGINT, signal.SIGTERM):

@@ -35,5 +35,18 @@ TEST(CodePageTest, NamesCompareWithoutRegardToCase) {
     EXPECT_EQ(upperCase("auto\xE4\xF7\xFF"), "AUTO\xC4\xF7\x9F");
 }
 
+TEST(CodePage, KnowsWholeCharactersOfUtf8) {
+    for (const char* text :
+         {"", "plain", "K\u00E4se", "\u20AC", "\U0001F4FB", "\u007F\u0080\u07FF\u0800\uFFFF\U0010FFFF"}) {
+        EXPECT_TRUE(isUtf8(text)) << text;
+    }
+    EXPECT_TRUE(isUtf8(std::string_view("\0", 1)));
+    for (const char* text :
+         {"\xFC", "a\x80", "\xC3", "\xC3(", "\xC0\x80", "\xC1\xBF", "\xE0\x9F\xBF", "\xED\xA0\x80", "\xF0\x8F\xBF\xBF",
+          "\xF4\x90\x80\x80", "\xF5\x80\x80\x80", "\xFF", "\xE2\x82", "\xF8\x88\x80\x80\x80"}) {
+        EXPECT_FALSE(isUtf8(text)) << text;
+    }
+}
+
 }  // namespace
 }  // namespace kdx

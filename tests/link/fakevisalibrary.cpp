@@ -54,6 +54,26 @@ std::int32_t viClose(Unsigned object) {
 }
 #endif
 
+#ifndef KDX_WITHOUT_LIST
+// Three instruments, or none when KDX_FAKE_VISA_EMPTY is set.
+std::int32_t viFindRsrc(Unsigned resourceManager, char* /*expression*/, Unsigned* list, Unsigned* count,
+                        char* description) {
+    if (resourceManager != kManager) return kInvalidObject;
+    if (std::getenv("KDX_FAKE_VISA_EMPTY") != nullptr) return -1073807343;
+    *list = kSession;
+    *count = 3;
+    std::strcpy(description, "GPIB0::28::INSTR");
+    return 0;
+}
+
+std::int32_t viFindNext(Unsigned list, char* description) {
+    if (list != kSession) return kInvalidObject;
+    const bool second = std::strcmp(description, "GPIB0::28::INSTR") == 0;
+    std::strcpy(description, second ? "ASRL1::INSTR" : "TCPIP0::127.0.0.1::inst0::INSTR");
+    return 0;
+}
+#endif
+
 std::int32_t viOpen(Unsigned resourceManager, char* resource, Unsigned accessMode, Unsigned openTimeout,
                     Unsigned* session) {
     if (resourceManager != kManager) return kInvalidObject;
@@ -66,6 +86,14 @@ std::int32_t viOpen(Unsigned resourceManager, char* resource, Unsigned accessMod
 std::int32_t viStatusDesc(Unsigned object, Signed status, char* description) {
     std::snprintf(description, 256, "status %d of %u", static_cast<int>(status), static_cast<unsigned>(object));
     return status == 7 ? 1073676421 : 0;
+}
+#endif
+
+#ifndef KDX_WITHOUT_ATTRIBUTES
+std::int32_t viSetAttribute(Unsigned object, Unsigned attribute, std::uintptr_t value) {
+    if (object != kSession) return kInvalidObject;
+    held += " " + std::to_string(attribute) + "=" + std::to_string(value);
+    return value == 6667 ? kInvalidObject : 0;
 }
 #endif
 

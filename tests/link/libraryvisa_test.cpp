@@ -16,6 +16,7 @@ namespace {
 using ::testing::AllOf;
 using ::testing::ElementsAre;
 using ::testing::HasSubstr;
+using ::testing::IsEmpty;
 using ::testing::Not;
 using ::testing::StartsWith;
 
@@ -60,6 +61,48 @@ TEST_F(LibraryVisaTest, TellsWhichFileWasLoaded) {
 TEST_F(LibraryVisaTest, OpensWithTheArgumentsAsTheyStand) {
     ASSERT_EQ(library.visa->viOpen(manager, "TCPIP:: x ::INSTR", 1, 2500, session), 0);
     EXPECT_THAT(read(), StartsWith("TCPIP:: x ::INSTR 1 2500"));
+}
+
+TEST(LibraryVisaList, NamesTheInstrumentsThatTheLibraryKnows) {
+    for (const std::string& file : {kComplete, kWide}) {
+        EXPECT_THAT(loadVisaLibrary(file).visa->findResources(),
+                    ElementsAre("GPIB0::28::INSTR", "ASRL1::INSTR", "TCPIP0::127.0.0.1::inst0::INSTR"));
+    }
+    ::setenv("KDX_FAKE_VISA_EMPTY", "1", 1);
+    EXPECT_THAT(loadVisaLibrary(kComplete).visa->findResources(), IsEmpty());
+    ::unsetenv("KDX_FAKE_VISA_EMPTY");
+}
+
+TEST(LibraryVisaList, IsEmptyWhereTheLibraryCannotSay) {
+    EXPECT_THAT(loadVisaLibrary(kWordless).visa->findResources(), IsEmpty());
+}
+
+TEST(LibraryVisaTime, IsSetForEachSession) {
+    using namespace std::chrono_literals;
+    for (const std::string& file : {kComplete, kWide}) {
+        const VisaLibrary library = loadVisaLibrary(file, 2500ms);
+        ASSERT_NE(library.visa, nullptr) << library.reason;
+        VisaHandle manager = 0, session = 0;
+        library.visa->viOpenDefaultRM(manager);
+        ASSERT_EQ(library.visa->viOpen(manager, "GPIB0::28::INSTR", 0, 0, session), 0);
+        std::string answer(60, ' ');
+        std::int32_t count = 0;
+        library.visa->viRead(session, answer, count);
+        EXPECT_THAT(answer, StartsWith("GPIB0::28::INSTR 0 0 1073676314=2500 "));
+    }
+}
+
+TEST(LibraryVisaTime, ThatTheLibraryDoesNotTakeIsAFailedOpening) {
+    using namespace std::chrono_literals;
+    const VisaLibrary library = loadVisaLibrary(kComplete, 6667ms);
+    VisaHandle manager = 0, session = 0;
+    library.visa->viOpenDefaultRM(manager);
+    EXPECT_EQ(library.visa->viOpen(manager, "GPIB0::28::INSTR", 0, 0, session), visa::kInvalidObject);
+}
+
+TEST(LibraryVisaTime, NeedsALibraryThatCanSetIt) {
+    EXPECT_NE(loadVisaLibrary(kWordless).visa, nullptr);
+    EXPECT_THAT(loadVisaLibrary(kWordless, std::chrono::milliseconds(100)).reason, HasSubstr("lacks viSetAttribute"));
 }
 
 TEST_F(LibraryVisaTest, StatusesOfAllKindsComeThrough) {

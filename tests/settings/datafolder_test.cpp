@@ -97,14 +97,6 @@ TEST_F(DataFolderTest, WritesGoToTheCurrentDataSetWhileTheGeneratorIsReadFromDat
     EXPECT_EQ(m_data.ReadIni("VRN", "HF_Frequenz", "Datenset1.ini"), "87.6");
 }
 
-TEST_F(DataFolderTest, AFolderInTheFilesPlaceReadsAsNothingAndIsReported) {
-    fs::create_directory(m_folder.data() / "RDS_Allg.INI");
-    EXPECT_EQ(m_data.ReadIni("BUS", "INTERFACE", kGeneralSettings), "");
-    m_data.WriteIni("BUS", "INTERFACE", "IEC", kGeneralSettings);
-    EXPECT_EQ(m_data.unsavedFile(), "RDS_Allg.INI");
-    EXPECT_TRUE(fs::is_directory(m_folder.data() / "RDS_Allg.INI"));
-}
-
 TEST_F(DataFolderTest, AFileThatCannotBeReadIsNeverReplaced) {
     if (geteuid() != 0) GTEST_SKIP() << "only the administrator can play two users";
     m_folder.write("RDS_Allg.INI", "[BUS]\r\nINTERFACE=IEC\r\n");

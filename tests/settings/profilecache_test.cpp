@@ -75,6 +75,18 @@ TEST_F(ProfileCacheTest, WhatWasHandedOutStaysAsItIs) {
     EXPECT_EQ(before->value("M", "a"), "1");
 }
 
+TEST_F(ProfileCacheTest, WhatWasWrittenIsGivenOutAsLongAsTheFileHoldsIt) {
+    write('1');
+    const fs::path file = m_folder.data() / "a.ini";
+    const auto written = std::make_shared<const ProfileText>("[M]\r\na=1\r\n");
+    m_cache.written(file, written);
+    EXPECT_EQ(m_cache.load(file), written);
+    write('2');
+    EXPECT_EQ(value(), "2");
+    m_cache.written(file, written);
+    EXPECT_EQ(value(), "2") << "another program was quicker";
+}
+
 TEST_F(ProfileCacheTest, Utf16TextIsNothing) {
     using namespace std::string_literals;
     m_folder.write("a.ini", "\xFF\xFE[\0M\0]\0\n\0a\0=\0"s + "1\0\n\0"s);

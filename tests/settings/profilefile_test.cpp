@@ -60,6 +60,7 @@ TEST(ProfileTextTest, TheMarkOfAUtf8FileIsPassedOverAndKept) {
     EXPECT_EQ(written(marked, "RDS", "PS", "X"), mark + "[RDS]\r\nPS=X\r\n");
     EXPECT_EQ(written(marked, "FM", "ARI", "1"), marked + "[FM]\r\nARI=1\r\n");
     EXPECT_EQ(written(mark, "RDS", "PS", "X"), mark + "[RDS]\r\nPS=X\r\n");
+    EXPECT_EQ(ProfileText(mark + "[RDS]\r\nPS=F\xC3\x9CNF\r\n").value("RDS", "PS"), "F\xC3\x9CNF") << "8-bit text";
     EXPECT_EQ(ProfileText("[RDS]\r\n" + mark + "PS=RADIO\r\n").value("RDS", "PS"), "") << "only where a file begins";
 }
 
@@ -174,6 +175,22 @@ TEST(ReadFileTest, GivesNothingForWhatIsNoFile) {
     EXPECT_EQ(readFile(folder.data() / "missing.ini"), std::nullopt);
     EXPECT_EQ(readFile(folder.data()), std::nullopt);
     EXPECT_EQ(readFile("/dev/zero"), std::nullopt);
+}
+
+TEST(FileHoldsTest, ComparesEveryByteAndTheLength) {
+    const test::TempFolder folder;
+    const std::string bytes(200'000, 'x');
+    const auto file = folder.data() / "a.ini";
+    folder.write("a.ini", bytes);
+    EXPECT_TRUE(fileHolds(file, bytes));
+    EXPECT_FALSE(fileHolds(file, bytes + "x"));
+    EXPECT_FALSE(fileHolds(file, bytes.substr(1)));
+    EXPECT_FALSE(fileHolds(file, bytes.substr(1) + "y"));
+    EXPECT_FALSE(fileHolds(file, ""));
+    folder.write("a.ini", "");
+    EXPECT_TRUE(fileHolds(file, ""));
+    EXPECT_FALSE(fileHolds(folder.data() / "missing.ini", ""));
+    EXPECT_FALSE(fileHolds(folder.data(), ""));
 }
 
 TEST(ReadToChangeTest, GivesTheBytesOfAFileAndNoneOfOneYetToBeMade) {

@@ -37,28 +37,54 @@ std::string plainRead(std::string bytes, const std::string& section, const std::
     return "";
 }
 
-TEST(ProfileIndexTest, FindsInAnyFileWhatReadingLineByLineFinds) {
-    const std::vector<std::string> pieces = {"[a]", "[ B ]", "[b", "a",  "A=1",  "b = 2", "\xFC=3", "\xDC=4", "=5",
-                                             "x",   "\r\n",  "\n", "\r", "\r\n", "\n",    " ",      ";",      "[]"};
-    const std::vector<std::string> names = {"a", "B", "", "\xFC", "x", "ax"};
-    std::mt19937 random(20090305);
-    int found = 0;
-    for (int round = 0; round < 500; ++round) {
+const std::vector<std::string> kNames = {"a", "B", "", "\xFC", "x", "ax"};
+
+class ProfileIndexTest : public ::testing::Test {
+protected:
+    std::size_t below(std::size_t count) { return m_random() % count; }
+    std::string anyFile() {
+        const std::vector<std::string> pieces = {"[a]", "[ B ]", "[b", "a",  "A=1",  "b = 2", "\xFC=3", "\xDC=4", "=5",
+                                                 "x",   "\r\n",  "\n", "\r", "\r\n", "\n",    " ",      ";",      "[]"};
         std::string bytes;
-        for (int piece = 0; piece < 40; ++piece) bytes += pieces[random() % pieces.size()];
-        const ProfileText text(bytes);
-        for (const std::string& section : names) {
-            for (const std::string& key : names) {
-                const std::string expected = plainRead(bytes, section, key);
-                ASSERT_EQ(text.value(section, key), expected) << bytes << "\n: " << section << ", " << key;
-                if (!expected.empty()) ++found;
+        for (int piece = 0; piece < 40; ++piece) bytes += pieces[below(pieces.size())];
+        return bytes;
+    }
+    void expectReadsLineByLine(const ProfileText& text) {
+        for (const std::string& section : kNames) {
+            for (const std::string& key : kNames) {
+                const std::string expected = plainRead(text.bytes(), section, key);
+                ASSERT_EQ(text.value(section, key), expected) << text.bytes() << "\n: " << section << ", " << key;
+                if (!expected.empty()) ++m_found;
             }
         }
     }
-    EXPECT_GT(found, 500) << "the files have to hold something";
+
+    int m_found = 0;
+
+private:
+    std::mt19937 m_random{20090305};
+};
+
+TEST_F(ProfileIndexTest, FindsInAnyFileWhatReadingLineByLineFinds) {
+    for (int round = 0; round < 500; ++round) expectReadsLineByLine(ProfileText(anyFile()));
+    EXPECT_GT(m_found, 500) << "the files have to hold something";
 }
 
-TEST(ProfileIndexTest, FindsEachOfManyKeys) {
+TEST_F(ProfileIndexTest, FindsWhatIsWrittenOneAfterTheOther) {
+    for (int round = 0; round < 200; ++round) {
+        ProfileText text(anyFile());
+        for (int written = 0; written < 6; ++written) {
+            const std::string section = kNames[below(kNames.size())];
+            const std::string key = kNames[below(kNames.size())];
+            text.setValue(section, key, std::to_string(written + 10));
+            ASSERT_EQ(text.value(section, key), std::to_string(written + 10)) << text.bytes();
+            expectReadsLineByLine(text);
+        }
+    }
+    EXPECT_GT(m_found, 1000);
+}
+
+TEST_F(ProfileIndexTest, FindsEachOfManyKeys) {
     std::string bytes;
     for (int section = 0; section < 20; ++section) {
         bytes += "[s" + std::to_string(section) + "]\n";

@@ -70,6 +70,16 @@ TEST_F(UnsavedTest, AReadGivesItMeanwhileByTheRulesOfReading) {
     EXPECT_EQ(read("PS"), "");
 }
 
+TEST_F(UnsavedTest, ReadsMeanwhileCopyTheFileOnceOnly) {
+    lock();
+    write("PS", "NEW");
+    const auto first = m_data.profile(kFile);
+    EXPECT_EQ(m_data.profile(kFile), first);
+    write("PS", "NEWER");
+    EXPECT_EQ(m_data.profile(kFile)->value("RDS", "PS"), "NEWER");
+    EXPECT_EQ(first->value("RDS", "PS"), "NEW") << "what was handed out stays as it is";
+}
+
 TEST_F(UnsavedTest, OfSeveralValuesOfAKeyTheLastIsKept) {
     lock();
     write("PS", "FIRST");
@@ -117,13 +127,18 @@ TEST_F(UnsavedTest, AFolderThatComesBackGetsEverything) {
     EXPECT_EQ(m_folder.read(kFile), "[RDS]\r\nPS=NEW\r\nPI=D3C0\r\n");
 }
 
-TEST_F(UnsavedTest, AFolderInTheFilesPlaceReadsAsNothingAllTheSame) {
-    fs::create_directory(m_folder.data() / "a.ini");
-    m_data.WriteIni("M", "a", "1", "a.ini");
-    EXPECT_EQ(m_data.ReadIni("M", "a", "a.ini"), "");
-    fs::remove(m_folder.data() / "a.ini");
+TEST_F(UnsavedTest, AFolderInTheFilesPlaceReadsAsNothingAndGivesTheValueBackWhenItGoes) {
+    const fs::path file = m_folder.data() / kGeneralSettings;
+    fs::create_directory(file);
+    m_data.WriteIni("BUS", "INTERFACE", "IEC", kGeneralSettings);
+    EXPECT_EQ(m_data.ReadIni("BUS", "INTERFACE", kGeneralSettings), "");
+    EXPECT_EQ(m_data.unsavedFile(), kGeneralSettings);
+    EXPECT_TRUE(fs::is_directory(file));
+    fs::remove(file);
+    EXPECT_EQ(m_data.ReadIni("BUS", "INTERFACE", kGeneralSettings), "IEC") << "kept meanwhile";
     m_data.retryUnsaved();
-    EXPECT_EQ(m_data.ReadIni("M", "a", "a.ini"), "1");
+    EXPECT_EQ(m_data.unsavedFile(), std::nullopt);
+    EXPECT_EQ(m_folder.read(kGeneralSettings), "[BUS]\r\nINTERFACE=IEC\r\n");
 }
 
 TEST_F(UnsavedTest, AFileInUtf16IsToldAndLeftAlone) {
@@ -156,6 +171,14 @@ TEST_F(UnsavedTest, AFolderInAFilesPlaceIsUnreadable) {
     fs::remove(m_folder.data() / "a.ini");
     EXPECT_EQ(m_data.ReadIni("M", "a", "a.ini"), "");
     EXPECT_EQ(m_data.unreadableFile(), std::nullopt) << "a missing file is no fault";
+}
+
+TEST_F(UnsavedTest, AFileThatCouldNotBeWrittenHidesNoOtherThatCannotBeRead) {
+    for (const char* name : {"a.ini", "b.ini"}) fs::create_directory(m_folder.data() / name);
+    EXPECT_EQ(m_data.ReadIni("M", "a", "a.ini"), "");
+    m_data.WriteIni("M", "a", "1", "b.ini");
+    EXPECT_EQ(m_data.unsavedFile(), "b.ini");
+    EXPECT_EQ(m_data.unreadableFile(), "a.ini");
 }
 
 TEST_F(UnsavedTest, FilesThatCanBeReadOrAreMissingAreNotTold) {

@@ -52,10 +52,22 @@ TEST_F(PictureSwitchTest, WithoutPicturesTheStateIsStillToBeSeen) {
     EXPECT_NE(shown(true), shown(false));
 }
 
-TEST_F(PictureSwitchTest, ABrokenPictureIsReplacedByADrawnOne) {
+TEST_F(PictureSwitchTest, ABrokenPictureIsReplacedByADrawnOneAndTold) {
+    int changes = 0;
+    QObject::connect(&button, &PictureSwitch::brokenPictureChanged, [&changes] { ++changes; });
     const QImage drawn = shown(true);
+    EXPECT_EQ(button.brokenPicture(), QString()) << "a missing one is no fault";
     folder.write("sch_on.ICO", "no picture at all");
     EXPECT_EQ(shown(true), drawn);
+    EXPECT_EQ(button.brokenPicture(), QStringLiteral("Sch_On.ico"));
+    EXPECT_EQ(changes, 1);
+    std::filesystem::remove(folder.data() / "sch_on.ICO");
+    folder.copyShipped();
+    EXPECT_EQ(button.grab().toImage(), drawn) << "not looked for at each painting";
+    button.tryAgain();
+    EXPECT_NE(button.grab().toImage(), drawn);
+    EXPECT_EQ(button.brokenPicture(), QString());
+    EXPECT_EQ(changes, 2);
 }
 
 }  // namespace

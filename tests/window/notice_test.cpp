@@ -75,6 +75,41 @@ TEST_F(NoticeTest, SettingsInAnotherEncodingAreToldAndLeftAlone) {
     EXPECT_EQ(notice(), "Nicht gespeichert: Datenset1.INI");
 }
 
+TEST_F(NoticeTest, APictureThatCannotBeReadIsToldBesideOtherFilesUntilItCan) {
+    const std::string picture = folder.read(kPictureOff);
+    folder.write(kPictureOff, "no picture at all");
+    start();
+    QCoreApplication::processEvents();
+    EXPECT_EQ(notice(), "Nicht lesbar: Sch_Off.ico") << "once, though several switches show it";
+
+    std::filesystem::remove(folder.data() / "Datenset1.INI");
+    std::filesystem::create_directory(folder.data() / "Datenset1.INI");
+    start();
+    QCoreApplication::processEvents();
+    EXPECT_EQ(notice(), "Nicht lesbar: Datenset1.INI, Sch_Off.ico");
+    openSession();
+    type("PS_T", "NEW");
+    click("PS_Taste");
+    EXPECT_EQ(notice(), "Nicht lesbar: Sch_Off.ico  -  Nicht gespeichert: Datenset1.INI");
+
+    showPage(2);
+    folder.write(kPictureOff, picture);
+    waitForRetry();
+    QCoreApplication::processEvents();
+    EXPECT_EQ(notice(), "Nicht gespeichert: Datenset1.INI");
+}
+
+TEST_F(NoticeTest, APictureThatIsAFolderIsToldAndAMissingOneIsNot) {
+    std::filesystem::remove(folder.data() / kPictureOff);
+    start();
+    QCoreApplication::processEvents();
+    EXPECT_EQ(notice(), "");
+    std::filesystem::create_directory(folder.data() / kPictureOff);
+    waitForRetry();
+    QCoreApplication::processEvents();
+    EXPECT_EQ(notice(), "Nicht lesbar: Sch_Off.ico");
+}
+
 TEST_F(NoticeTest, AnotherProgramOnTheSameDataIsToldWhileItRuns) {
     std::optional<FolderClaim> other(folder.data());
     start();

@@ -3,18 +3,18 @@
 #include <memory>
 
 #include "app/ctl/laboratory.h"
-#include "app/ctl/rehearsal.h"
+#include "app/ctl/whichdataset.h"
 #include "base/codepage.h"
 #include "base/printable.h"
 #include "coder/sendparam.h"
+#include "station/rehearsal.h"
 
 namespace kdx::ctl {
 
 namespace {
 
 struct Apply {
-    int dataSet = 1;
-    std::string file;
+    WhichDataSet source;
     bool keepOpen = false;
     bool dryRun = false;
 };
@@ -34,19 +34,14 @@ bool isLegal(Laboratory& laboratory, const Steps& steps) {
 
 int apply(Laboratory& laboratory, const Apply& what) {
     Session& session = laboratory.session();
-    laboratory.state().CurrentDataSet = std::to_string(what.dataSet);
-    const std::string file = what.file.empty() ? dataSetFile(laboratory.state().CurrentDataSet)
-                                               : std::filesystem::absolute(what.file).string();
-    if (!laboratory.data().profile(file)) {
-        laboratory.output().problem(file + " cannot be read");
-        return kWrongCall;
-    }
-    session.load(Profile::ofFile(laboratory.data(), file));
+    const auto source = what.source.profile(laboratory);
+    if (!source) return kWrongCall;
+    session.load(*source);
     const Steps steps = openingSteps(session.station);
     if (!isLegal(laboratory, steps)) return kWrongCall;
     if (what.dryRun) {
         Rehearsal rehearsal(laboratory.data(), laboratory.captions());
-        rehearsal.apply(Profile::ofFile(laboratory.data(), file));
+        rehearsal.apply(*source);
         for (const std::string& command : rehearsal.commands()) {
             laboratory.output().line(toUtf8(printable(command, '.')));
             laboratory.output().document["commands"].push_back(toUtf8(command));
@@ -68,8 +63,7 @@ int apply(Laboratory& laboratory, const Apply& what) {
 void addApply(CLI::App& app, Task& task) {
     auto what = std::make_shared<Apply>();
     CLI::App* command = app.add_subcommand("apply", "Send a whole data set, as opening the session in the window does");
-    auto* number = command->add_option("--data-set", what->dataSet, "the data set, 1 to 5")->check(CLI::Range(1, 5));
-    command->add_option("--file", what->file, "any data-set file instead")->type_name("FILE")->excludes(number);
+    what->source.addTo(*command);
     command->add_flag("--keep-open", what->keepOpen, "leave the instrument in remote at the end");
     command->add_flag("--dry-run", what->dryRun, "print the commands and send none");
     command->footer("Example: kdx-ctl apply --data-set 2");

@@ -18,6 +18,7 @@ class Laboratory;
 inline constexpr int kDone = 0;
 inline constexpr int kFailed = 1;        ///< a command failed, or the run was stopped
 inline constexpr int kWrongCall = 2;     ///< the call cannot be understood, or a file cannot be read
+inline constexpr int kDifferent = 3;     ///< done, and what was compared differs, or there are warnings
 inline constexpr int kNoConnection = 4;  ///< the instrument cannot be reached
 
 /// What holds for every subcommand.
@@ -39,9 +40,13 @@ using Task = std::function<int(Laboratory&)>;
 using AddSubcommand = void (*)(CLI::App& app, Task& task);
 
 void addApply(CLI::App& app, Task& task);
+void addDiff(CLI::App& app, Task& task);
+void addFind(CLI::App& app, Task& task);
 void addList(CLI::App& app, Task& task);
 void addQuery(CLI::App& app, Task& task);
+void addRead(CLI::App& app, Task& task);
 void addReplay(CLI::App& app, Task& task);
 void addSend(CLI::App& app, Task& task);
+void addShell(CLI::App& app, Task& task);
 
 }  // namespace kdx::ctl

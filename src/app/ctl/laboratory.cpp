@@ -2,13 +2,14 @@
 
 #include <utility>
 
+#include "af/settings.h"
+#include "app/appfolder.h"
 #include "app/platform.h"
 #include "base/codepage.h"
 #include "base/numbers.h"
 #include "base/printable.h"
 #include "coder/keyfacts.h"
 #include "link/visastatus.h"
-#include "settings/dataplace.h"
 #include "settings/generalsettings.h"
 #include "settings/withoutcontrols.h"
 #include "sim/virtualinstrument.h"
@@ -17,14 +18,9 @@ namespace kdx::ctl {
 
 namespace {
 
-std::filesystem::path appFolder(const Call& call, Output& output, const char* program) {
-    DataPlaces places;
-    if (call.program.appFolder) places.asked = *call.program.appFolder;
-    places.program = programFolder(program);
-    places.user = userFolder();
-    places.shipped = shippedFolder(places.program, KDX_SHIPPED_DATA);
+std::filesystem::path folderOf(const Call& call, Output& output, const char* program) {
     std::string problem;
-    auto folder = chooseAppFolder(places, problem);
+    auto folder = appFolder(call.program, program, problem);
     if (!problem.empty()) output.problem(problem);
     return folder;
 }
@@ -54,7 +50,7 @@ Laboratory::Laboratory(const Call& call, Output& output, const char* program, in
     : m_call(call),
       m_output(output),
       m_stop(stop),
-      m_data(appFolder(call, output, program)),
+      m_data(folderOf(call, output, program)),
       m_captions(m_data),
       m_link(chooseVisa(call.program, m_clock)) {
     if (!m_link.visa) return;
@@ -85,6 +81,7 @@ Laboratory::~Laboratory() {
 bool Laboratory::open() {
     // A run goes on over midnight, whatever the general settings say of the window: nobody sits by a script.
     m_clock.correctMidnight(true);
+    if (m_session && m_held && m_session->instrument.isOpen()) return true;
     if (!m_session) {
         m_output.problem(m_link.description);
         return false;
@@ -100,19 +97,45 @@ bool Laboratory::open() {
         kind = "IEC";
         address = std::to_string(*m_call.gpib);
     }
-    if (m_session->open(kind, address) == visa::kSuccess) return true;
+    if (m_session->open(kind, address) == visa::kSuccess) {
+        // Commands about the other network are led by the one of the data set, until another one is sent.
+        m_state.eonIdentifier = profile.read(setting::kEonPi.place);
+        if (m_lost) reconnected();
+        return true;
+    }
     const std::string place = kind == "TCPIP" ? address : "GPIB address " + address;
-    m_output.problem("no connection to " + place + ": " + statusText());
+    const std::string problem = "no connection to " + place + ": " + statusText();
+    // A script learns once that the link is lost, a person with every line.
+    if (m_lost && !inputIsTerminal()) {
+        m_output.note(problem);
+    } else {
+        m_output.problem(problem);
+    }
     return false;
 }
 
-bool Laboratory::run(const Steps& steps) {
-    if (stopAsked()) return false;
-    return m_session->transmitter.run(steps) && result() == kDone;
+void Laboratory::reconnected() {
+    m_lost = false;
+    m_output.remark("connected again");
+    m_output.document["connected_again"] = true;
+}
+
+void Laboratory::close() {
+    if (!m_held) m_session->close();
+}
+
+void Laboratory::nextTask() {
+    m_failed = false;
+    if (m_lost) m_session->instrument.close();
+}
+
+bool Laboratory::pause(std::chrono::milliseconds duration) {
+    waitReadable(m_stop, duration);
+    return !isStopped();
 }
 
 bool Laboratory::goesOn() {
-    return !stopAsked() && (!m_failed || m_call.continues);
+    return !isStopped() && (!m_failed || m_call.continues);
 }
 
 bool Laboratory::mayBeSent(const std::string& key, const std::string& value) {
@@ -138,10 +161,10 @@ void Laboratory::stepGoesOut(const Step& step, std::size_t number, std::size_t t
     if (number > 0) m_output.progress(number, total);
     if (step.kind == Step::Kind::Refused)
         m_output.problem(step.key + " is not sent: the coder cannot take so many frequencies with method B");
-    if (stopAsked()) m_session->transmitter.stop();
+    if (isStopped()) m_session->transmitter.stop();
 }
 
-bool Laboratory::stopAsked() {
+bool Laboratory::isStopped() {
     if (!m_stopped && isReadable(m_stop)) {
         m_output.problem("stopped");
         m_stopped = true;
@@ -153,6 +176,7 @@ bool Laboratory::stopAsked() {
 bool Laboratory::linkFailed() {
     if (!m_failed) m_output.problem("the link to the instrument is broken: " + statusText());
     m_failed = true;
+    if (m_held && m_session->instrument.LastVisaStatus == visa::kConnectionLost) m_lost = true;
     return !m_call.continues;
 }
 

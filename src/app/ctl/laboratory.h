@@ -27,17 +27,29 @@ public:
 
     /// Opens the session; a failure is told. False then.
     [[nodiscard]] bool open();
-    /// Sends the steps with progress; false when they were stopped or a command failed.
-    bool run(const Steps& steps);
+    /// Closes it, unless it is held.
+    void close();
+    /// One session for several tasks: open() finds it open, close() leaves it so.
+    void hold() { m_held = true; }
+    /// The failures of the task before are over; a link that was lost is made anew by open().
+    void nextTask();
+    /// Waits; false when the user wants to stop, at once then.
+    bool pause(std::chrono::milliseconds duration);
     /// After a command outside of steps: whether to go on with the next.
     [[nodiscard]] bool goesOn();
     /// kDone, or kFailed when anything failed or was stopped.
     [[nodiscard]] int result() const { return m_failed || m_stopped ? kFailed : kDone; }
     /// Checks a value against what is legal for the key; tells what is wrong, unless the call is to be forced.
     [[nodiscard]] bool mayBeSent(const std::string& key, const std::string& value);
+    /// Whether the run was stopped, or the user wants to; that is told.
+    [[nodiscard]] bool isStopped();
     /// Lets the session be when the program ends.
     void keepOpen() { m_session->keepOpen(); }
 
+    /// Readable once the user wants to stop.
+    [[nodiscard]] int stop() const { return m_stop; }
+    /// What instruments are reached by; null when a library that was asked for cannot be used.
+    [[nodiscard]] Visa* visa() const { return m_link.visa.get(); }
     [[nodiscard]] const Call& call() const { return m_call; }
     [[nodiscard]] Output& output() { return m_output; }
     [[nodiscard]] DataFolder& data() { return m_data; }
@@ -51,8 +63,8 @@ private:
     void stepAnswered(const Step&, const std::string&) override {}
     void stepsEnded() override { m_output.endProgress(); }
 
-    [[nodiscard]] bool stopAsked();
     bool linkFailed();
+    void reconnected();
     [[nodiscard]] std::string statusText() const;
 
     const Call& m_call;
@@ -64,6 +76,8 @@ private:
     Captions m_captions;
     ChosenVisa m_link;
     std::unique_ptr<Session> m_session;
+    bool m_held = false;
+    bool m_lost = false;  ///< the link, and no new one was made yet
     bool m_failed = false;
     bool m_stopped = false;
 };

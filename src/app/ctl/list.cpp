@@ -1,6 +1,5 @@
 #include <CLI/CLI.hpp>
 
-#include <algorithm>
 #include <memory>
 
 #include "app/ctl/laboratory.h"
@@ -13,32 +12,8 @@ namespace kdx::ctl {
 
 namespace {
 
-using Rows = std::vector<std::vector<std::string>>;
-
-/// Characters of a UTF-8 text.
-std::size_t width(const std::string& text) {
-    return static_cast<std::size_t>(std::count_if(text.begin(), text.end(), [](char c) { return (c & 0xC0) != 0x80; }));
-}
-
-/// Prints the rows with their columns under each other.
-void print(const Output& output, const Rows& rows) {
-    std::vector<std::size_t> widths;
-    for (const auto& row : rows) {
-        widths.resize(std::max(widths.size(), row.size()));
-        for (std::size_t i = 0; i < row.size(); ++i) widths[i] = std::max(widths[i], width(row[i]));
-    }
-    for (const auto& row : rows) {
-        std::string line;
-        for (std::size_t i = 0; i < row.size(); ++i) {
-            line += row[i];
-            if (i + 1 < row.size()) line += std::string(widths[i] - width(row[i]) + 2, ' ');
-        }
-        output.line(line);
-    }
-}
-
 int listDataSets(Laboratory& laboratory) {
-    Rows rows;
+    Output::Rows rows;
     nlohmann::json& listed = laboratory.output().document["data_sets"] = nlohmann::json::array();
     for (int number = 1; number <= 5; ++number) {
         const std::string file = dataSetFile(std::to_string(number));
@@ -49,29 +24,29 @@ int listDataSets(Laboratory& laboratory) {
         rows.push_back({std::to_string(number), ps, pi});
         listed.push_back({{"number", number}, {"ps", ps}, {"pi", pi}});
     }
-    print(laboratory.output(), rows);
+    laboratory.output().table(rows);
     return kDone;
 }
 
 int listKeys(Laboratory& laboratory) {
-    Rows rows;
+    Output::Rows rows;
     nlohmann::json& listed = laboratory.output().document["keys"] = nlohmann::json::array();
     for (const KeyFacts& facts : keyFacts()) {
         rows.push_back({std::string(facts.key), std::string(facts.meaning), facts.range});
         listed.push_back({{"key", facts.key}, {"meaning", facts.meaning}, {"range", facts.range}});
     }
-    print(laboratory.output(), rows);
+    laboratory.output().table(rows);
     return kDone;
 }
 
 int listQueries(Laboratory& laboratory) {
-    Rows rows;
+    Output::Rows rows;
     nlohmann::json& listed = laboratory.output().document["queries"] = nlohmann::json::array();
     for (const ReadBack& readBack : readBacks()) {
         rows.push_back({readBack.name, readBack.meaning});
         listed.push_back({{"name", readBack.name}, {"meaning", readBack.meaning}});
     }
-    print(laboratory.output(), rows);
+    laboratory.output().table(rows);
     return kDone;
 }
 

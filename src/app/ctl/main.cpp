@@ -8,6 +8,7 @@
 #include "app/ctl/laboratory.h"
 #include "app/ctl/output.h"
 #include "app/platform.h"
+#include "base/duration.h"
 #include "settings/shownpath.h"
 
 namespace {
@@ -27,6 +28,20 @@ void addConnection(CLI::App& app, Call& call) {
         ->excludes(library);
     app.add_option("--app-folder", call.program.appFolder, "the program's folder; settings and texts are in DIR/Daten")
         ->type_name("DIR");
+}
+
+/// How long an answer may take. Nobody waits ten minutes for one, and a tenth of a second is what a network may need.
+void addTimeout(CLI::App& app, Call& call) {
+    app.add_option_function<std::string>(
+           "--timeout",
+           [&call](const std::string& text) {
+               using namespace std::chrono_literals;
+               call.program.answerTime = kdx::parseDuration(text + " s");
+               if (!call.program.answerTime || *call.program.answerTime < 100ms || *call.program.answerTime > 600s)
+                   throw CLI::ValidationError("--timeout", "takes 0.1 to 600 seconds, not \"" + text + "\"");
+           },
+           "how long an answer may take, 0.1 to 600; else 2 over the LAN, the VISA library's own time with one")
+        ->type_name("SECONDS");
 }
 
 void addManner(CLI::App& app, Call& call) {
@@ -59,15 +74,18 @@ int called(int argc, const char* const* argv) {
     app.require_subcommand(1);
     Call call;
     addConnection(app, call);
+    addTimeout(app, call);
     addManner(app, call);
     kdx::ctl::Task task;
     for (const auto add :
-         {kdx::ctl::addApply, kdx::ctl::addList, kdx::ctl::addQuery, kdx::ctl::addReplay, kdx::ctl::addSend}) {
+         {kdx::ctl::addApply, kdx::ctl::addDiff, kdx::ctl::addFind, kdx::ctl::addList, kdx::ctl::addQuery,
+          kdx::ctl::addRead, kdx::ctl::addReplay, kdx::ctl::addSend, kdx::ctl::addShell}) {
         add(app, task);
     }
     app.footer(
         "Without --lan, --gpib or --simulate the instrument is the one of the general settings.\n"
-        "Exit codes: 0 done, 1 a command failed, 2 wrong call or unreadable file, 4 no connection.\n"
+        "Exit codes: 0 done, 1 a command failed, 2 wrong call or unreadable file, 3 differences or warnings,\n"
+        "4 no connection.\n"
         "kdx-ctl SUBCOMMAND --help says more.");
     app.failure_message([](const CLI::App*, const CLI::Error& error) {
         return kdx::shownPath(error.what()) + "\nRun with --help for more information.\n";

@@ -1,5 +1,6 @@
 #include "app/ctl/output.h"
 
+#include <algorithm>
 #include <cstdio>
 
 #include "app/ctl/call.h"
@@ -7,6 +8,15 @@
 #include "settings/shownpath.h"
 
 namespace kdx::ctl {
+
+namespace {
+
+/// Characters of a UTF-8 text.
+std::size_t width(const std::string& text) {
+    return static_cast<std::size_t>(std::count_if(text.begin(), text.end(), [](char c) { return (c & 0xC0) != 0x80; }));
+}
+
+}  // namespace
 
 void Output::line(const std::string& text) const {
     if (m_call.json) return;
@@ -23,8 +33,24 @@ void Output::problem(const std::string& problem) {
     const std::string text = shownPath(problem);
     endProgress();
     std::fflush(stdout);
-    std::fprintf(stderr, "kdx-ctl: %s\n", text.c_str());
-    document["problems"].push_back(text);
+    std::fprintf(stderr, "kdx-ctl: %s%s\n", m_place.c_str(), text.c_str());
+    note(text);
+}
+
+void Output::table(const Rows& rows) const {
+    std::vector<std::size_t> widths;
+    for (const auto& row : rows) {
+        widths.resize(std::max(widths.size(), row.size()));
+        for (std::size_t i = 0; i < row.size(); ++i) widths[i] = std::max(widths[i], width(row[i]));
+    }
+    for (const auto& row : rows) {
+        std::string text;
+        for (std::size_t i = 0; i < row.size(); ++i) {
+            text += row[i];
+            if (i + 1 < row.size()) text += std::string(widths[i] - width(row[i]) + 2, ' ');
+        }
+        line(text);
+    }
 }
 
 void Output::progress(std::size_t number, std::size_t total) {
@@ -40,9 +66,23 @@ void Output::endProgress() {
 
 void Output::finish(int exitCode) {
     endProgress();
-    if (!m_call.json) return;
+    if (!m_call.json || m_linewise) return;
     document["exit_code"] = exitCode;
     std::puts(document.dump(2, ' ', false, nlohmann::json::error_handler_t::replace).c_str());
+}
+
+void Output::beginLine(std::size_t number, const std::string& place) {
+    document = {{"line", number}};
+    m_place = place;
+}
+
+bool Output::endLine(int exitCode) {
+    m_place.clear();
+    if (m_call.json) {
+        document["exit_code"] = exitCode;
+        std::puts(document.dump(-1, ' ', false, nlohmann::json::error_handler_t::replace).c_str());
+    }
+    return std::fflush(stdout) == 0 && std::ferror(stdout) == 0;
 }
 
 }  // namespace kdx::ctl

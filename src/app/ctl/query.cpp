@@ -3,7 +3,6 @@
 #include <algorithm>
 #include <memory>
 
-#include "af/settings.h"
 #include "app/ctl/laboratory.h"
 #include "base/codepage.h"
 #include "coder/readback.h"
@@ -39,7 +38,6 @@ int query(Laboratory& laboratory, const Query& what) {
     }
     if (!laboratory.open()) return kNoConnection;
     Session& session = laboratory.session();
-    laboratory.state().eonIdentifier = session.profile.read(setting::kEonPi.place);
     nlohmann::json& answered = laboratory.output().document["answers"] = nlohmann::json::object();
     for (const ReadBack* readBack : asked) {
         if (!laboratory.goesOn()) break;
@@ -55,7 +53,7 @@ int query(Laboratory& laboratory, const Query& what) {
             laboratory.output().line(words);
         }
     }
-    session.close();
+    laboratory.close();
     return laboratory.result();
 }
 

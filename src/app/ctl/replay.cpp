@@ -25,9 +25,10 @@ int replay(Laboratory& laboratory, const Replay& what) {
     for (const std::size_t line : logged.unreadableLines)
         laboratory.output().problem(what.log + ", line " + std::to_string(line) + ": not a line of a command log");
     if (!laboratory.call().force) {
-        for (const std::size_t line : logged.quotedLines)
+        for (const std::size_t line : logged.quotedLines) {
             laboratory.output().problem(what.log + ", line " + std::to_string(line) +
                                         ": a double quote ends the coder command early");
+        }
     }
     if (!logged.unreadableLines.empty() || (!logged.quotedLines.empty() && !laboratory.call().force)) return kWrongCall;
     laboratory.output().document["commands"] = logged.commands.size();

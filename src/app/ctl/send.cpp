@@ -45,9 +45,8 @@ int send(Laboratory& laboratory, const Send& what) {
     if (!legal) return kWrongCall;
     if (!laboratory.open()) return kNoConnection;
     Session& session = laboratory.session();
-    laboratory.state().eonIdentifier = session.profile.read(setting::kEonPi.place);
     for (const auto& [key, value] : settings) {
-        // Commands about the other network are led by the one of the data set, unless one was just sent.
+        // Commands about the other network are led by the one that was sent last.
         if (key == setting::kEonPi.sendKey) laboratory.state().eonIdentifier = value;
         if (laboratory.goesOn()) session.params.SendParam(key, std::string(value));
     }
@@ -56,7 +55,7 @@ int send(Laboratory& laboratory, const Send& what) {
     };
     for (const std::string& command : what.raw) sendCommand(line(command));
     for (const std::string& command : what.coder) sendCommand(coderCommand(line(command)));
-    session.close();
+    laboratory.close();
     return laboratory.result();
 }
 
@@ -67,8 +66,10 @@ void addSend(CLI::App& app, Task& task) {
     CLI::App* command = app.add_subcommand("send", "Send single settings by their keys, or commands as they stand");
     command->add_option("settings", what->settings, "keys of the key table (kdx-ctl list keys) with their values")
         ->type_name("KEY=VALUE");
-    command->add_option("--raw", what->raw, "an instrument command as it stands")->type_name("TEXT");
-    command->add_option("--coder", what->coder, "a coder command")->type_name("TEXT");
+    command->add_option("--raw", what->raw, "an instrument command as it stands")
+        ->type_name("TEXT")
+        ->allow_extra_args(false);
+    command->add_option("--coder", what->coder, "a coder command")->type_name("TEXT")->allow_extra_args(false);
     command->require_option(1, 0);
     command->footer("Example: kdx-ctl send PS=MESSTURM TP=1 HF-Frequenz=98.5");
     command->callback([what, &task] { task = [what](Laboratory& laboratory) { return send(laboratory, *what); }; });

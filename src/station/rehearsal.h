@@ -7,9 +7,10 @@
 #include "settings/programstate.h"
 #include "sim/simvisa.h"
 #include "sim/virtualinstrument.h"
+#include "station/readout.h"
 #include "station/session.h"
 
-namespace kdx::ctl {
+namespace kdx {
 
 /// The machine's clock with pauses that take no time.
 class HastyClock final : public Clock {
@@ -24,7 +25,7 @@ private:
     std::chrono::nanoseconds m_skipped{0};
 };
 
-/// A data set sent to a virtual instrument of its own: what would go out, and what the instrument would make of it.
+/// A virtual instrument of its own, as after switching on, to try out what a data set would do.
 class Rehearsal : private TrafficWatcher {
 public:
     Rehearsal(DataFolder& data, const Captions& captions);
@@ -32,20 +33,27 @@ public:
     Rehearsal(const Rehearsal&) = delete;
     Rehearsal& operator=(const Rehearsal&) = delete;
 
+    /// Gives it the values of another instrument, as far as it takes them.
+    void become(const Readout& other);
     /// Opens the session, sends what belongs to the opening, closes it.
     void apply(const Profile& source);
-    /// What was written, in its order.
+    /// What it has now.
+    [[nodiscard]] Readout readOut();
+
+    /// What apply() has written, in its order.
     [[nodiscard]] const std::vector<std::string>& commands() const { return m_commands; }
 
 private:
     void passed(const Traffic& traffic) override;
+    void open();
 
     HastyClock m_clock;
     sim::VirtualInstrument m_instrument{m_clock};
     sim::SimVisa m_visa{m_instrument};
     ProgramState m_state;
     std::vector<std::string> m_commands;
+    bool m_applies = false;
     Session m_session;
 };
 
-}  // namespace kdx::ctl
+}  // namespace kdx

@@ -1,0 +1,18 @@
+#include "app/appfolder.h"
+
+#include "app/options.h"
+#include "app/platform.h"
+#include "settings/dataplace.h"
+
+namespace kdx {
+
+std::filesystem::path appFolder(const Options& options, const char* program, std::string& problem) {
+    DataPlaces places;
+    if (options.appFolder) places.asked = *options.appFolder;
+    places.program = programFolder(program);
+    places.user = userFolder();
+    places.shipped = shippedFolder(places.program, KDX_SHIPPED_DATA);
+    return chooseAppFolder(places, problem);
+}
+
+}  // namespace kdx

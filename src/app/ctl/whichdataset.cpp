@@ -1,0 +1,23 @@
+#include "app/ctl/whichdataset.h"
+
+#include <CLI/CLI.hpp>
+
+#include "app/ctl/laboratory.h"
+
+namespace kdx::ctl {
+
+void WhichDataSet::addTo(CLI::App& command) {
+    auto* set = command.add_option("--data-set", number, "the data set, 1 to 5")->check(CLI::Range(1, 5));
+    command.add_option("--file", file, "any data-set file instead")->type_name("FILE")->excludes(set);
+}
+
+std::optional<Profile> WhichDataSet::profile(Laboratory& laboratory) const {
+    laboratory.state().CurrentDataSet = std::to_string(number);
+    const std::string name =
+        file.empty() ? dataSetFile(laboratory.state().CurrentDataSet) : std::filesystem::absolute(file).string();
+    if (laboratory.data().profile(name)) return Profile::ofFile(laboratory.data(), name);
+    laboratory.output().problem(name + " cannot be read");
+    return std::nullopt;
+}
+
+}  // namespace kdx::ctl

@@ -1,0 +1,26 @@
+#pragma once
+
+#include <optional>
+#include <string>
+
+#include "settings/profile.h"
+
+namespace CLI {
+class App;
+}
+
+namespace kdx::ctl {
+
+class Laboratory;
+
+/// The data set that a subcommand works with, as the command line names it.
+struct WhichDataSet {
+    int number = 1;
+    std::string file;
+
+    void addTo(CLI::App& command);
+    /// Makes it the one at work; nothing when it cannot be read, which is told.
+    [[nodiscard]] std::optional<Profile> profile(Laboratory& laboratory) const;
+};
+
+}  // namespace kdx::ctl

@@ -1,0 +1,11 @@
+#pragma once
+
+#include <string_view>
+#include <vector>
+
+namespace kdx {
+
+/// The pieces of the text between the separators, empty ones too; one at least.
+[[nodiscard]] std::vector<std::string_view> split(std::string_view text, std::string_view separator);
+
+}  // namespace kdx

@@ -1,0 +1,53 @@
+#include "station/rehearsal.h"
+
+#include <cmath>
+
+namespace kdx {
+
+double HastyClock::secondsSinceMidnight() const {
+    constexpr double kDay = 86400;
+    return std::fmod(m_clock.secondsSinceMidnight() + std::chrono::duration<double>(m_skipped).count(), kDay);
+}
+
+std::chrono::steady_clock::time_point HastyClock::steadyNow() const {
+    return m_clock.steadyNow() + m_skipped;
+}
+
+Rehearsal::Rehearsal(DataFolder& data, const Captions& captions)
+    : m_session(m_visa, m_state, data, captions, m_clock, [this] { m_session.transmitter.stop(); }) {
+    m_session.instrument.addWatcher(*this);
+}
+
+void Rehearsal::become(const Readout& other) {
+    const SettingCommands commands = commandsFor(differences(other, readOut()), other);
+    open();
+    for (const auto& [key, command] : commands) m_session.params.sendCommand(key, command);
+    m_session.close();
+}
+
+void Rehearsal::apply(const Profile& source) {
+    m_session.load(source);
+    open();
+    m_applies = true;
+    m_session.sendOpening();
+    m_applies = false;
+    m_session.close();
+}
+
+Readout Rehearsal::readOut() {
+    open();
+    Readout readout = kdx::readOut(m_session.instrument);
+    m_session.close();
+    return readout;
+}
+
+void Rehearsal::open() {
+    m_clock.correctMidnight(true);
+    m_session.open("TCPIP", "rehearsal");
+}
+
+void Rehearsal::passed(const Traffic& traffic) {
+    if (m_applies && traffic.kind == Traffic::Kind::Written) m_commands.push_back(traffic.text);
+}
+
+}  // namespace kdx

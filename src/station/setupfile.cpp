@@ -1,0 +1,126 @@
+#include "station/setupfile.h"
+
+#include <algorithm>
+#include <array>
+#include <string_view>
+
+#include "af/settings.h"
+#include "base/numbers.h"
+#include "groups/settings.h"
+#include "rds/settings.h"
+#include "settings/profilefile.h"
+#include "settings/storedvalue.h"
+#include "settings/withoutcontrols.h"
+#include "stereo/deviation.h"
+#include "stereo/settings.h"
+
+namespace kdx {
+
+namespace {
+
+constexpr std::array kAsRead = {
+    Setting{"MPX_SOURCE", setting::kSource.place},
+    Setting{"MPX_IMPEDANZ", setting::kImpedance.place},
+    Setting{"PREEMPHASIS", setting::kPreemphasis.place},
+    Setting{"PILOT", setting::kPilot.place},
+    Setting{"ARI", setting::kAri.place},
+    Setting{"ARI-ID", setting::kAriType.place},
+    Setting{"ARI-BK", setting::kAriArea.place},
+    Setting{"RDS", setting::kRds.place},
+    Setting{"RDS_PHASE", setting::kRdsPhase},
+    Setting{"PI", setting::kPi.place},
+    Setting{"PTY", setting::kPtyOfDataSet},
+    Setting{"MS", setting::kMusicSpeech.place},
+    Setting{"DI", setting::kDecoderInfo.place},
+    Setting{"HF-Frequenz", setting::kRfFrequency.place},
+    Setting{"HF-Pegel", setting::kRfLevel.place},
+    Setting{"NF-Frequenz", setting::kAudioFrequency.place},
+    Setting{"EON_PI", setting::kEonPi.place},
+    Setting{"EON_PTY", setting::kEonPty.place},
+    Setting{"EON_TP", setting::kEonTp.place},
+    Setting{"EON_TA", setting::kEonTa.place},
+    Setting{"EON_AFB1", setting::kEonAfLists[0].place},
+    Setting{"EON_AFB2", setting::kEonAfLists[1].place},
+    Setting{"EON_AFB3", setting::kEonAfLists[2].place},
+    Setting{"EON_AFB4", setting::kEonAfLists[3].place},
+    Setting{"EON_AFB5", setting::kEonAfLists[4].place},
+    Setting{"AF1", setting::kAfLists[0].place},
+    Setting{"AF2", setting::kAfLists[1].place},
+    Setting{"AF3", setting::kAfLists[2].place},
+    Setting{"AF4", setting::kAfLists[3].place},
+    Setting{"AF5", setting::kAfLists[4].place},
+};
+
+/// The texts, whose blanks count.
+constexpr std::array kTexts = {
+    Setting{"PS", setting::kPs.place},
+    Setting{"RT", setting::kRadiotext.place},
+    Setting{"EON_PS", setting::kEonPs.place},
+};
+
+constexpr std::array kDeviations = {kTotalDeviation, kPilotDeviation, kRdsDeviation, kAriDeviation};
+
+const Setting* settingOf(const auto& settings, std::string_view key) {
+    const auto found =
+        std::find_if(settings.begin(), settings.end(), [key](const Setting& s) { return s.sendKey == key; });
+    return found == settings.end() ? nullptr : &*found;
+}
+
+/// Reading takes off blanks at the edges, and one pair of quotes.
+std::string quotedWhereNeeded(const std::string& text) {
+    if (text.empty()) return text;
+    const bool blank = text.front() == ' ' || text.back() == ' ';
+    const bool quote = text.front() == text.back() && (text.front() == '"' || text.front() == '\'');
+    return blank || quote ? '"' + text + '"' : text;
+}
+
+class Keeper {
+public:
+    explicit Keeper(ProfileText& text) : m_text(text) {}
+
+    void keep(const std::string& key, const std::string& value) {
+        if (const Setting* setting = settingOf(kAsRead, key)) {
+            // What leads a list tells the coder which one it is; the file tells it by the key.
+            const bool list = value.starts_with("N,") || value.starts_with("+,");
+            write(setting->place, list ? value.substr(2) : value);
+        } else if (const Setting* text = settingOf(kTexts, key)) {
+            write(text->place, quotedWhereNeeded(value));
+        } else if (key == setting::kGroupSequence.sendKey) {
+            write(setting::kGroupSequence.place, value.empty() ? value : value + ",");
+        } else if (key == setting::kStereoMode.sendKey) {
+            write(setting::kStereoMode.place, shortestDecimal(leadingNumber(value) - 1));
+        } else if (key == setting::kPilotPhase.sendKey) {
+            write(setting::kPilotPhase.place,
+                  pilotPhaseSetting(storedPosition(value, kLowestPilotPhase, kHighestPilotPhase)));
+        }
+        for (const Deviation& deviation : kDeviations) {
+            if (key != deviation.setting.sendKey) continue;
+            write(deviation.setting.place, deviationSetting(deviation, storedPosition(value, 0, deviation.highest)));
+        }
+    }
+
+private:
+    void write(const Place& place, const std::string& value) { m_text.setValue(place.section, place.key, value); }
+
+    ProfileText& m_text;
+};
+
+}  // namespace
+
+void keep(const Readout& readout, ProfileText& text) {
+    Keeper keeper(text);
+    // A data set holds one other network: the one that the coder names first.
+    std::string network;
+    for (const Reading& reading : readout) {
+        if (network.empty()) network = reading.network;
+        if (reading.value && (reading.network.empty() || reading.network == network))
+            keeper.keep(reading.key, withoutControls(*reading.value));
+    }
+    if (!network.empty()) return;
+    for (const Setting& setting : kAsRead) {
+        if (std::string_view(setting.sendKey).starts_with("EON_")) keeper.keep(setting.sendKey, "");
+    }
+    keeper.keep("EON_PS", "");
+}
+
+}  // namespace kdx
