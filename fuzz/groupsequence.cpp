@@ -11,12 +11,12 @@ int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     FuzzedDataProvider input(data, size);
     kdx::GroupSequence sequence;
     const std::string stored = kdx::fuzz::nextText(input);
-    sequence.setRead(stored);
+    sequence.groups = stored;
     kdx::Steps steps;
     sequence.appendSteps(steps);
     demand(steps.size() == (stored.empty() ? 0 : 1), "what is stored is sent");
     demand(stored.empty() || steps[0].value + stored.back() == stored, "without its last character");
-    demand(sequence.exceedsReading() == (stored.size() >= kdx::kLongestValue), "a long one may go on in its file");
+    demand(sequence.exceedsReading() == (stored.size() > kdx::kLongestValue), "a long one cannot be read back");
 
     std::string composed = kdx::groupText(input.ConsumeIntegralInRange(0, kdx::kGroups - 1));
     for (int groups = 1; groups < 256 && input.remaining_bytes() > 0; ++groups) {

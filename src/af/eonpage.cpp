@@ -6,6 +6,7 @@
 #include "coder/sendparam.h"
 #include "link/instrument.h"
 #include "settings/programstate.h"
+#include "settings/withoutcontrols.h"
 #include "ui/dialogs.h"
 #include "ui/layouts.h"
 #include "ui/pictureswitch.h"
@@ -131,6 +132,7 @@ void EonPage::EON_PI_Text_Change() {
 }
 
 void EonPage::EON_PI_Taste_Click() {
+    holdPi(withoutControls(m_network.pi));  // the data set may hold what cannot be typed
     const auto& [label, key] = setting::kHeldNetworks;
     m_with.params.SendParam(setting::kEonRemoval, firstNetwork(m_with.instrument.X4_Abfrage(label, key)));
     m_with.params.SendParam(setting::kEonPi.sendKey, m_network.pi);
@@ -141,6 +143,7 @@ void EonPage::EON_PS_Text_Change() {
 }
 
 void EonPage::EON_PS_Taste_Click() {
+    m_network.ps = withoutControls(m_network.ps);
     m_with.profile.write(setting::kEonPs.place, m_network.ps);
     m_with.params.SendParam(setting::kEonPs.sendKey, m_network.ps);
 }

@@ -3,20 +3,34 @@
 #include "af/aflist.h"
 #include "ui/text.h"
 
+#include <QApplication>
 #include <QLabel>
 #include <QListWidget>
 
 namespace kdx {
 
+namespace {
+
+/// A double quote would end the list for the coder.
+bool endsTheList(const std::string& frequency) {
+    return frequency.find('"') != std::string::npos;
+}
+
+}  // namespace
+
 void FillAfLists(QListWidget& list, QLabel& tuned, std::string_view listText) {
     const auto parts = splitForDisplay(listText);
     if (!parts) return;
     tuned.setText(toText(parts->tuned));
+    QPalette palette = tuned.palette();
+    palette.setColor(QPalette::WindowText, endsTheList(parts->tuned)
+                                               ? QColor(Qt::red)
+                                               : QApplication::palette(&tuned).color(QPalette::WindowText));
+    tuned.setPalette(palette);
     list.clear();
     for (const std::string& frequency : parts->frequencies) {
         list.addItem(toText(frequency));
-        // A double quote would end the list for the coder.
-        if (frequency.find('"') != std::string::npos) list.item(list.count() - 1)->setForeground(Qt::red);
+        if (endsTheList(frequency)) list.item(list.count() - 1)->setForeground(Qt::red);
     }
 }
 

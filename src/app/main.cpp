@@ -16,6 +16,7 @@
 #include "settings/folderlock.h"
 #include "settings/leftovers.h"
 #include "settings/programstate.h"
+#include "settings/shownpath.h"
 #include "sim/virtualinstrument.h"
 #include "station/session.h"
 #include "ui/application.h"
@@ -44,12 +45,40 @@ void endWhenAsked(kdx::Application& application) {
     });
 }
 
+/// Lets the instrument go also when exit() ends the program, as Qt calls it when the display is lost: what main owns is
+/// not destroyed then.
+class EndsWithProgram {
+public:
+    explicit EndsWithProgram(kdx::Session& session) {
+        owned() = &session;
+        (void)std::atexit([] {
+            if (owned() != nullptr) owned()->letGo();
+        });
+    }
+    ~EndsWithProgram() { owned() = nullptr; }
+    EndsWithProgram(const EndsWithProgram&) = delete;
+    EndsWithProgram& operator=(const EndsWithProgram&) = delete;
+
+private:
+    static kdx::Session*& owned() {
+        static kdx::Session* session = nullptr;
+        return session;
+    }
+};
+
+/// Tries a last time to save what could not be, while there is still somebody to tell.
+void saveTheRest(kdx::DataFolder& data) {
+    data.retryUnsaved();
+    if (const auto unsaved = data.unsavedFile())
+        std::fprintf(stderr, "kdx-rds: what was changed last in %s could not be saved.\n", unsaved->c_str());
+}
+
 }  // namespace
 
 int main(int argc, char** argv) {
     const kdx::Options options = kdx::parseOptions({argv + 1, argv + argc});
     if (!options.error.empty()) {
-        std::fprintf(stderr, "kdx-rds: %s\nTry kdx-rds --help.\n", options.error.c_str());
+        std::fprintf(stderr, "kdx-rds: %s\nTry kdx-rds --help.\n", kdx::shownPath(options.error).c_str());
         return kUsageError;
     }
     if (options.help) {
@@ -92,6 +121,7 @@ int main(int argc, char** argv) {
     });
     const auto end = [&application] { application.end(); };
     kdx::Session session(*link.visa, state, data, captions, clock, end);
+    const EndsWithProgram letGo(session);
     kdx::TickerGroup tickers;
     kdx::HMenue window({session, state, data, captions, clock, dialogs, tickers, claim,
                         QString::fromStdString(link.description), QString::fromStdString(problem), end});
@@ -101,13 +131,12 @@ int main(int argc, char** argv) {
         application.guarded(window.objectName(), [&] {
             result = kdx::makeTour(window, session.instrument, tourBoxes, *options.tourFolder, print);
         });
+        saveTheRest(data);
         return result;
     }
     if (application.isEnding()) return EXIT_SUCCESS;  // asked for while a box of the start was open
     window.show();
     const int result = kdx::Application::exec();
-    data.retryUnsaved();  // while there is still somebody to tell
-    if (const auto unsaved = data.unsavedFile())
-        std::fprintf(stderr, "kdx-rds: what was changed last in %s could not be saved.\n", unsaved->c_str());
+    saveTheRest(data);
     return result;
 }

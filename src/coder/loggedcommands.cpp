@@ -2,6 +2,8 @@
 
 #include <algorithm>
 
+#include "coder/sendparam.h"
+
 namespace kdx {
 
 namespace {
@@ -48,7 +50,8 @@ LoggedCommands readLoggedCommands(std::string_view log) {
         }
         // Only what was sent has an empty value and a note.
         if (rest.size() < 2 || rest.front() != '"' || rest.back() != '"') continue;
-        logged.commands.emplace_back(key, rest.substr(1, rest.size() - 2));
+        const auto& command = logged.commands.emplace_back(key, rest.substr(1, rest.size() - 2)).second;
+        if (endsItsTextEarly(command)) logged.quotedLines.push_back(number);
     }
     return logged;
 }

@@ -12,6 +12,8 @@ namespace kdx {
 struct LoggedCommands {
     /// Keys and commands in their order. Questions and answers are no commands.
     std::vector<std::pair<std::string, std::string>> commands;
+    /// Lines, counted from 1, with a command whose text for the coder a double quote ends early.
+    std::vector<std::size_t> quotedLines;
     /// Lines, counted from 1, that no program of ours has written.
     std::vector<std::size_t> unreadableLines;
 };

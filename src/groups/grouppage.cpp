@@ -119,7 +119,7 @@ void GroupPage::stepGoesOut(const Step& step) {
 
 void GroupPage::showStored() {
     // Data set 1 whatever set is at work, although sending stores in the one at work.
-    m_sequence.setRead(m_with.profile.read(setting::kShownGroupSequence));
+    m_sequence.load(m_with.profile, setting::kShownGroupSequence);
     m_with.state.storedGroupSequence = m_sequence.groups;
     showSequence();
 }

@@ -1,7 +1,6 @@
 #include "groups/groupsequence.h"
 
 #include <limits>
-#include <utility>
 
 #include "groups/settings.h"
 #include "settings/profilefile.h"
@@ -18,13 +17,13 @@ std::string sequenceToSend(std::string_view groups) {
 }
 
 void GroupSequence::load(const Profile& profile) {
-    setRead(profile.read(setting::kGroupSequence.place));
+    load(profile, setting::kGroupSequence.place);
 }
 
-void GroupSequence::setRead(std::string text) {
-    groups = std::move(text);
+void GroupSequence::load(const Profile& profile, const Place& place) {
+    groups = profile.read(place);
     composed = false;
-    cut = groups.size() == kLongestValue;
+    cut = profile.holdsMore(place);
 }
 
 void GroupSequence::startAnew() {

@@ -9,6 +9,7 @@
 namespace kdx {
 
 class Profile;
+struct Place;
 
 // A group sequence is the groups in their order, each followed by a comma: "0A,2A,8A,". That is how it is shown after
 // its heading, and how it is stored.
@@ -27,14 +28,14 @@ inline constexpr int kTmcGroup = 8;
 struct GroupSequence {
     std::string groups;     ///< each followed by a comma
     bool composed = false;  ///< by the user, since it was read
-    bool cut = false;       ///< begins with a reading that may go on in its file
+    bool cut = false;       ///< begins with a reading that goes on in its file
 
     void load(const Profile& profile);
-    /// Takes over what was read.
-    void setRead(std::string text);
+    /// The same from another place.
+    void load(const Profile& profile, const Place& place);
     /// Begins a new one.
     void startAnew();
-    /// Whether it is longer than a reading gives; true also for one that was read and may go on in its file.
+    /// Whether it is longer than a reading gives; true also for one that was read and goes on in its file.
     [[nodiscard]] bool exceedsReading() const;
     /// Whether the set at work is to get it when it is sent; never what begins with a cut reading.
     [[nodiscard]] bool isToBeStored(const Profile& profile) const;

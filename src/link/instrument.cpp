@@ -26,7 +26,13 @@ VisaStatus Instrument::open(const std::string& kind, const std::string& address)
     LastVisaStatus = m_visa.viStatusDesc(DefaultRm, LastVisaStatus, description);
     const std::string resource = (kind == "TCPIP" ? "TCPIP::" : "GPIB0::") + address + "::INSTR";
     LastVisaStatus = m_visa.viOpen(DefaultRm, resource, 0, 0, InstrSession);
-    if (LastVisaStatus == 0) m_state.InstrumentOnline = m_open = true;
+    if (LastVisaStatus == 0) {
+        m_state.InstrumentOnline = m_open = true;
+    } else if (LastVisaStatus > 0 && InstrSession != 0) {
+        // A warning counts as a failure here, but the library has opened it.
+        m_visa.viClose(InstrSession);
+        m_open = false;
+    }
     return LastVisaStatus;
 }
 

@@ -2,6 +2,7 @@
 
 #include "link/sharedlibrary.h"
 #include "link/visastatus.h"
+#include "settings/shownpath.h"
 
 #include <algorithm>
 #include <array>
@@ -188,7 +189,7 @@ VisaLibrary loadFirstVisaLibrary(std::span<const std::string> names, AnswerTime 
         // The system's own message may begin with the name.
         if (!cause.starts_with(name)) cause.insert(0, name + ": ");
         if (!result.reason.empty()) result.reason += '\n';
-        result.reason += cause;
+        result.reason += shownPath(cause);  // the name in it may have any bytes
     }
     return result;
 }

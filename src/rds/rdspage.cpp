@@ -10,6 +10,7 @@
 #include "settings/captions.h"
 #include "settings/programstate.h"
 #include "settings/storedvalue.h"
+#include "settings/withoutcontrols.h"
 #include "ui/dialogs.h"
 #include "ui/statusrow.h"
 
@@ -66,15 +67,18 @@ void RdsPage::stepGoesOut(const Step& step) {
     m_ta->stepGoesOut(step);
 }
 
+// What a data set holds goes out as it stands with the whole set; the button beside an entry sends what could be typed
+// there.
 void RdsPage::PS_Taste_Click() {
-    m_programme.ps = toBytes(PS_T->text()).substr(0, kPsLength);
+    m_programme.ps = withoutControls(toBytes(PS_T->text())).substr(0, kPsLength);
     sendAndStore(setting::kPs, m_programme.ps);
     m_with.status.show(StatusSlot::Ps, m_programme.ps);
 }
 
 void RdsPage::Command3_Click() {
+    m_programme.pi = withoutControls(m_programme.pi);
     m_with.params.SendParam(setting::kPi.sendKey, m_programme.pi);  // which gives it its four characters
-    m_with.profile.write(setting::kPi.place, toBytes(PI_T->text()));
+    m_with.profile.write(setting::kPi.place, withoutControls(toBytes(PI_T->text())));
     m_with.status.show(StatusSlot::Pi, PI_T->text());
 }
 
@@ -102,6 +106,7 @@ void RdsPage::DI_Opt_Click(int index) {
 }
 
 void RdsPage::RT_Taste1_Click() {
+    m_programme.radiotext = withoutControls(m_programme.radiotext);
     m_with.profile.write(setting::kRadiotext.place, m_programme.radiotext);
     m_with.params.SendParam(setting::kRadiotext.sendKey, m_programme.radiotext);
 }

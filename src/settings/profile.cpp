@@ -1,6 +1,7 @@
 #include "settings/profile.h"
 
 #include "settings/datafolder.h"
+#include "settings/profilefile.h"
 
 namespace kdx {
 
@@ -20,6 +21,11 @@ Profile Profile::ofFile(DataFolder& data, const std::filesystem::path& file) {
 
 std::string Profile::read(const Place& place) const {
     return m_data->ReadIni(place.section, place.key, fileOf(place));
+}
+
+bool Profile::holdsMore(const Place& place) const {
+    const auto text = m_data->profile(fileOf(place));
+    return text && text->value(place.section, place.key, kLongestValue + 1).size() > kLongestValue;
 }
 
 void Profile::write(const Place& place, std::string_view value) {

@@ -43,6 +43,8 @@ public:
 
     /// "" when nothing is there.
     [[nodiscard]] std::string read(const Place& place) const;
+    /// Whether more is stored there than read() gives.
+    [[nodiscard]] bool holdsMore(const Place& place) const;
     void write(const Place& place, std::string_view value);
 
 private:

@@ -1,17 +1,20 @@
 #include "simserver/mapperclient.h"
 
+#include <arpa/inet.h>
 #include <netinet/in.h>
 #include <rpc/pmap_prot.h>
 #include <rpc/rpc.h>
 
 namespace kdx::simserver {
 
-MapperClient::MapperClient(unsigned short mapperPort, Deadline deadline)
+MapperClient::MapperClient(const std::string& otherAddress, unsigned short mapperPort, Deadline deadline)
     : m_channel(PMAPPROG, PMAPVERS), m_deadline(deadline) {
     sockaddr_in address{};
     address.sin_family = AF_INET;
     address.sin_addr.s_addr = htonl(INADDR_LOOPBACK);
-    m_connected = m_channel.connect(address, mapperPort, deadline);
+    m_connected = m_channel.connect(address, mapperPort, deadline) ||
+                  (::inet_pton(AF_INET, otherAddress.c_str(), &address.sin_addr) == 1 &&
+                   m_channel.connect(address, mapperPort, deadline));
 }
 
 std::optional<std::uint32_t> MapperClient::portOf(const PortMapping& mapping) {

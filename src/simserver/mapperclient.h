@@ -5,15 +5,17 @@
 
 #include <cstdint>
 #include <optional>
+#include <string>
 
 namespace kdx::simserver {
 
-/// One conversation with the port mapper that runs on this machine, over its loopback address: from there they let
-/// others register. Whatever the port mapper does, it is over at the deadline.
+/// One conversation with the port mapper that runs on this machine. Whatever the port mapper does, it is over at the
+/// deadline.
 class MapperClient {
 public:
-    /// Connects.
-    MapperClient(unsigned short mapperPort, Deadline deadline);
+    /// Connects over the loopback address, from where they let others register; in vain, at the other address: one may
+    /// listen there alone.
+    MapperClient(const std::string& otherAddress, unsigned short mapperPort, Deadline deadline);
 
     [[nodiscard]] bool isConnected() const { return m_connected; }
     /// The port that is registered for the program, 0 for none; nothing when no answer came.

@@ -59,7 +59,7 @@ PortAnnouncement::PortAnnouncement(PollLoop& loop, std::vector<PortMapping> mapp
     } catch (const std::system_error& error) {
         reason = error.code();
     }
-    m_registration = std::make_unique<Registration>(mappings, mapperPort, lookAfterEvery);
+    m_registration = std::make_unique<Registration>(mappings, bindAddress, mapperPort, lookAfterEvery);
     if (m_registration->succeeded()) {
         m_way = Way::Registered;
     } else {

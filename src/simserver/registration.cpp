@@ -38,10 +38,13 @@ bool add(MapperClient& mapper, const PortMapping& mapping) {
 
 }  // namespace
 
-Registration::Registration(std::vector<PortMapping> mappings, unsigned short mapperPort,
+Registration::Registration(std::vector<PortMapping> mappings, std::string address, unsigned short mapperPort,
                            std::chrono::milliseconds lookAfterEvery)
-    : m_mappings(std::move(mappings)), m_mapperPort(mapperPort), m_lookAfterEvery(lookAfterEvery) {
-    MapperClient mapper(m_mapperPort, steady_clock::now() + kTimeToRegister);
+    : m_mappings(std::move(mappings)),
+      m_address(std::move(address)),
+      m_mapperPort(mapperPort),
+      m_lookAfterEvery(lookAfterEvery) {
+    MapperClient mapper(m_address, m_mapperPort, steady_clock::now() + kTimeToRegister);
     m_mapperRuns = mapper.isConnected();
     m_succeeded = m_registered = registerAll(mapper);
     m_keeper = std::thread([this] { keepRegistered(); });
@@ -55,7 +58,7 @@ Registration::~Registration() {
     m_ended.notify_all();
     m_keeper.join();
     if (!m_registered) return;
-    MapperClient mapper(m_mapperPort, steady_clock::now() + kTimeToTakeBack);
+    MapperClient mapper(m_address, m_mapperPort, steady_clock::now() + kTimeToTakeBack);
     for (const PortMapping& mapping : m_mappings) {
         if (mapper.portOf(mapping) == mapping.port) mapper.remove(mapping);
     }
@@ -76,7 +79,7 @@ void Registration::keepRegistered() {
     std::unique_lock guard(m_mutex);
     while (!m_ended.wait_for(guard, m_lookAfterEvery, [this] { return m_ending; })) {
         guard.unlock();
-        MapperClient mapper(m_mapperPort, steady_clock::now() + kTimeToLookAfter);
+        MapperClient mapper(m_address, m_mapperPort, steady_clock::now() + kTimeToLookAfter);
         if (m_registered) {
             for (const PortMapping& mapping : m_mappings) {
                 if (mapper.portOf(mapping) == 0U) mapper.add(mapping);

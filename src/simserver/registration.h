@@ -5,6 +5,7 @@
 #include <chrono>
 #include <condition_variable>
 #include <mutex>
+#include <string>
 #include <thread>
 #include <vector>
 
@@ -16,8 +17,9 @@ class MapperClient;
 /// take them now, is started later, or is started anew and has forgotten them, is told again within seconds.
 class Registration {
 public:
-    /// Takes three seconds at most. @param lookAfterEvery how often the port mapper is asked whether it still knows.
-    Registration(std::vector<PortMapping> mappings, unsigned short mapperPort,
+    /// Takes three seconds at most. @param address where the programs listen: the port mapper may listen there alone.
+    /// @param lookAfterEvery how often the port mapper is asked whether it still knows.
+    Registration(std::vector<PortMapping> mappings, std::string address, unsigned short mapperPort,
                  std::chrono::milliseconds lookAfterEvery);
     Registration(const Registration&) = delete;
     Registration& operator=(const Registration&) = delete;
@@ -34,6 +36,7 @@ private:
     void keepRegistered();
 
     std::vector<PortMapping> m_mappings;
+    std::string m_address;
     unsigned short m_mapperPort;
     std::chrono::milliseconds m_lookAfterEvery;
     bool m_mapperRuns = false;

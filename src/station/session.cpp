@@ -18,6 +18,10 @@ Session::Session(Visa& visa, ProgramState& state, DataFolder& data, const Captio
       m_source(profile) {}
 
 Session::~Session() {
+    letGo();
+}
+
+void Session::letGo() {
     if (instrument.isOpen() && !m_kept) instrument.close();
 }
 

@@ -33,6 +33,8 @@ struct Session {
     bool sendDataSet();
     /// Closes the session.
     void close();
+    /// What is done when this goes: closes what is open still, unless it is to be kept.
+    void letGo();
     /// Lets an open session be when this goes: the instrument stays in remote.
     void keepOpen() { m_kept = true; }
 

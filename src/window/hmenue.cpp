@@ -332,11 +332,8 @@ QStringList HMenue::notes() const {
     unreadable.removeAll(QString());
     unreadable.removeDuplicates();
     if (!unreadable.isEmpty()) note({325, "Nicht lesbar: %1"}, unreadable.join(QStringLiteral(", ")));
-    if (const auto unsaved = m_s.data.unsavedFile()) {
-        note({312, "Nicht gespeichert: %1"}, toText(*unsaved));
-    } else if (!m_s.session.instrument.log.isWritable()) {
-        note({312, "Nicht gespeichert: %1"}, toText(kCommandLog));
-    }
+    if (const auto unsaved = m_s.data.unsavedFile()) note({312, "Nicht gespeichert: %1"}, toText(*unsaved));
+    if (!m_s.session.instrument.log.isWritable()) note({312, "Nicht gespeichert: %1"}, toText(kCommandLog));
     if (m_s.claim.isShared()) note({326, "Ein anderes Programm nutzt dieselben Daten"});
     QStringList quoted;
     for (const std::string& key : m_s.session.params.quotedKeys()) quoted += toText(key);

@@ -39,6 +39,16 @@ TEST_F(FillAfListsTest, AnEntryWithADoubleQuoteIsRed) {
     EXPECT_NE(list.item(1)->foreground().color(), QColor(Qt::red));
 }
 
+TEST_F(FillAfListsTest, ATunedFrequencyWithADoubleQuoteIsRedUntilAnotherListIsShown) {
+    const auto colour = [this] { return tuned.palette().color(QPalette::WindowText); };
+    const QColor plain = colour();
+    FillAfLists(list, tuned, "98.5\",90.1");
+    EXPECT_EQ(tuned.text(), QStringLiteral("98.5\""));
+    EXPECT_EQ(colour(), QColor(Qt::red));
+    FillAfLists(list, tuned, "98.5,90.1");
+    EXPECT_EQ(colour(), plain);
+}
+
 TEST_F(FillAfListsTest, AListWithoutACommaChangesNothing) {
     FillAfLists(list, tuned, "87.6,90.1");
     for (const char* text : {"", "100.1"}) {

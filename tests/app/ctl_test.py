@@ -93,6 +93,30 @@ class Calls(Ctl):
         self.assertIn("none.so", run.stderr)
 
 
+    def testNoControlCharacterIsPrinted(self):
+        """What the terminal would take for a command: in a name of a file, a key, an address."""
+        bad = b"x\x1b[2J\xff"
+        log = self.folder / os.fsdecode(bad)
+        log.write_bytes(b"no log\n")
+        for call in (("--visa-library", bad, "query", "ps"), ("--simulate", "apply", "--file", bad),
+                     ("--simulate", "replay", bad), ("--simulate", "replay", os.fsencode(log)),
+                     ("--simulate", "send", bad), ("--simulate", "send", bad + b"=1"),
+                     ("--simulate", "send", b"PS=" + bad + b'"'), ("--simulate", "send", "--coder", bad + b'"'),
+                     ("--simulate", "query", bad), ("--simulate", "list", bad),
+                     ("--lan", b"127.0.0.9,x\x1b[2J", "query", "ps"), ("--simulate", "query", "ps", b"--" + bad)):
+            with self.subTest(call):
+                run = subprocess.run(self.command(*call), capture_output=True, timeout=100)
+                self.assertIn(run.returncode, (WRONG_CALL, NO_CONNECTION))
+                self.assertIn(b"[2J", run.stderr)
+                self.assertEqual([byte for byte in run.stdout + run.stderr if byte < 0x20 and byte != 0x0A], [])
+                run.stderr.decode()
+
+    def testALogThatCannotBeWrittenIsToldOnce(self):
+        (self.folder / "Daten" / "RDS_log.txt").mkdir()
+        run = self.simulated("send", "PS=RADIO", "TP=1")
+        self.assertRegex(run.stderr, r"^kdx-ctl: the command log .*RDS_log\.txt cannot be written\n$")
+
+
 class Lists(Ctl):
     def testTheDataSetsWithPsAndPi(self):
         lines = self.ctl("list").stdout.splitlines()
@@ -140,6 +164,11 @@ class Apply(Ctl):
             # The tour leaves out the blanks at a command's end.
             self.assertEqual(shown[:len(applied)], [line.rstrip() for line in applied], f"data set {number}")
 
+    def testADryRunPrintsNoControlCharacter(self):
+        file = self.write("lab.ini", "[RDS]\r\nPS=A\x1bB\r\n")
+        run = self.ctl("--force", "apply", "--file", file, "--dry-run")
+        self.assertIn(':STEREO:DIRECT "PS=A.B     "\n', run.stdout)
+
     def testAnyFileCanBeSent(self):
         file = self.write("lab.ini", "[RDS]\r\nPS=Käse\r\nPI=1234\r\n")
         lines = self.ctl("apply", "--file", file, "--dry-run").stdout.splitlines()
@@ -177,6 +206,13 @@ class Send(Ctl):
     def testLineBreaksCopiedAlongEndNoCommand(self):
         self.assertEqual(self.sent("send", "PS=RADIO\n", "--raw", "FREQ 99 MHZ\r\n*RST"),
                          [':STEREO:DIRECT "PS=RADIO   "', "FREQ 99 MHZ *RST"])
+
+    def testACoderCommandThatADoubleQuoteEndsIsRefused(self):
+        run = self.simulated("-v", "send", "TP=1", "--coder", 'PS=x";*RST', expect=WRONG_CALL)
+        self.assertEqual(run.stdout, "")
+        self.assertIn('the coder command PS=x";*RST cannot be sent: a double quote ends it early', run.stderr)
+        self.assertEqual(self.sent("--force", "send", "--coder", 'PS=x";*RST'), [':STEREO:DIRECT "PS=x";*RST"'])
+        self.assertEqual(self.sent("send", "--raw", ':STEREO:DIRECT "PS=x";*RST'), [':STEREO:DIRECT "PS=x";*RST'])
 
     def testIllegalValuesAreNamedBeforeAnythingIsSent(self):
         run = self.simulated("-v", "send", "TP=1", "HF-Frequenz=98,5", "NOKEY=1", expect=WRONG_CALL)
@@ -236,6 +272,16 @@ class Replay(Ctl):
         self.assertEqual(run.stdout, "")
         self.assertIn("line 5: not a line of a command log", run.stderr)
         self.assertIn("line 10: not a line of a command log", run.stderr)
+
+    def testALineThatADoubleQuoteEndsIsNamedAndNothingIsSent(self):
+        bad = ':STEREO:DIRECT "PS=x";*RST"'
+        log = self.write("log.txt", self.LOG + f'             PS= "{bad}"\r\n')
+        for options in ((), ("--check",)):
+            run = self.simulated("-v", "replay", *options, log, expect=WRONG_CALL)
+            self.assertEqual(run.stdout, "")
+            self.assertEqual(run.stderr.count("\n"), 1)
+            self.assertIn("line 5: a double quote ends the coder command early", run.stderr)
+        self.assertEqual(self.sent("--force", "replay", log)[-1], bad)
 
     def testAMissingLogIsExitCode2(self):
         self.simulated("replay", str(self.folder / "none"), expect=WRONG_CALL)
@@ -303,6 +349,23 @@ class OverTheNetwork(Ctl):
 
     def testTheAddressOfTheGeneralSettingsIsTheDefault(self):
         self.assertEqual(self.ctl("query", "ps").stdout, "KDX-X4  \n")
+
+    def testAnAddressCopiedWithItsLineEnd(self):
+        self.assertEqual(self.ctl("--lan", "127.0.0.1\r\n", "query", "ps").stdout, "KDX-X4  \n")
+
+    def testAReaderThatGoesAwayStopsNothing(self):
+        process = subprocess.Popen(self.command("--lan", "127.0.0.1", "-v", "apply", "--data-set", "2"),
+                                   stdout=subprocess.PIPE, stderr=subprocess.PIPE, text=True)
+        process.stdout.readline()
+        process.stdout.close()
+        with process.stderr:
+            self.assertEqual(process.stderr.read(), "")
+        self.assertEqual(process.wait(100), DONE)
+        names = ("ps", "groups", "eon", "frequency")
+        cut = self.lan("query", *names).stdout
+        self.lan("apply", "--data-set", "2")
+        self.assertEqual(cut, self.lan("query", *names).stdout)
+        self.assertIn("TALWELLE", cut)
 
     def testADeviceNameIsGivenBehindAComma(self):
         self.assertEqual(self.ctl("--lan", "127.0.0.1,inst0", "query", "ps").stdout, "KDX-X4  \n")

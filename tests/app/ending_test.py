@@ -36,9 +36,9 @@ class Ending(unittest.TestCase):
         settings.write_bytes(text)
         return folder
 
-    def start(self, folder, *options, **how):
-        environment = dict(os.environ, HOME=str(self.home), QT_QPA_PLATFORM="offscreen",
-                           KDX_VISA_RECORD=str(folder / "record"))
+    def start(self, folder, *options, display=None, **how):
+        shown = {"QT_QPA_PLATFORM": "xcb", "DISPLAY": display} if display else {"QT_QPA_PLATFORM": "offscreen"}
+        environment = dict(os.environ, HOME=str(self.home), KDX_VISA_RECORD=str(folder / "record"), **shown)
         process = subprocess.Popen([PROGRAM, "--visa-library", LIBRARY, "--app-folder", str(folder), *options],
                                    stdout=subprocess.PIPE, stderr=subprocess.STDOUT, text=True, env=environment, **how)
         self.addCleanup(process.stdout.close)
@@ -77,6 +77,21 @@ class Ending(unittest.TestCase):
                 self.assertEqual(self.record(folder)[-1], "close")
                 self.assertEqual(self.record(folder).count("close"), 1)
 
+    @unittest.skipUnless(shutil.which("Xvfb"), "no Xvfb")
+    def testTheLossOfTheDisplayClosesTheSession(self):
+        server = subprocess.Popen(["Xvfb", "-displayfd", "1", "-nolisten", "tcp"], stdout=subprocess.PIPE,
+                                  stderr=subprocess.DEVNULL, text=True)
+        self.addCleanup(server.stdout.close)
+        self.addCleanup(server.wait)
+        self.addCleanup(server.kill)
+        folder = self.folder("display", "lab")
+        process = self.start(folder, display=":" + server.stdout.readline().strip())
+        self.waitForTheFirstWrite(folder, process)
+        server.kill()
+        self.assertNotEqual(process.wait(PATIENCE), 0)
+        self.assertEqual(self.record(folder)[-1], "close")
+        self.assertEqual(self.record(folder).count("close"), 1)
+
     def testABoxOverADeadInstrumentIsClosedAndTheRestIsNotSent(self):
         folder = self.folder("box", "dead")
         process = self.start(folder)
@@ -89,12 +104,24 @@ class Ending(unittest.TestCase):
         self.assertLess(time.monotonic() - asked, 30)
         self.assertEqual(self.record(folder), ["open TCPIP::dead::INSTR", "write", "close"])
 
-    def testWhatCouldNotBeSavedIsToldAtTheEnd(self):
+    def lockedFolder(self):
+        """One whose general settings cannot be written, though the start has something to store."""
         folder = self.folder("locked", "lab", "MANUAL")
         settings = folder / "Daten" / "RDS_Allg.INI"
         # Without a state of the pilot tone the start stores one.
         settings.write_bytes(re.sub(rb"(?m)^PILOT=.*\r\n", b"", settings.read_bytes()))
         settings.chmod(0o444)
+        return folder
+
+    def testTheTourTellsAtItsEndWhatCouldNotBeSaved(self):
+        folder = self.lockedFolder()
+        process = self.start(folder, "--tour", str(folder / "pictures"))
+        printed = process.communicate(timeout=PATIENCE)[0]
+        self.assertEqual(process.returncode, 0, printed)
+        self.assertIn("changed last in RDS_Allg.INI could not be saved", printed)
+
+    def testWhatCouldNotBeSavedIsToldAtTheEnd(self):
+        folder = self.lockedFolder()
         process = self.start(folder)
         self.waitFor(process, (folder / "Daten" / "RDS_log.txt").exists)  # comes after that
         time.sleep(1)

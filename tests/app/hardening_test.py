@@ -50,6 +50,15 @@ class Hardening(unittest.TestCase):
                 expected = (1, f"{program}: without {named}\n") if named else (0, "1 programs\n")
                 self.assertEqual(self.check("--optimised", program), expected)
 
+    def testNoProgramExcusesAnother(self):
+        folder = tempfile.TemporaryDirectory(prefix="kdx-hardening-")
+        self.addCleanup(folder.cleanup)
+        good, bad = (str(pathlib.Path(folder.name) / name) for name in ("good", "bad"))
+        for program, weakening in ((good, []), (bad, ["-U_FORTIFY_SOURCE"])):
+            subprocess.run([COMPILER, "-x", "c", "-", "-o", program, *HARDENED, *weakening], input=SOURCE, text=True,
+                           check=True, capture_output=True)
+        self.assertEqual(self.check("--optimised", good, bad), (1, f"{bad}: without checked library calls\n"))
+
 
 if __name__ == "__main__":
     CHECK, COMPILER, *PROGRAMS = sys.argv[1:]

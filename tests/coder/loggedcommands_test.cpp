@@ -23,6 +23,7 @@ TEST_F(LoggedCommandsTest, AreWhatTheProgramHasLoggedAsSent) {
     EXPECT_EQ(logged.unreadableLines, Numbers());
     EXPECT_EQ(logged.commands,
               (Commands{{"PS", R"(:STEREO:DIRECT "PS=A"B     ")"}, {"HF:PEGEL:STATE", ":OUTPUT:STAT ON"}}));
+    EXPECT_EQ(logged.quotedLines, Numbers{1});
 }
 
 TEST(ReadLoggedCommandsTest, TakesAnAnswerForOneWhateverLineEndItHas) {

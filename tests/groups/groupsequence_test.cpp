@@ -53,6 +53,21 @@ TEST_F(GroupSequencePart, IsNoStepWithoutAGroup) {
     EXPECT_EQ(steps(), Steps{});
 }
 
+TEST_F(GroupSequencePart, CountsAsCutOnlyWhenItsFileHoldsMoreThanAReadingGives) {
+    for (const std::size_t length : {253U, 254U, 255U}) {
+        const std::string stored(length, 'x');
+        setProfile("Datenset1.INI", "RDS", "GR_Folge", stored);
+        setProfile("Datenset2.INI", "RDS", "GR_Folge", "0A,");
+        sequence.load(settings);
+        EXPECT_EQ(sequence.groups, stored.substr(0, 254));
+        EXPECT_EQ(sequence.cut, length == 255) << length;
+        EXPECT_EQ(sequence.exceedsReading(), length == 255) << length;
+        state.CurrentDataSet = "2";  // it has another one, and is to get this
+        EXPECT_EQ(sequence.isToBeStored(settings), length != 255) << length;
+        state.CurrentDataSet = "1";
+    }
+}
+
 TEST(GroupSequenceTest, AFullCounterStaysFull) {
     std::int16_t counter = 0;
     countUp(counter);

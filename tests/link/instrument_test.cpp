@@ -104,6 +104,15 @@ TEST_F(InstrumentTest, APositiveStatusOfAWriteIsReported) {
     EXPECT_EQ(instrument.LastVisaStatus, visa::kMaxCountReached);
 }
 
+TEST_F(InstrumentTest, AnOpeningWithAWarningIsAFailureThatLeavesNothingOpen) {
+    constexpr VisaStatus kNotResponding = 0x3FFF007D;
+    visa.openStatus = kNotResponding;
+    EXPECT_EQ(instrument.open("TCPIP", "lab"), kNotResponding);
+    EXPECT_EQ(visa.calls.back(), "viClose " + std::to_string(instrument.InstrSession));
+    EXPECT_EQ(instrument.LastVisaStatus, kNotResponding);
+    EXPECT_FALSE(instrument.isOpen());
+}
+
 TEST_F(InstrumentTest, APositiveStatusOfAReadIsSuccess) {
     visa.answers = {"67.5\n"};
     visa.readStatus = visa::kTermCharacter;

@@ -25,6 +25,12 @@ const std::string kIncomplete = KDX_FAKE_VISA_INCOMPLETE;
 const std::string kWide = KDX_FAKE_VISA_WIDE;
 const std::string kWordless = KDX_FAKE_VISA_WORDLESS;
 
+TEST(LibraryVisaNameTest, IsToldWithoutControlCharactersAndAsUtf8) {
+    const VisaLibrary library = loadVisaLibrary("/nowhere/x\x1B[2J\xFF.so");
+    EXPECT_EQ(library.visa, nullptr);
+    EXPECT_THAT(library.reason, StartsWith("/nowhere/x\\x1B[2J\\xFF.so: "));
+}
+
 /// A session to the library's instrument.
 class LibraryVisaTest : public ::testing::Test {
 protected:

@@ -188,6 +188,12 @@ class Run(unittest.TestCase):
             self.assertIn("tried again every few seconds", second.errors)
             self.assertIn("--bind 127.0.0.2 and open TCPIP::127.0.0.2::INSTR", second.errors)
 
+    def testASecondOneAtAnotherAddressSaysSoToo(self):
+        with KdxSim(PROGRAM, "--bind", "127.0.0.2"), KdxSim(PROGRAM, "--bind", "127.0.0.2") as second:
+            self.assertEqual(second.end(), 0)
+            self.assertIn("did not take the registration", second.errors)
+            self.assertIn("--bind 127.0.0.3 and open TCPIP::127.0.0.3::INSTR", second.errors)
+
     def testASecondOneAtTheAddressThatTheFirstNamesIsFound(self):
         with KdxSim(PROGRAM) as first, KdxSim(PROGRAM, "--bind", "127.0.0.2", "--idn", "SECOND") as second:
             device = pyvisa.ResourceManager("@py").open_resource("TCPIP::127.0.0.2::inst0::INSTR")

@@ -219,6 +219,16 @@ TEST_F(PortAnnouncementTest, SaysSoWhenTheRunningOneRefuses) {
     });
 }
 
+TEST_F(PortAnnouncementTest, AsksTheOneThatRunsAtItsOwnAddressOnly) {
+    PollLoop firstLoop;
+    const PortMapper first(firstLoop, {{kCore, 1, 5711}, {kAsync, 1, 5712}}, "127.0.0.3", 0);  // it refuses all others
+    const RunningLoop running(firstLoop);
+    const PortAnnouncement announcement(m_loop, m_mappings, "127.0.0.3", first.port());
+    EXPECT_EQ(announcement.way(), PortAnnouncement::Way::None);
+    for (const char* words : {"did not take the registration", "--bind 127.0.0.2 ", "4711"})
+        EXPECT_NE(announcement.problem().find(words), std::string::npos) << announcement.problem();
+}
+
 TEST_F(PortAnnouncementTest, SaysSoWhenNobodyAnswersAndThePortIsTaken) {
     const FileDescriptor taken = bindUdp("127.0.0.1", 0);  // the TCP port of the same number is free
     const PortAnnouncement announcement(m_loop, m_mappings, "127.0.0.1", localPort(taken));

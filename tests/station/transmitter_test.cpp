@@ -158,6 +158,7 @@ TEST(SessionTest, ItsEndClosesWhatIsOpenOnce) {
     EXPECT_EQ(callsAtTheEnd(0, false), Lines{"viClose 102"});
     EXPECT_EQ(callsAtTheEnd(0, true), Lines{"viClose 102"});
     EXPECT_EQ(callsAtTheEnd(visa::kTimeout, false), Lines{});
+    EXPECT_EQ(callsAtTheEnd(0x3FFF007D, false), Lines{"viClose 102"}) << "closed when it was opened with a warning";
 }
 
 TEST(SessionTest, ThatWasNeverOpenedClosesNothing) {

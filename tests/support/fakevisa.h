@@ -26,7 +26,7 @@ public:
     VisaStatus viOpen(VisaHandle, const std::string& resource, std::uint32_t accessMode, std::uint32_t openTimeoutMs,
                       VisaHandle& session) override {
         calls.push_back("viOpen " + resource + " " + std::to_string(accessMode) + " " + std::to_string(openTimeoutMs));
-        if (openStatus == 0) session = ++m_lastHandle;
+        if (openStatus >= 0) session = ++m_lastHandle;
         return openStatus;
     }
     VisaStatus viWrite(VisaHandle session, std::span<const char> bytes, std::int32_t& count) override {

@@ -40,6 +40,15 @@ TEST_F(NoticeTest, ALogThatLeadsElsewhereIsToldAlsoWithLoggingOff) {
     EXPECT_EQ(notice(), "");
 }
 
+TEST_F(NoticeTest, SettingsAndALogThatCannotBeWrittenAreBothTold) {
+    std::filesystem::create_directory(folder.data() / kCommandLog);
+    folder.write("Datenset1.INI", "\xFF\xFE");
+    start();
+    openSession();
+    click("PS_Taste");
+    EXPECT_EQ(notice(), "Nicht gespeichert: Datenset1.INI  -  Nicht gespeichert: RDS_log.txt");
+}
+
 TEST_F(NoticeTest, PipesInThePlaceOfFilesDelayNothing) {
     for (const char* file : {kCommandLog, kPictureOn, kPictureOff, kEventList, "Datenset1.INI"}) {
         std::filesystem::remove(folder.data() / file);
@@ -115,6 +124,8 @@ TEST_F(NoticeTest, AnotherProgramOnTheSameDataIsToldWhileItRuns) {
 class QuoteTest : public NoticeTest {
 protected:
     bool isRed(const char* entry) { return find<QLineEdit>(entry)->palette().color(QPalette::Text) == Qt::red; }
+    bool isRedInList(const char* list) { return find<QListWidget>(list)->item(0)->foreground().color() == Qt::red; }
+    bool isRedLabel(const char* label) { return find<QLabel>(label)->palette().color(QPalette::WindowText) == Qt::red; }
 };
 
 TEST_F(QuoteTest, AValueWithADoubleQuoteIsToldAndMarkedUntilAnotherIsSent) {
@@ -137,10 +148,12 @@ TEST_F(QuoteTest, EveryTextThatGoesToTheCoderIsMarked) {
     setDataSet1("RDS", "RTA", "say \"hello\"");
     setDataSet1("RDS", "EON_PI", "D3C1");
     setDataSet1("RDS", "EON_PS", "E\"ON");
-    setDataSet1("RDS", "AF_LISTE1", "98.5,90.1\"");
-    setDataSet1("RDS", "EON_AFB1", "98.5,90.1\"");
+    setDataSet1("RDS", "AF_LISTE1", "98.5\",90.1\"");
+    setDataSet1("RDS", "EON_AFB1", "98.5\",90.1\"");
     start();
-    EXPECT_TRUE(isRed("EON_PS_Text"));
+    for (const char* entry : {"EON_PS_Text", "RT_Text1"}) EXPECT_TRUE(isRed(entry)) << entry;
+    for (const char* list : {"AF_List1", "AFB_Liste"}) EXPECT_TRUE(isRedInList(list)) << list;
+    for (const char* label : {"AF_TN", "Tuned_AFB"}) EXPECT_TRUE(isRedLabel(label)) << label;
     openSession();
     EXPECT_EQ(notice(), "Anführungszeichen beendet den Text: AF1, EON_AFB1, EON_PS, RT");
 }

@@ -4,6 +4,7 @@
 #include <QInputDialog>
 #include <QListWidget>
 
+#include <algorithm>
 #include <ostream>
 
 #include "support/windowtest.h"
@@ -82,12 +83,43 @@ std::string entryName(const ::testing::TestParamInfo<Entry>& info) {
     return name;
 }
 
-INSTANTIATE_TEST_SUITE_P(Entries, PastingIntoAnEntry,
-                         ::testing::Values(Entry{"PS_T", "PS_Taste", "PS"}, Entry{"RT_Text1", "RT_Taste1", "RTA"},
-                                           Entry{"PI_T", "Command3", "PI"},
-                                           Entry{"EON_PI_Text", "EON_PI_Taste", "EON_PI"},
-                                           Entry{"EON_PS_Text", "EON_PS_Taste", "EON_PS"}),
-                         entryName);
+constexpr Entry kEntries[] = {{"PS_T", "PS_Taste", "PS"},
+                              {"RT_Text1", "RT_Taste1", "RTA"},
+                              {"PI_T", "Command3", "PI"},
+                              {"EON_PI_Text", "EON_PI_Taste", "EON_PI"},
+                              {"EON_PS_Text", "EON_PS_Taste", "EON_PS"}};
+
+INSTANTIATE_TEST_SUITE_P(Entries, PastingIntoAnEntry, ::testing::ValuesIn(kEntries), entryName);
+
+/// Entries that a data set filled with what nobody can type.
+class StoredInAnEntry : public PastingTest, public ::testing::WithParamInterface<Entry> {
+protected:
+    StoredInAnEntry() {
+        setDataSet1("RDS", GetParam().key, "A\tB\x01");
+        visa.written.clear();
+        start();
+    }
+};
+
+TEST_P(StoredInAnEntry, GoesAsItIsStoredWithTheWholeDataSet) {
+    openSession();
+    const Lines commands = sent();
+    EXPECT_TRUE(std::any_of(commands.begin(), commands.end(),
+                            [](const std::string& command) { return command.find("A\tB\x01") != std::string::npos; }));
+    EXPECT_EQ(data.ReadIni("RDS", GetParam().key, dataSetFile("1")), "A\tB\x01");
+}
+
+TEST_P(StoredInAnEntry, GoesWithoutControlCharactersByTheButtonBesideIt) {
+    openSession();
+    visa.written.clear();
+    click(GetParam().send);
+    expectNoControlCharacterSent();
+    // The other network's PI is stored when it is typed only.
+    const bool stores = GetParam().key != std::string("EON_PI");
+    EXPECT_EQ(data.ReadIni("RDS", GetParam().key, dataSetFile("1")), stores ? "A B" : "A\tB\x01");
+}
+
+INSTANTIATE_TEST_SUITE_P(Entries, StoredInAnEntry, ::testing::ValuesIn(kEntries), entryName);
 
 TEST_F(PastingTest, IntoTheMiddleKeepsTheCursorBehindWhatWasPasted) {
     auto* entry = find<QLineEdit>("PS_T");

@@ -217,7 +217,8 @@ INSTANTIATE_TEST_SUITE_P(Values, SettingsThatMakeNoSense,
 TEST_F(StartUpTest, AMissingDataFolderIsNamedAndTheWindowWorksWithoutIt) {
     std::filesystem::remove_all(folder.data());
     start();
-    EXPECT_EQ(text("QuietLine"), "Nicht gefunden: " + folder.data().string() + "  -  Nicht gespeichert: RDS_Allg.INI");
+    EXPECT_EQ(text("QuietLine"), "Nicht gefunden: " + folder.data().string() +
+                                     "  -  Nicht gespeichert: RDS_Allg.INI  -  Nicht gespeichert: RDS_log.txt");
     expectToWork();
     EXPECT_FALSE(std::filesystem::exists(folder.data()));
 }
@@ -229,7 +230,7 @@ TEST_F(StartUpTest, ADataFolderThatCannotBeReadIsToldAndTheWindowWorksWithoutIt)
     start();
     EXPECT_EQ(text("QuietLine"),
               "Nicht gefunden: Sprachen.ini [deutsch]  -  Nicht lesbar: Datenset1.INI  -  "
-              "Nicht gespeichert: RDS_Allg.INI");
+              "Nicht gespeichert: RDS_Allg.INI  -  Nicht gespeichert: RDS_log.txt");
     expectToWork();
 }
 
@@ -246,7 +247,7 @@ TEST_F(StartUpTest, ADataFolderThatCannotBeWrittenLosesNothingAndIsTold) {
         EXPECT_EQ(text("PS_T"), "MESSTURM");
         EXPECT_EQ(text("QuietLine"), "Nicht gespeichert: RDS_log.txt");
         expectToWork();
-        EXPECT_EQ(text("QuietLine"), "Nicht gespeichert: Datenset1.INI");
+        EXPECT_EQ(text("QuietLine"), "Nicht gespeichert: Datenset1.INI  -  Nicht gespeichert: RDS_log.txt");
     }
     EXPECT_EQ(folder.read("Datenset1.INI"), before);
 }

@@ -5,6 +5,7 @@
 #include "app/ctl/laboratory.h"
 #include "app/ctl/whichdataset.h"
 #include "base/codepage.h"
+#include "base/printable.h"
 #include "coder/sendparam.h"
 #include "station/rehearsal.h"
 
@@ -42,7 +43,7 @@ int apply(Laboratory& laboratory, const Apply& what) {
         Rehearsal rehearsal(laboratory.data(), laboratory.captions());
         rehearsal.apply(*source);
         for (const std::string& command : rehearsal.commands()) {
-            laboratory.output().line(toUtf8(command));
+            laboratory.output().line(toUtf8(printable(command, '.')));
             laboratory.output().document["commands"].push_back(toUtf8(command));
         }
         return kDone;

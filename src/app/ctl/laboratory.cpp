@@ -1,5 +1,7 @@
 #include "app/ctl/laboratory.h"
 
+#include <utility>
+
 #include "af/settings.h"
 #include "app/appfolder.h"
 #include "app/platform.h"
@@ -9,6 +11,7 @@
 #include "coder/keyfacts.h"
 #include "link/visastatus.h"
 #include "settings/generalsettings.h"
+#include "settings/withoutcontrols.h"
 #include "sim/virtualinstrument.h"
 
 namespace kdx::ctl {
@@ -63,6 +66,10 @@ Laboratory::Laboratory(const Call& call, Output& output, const char* program, in
     m_session->transmitter.setWatcher(this);
     m_session->instrument.onFailure([this](const std::string&, bool) { return linkFailed(); });
     m_session->instrument.addWatcher(*this);
+    m_session->instrument.log.onChange([this, told = false]() mutable {
+        if (m_session->instrument.log.isWritable() || std::exchange(told, true)) return;
+        m_output.problem("the command log " + m_data.file(kCommandLog).string() + " cannot be written");
+    });
 }
 
 Laboratory::~Laboratory() {
@@ -72,7 +79,7 @@ Laboratory::~Laboratory() {
 }
 
 bool Laboratory::open() {
-    // A run goes on over midnight, whatever the window is to do.
+    // A run goes on over midnight, whatever the general settings say of the window: nobody sits by a script.
     m_clock.correctMidnight(true);
     if (m_session && m_held && m_session->instrument.isOpen()) return true;
     if (!m_session) {
@@ -84,7 +91,7 @@ bool Laboratory::open() {
     std::string address = profile.read(kind == "TCPIP" ? setting::kLanAddress : setting::kGpibAddress);
     if (m_call.lan) {
         kind = "TCPIP";
-        address = *m_call.lan;
+        address = withoutControls(*m_call.lan);
         if (const auto comma = address.find(','); comma != std::string::npos) address.replace(comma, 1, "::");
     } else if (m_call.gpib) {
         kind = "IEC";

@@ -9,6 +9,7 @@
 #include "app/ctl/output.h"
 #include "app/platform.h"
 #include "base/duration.h"
+#include "settings/shownpath.h"
 
 namespace {
 
@@ -52,6 +53,8 @@ void addManner(CLI::App& app, Call& call) {
 }
 
 int run(const Call& call, const kdx::ctl::Task& task, const char* program) {
+    // Who does not want to read on stops nothing that is half sent.
+    kdx::surviveBrokenPipes();
     kdx::ctl::Output output(call);
     int result = kdx::ctl::kFailed;
     try {
@@ -74,9 +77,9 @@ int called(int argc, const char* const* argv) {
     addTimeout(app, call);
     addManner(app, call);
     kdx::ctl::Task task;
-    for (const auto add : {kdx::ctl::addApply, kdx::ctl::addDiff, kdx::ctl::addFind, kdx::ctl::addList,
-                           kdx::ctl::addQuery, kdx::ctl::addRead, kdx::ctl::addReplay, kdx::ctl::addSend,
-                           kdx::ctl::addShell}) {
+    for (const auto add :
+         {kdx::ctl::addApply, kdx::ctl::addDiff, kdx::ctl::addFind, kdx::ctl::addList, kdx::ctl::addQuery,
+          kdx::ctl::addRead, kdx::ctl::addReplay, kdx::ctl::addSend, kdx::ctl::addShell}) {
         add(app, task);
     }
     app.footer(
@@ -84,6 +87,9 @@ int called(int argc, const char* const* argv) {
         "Exit codes: 0 done, 1 a command failed, 2 wrong call or unreadable file, 3 differences or warnings,\n"
         "4 no connection.\n"
         "kdx-ctl SUBCOMMAND --help says more.");
+    app.failure_message([](const CLI::App*, const CLI::Error& error) {
+        return kdx::shownPath(error.what()) + "\nRun with --help for more information.\n";
+    });
     try {
         app.parse(argc, argv);
     } catch (const CLI::ParseError& error) {

@@ -5,6 +5,7 @@
 
 #include "app/ctl/call.h"
 #include "app/platform.h"
+#include "settings/shownpath.h"
 
 namespace kdx::ctl {
 
@@ -27,7 +28,9 @@ void Output::remark(const std::string& text) const {
     if (!m_call.quiet) line(text);
 }
 
-void Output::problem(const std::string& text) {
+void Output::problem(const std::string& problem) {
+    // Names and values come from the command line and from files, with any bytes in them.
+    const std::string text = shownPath(problem);
     endProgress();
     std::fflush(stdout);
     std::fprintf(stderr, "kdx-ctl: %s%s\n", m_place.c_str(), text.c_str());

@@ -20,7 +20,7 @@ public:
     void line(const std::string& text) const;
     /// A line that only tells how it goes; not with JSON, not when the call is to be quiet.
     void remark(const std::string& text) const;
-    void problem(const std::string& text);
+    void problem(const std::string& problem);
     using Rows = std::vector<std::vector<std::string>>;
     /// Lines of the result with their columns under each other.
     void table(const Rows& rows) const;

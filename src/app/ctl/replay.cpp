@@ -24,7 +24,13 @@ int replay(Laboratory& laboratory, const Replay& what) {
     const LoggedCommands logged = readLoggedCommands(*bytes);
     for (const std::size_t line : logged.unreadableLines)
         laboratory.output().problem(what.log + ", line " + std::to_string(line) + ": not a line of a command log");
-    if (!logged.unreadableLines.empty()) return kWrongCall;
+    if (!laboratory.call().force) {
+        for (const std::size_t line : logged.quotedLines) {
+            laboratory.output().problem(what.log + ", line " + std::to_string(line) +
+                                        ": a double quote ends the coder command early");
+        }
+    }
+    if (!logged.unreadableLines.empty() || (!logged.quotedLines.empty() && !laboratory.call().force)) return kWrongCall;
     laboratory.output().document["commands"] = logged.commands.size();
     if (what.check) {
         laboratory.output().line(std::to_string(logged.commands.size()) + " commands");

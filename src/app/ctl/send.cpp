@@ -37,6 +37,11 @@ int send(Laboratory& laboratory, const Send& what) {
         settings.emplace_back(text.substr(0, equals), line(text.substr(equals + 1)));
         legal = laboratory.mayBeSent(settings.back().first, settings.back().second) && legal;
     }
+    for (const std::string& command : what.coder) {
+        if (laboratory.call().force || !endsItsTextEarly(coderCommand(line(command)))) continue;
+        laboratory.output().problem("the coder command " + command + " cannot be sent: a double quote ends it early");
+        legal = false;
+    }
     if (!legal) return kWrongCall;
     if (!laboratory.open()) return kNoConnection;
     Session& session = laboratory.session();

@@ -144,7 +144,6 @@ int shell(Laboratory& laboratory) {
     laboratory.output().answerLines();
     if (!laboratory.open()) return kNoConnection;
     laboratory.hold();
-    surviveBrokenPipes();
     const bool prompted = inputIsTerminal() && outputIsTerminal() && !laboratory.call().json;
     const auto lines = prompted ? prompt(laboratory.stop()) : std::make_unique<PipedLines>(laboratory.stop());
     int worst = kDone;
