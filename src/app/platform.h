@@ -42,4 +42,13 @@ void surviveBrokenPipes();
 /// the descriptor that this gives readable. -1 when they cannot be had so.
 [[nodiscard]] int endRequests();
 
+/// Opens what of standard input, output and error the caller has closed: else the next file opened would take its place
+/// and get what is printed.
+void openStandardStreams();
+
+/// What the standard input has of a line.
+enum class InputLine { NotYet, Whole, Ended };
+/// Takes a line off the standard input when there is one, without waiting for it.
+[[nodiscard]] InputLine takeInputLine();
+
 }  // namespace kdx

@@ -114,4 +114,24 @@ int endRequests() {
     return ends[0];
 }
 
+void openStandardStreams() {
+    int opened = -1;
+    do {
+        opened = open("/dev/null", O_RDWR);
+    } while (opened >= 0 && opened <= STDERR_FILENO);
+    if (opened > STDERR_FILENO) close(opened);
+}
+
+InputLine takeInputLine() {
+    constexpr int kMostAtOnce = 4096;  // whoever writes without end and without a line end holds nothing up
+    for (int i = 0; i < kMostAtOnce && isReadable(STDIN_FILENO); ++i) {
+        char character = 0;  // one at a time: the next line is for who asks next
+        const ssize_t got = read(STDIN_FILENO, &character, 1);
+        if (got < 0 && (errno == EINTR || errno == EAGAIN)) return InputLine::NotYet;
+        if (got <= 0) return InputLine::Ended;
+        if (character == '\n') return InputLine::Whole;
+    }
+    return InputLine::NotYet;
+}
+
 }  // namespace kdx

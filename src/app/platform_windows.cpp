@@ -57,4 +57,10 @@ int endRequests() {
     return -1;  // there the system closes the window
 }
 
+void openStandardStreams() {}  // there a closed one is none: nothing takes its place
+
+InputLine takeInputLine() {
+    return InputLine::Ended;  // it cannot be asked without waiting: a pause ends the run, see --yes
+}
+
 }  // namespace kdx

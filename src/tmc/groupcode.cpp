@@ -18,6 +18,10 @@ namespace {
 constexpr std::size_t kMessageBits = 36;
 constexpr std::size_t kBitsOfDigit = 4;
 constexpr std::size_t kNumberLength = 5;
+// Group type 8A, the two system information words in turn, the identifier of the TMC application.
+constexpr const char* kFirstAnnouncement = "01,106100CD46";
+constexpr const char* kSecondAnnouncement = "01,100066CD46";
+constexpr const char* kMessagePrefix = "02,";
 
 }  // namespace
 
@@ -30,6 +34,14 @@ std::string groupCode(const GroupBits& bits) {
         code += rightmost(hexadecimal(Modul2::BinaryToValue(fourBits)), 1);
     }
     return code;
+}
+
+std::string announcement(bool otherVariant) {
+    return otherVariant ? kSecondAnnouncement : kFirstAnnouncement;
+}
+
+std::string sentMessage(std::string_view code) {
+    return std::string(kMessagePrefix).append(code);
 }
 
 std::string lastBits(double number, std::size_t count) {

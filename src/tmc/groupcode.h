@@ -25,6 +25,13 @@ struct GroupBits {
 /// the code is then incomplete, but ten characters all the same.
 [[nodiscard]] std::string groupCode(const GroupBits& bits);
 
+/// The open-data announcement that goes out before each message: receivers look for messages when they see it.
+/// @param otherVariant the two system information words go out in turn.
+[[nodiscard]] std::string announcement(bool otherVariant);
+
+/// The message of that group code as it goes out.
+[[nodiscard]] std::string sentMessage(std::string_view code);
+
 /// The number's last `count` binary digits: larger numbers lose their upper bits.
 [[nodiscard]] std::string lastBits(double number, std::size_t count);
 

@@ -1,5 +1,6 @@
 #include "tmc/tmctransmission.h"
 
+#include "tmc/groupcode.h"
 #include "tmc/messagedelegate.h"
 #include "tmc/messagelist.h"
 #include "tmc/settings.h"
@@ -12,15 +13,6 @@
 #include <stdexcept>
 
 namespace kdx {
-
-namespace {
-
-// Group type 8A, the two system information words in turn, the identifier of the TMC application.
-constexpr const char* kFirstAnnouncement = "01,106100CD46";
-constexpr const char* kSecondAnnouncement = "01,100066CD46";
-constexpr const char* kMessagePrefix = "02,";
-
-}  // namespace
 
 TmcTransmission::TmcTransmission(const PageContext& with, const TmcBuilder& builder, QWidget* parent)
     : Page(with, parent), m_builder(builder) {
@@ -103,13 +95,13 @@ bool TmcTransmission::setInterval() {
 void TmcTransmission::TMC_Sende_Timer_Timer() {
     // A failed write shows its box in here; the timer lets no further tick in until it is closed.
     m_sendPosition = nextPosition(m_sendPosition, TMC_List->count());
-    sendAndStore(setting::kOpenDataAnnouncement, m_otherVariant ? kSecondAnnouncement : kFirstAnnouncement);
+    sendAndStore(setting::kOpenDataAnnouncement, announcement(m_otherVariant));
     m_otherVariant = !m_otherVariant;
     const bool multi = optMultiMessage->isChecked();
     if (multi) TMC_List->setCurrentRow(m_sendPosition);
     const QListWidgetItem* message = TMC_List->currentItem();
     sendAndStore(setting::kTrafficMessage,
-                 kMessagePrefix + codeOfMessage(toBytes(message != nullptr ? message->text() : QString())));
+                 sentMessage(codeOfMessage(toBytes(message != nullptr ? message->text() : QString()))));
     if (!multi) Stop_Timer_Click();
 }
 

@@ -329,7 +329,7 @@ class Diff(Ctl):
         self.simulated("diff", "--file", str(self.folder / "none.INI"), expect=WRONG_CALL)
 
 
-class OverTheNetwork(Ctl):
+class Networked(Ctl):
     """Against kdx-sim as a process of its own; in a network of its own where the system permits that."""
 
     def setUp(self):
@@ -343,6 +343,8 @@ class OverTheNetwork(Ctl):
     def lan(self, *arguments, **how):
         return self.ctl("--lan", "127.0.0.1", *arguments, **how)
 
+
+class OverTheNetwork(Networked):
     def testWhatIsSentIsReadBack(self):
         self.lan("send", "PS=TESTTURM", "PI=ABCD", "HF-Frequenz=98.5")
         self.assertEqual(self.lan("query", "ps", "pi", "frequency").stdout, "TESTTURM\nABCD\n98.5 MHz\n")

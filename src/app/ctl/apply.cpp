@@ -6,7 +6,6 @@
 #include "app/ctl/whichdataset.h"
 #include "base/codepage.h"
 #include "base/printable.h"
-#include "coder/sendparam.h"
 #include "station/rehearsal.h"
 
 namespace kdx::ctl {
@@ -19,26 +18,12 @@ struct Apply {
     bool dryRun = false;
 };
 
-/// Whether anything of the data set is not legal; each is told. What the data set does not say, and what the program
-/// has no command for, is sent empty as it always was.
-bool isLegal(Laboratory& laboratory, const Steps& steps) {
-    bool legal = true;
-    for (const Step& step : steps) {
-        std::string value = step.value;
-        if (step.kind != Step::Kind::Parameter || value.empty()) continue;
-        if (composeCommand(step.key, value, {}).value_or("").empty()) continue;
-        if (!laboratory.mayBeSent(step.key, step.value)) legal = false;
-    }
-    return legal;
-}
-
 int apply(Laboratory& laboratory, const Apply& what) {
     Session& session = laboratory.session();
     const auto source = what.source.profile(laboratory);
     if (!source) return kWrongCall;
     session.load(*source);
-    const Steps steps = openingSteps(session.station);
-    if (!isLegal(laboratory, steps)) return kWrongCall;
+    if (!laboratory.mayBeSent(openingSteps(session.station))) return kWrongCall;
     if (what.dryRun) {
         Rehearsal rehearsal(laboratory.data(), laboratory.captions());
         rehearsal.apply(*source);

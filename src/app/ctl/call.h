@@ -40,9 +40,11 @@ using Task = std::function<int(Laboratory&)>;
 using AddSubcommand = void (*)(CLI::App& app, Task& task);
 
 void addApply(CLI::App& app, Task& task);
+void addCheck(CLI::App& app, Task& task);
 void addDiff(CLI::App& app, Task& task);
 void addFind(CLI::App& app, Task& task);
 void addList(CLI::App& app, Task& task);
+void addPlay(CLI::App& app, Task& task);
 void addQuery(CLI::App& app, Task& task);
 void addRead(CLI::App& app, Task& task);
 void addReplay(CLI::App& app, Task& task);

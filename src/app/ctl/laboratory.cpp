@@ -9,6 +9,7 @@
 #include "base/numbers.h"
 #include "base/printable.h"
 #include "coder/keyfacts.h"
+#include "coder/sendparam.h"
 #include "link/visastatus.h"
 #include "settings/generalsettings.h"
 #include "settings/withoutcontrols.h"
@@ -145,6 +146,18 @@ bool Laboratory::mayBeSent(const std::string& key, const std::string& value) {
     return !wrong;
 }
 
+// What a data set does not say, and what the program has no command for, is sent empty as it always was.
+bool Laboratory::mayBeSent(const Steps& steps) {
+    bool legal = true;
+    for (const Step& step : steps) {
+        std::string value = step.value;
+        if (step.kind != Step::Kind::Parameter || value.empty()) continue;
+        if (composeCommand(step.key, value, {}).value_or("").empty()) continue;
+        if (!mayBeSent(step.key, step.value)) legal = false;
+    }
+    return legal;
+}
+
 void Laboratory::passed(const Traffic& traffic) {
     if (traffic.kind == Traffic::Kind::Logged) return;
     const bool written = traffic.kind == Traffic::Kind::Written;
@@ -161,7 +174,7 @@ void Laboratory::stepGoesOut(const Step& step, std::size_t number, std::size_t t
     if (number > 0) m_output.progress(number, total);
     if (step.kind == Step::Kind::Refused)
         m_output.problem(step.key + " is not sent: the coder cannot take so many frequencies with method B");
-    if (isStopped()) m_session->transmitter.stop();
+    if (!m_finishing && isStopped()) m_session->transmitter.stop();
 }
 
 bool Laboratory::isStopped() {

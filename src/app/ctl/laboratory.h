@@ -7,7 +7,7 @@
 #include "app/choosevisa.h"
 #include "app/ctl/call.h"
 #include "app/ctl/output.h"
-#include "base/clock.h"
+#include "app/ctl/pacedclock.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
 #include "settings/programstate.h"
@@ -41,8 +41,14 @@ public:
     [[nodiscard]] int result() const { return m_failed || m_stopped ? kFailed : kDone; }
     /// Checks a value against what is legal for the key; tells what is wrong, unless the call is to be forced.
     [[nodiscard]] bool mayBeSent(const std::string& key, const std::string& value);
+    /// Checks all that a data set's steps send; what is wrong is told.
+    [[nodiscard]] bool mayBeSent(const Steps& steps);
     /// Whether the run was stopped, or the user wants to; that is told.
     [[nodiscard]] bool isStopped();
+    /// From here on a wish to stop is let be: what is sent puts things back.
+    void finish() { m_finishing = true; }
+    /// Lets time run faster, for the virtual instrument inside too.
+    void hasten(double factor) { m_clock.hasten(factor); }
     /// Lets the session be when the program ends.
     void keepOpen() { m_session->keepOpen(); }
 
@@ -55,6 +61,9 @@ public:
     [[nodiscard]] DataFolder& data() { return m_data; }
     [[nodiscard]] const Captions& captions() const { return m_captions; }
     [[nodiscard]] ProgramState& state() { return m_state; }
+    [[nodiscard]] Clock& clock() { return m_clock; }
+    /// False when there is no VISA library for it; open() tells why.
+    [[nodiscard]] bool hasSession() const { return m_session != nullptr; }
     [[nodiscard]] Session& session() { return *m_session; }
 
 private:
@@ -70,7 +79,7 @@ private:
     const Call& m_call;
     Output& m_output;
     int m_stop;
-    SystemClock m_clock;
+    PacedClock m_clock;
     DataFolder m_data;
     ProgramState m_state;
     Captions m_captions;
@@ -80,6 +89,7 @@ private:
     bool m_lost = false;  ///< the link, and no new one was made yet
     bool m_failed = false;
     bool m_stopped = false;
+    bool m_finishing = false;
 };
 
 }  // namespace kdx::ctl

@@ -59,6 +59,18 @@ void Output::progress(std::size_t number, std::size_t total) {
     m_progressShown = true;
 }
 
+void Output::waiting(const std::string& until) {
+    if (m_call.quiet || m_call.verbose || !errorIsTerminal()) return;
+    std::fprintf(stderr, "\rnext at %s ", until.c_str());
+    m_progressShown = true;
+}
+
+void Output::prompt(const std::string& text) {
+    endProgress();
+    std::fflush(stdout);
+    std::fprintf(stderr, "%s\n", text.c_str());
+}
+
 void Output::endProgress() {
     if (m_progressShown) std::fputs("\r\033[K", stderr);
     m_progressShown = false;

@@ -28,7 +28,11 @@ public:
     void note(const std::string& text) { document["problems"].push_back(text); }
     /// Which command of how many goes out; only while the standard error is a terminal.
     void progress(std::size_t number, std::size_t total);
+    /// Until when nothing happens; likewise.
+    void waiting(const std::string& until);
     void endProgress();
+    /// What is asked of the person at the program, whatever else the call wants shown.
+    void prompt(const std::string& text);
 
     /// The document of --json; problems and the exit code are added to it.
     nlohmann::json document = nlohmann::json::object();

@@ -1,0 +1,35 @@
+#include "app/ctl/scenariofile.h"
+
+#include "app/ctl/laboratory.h"
+#include "app/ctl/whichdataset.h"
+#include "scenario/reader.h"
+#include "settings/profilefile.h"
+
+namespace kdx::ctl {
+
+namespace {
+
+bool loadDataSet(Laboratory& laboratory, int number) {
+    const auto source = WhichDataSet{number, {}}.profile(laboratory);
+    if (!source || !laboratory.hasSession()) return source.has_value();
+    laboratory.session().load(*source);
+    return laboratory.mayBeSent(openingSteps(laboratory.session().station));
+}
+
+}  // namespace
+
+std::optional<scenario::Scenario> readScenarioFile(Laboratory& laboratory, const std::string& file) {
+    const auto bytes = readFile(file);
+    if (!bytes) {
+        laboratory.output().problem(file + " cannot be read");
+        return std::nullopt;
+    }
+    scenario::Reading reading = scenario::readScenario(*bytes, laboratory.call().force);
+    for (const auto& [line, column, sentence] : reading.problems)
+        laboratory.output().problem(file + ":" + std::to_string(line) + ":" + std::to_string(column) + ": " + sentence);
+    if (!reading.problems.empty()) return std::nullopt;
+    if (reading.scenario.dataSet && !loadDataSet(laboratory, *reading.scenario.dataSet)) return std::nullopt;
+    return std::move(reading.scenario);
+}
+
+}  // namespace kdx::ctl

@@ -1,0 +1,78 @@
+#include "scenario/problems.h"
+
+#include <algorithm>
+#include <tuple>
+
+#include "base/printable.h"
+
+namespace kdx::scenario {
+
+namespace {
+
+constexpr std::size_t kMostProblems = 50;
+constexpr std::string_view kIndentation = " \t";
+
+bool isContinuation(char byte) {
+    return (static_cast<unsigned char>(byte) & 0xC0U) == 0x80U;
+}
+
+bool isControl(char byte) {
+    const auto code = static_cast<unsigned char>(byte);
+    return (code < 0x20 && byte != '\t' && byte != '\n' && byte != '\r') || code == 0x7F;
+}
+
+}  // namespace
+
+void Problems::add(std::size_t at, const std::string& sentence) {
+    if (m_found.size() >= kMostProblems) return;
+    const std::string_view before = m_text.substr(0, std::min(at, m_text.size()));
+    const std::size_t lineBegin = before.rfind('\n') + 1;  // 0 in the first line: npos + 1
+    const auto lines = std::count(before.begin(), before.end(), '\n');
+    const auto column = std::count_if(before.begin() + static_cast<std::ptrdiff_t>(lineBegin), before.end(),
+                                      [](char byte) { return !isContinuation(byte); });
+    m_found.push_back(
+        {static_cast<std::size_t>(lines) + 1, static_cast<std::size_t>(column) + 1, printable(sentence, '.')});
+}
+
+std::vector<Problem> Problems::inOrder() const {
+    std::vector<Problem> all = m_found;
+    std::stable_sort(all.begin(), all.end(), [](const Problem& left, const Problem& right) {
+        return std::tie(left.line, left.column) < std::tie(right.line, right.column);
+    });
+    return all;
+}
+
+std::size_t characterLength(std::string_view utf8) {
+    if (utf8.empty()) return 0;
+    const auto first = static_cast<unsigned char>(utf8.front());
+    if (first < 0x80) return 1;
+    const std::size_t length = first >= 0xF0 ? 4 : first >= 0xE0 ? 3 : 2;
+    if (first < 0xC2 || first > 0xF4 || utf8.size() < length) return 0;
+    if (!std::all_of(utf8.begin() + 1, utf8.begin() + static_cast<std::ptrdiff_t>(length), isContinuation)) return 0;
+    // The shortest form only, no halves of pairs, nothing beyond the last code point.
+    const auto second = static_cast<unsigned char>(utf8[1]);
+    const bool wrong = (first == 0xE0 && second < 0xA0) || (first == 0xED && second > 0x9F) ||
+                       (first == 0xF0 && second < 0x90) || (first == 0xF4 && second > 0x8F);
+    return wrong ? 0 : length;
+}
+
+void addForeignBytes(Problems& problems) {
+    const std::string_view text = problems.text();
+    bool indents = true;
+    for (std::size_t at = 0; at < text.size();) {
+        const std::size_t length = characterLength(text.substr(at));
+        if (length == 0) {
+            problems.add(at, "this is not UTF-8");
+            return;
+        }
+        if (isControl(text[at])) problems.add(at, "a control character");
+        if (indents && text[at] == '\t') {
+            problems.add(at, "a tab indents this line; YAML wants blanks");
+            indents = false;
+        }
+        if (kIndentation.find(text[at]) == std::string_view::npos) indents = text[at] == '\n';
+        at += length;
+    }
+}
+
+}  // namespace kdx::scenario

@@ -1,0 +1,51 @@
+#include "scenario/readoutrestorer.h"
+
+#include <algorithm>
+
+#include "link/commandsequence.h"
+
+namespace kdx::scenario {
+
+namespace {
+
+Readout askedFor(Instrument& instrument) {
+    const CommandSequence sequence(instrument);  // one failure ends all of it
+    return readOut(instrument);
+}
+
+}  // namespace
+
+bool ReadoutRestorer::remember() {
+    m_before = askedFor(m_instrument);
+    return std::any_of(m_before.begin(), m_before.end(),
+                       [](const Reading& reading) { return reading.value.has_value(); });
+}
+
+std::optional<SettingCommands> ReadoutRestorer::commands() {
+    const auto differences = differing();
+    return differences ? std::optional(commandsFor(*differences, m_before)) : std::nullopt;
+}
+
+std::optional<std::vector<std::string>> ReadoutRestorer::changed() {
+    const auto differences = differing();
+    if (!differences) return std::nullopt;
+    std::vector<std::string> keys;
+    for (const Difference& difference : *differences) {
+        const bool known = std::find(keys.begin(), keys.end(), difference.key) != keys.end();
+        if (!known) keys.push_back(difference.key);
+    }
+    return keys;
+}
+
+/// Nothing when the instrument gave fewer answers than before.
+std::optional<Differences> ReadoutRestorer::differing() const {
+    const Readout present = askedFor(m_instrument);
+    const Readout silent = unanswered(present);
+    const Readout silentBefore = unanswered(m_before);
+    const bool told = std::all_of(silent.begin(), silent.end(), [&](const Reading& reading) {
+        return std::find(silentBefore.begin(), silentBefore.end(), reading) != silentBefore.end();
+    });
+    return told ? std::optional(differences(m_before, present)) : std::nullopt;
+}
+
+}  // namespace kdx::scenario

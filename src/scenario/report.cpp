@@ -1,0 +1,55 @@
+#include "scenario/report.h"
+
+#include <algorithm>
+#include <string_view>
+
+#include "base/clock.h"
+#include "base/numbers.h"
+#include "settings/durablefile.h"
+
+namespace kdx::scenario {
+
+namespace {
+
+std::string field(std::string_view text) {
+    if (text.find_first_of(",\"\r\n") == std::string_view::npos) return std::string(text);
+    std::string quoted = "\"";
+    for (const char character : text) quoted.append(character == '"' ? 2 : 1, character);
+    return quoted + "\"";
+}
+
+}  // namespace
+
+std::string dateAndTime(const Clock& clock) {
+    // The day is asked before and after: over midnight it must be the one that the seconds belong to.
+    Date today = clock.today();
+    double seconds = clock.secondsSinceMidnight();
+    if (const Date after = clock.today(); after.day != today.day) {
+        today = after;
+        seconds = clock.secondsSinceMidnight();
+    }
+    // The clock's seconds are sums of fractions, so that a whole millisecond may lie a little below itself.
+    constexpr int kLastOfDay = 24 * 3600 * 1000 - 1;
+    const int milliseconds = std::min(static_cast<int>(seconds * 1000 + 0.001), kLastOfDay);
+    const int whole = milliseconds / 1000;
+    return std::to_string(today.year) + "-" + twoDigits(today.month) + "-" + twoDigits(today.day) + " " +
+           twoDigits(whole / 3600) + ":" + twoDigits(whole / 60 % 60) + ":" + twoDigits(whole % 60) + "." +
+           rightmost("00" + std::to_string(milliseconds % 1000), 3);
+}
+
+std::string csvLine(const Row& row) {
+    std::string line = field(row.time);
+    for (const std::string* text : {&row.step, &row.key, &row.value, &row.command, &row.status, &row.answer})
+        line.append(",").append(field(*text));
+    return line + "\r\n";
+}
+
+bool Report::begin() const {
+    return emptyPlainFile(m_file) && add({"time", "step", "key", "value", "command", "status", "answer"});
+}
+
+bool Report::add(const Row& row) const {
+    return appendToPlainFile(m_file, csvLine(row));
+}
+
+}  // namespace kdx::scenario

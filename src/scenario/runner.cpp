@@ -1,0 +1,285 @@
+#include "scenario/runner.h"
+
+#include <algorithm>
+#include <utility>
+
+#include "af/settings.h"
+#include "base/codepage.h"
+#include "base/printable.h"
+#include "scenario/questions.h"
+#include "settings/programstate.h"
+#include "station/session.h"
+#include "tmc/groupcode.h"
+#include "tmc/settings.h"
+
+namespace kdx::scenario {
+
+namespace {
+
+constexpr std::chrono::milliseconds kLongestSleep{50};  // who stops a run or presses Return need not wait longer
+
+using Kind = Action::Kind;
+
+std::string shown(const std::string& bytes) {
+    return toUtf8(printableLine(bytes, '.'));
+}
+
+std::string joined(const std::vector<std::string>& values) {
+    std::string text;
+    for (std::size_t i = 0; i < values.size(); ++i) text += (i == 0 ? "" : ",") + shown(values[i]);
+    return text;
+}
+
+}  // namespace
+
+Runner::Runner(const Surroundings& with) : m_with(with), m_schedule(with.clock) {
+    m_with.session.instrument.addWatcher(*this);
+}
+
+Runner::~Runner() {
+    m_with.session.instrument.removeWatcher(*this);
+}
+
+/// What is asked meanwhile is no row of the report.
+template <typename Asks>
+auto Runner::silently(Asks asks) {
+    m_questions.emplace();
+    auto answer = asks();
+    m_questions.reset();
+    return answer;
+}
+
+Outcome Runner::run(const Scenario& scenario, RunOptions options) {
+    m_options = std::move(options);
+    const bool restores = scenario.restore && m_with.restorer != nullptr;
+    const bool begins = !restores || silently([&] { return m_with.restorer->remember(); });
+    if (begins) {
+        try {
+            play(scenario);
+        } catch (...) {
+            if (restores) bringBack();
+            throw;
+        }
+        if (restores) bringBack();
+    }
+    m_with.watcher.ended(m_outcome);
+    return m_outcome;
+}
+
+void Runner::play(const Scenario& scenario) {
+    m_place = kOpening;
+    if (scenario.dataSet) m_with.session.sendOpening();
+    m_place.clear();
+    m_schedule.goOnFromNow();
+    m_outcome.complete = goesOn() && list(scenario.actions) != Flow::Ends && goesOn();
+}
+
+void Runner::bringBack() {
+    m_with.attendant.finishes();
+    m_place = kRestoring;
+    m_setting = {};
+    const auto commands = silently([&] { return m_with.restorer->commands(); });
+    for (const auto& [key, command] : commands.value_or(SettingCommands())) {
+        m_setting.first = key;
+        m_with.session.params.sendCommand(key, command);
+        if (m_with.session.instrument.LastVisaStatus != visa::kSuccess) m_outcome.restored = false;
+    }
+    const auto changed = silently([&] { return m_with.restorer->changed(); });
+    m_outcome.restored = m_outcome.restored && commands && changed;
+    m_outcome.changed = changed.value_or(std::vector<std::string>());
+}
+
+Runner::Flow Runner::list(const std::vector<Action>& actions) {
+    std::size_t begin = 1;
+    if (m_options.from) {
+        const auto& parts = m_options.from->parts;
+        const StepNumber::Part part = parts[m_number.parts.size()];
+        begin = part.step;
+        if (m_number.parts.size() + 1 == parts.size() && part.pass == 0) m_options.from.reset();
+    }
+    m_number.parts.emplace_back();
+    Flow flow = Flow::Next;
+    for (std::size_t step = begin; step <= actions.size() && flow == Flow::Next; ++step) {
+        m_number.parts.back() = {step, 0};
+        flow = one(actions[step - 1]);
+        if (flow == Flow::Next) flow = unlessReached();
+    }
+    m_number.parts.pop_back();
+    return flow;
+}
+
+Runner::Flow Runner::one(const Action& action) {
+    if (!goesOn()) return Flow::Ends;
+    m_with.watcher.begins(m_number.text(), action);
+    switch (action.kind) {
+        case Kind::Send:
+            for (const auto& [key, value] : action.settings) {
+                if (send(key, value) == Flow::Ends) return Flow::Ends;
+            }
+            return Flow::Next;
+        case Kind::Wait:
+            m_schedule.wait(action.time);
+            return waitUntil(m_schedule.due());
+        case Kind::Expect:
+            return expect(action);
+        case Kind::Sweep:
+        case Kind::Repeat:
+            return loop(action);
+        case Kind::TrafficMessage:
+            return message(action.text);
+        case Kind::Pause:
+            return pause(action);
+        case Kind::Note:
+            tell({{}, {}, kNoteRow, action.text, {}, {}, {}});
+            return afterCommand();
+    }
+    return Flow::Next;
+}
+
+Runner::Flow Runner::loop(const Action& action) {
+    std::size_t first = 1;
+    if (m_options.from) {
+        const auto& parts = m_options.from->parts;
+        first = std::max<std::size_t>(parts[m_number.parts.size() - 1].pass, 1);
+        if (m_number.parts.size() == parts.size()) m_options.from.reset();
+    }
+    const bool listens = action.untilReturn && !m_options.nobodyThere;
+    if (listens) ++m_listening;
+    const Flow flow = passes(action, first);
+    if (listens) --m_listening;
+    if (action.untilReturn && (flow == Flow::Next || flow == Flow::Returned)) {
+        // What was reached when the person pressed Return is what the loop was for.
+        const std::size_t pass = std::min(m_number.parts.back().pass, passesOf(action));
+        const bool sweeps = action.kind == Kind::Sweep;
+        tell({{},
+              {},
+              sweeps ? action.key : kRepeatRow,
+              sweeps ? action.points[pass - 1] : std::to_string(pass),
+              {},
+              flow == Flow::Returned ? kReturn : kNoReturn,
+              {}});
+    }
+    m_number.parts.back().pass = 0;
+    if (flow != Flow::Returned || !listens) return flow;
+    m_schedule.goOnFromNow();
+    return afterCommand();
+}
+
+Runner::Flow Runner::passes(const Action& action, std::size_t first) {
+    for (std::size_t number = first; number <= passesOf(action); ++number) {
+        m_number.parts.back().pass = number;
+        if (!goesOn()) return Flow::Ends;
+        Flow flow = pass(action);
+        if (flow == Flow::Next) flow = unlessReached();
+        if (flow != Flow::Next) return flow;
+    }
+    return Flow::Next;
+}
+
+/// A sweep's point lasts `time` at least, its steps included.
+Runner::Flow Runner::pass(const Action& action) {
+    const Schedule::Time begin = m_schedule.due();
+    if (action.kind == Kind::Sweep && send(action.key, action.points[m_number.parts.back().pass - 1]) == Flow::Ends)
+        return Flow::Ends;
+    const Flow flow = action.actions.empty() ? Flow::Next : list(action.actions);
+    if (flow != Flow::Next) return flow;
+    m_schedule.waitUntil(begin + action.time);
+    return waitUntil(m_schedule.due());
+}
+
+Runner::Flow Runner::send(const std::string& key, const std::string& value) {
+    // Commands about the other network are led by the PI that was sent last.
+    if (key == setting::kEonPi.sendKey) m_with.state.eonIdentifier = value;
+    m_setting = {key, value};
+    m_with.session.params.SendParam(key, std::string(value));
+    return afterCommand();
+}
+
+Runner::Flow Runner::message(const std::string& code) {
+    const bool other = m_otherVariant;
+    m_otherVariant = !m_otherVariant;
+    if (send(setting::kOpenDataAnnouncement.sendKey, announcement(other)) == Flow::Ends) return Flow::Ends;
+    return send(setting::kTrafficMessage.sendKey, sentMessage(code));
+}
+
+Runner::Flow Runner::expect(const Action& action) {
+    const Schedule::Time begin = m_with.clock.steadyNow();
+    bool waited = false;
+    for (const Action::Expectation& expectation : action.expected) {
+        Row row{{}, {}, expectation.name, joined(expectation.values), {}, {}, {}};
+        const Flow flow = askUntilMet(expectation, begin + action.time, row, waited);
+        tell(row);
+        if (row.status != kMet) ++m_outcome.unmet;
+        if (flow != Flow::Next) return flow;
+    }
+    if (waited) m_schedule.goOnFromNow();
+    return afterCommand();
+}
+
+Runner::Flow Runner::askUntilMet(const Action::Expectation& expectation, Schedule::Time deadline, Row& row,
+                                 bool& waited) {
+    for (;;) {
+        const Schedule::Time asked = m_with.clock.steadyNow();
+        const auto question = questionOf(expectation.name, m_with.state.eonIdentifier).value();
+        m_questions.emplace();
+        const auto answers = ask(m_with.session.instrument, question);
+        row.command = *std::exchange(m_questions, std::nullopt);
+        row.answer = joined(answers);
+        const bool met =
+            std::equal(answers.begin(), answers.end(), expectation.values.begin(), expectation.values.end(), isAnswer);
+        row.status = met ? kMet : kNotMet;
+        if (!goesOn()) return Flow::Ends;
+        if (met || m_with.clock.steadyNow() >= deadline) return Flow::Next;
+        waited = true;
+        if (const Flow flow = waitUntil(std::min(asked + kPollInterval, deadline)); flow != Flow::Next) return flow;
+    }
+}
+
+Runner::Flow Runner::pause(const Action& action) {
+    Row row{{}, {}, kPauseRow, action.text, {}, kGoesOn, {}};
+    Flow flow = Flow::Next;
+    if (!m_options.nobodyThere) {
+        auto pressed = Attendant::Return::NotYet;
+        while (pressed == Attendant::Return::NotYet && goesOn()) {
+            pressed = m_with.attendant.pressed();
+            if (pressed == Attendant::Return::NotYet) m_with.clock.sleep(kLongestSleep);
+        }
+        row.status = pressed == Attendant::Return::Pressed ? kReturn : kNoReturn;
+        if (pressed != Attendant::Return::Pressed) flow = Flow::Ends;
+        m_schedule.goOnFromNow();
+    }
+    tell(row);
+    return flow == Flow::Next ? afterCommand() : flow;
+}
+
+Runner::Flow Runner::waitUntil(Schedule::Time time) {
+    for (bool told = false;; told = true) {
+        if (!goesOn()) return Flow::Ends;
+        if (m_listening > 0 && m_with.attendant.pressed() == Attendant::Return::Pressed) return Flow::Returned;
+        const auto left = time - m_with.clock.steadyNow();
+        if (left.count() <= 0) return Flow::Next;
+        if (!told) m_with.watcher.waits(left);
+        m_with.clock.sleep(std::min<std::chrono::nanoseconds>(left, kLongestSleep));
+    }
+}
+
+void Runner::tell(Row row) {
+    row.time = dateAndTime(m_with.clock);
+    row.step = m_place.empty() ? m_number.text() : m_place;
+    m_with.watcher.happened(row);
+    if (m_with.report == nullptr || m_outcome.reportLost || m_with.report->add(row)) return;
+    m_outcome.reportLost = true;
+    m_with.watcher.reportLost();
+}
+
+void Runner::passed(const Traffic& traffic) {
+    if (traffic.kind != Traffic::Kind::Written) return;
+    if (m_questions) {
+        m_questions->append(m_questions->empty() ? "" : "; ").append(shown(traffic.text));
+        return;
+    }
+    const auto& [key, value] = m_setting;
+    tell({{}, {}, key, toUtf8(value), shown(traffic.text), std::to_string(traffic.status), {}});
+}
+
+}  // namespace kdx::scenario

@@ -1,0 +1,286 @@
+#include "scenario/stepreader.h"
+
+#include <array>
+#include <span>
+
+#include "coder/keyfacts.h"
+#include "scenario/decimal.h"
+#include "scenario/questions.h"
+#include "tmc/groupcode.h"
+
+namespace kdx::scenario {
+
+namespace {
+
+using Kind = Action::Kind;
+using Words = std::span<const std::string_view>;
+
+constexpr std::array<std::string_view, 6> kBesideSweep = {"from", "to", "step", "points", "dwell", "steps"};
+constexpr std::array<std::string_view, 1> kBesideRepeat = {"steps"};
+constexpr std::string_view kUntil = "until";  // beside both
+constexpr std::string_view kWithin = "within";
+
+/// The word that says what a step does.
+struct KindWord {
+    std::string_view word;
+    Kind kind;
+    Words beside = {};
+};
+constexpr std::array kKinds = {KindWord{"send", Kind::Send},
+                               KindWord{"wait", Kind::Wait},
+                               KindWord{"expect", Kind::Expect},
+                               KindWord{"sweep", Kind::Sweep, kBesideSweep},
+                               KindWord{"repeat", Kind::Repeat, kBesideRepeat},
+                               KindWord{"tmc", Kind::TrafficMessage},
+                               KindWord{"pause", Kind::Pause},
+                               KindWord{"note", Kind::Note}};
+
+const KindWord* kindOf(std::string_view word) {
+    const auto* const found =
+        std::find_if(kKinds.begin(), kKinds.end(), [word](const KindWord& kind) { return kind.word == word; });
+    return found == kKinds.end() ? nullptr : found;
+}
+
+std::vector<std::string_view> kindWords() {
+    std::vector<std::string_view> words(kKinds.size());
+    std::transform(kKinds.begin(), kKinds.end(), words.begin(), [](const KindWord& kind) { return kind.word; });
+    return words;
+}
+
+std::vector<std::string_view> wordsBeside(const KindWord& kind) {
+    std::vector<std::string_view> words{kind.word};
+    words.insert(words.end(), kind.beside.begin(), kind.beside.end());
+    if (!kind.beside.empty()) words.push_back(kUntil);
+    return words;
+}
+
+bool isKey(std::string_view key) {
+    const auto& all = keyFacts();
+    return std::any_of(all.begin(), all.end(), [key](const KeyFacts& facts) { return facts.key == key; });
+}
+
+bool isNumericKey(std::string_view key) {
+    const auto& all = keyFacts();
+    return std::any_of(all.begin(), all.end(),
+                       [key](const KeyFacts& facts) { return facts.key == key && facts.isNumber; });
+}
+
+}  // namespace
+
+const YamlNode* memberOf(const YamlNode& map, std::string_view name) {
+    const auto found = std::find_if(map.members.begin(), map.members.end(),
+                                    [name](const auto& member) { return member.first.text == name; });
+    return found == map.members.end() ? nullptr : &found->second;
+}
+
+std::vector<Action> StepReader::steps(const YamlNode& list) {
+    std::vector<Action> actions;
+    if (list.kind != YamlNode::Kind::List) {
+        m_values.wrong(list, "steps are a list: each begins with a dash, as - wait: 2 s");
+    } else if (list.items.empty()) {
+        m_values.wrong(list, "there are no steps in this list");
+    } else if (m_depth >= kDeepestNesting) {
+        m_values.wrong(list, "steps are nested " + std::to_string(kDeepestNesting) + " deep at most");
+    } else {
+        ++m_depth;
+        for (const YamlNode& item : list.items) actions.push_back(step(item));
+        --m_depth;
+    }
+    return actions;
+}
+
+Action StepReader::step(const YamlNode& node) {
+    Action action;
+    if (node.kind != YamlNode::Kind::Map || node.members.empty()) {
+        m_values.wrong(node, "a step is a word, a colon and what belongs to it, as wait: 2 s");
+        return action;
+    }
+    const auto said = std::find_if(node.members.begin(), node.members.end(),
+                                   [](const auto& member) { return kindOf(member.first.text) != nullptr; });
+    if (said == node.members.end()) {
+        m_values.wrong(node.members.front().first, unknownWord(node.members.front().first.text, kindWords()));
+        return action;
+    }
+    const KindWord& kind = *kindOf(said->first.text);
+    for (const auto& [name, value] : node.members) {
+        if (kindOf(name.text) != nullptr && name.text != kind.word) {
+            m_values.wrong(name, "a step does one thing; " + name.text + " needs a dash of its own");
+        } else if (const auto words = wordsBeside(kind); !isOneOf(words, name.text)) {
+            m_values.wrong(name, unknownWord(name.text, words));
+        }
+    }
+    const YamlNode& value = said->second;
+    action.kind = kind.kind;
+    switch (kind.kind) {
+        case Kind::Send:
+            send(value, action);
+            break;
+        case Kind::Wait:
+            action.time = m_values.time(value, kind.word).value_or(action.time);
+            break;
+        case Kind::Expect:
+            expect(value, action);
+            break;
+        case Kind::Sweep:
+            sweep(node, value, action);
+            break;
+        case Kind::Repeat:
+            repeat(node, value, action);
+            break;
+        case Kind::TrafficMessage:
+            message(value, action);
+            break;
+        case Kind::Pause:
+        case Kind::Note:
+            action.text = m_values.text(value, kind.word).value_or("");
+            break;
+    }
+    return action;
+}
+
+bool StepReader::isNames(const YamlNode& node, std::string_view word, std::string_view example) {
+    if (node.kind == YamlNode::Kind::Map && !node.members.empty()) return true;
+    m_values.wrong(node, std::string(word) + " takes names with values, as " + std::string(example));
+    return false;
+}
+
+void StepReader::send(const YamlNode& map, Action& action) {
+    if (!isNames(map, "send", "send: {PS: MESSTURM, TP: 1}")) return;
+    for (const auto& [name, value] : map.members) {
+        if (!isKey(name.text)) {
+            m_values.wrong(name, "there is no key " + name.text);
+        } else if (const auto legal = m_values.keyValue(value, name.text)) {
+            action.settings.emplace_back(name.text, *legal);
+        }
+    }
+}
+
+void StepReader::expect(const YamlNode& map, Action& action) {
+    if (!isNames(map, "expect", R"(expect: {TA: "1", within: 1 s})")) return;
+    for (const auto& [name, value] : map.members) {
+        if (name.text == kWithin) {
+            action.time = m_values.time(value, kWithin).value_or(action.time);
+        } else {
+            expectation(name.text, name, value, action);
+        }
+    }
+    if (map.members.size() == 1 && map.members.front().first.text == kWithin)
+        m_values.wrong(map, "nothing is expected here");
+}
+
+void StepReader::expectation(const std::string& name, const YamlNode& at, const YamlNode& value, Action& action) {
+    const auto question = questionOf(name, {});
+    if (!question) {
+        m_values.wrong(at, "there is no read-back and no question " + name);
+        return;
+    }
+    const std::size_t wanted = question->queries.size();
+    const std::span<const YamlNode> given =
+        value.kind == YamlNode::Kind::List ? std::span(value.items) : std::span(&value, 1);
+    if (given.size() != wanted) {
+        m_values.wrong(value, name + " has " + std::to_string(wanted) + (wanted == 1 ? " answer" : " answers") +
+                                  "; expected are " + std::to_string(given.size()));
+        return;
+    }
+    Action::Expectation expectation{name, {}};
+    for (const YamlNode& one : given) expectation.values.push_back(m_values.instrumentText(one, name).value_or(""));
+    action.expected.push_back(std::move(expectation));
+}
+
+void StepReader::sweep(const YamlNode& node, const YamlNode& key, Action& action) {
+    const auto name = m_values.text(key, "sweep");
+    if (name && !isKey(*name)) {
+        m_values.wrong(key, "there is no key " + *name);
+    } else if (name && !isNumericKey(*name)) {
+        m_values.wrong(key, *name + " is no number that could be swept");
+    } else if (name) {
+        action.key = *name;
+    }
+    pointsOf(node, action);
+    if (const YamlNode* dwell = memberOf(node, "dwell"))
+        action.time = m_values.time(*dwell, "dwell").value_or(action.time);
+    if (memberOf(node, "dwell") == nullptr && memberOf(node, "steps") == nullptr)
+        m_values.wrong(node, "a sweep needs dwell or steps, or both");
+    loop(node, action);
+}
+
+void StepReader::pointsOf(const YamlNode& node, Action& action) {
+    const YamlNode* points = memberOf(node, "points");
+    const bool ranged = std::any_of(node.members.begin(), node.members.end(), [](const auto& member) {
+        return member.first.text == "from" || member.first.text == "to" || member.first.text == "step";
+    });
+    if (points == nullptr) {
+        range(node, action);
+    } else if (ranged) {
+        m_values.wrong(*points, "a sweep has points, or from, to and step; not both");
+    } else if (points->kind != YamlNode::Kind::List || points->items.empty()) {
+        m_values.wrong(*points, "points are a list of numbers, as [60, 40, 20]");
+    } else if (points->items.size() > kMostPoints) {
+        m_values.wrong(*points, "a sweep has " + std::to_string(kMostPoints) + " points at most");
+    } else {
+        for (const YamlNode& point : points->items) {
+            const auto number = m_values.number(point, "a point");
+            if (number && (action.key.empty() || m_values.isLegal(point, action.key, point.text)))
+                action.points.push_back(point.text);
+        }
+    }
+}
+
+void StepReader::range(const YamlNode& node, Action& action) {
+    const YamlNode* const from = memberOf(node, "from");
+    const YamlNode* const to = memberOf(node, "to");
+    const YamlNode* const step = memberOf(node, "step");
+    if (from == nullptr || to == nullptr || step == nullptr) {
+        m_values.wrong(node, "a sweep needs from, to and step, or points");
+        return;
+    }
+    const auto first = m_values.number(*from, "from");
+    const auto last = m_values.number(*to, "to");
+    const auto one = m_values.number(*step, "step");
+    if (!first || !last || !one) return;
+    const bool upwards = last->millionths > first->millionths;
+    if (one->millionths == 0) {
+        m_values.wrong(*step, "with a step of 0 the sweep never ends");
+    } else if (*first != *last && upwards != (one->millionths > 0)) {
+        m_values.wrong(*step, "the step leads away from the end: " + from->text + " to " + to->text + " needs " +
+                                  (upwards ? "a step above 0" : "a step below 0"));
+    } else if (countPoints(*first, *last, *one) > kMostPoints) {
+        m_values.wrong(*step, "a sweep has " + std::to_string(kMostPoints) + " points at most, this one " +
+                                  std::to_string(countPoints(*first, *last, *one)));
+    } else if (action.key.empty() || (m_values.isLegal(*from, action.key, decimalText(*first)) &&
+                                      m_values.isLegal(*to, action.key, decimalText(*last)))) {
+        action.points = sweepPoints(*first, *last, *one);
+        // Between legal ends a point can only be wrong by its decimals, which the key may not take.
+        if (action.key.empty() || action.points.size() < 2) return;
+        (void)m_values.isLegal(*step, action.key, action.points[1]);
+    }
+}
+
+void StepReader::repeat(const YamlNode& node, const YamlNode& count, Action& action) {
+    action.passes = m_values.whole(count, "repeat", 1, kMostPasses).value_or(1);
+    if (memberOf(node, "steps") == nullptr) m_values.wrong(node, "repeat needs steps");
+    loop(node, action);
+}
+
+void StepReader::loop(const YamlNode& node, Action& action) {
+    if (const YamlNode* list = memberOf(node, "steps")) action.actions = steps(*list);
+    const YamlNode* until = memberOf(node, kUntil);
+    if (until == nullptr) return;
+    const auto what = m_values.text(*until, kUntil);
+    action.untilReturn = what == "Return";
+    if (what && !action.untilReturn) m_values.wrong(*until, "until knows Return only, not \"" + *what + "\"");
+}
+
+void StepReader::message(const YamlNode& code, Action& action) {
+    const auto digits = m_values.text(code, "tmc");
+    if (!digits) return;
+    action.text = *digits;
+    const bool hexadecimal =
+        digits->size() == kGroupCodeLength && digits->find_first_not_of("0123456789abcdefABCDEF") == std::string::npos;
+    if (!hexadecimal || digits->front() > '1') {
+        m_values.wrong(code,
+                       "tmc takes ten hexadecimal digits, the first 0 or 1, as 0B90E400CC; not \"" + *digits + "\"");
+    }
+}
+
+}  // namespace kdx::scenario

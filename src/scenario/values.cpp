@@ -1,0 +1,148 @@
+#include "scenario/values.h"
+
+#include <algorithm>
+#include <array>
+
+#include "base/codepage.h"
+#include "base/numbers.h"
+#include "coder/keyfacts.h"
+#include "scenario/scenario.h"
+
+namespace kdx::scenario {
+
+namespace {
+
+struct Unit {
+    std::string_view name;
+    std::int64_t milliseconds;
+};
+constexpr std::array kUnits = {Unit{"ms", 1}, Unit{"s", 1000}, Unit{"min", 60'000}, Unit{"h", 3'600'000}};
+constexpr std::string_view kTimes = "500 ms, 2 s, 1.5 min or 1 h";
+constexpr std::int64_t kOne = 1'000'000;  // of a decimal
+
+/// The place in the text where its first character stands that the code page does not have.
+std::size_t firstUnmappable(std::string_view utf8) {
+    for (std::size_t at = 0; at < utf8.size();) {
+        const std::size_t length = std::max<std::size_t>(characterLength(utf8.substr(at)), 1);
+        const std::string_view character = utf8.substr(at, length);
+        if (character != "?" && fromUtf8(character) == "?") return at;
+        at += length;
+    }
+    return std::string_view::npos;
+}
+
+bool isControl(char character) {
+    return static_cast<unsigned char>(character) < 0x20 || character == 0x7F;
+}
+
+std::string quoted(std::string_view text) {
+    return "\"" + std::string(text) + "\"";
+}
+
+}  // namespace
+
+std::optional<std::string> Values::text(const YamlNode& node, std::string_view name) {
+    const std::string subject(name);
+    if (node.kind == YamlNode::Kind::Nothing) {
+        wrong(node, subject + R"( has no value; an empty text is written "", a word like null in quotation marks)");
+        return std::nullopt;
+    }
+    if (node.kind != YamlNode::Kind::Text) {
+        wrong(node, subject + " takes one value, no list and no further names");
+        return std::nullopt;
+    }
+    std::string text = node.text;
+    if (text.ends_with('\n')) text.pop_back();  // a text over several lines ends so
+    if (std::any_of(text.begin(), text.end(), isControl)) {
+        wrong(node, subject + " holds a line end or another control character");
+        return std::nullopt;
+    }
+    return text;
+}
+
+std::optional<std::string> Values::instrumentText(const YamlNode& node, std::string_view name) {
+    const auto utf8 = text(node, name);
+    if (!utf8) return std::nullopt;
+    const std::size_t at = firstUnmappable(*utf8);
+    if (at == std::string_view::npos) return fromUtf8(*utf8);
+    // The very place is known when the file holds the text as it is, without escapes.
+    const std::string_view before = std::string_view(*utf8).substr(0, at);
+    const bool literal = m_problems.text().substr(std::min(node.at, m_problems.text().size())).starts_with(before);
+    const std::string character = utf8->substr(at, std::max<std::size_t>(characterLength(utf8->substr(at)), 1));
+    m_problems.add(literal ? node.at + at : node.at,
+                   std::string(name) + ": the instrument's character set (Windows-1252) has no " + character);
+    return std::nullopt;
+}
+
+std::optional<std::string> Values::keyValue(const YamlNode& node, const std::string& key) {
+    const auto& all = keyFacts();
+    const auto facts = std::find_if(all.begin(), all.end(), [&](const KeyFacts& f) { return f.key == key; });
+    const bool matters = facts == all.end() || !facts->range.empty();
+    if (!matters && node.kind == YamlNode::Kind::Nothing) return std::string();
+    auto value = instrumentText(node, key);
+    if (value && !isLegal(node, key, *value)) return std::nullopt;
+    return value;
+}
+
+std::optional<std::chrono::milliseconds> Values::time(const YamlNode& node, std::string_view name) {
+    const auto written = text(node, name);
+    if (!written) return std::nullopt;
+    const std::size_t digits = std::min(written->find_first_not_of("0123456789."), written->size());
+    const std::string_view rest = std::string_view(*written).substr(digits);
+    const std::string_view unitName = rest.substr(std::min(rest.find_first_not_of(' '), rest.size()));
+    const auto amount = readDecimal(std::string_view(*written).substr(0, digits));
+    const auto* const unit =
+        std::find_if(kUnits.begin(), kUnits.end(), [&](const Unit& known) { return known.name == unitName; });
+    if (amount && unitName.empty()) {
+        wrong(node, std::string(name) + " needs a unit: " + std::string(kTimes) + ", not " + quoted(*written));
+    } else if (!amount || unit == kUnits.end()) {
+        wrong(node, std::string(name) + " is a time: " + std::string(kTimes) + ", not " + quoted(*written));
+    } else {
+        const std::int64_t whole = amount->millionths / kOne * unit->milliseconds;
+        const std::int64_t part = amount->millionths % kOne * unit->milliseconds / kOne;
+        const std::chrono::milliseconds time(whole + part);
+        if (time.count() >= 1 && time <= kLongestTime) return time;
+        wrong(node, std::string(name) + " is 1 ms at least and 168 h at most, not " + quoted(*written));
+    }
+    return std::nullopt;
+}
+
+std::optional<unsigned> Values::whole(const YamlNode& node, std::string_view name, unsigned lowest, unsigned highest) {
+    const auto written = text(node, name);
+    if (!written) return std::nullopt;
+    const auto value = isDecimal(*written) ? readDecimal(*written) : std::nullopt;
+    if (value && value->millionths >= lowest * kOne && value->millionths <= highest * kOne)
+        return static_cast<unsigned>(value->millionths / kOne);
+    wrong(node, std::string(name) + " is a whole number, " + std::to_string(lowest) + " to " + std::to_string(highest) +
+                    ", not " + quoted(*written));
+    return std::nullopt;
+}
+
+std::optional<bool> Values::choice(const YamlNode& node, std::string_view name) {
+    const auto written = text(node, name);
+    if (!written) return std::nullopt;
+    if (*written == "true" || *written == "false") return *written == "true";
+    wrong(node, std::string(name) + " is true or false, not " + quoted(*written));
+    return std::nullopt;
+}
+
+std::optional<Decimal> Values::number(const YamlNode& node, std::string_view name) {
+    const auto written = text(node, name);
+    if (!written) return std::nullopt;
+    const auto value = readDecimal(*written);
+    if (!value) {
+        const bool comma = written->find(',') != std::string::npos;
+        wrong(node, std::string(name) + (comma ? " is a number with a decimal point, not " : " is a number, not ") +
+                        quoted(*written));
+    }
+    return value;
+}
+
+bool Values::isLegal(const YamlNode& node, const std::string& key, const std::string& value) {
+    if (m_force) return true;
+    const auto why = wrongValue(key, value);
+    if (why) wrong(node, *why);
+    return !why;
+}
+
+}  // namespace kdx::scenario

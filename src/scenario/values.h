@@ -1,0 +1,43 @@
+#pragma once
+
+#include <chrono>
+#include <cstdint>
+#include <optional>
+#include <string>
+#include <string_view>
+
+#include "scenario/decimal.h"
+#include "scenario/problems.h"
+#include "scenario/yamltree.h"
+
+namespace kdx::scenario {
+
+/// Reads single values of a document; what is wrong with them is added to the problems.
+class Values {
+public:
+    /// @param force values for the instrument need not be legal.
+    Values(Problems& problems, bool force) : m_problems(problems), m_force(force) {}
+
+    void wrong(const YamlNode& node, const std::string& sentence) { m_problems.add(node.at, sentence); }
+
+    /// A text as it is written, one line. @param name what it is the value of.
+    [[nodiscard]] std::optional<std::string> text(const YamlNode& node, std::string_view name);
+    /// The same in the instrument's characters.
+    [[nodiscard]] std::optional<std::string> instrumentText(const YamlNode& node, std::string_view name);
+    /// A value that the key's command can carry, in the instrument's characters.
+    [[nodiscard]] std::optional<std::string> keyValue(const YamlNode& node, const std::string& key);
+    /// "2 s", "500 ms", "1.5 min", "1 h".
+    [[nodiscard]] std::optional<std::chrono::milliseconds> time(const YamlNode& node, std::string_view name);
+    [[nodiscard]] std::optional<unsigned> whole(const YamlNode& node, std::string_view name, unsigned lowest,
+                                                unsigned highest);
+    [[nodiscard]] std::optional<bool> choice(const YamlNode& node, std::string_view name);
+    [[nodiscard]] std::optional<Decimal> number(const YamlNode& node, std::string_view name);
+    /// Whether the value is legal for the key, which need be no text of the file; told at the node.
+    bool isLegal(const YamlNode& node, const std::string& key, const std::string& value);
+
+private:
+    Problems& m_problems;
+    bool m_force;
+};
+
+}  // namespace kdx::scenario

@@ -1,0 +1,48 @@
+#include "scenario/report.h"
+
+#include <gtest/gtest.h>
+
+#include "scenario/playtest.h"
+
+namespace kdx::test {
+namespace {
+
+using ReportTest = PlayTest;
+using scenario::Report;
+
+TEST_F(ReportTest, AFieldIsQuotedWhereItMustBe) {
+    EXPECT_EQ(scenario::csvLine({"t", "1", "RT", "a,b", ":STEREO:DIRECT \"RT=a\"", "", "x\r\ny"}),
+              "t,1,RT,\"a,b\",\":STEREO:DIRECT \"\"RT=a\"\"\",,\"x\r\ny\"\r\n");
+}
+
+TEST_F(ReportTest, TheTimeHasItsDay) {
+    clock.set(86'399.9996);
+    EXPECT_EQ(scenario::dateAndTime(clock), "2009-03-05 23:59:59.999");
+    clock.set(61.05);
+    EXPECT_EQ(scenario::dateAndTime(clock), "2009-03-05 00:01:01.050");
+}
+
+TEST_F(ReportTest, EveryRowIsInTheFileWhenTheNextThingHappens) {
+    const Report file(folder.data() / "report.csv");
+    report = &file;
+    folder.write("report.csv", "what stood there before");
+    ASSERT_TRUE(file.begin());
+    EXPECT_EQ(folder.read("report.csv"), "time,step,key,value,command,status,answer\r\n");
+    clock.set(36000);
+    play("steps: [send: {PS: Süd}, note: \"a, b\"]");
+    EXPECT_EQ(folder.read("report.csv"),
+              "time,step,key,value,command,status,answer\r\n"
+              "2009-03-05 10:00:00.050,1,PS,Süd,\":STEREO:DIRECT \"\"PS=Süd     \"\"\",0,\r\n"
+              "2009-03-05 10:00:00.050,2,note,\"a, b\",,,\r\n");
+}
+
+TEST_F(ReportTest, OnlyAPlainFileIsWritten) {
+    EXPECT_FALSE(Report("/dev/full").begin());
+    EXPECT_FALSE(Report(folder.path()).begin());
+    EXPECT_FALSE(Report(folder.path() / "nothing" / "report.csv").begin());
+    std::filesystem::create_symlink(folder.data() / "other", folder.data() / "link");
+    EXPECT_FALSE(Report(folder.data() / "link").begin());
+}
+
+}  // namespace
+}  // namespace kdx::test
