@@ -1,5 +1,6 @@
 #include "settings/profile.h"
 
+#include "base/codepage.h"
 #include "settings/datafolder.h"
 #include "settings/profilefile.h"
 
@@ -28,13 +29,19 @@ bool Profile::holdsMore(const Place& place) const {
     return text && text->value(place.section, place.key, kLongestValue + 1).size() > kLongestValue;
 }
 
+bool Profile::hasInSetup(const Place& place) const {
+    const std::string_view section = place.section;
+    if (section != kMultiplexSection && section != kCarrierSection) return false;
+    const auto text = m_data->profile(m_file);
+    return text && text->anyKey(section, [&](std::string_view key) { return equalNoCase(key, place.key); });
+}
+
 void Profile::write(const Place& place, std::string_view value) {
     m_data->WriteIni(place.section, place.key, value, fileOf(place));
 }
 
 std::string Profile::fileOf(const Place& place) const {
-    const std::string_view section = place.section;
-    if (m_wholeSetup && (section == kMultiplexSection || section == kCarrierSection)) return m_file;
+    if (m_wholeSetup && hasInSetup(place)) return m_file;
     switch (place.file) {
         case KeptIn::General:
             return kGeneralSettings;

@@ -37,7 +37,8 @@ public:
         return {data, &number, {}};
     }
     /// The same with any file in the place of a data set's. One that has a section "FM" holds a whole set-up: the
-    /// multiplex, which data sets leave to the general settings, and the carrier come from there too.
+    /// multiplex, which data sets leave to the general settings, and the carrier come from there too, as far as it has
+    /// them.
     /// @param file absolute, or relative to the data folder.
     [[nodiscard]] static Profile ofFile(DataFolder& data, const std::filesystem::path& file);
 
@@ -51,6 +52,7 @@ private:
     Profile(DataFolder& data, const std::string* number, std::string file)
         : m_data(&data), m_dataSet(number), m_file(std::move(file)) {}
     [[nodiscard]] std::string fileOf(const Place& place) const;
+    [[nodiscard]] bool hasInSetup(const Place& place) const;
 
     DataFolder* m_data;
     const std::string* m_dataSet;

@@ -129,10 +129,19 @@ std::string valueOf(const Row& row, const std::string& answer) {
     return text;
 }
 
-/// Asks for all of them; an instrument that answered once is not broken when it keeps silent at one question.
+/// The identifiers in an answer that lists the other networks.
+std::vector<std::string> networksIn(const std::string& answer) {
+    std::vector<std::string> networks = networksToDelete(sim::unquoted(answer).value_or(answer));
+    std::erase_if(networks, [](const std::string& pi) { return pi.size() != kPiLength || !sim::isHex(pi); });
+    return networks;
+}
+
+/// Asks for all of them. Every instrument tells its name: one that does not has failed. One that keeps silent at
+/// another question does not know it, but when its answer only was late, the next one would be taken for the answer to
+/// another question: hence it tells its name once more, and when it is another one, nothing further is asked.
 class Questioner {
 public:
-    explicit Questioner(Instrument& instrument) : m_instrument(instrument) {}
+    explicit Questioner(Instrument& instrument) : m_instrument(instrument), m_name(instrument.ask(kName, false)) {}
 
     std::optional<std::string> coder(const std::string& question) {
         return ask(":STEREO:DIRECT? \"" + question + "\"");
@@ -141,6 +150,16 @@ public:
         const std::string question(row.question);
         keep(row, {}, row.generator ? ask(question + "?") : coder(question));
     }
+    void readNetworks() {
+        const auto answer = coder("EON-PI");
+        if (!answer) m_readout.push_back({std::string(kNetwork), {}, std::nullopt});
+        for (const std::string& pi : networksIn(answer.value_or(""))) readNetwork(pi);
+    }
+    [[nodiscard]] Readout take() { return std::move(m_readout); }
+
+private:
+    static constexpr const char* kName = "*IDN?";
+
     void readNetwork(const std::string& pi) {
         m_readout.push_back({std::string(kNetwork), pi, pi});
         for (const Row& row : kNetworkRows) {
@@ -149,12 +168,10 @@ public:
             keep(row, pi, coder(question));
         }
     }
-    [[nodiscard]] Readout take() { return std::move(m_readout); }
-
-private:
     std::optional<std::string> ask(const std::string& question) {
-        auto answer = m_instrument.ask(question, m_answered);
-        m_answered = m_answered || answer;
+        if (!m_name) return std::nullopt;
+        auto answer = m_instrument.ask(question, true);
+        if (!answer && m_instrument.ask(kName, false) != m_name) m_name.reset();
         return answer;
     }
     void keep(const Row& row, const std::string& network, const std::optional<std::string>& answer) {
@@ -164,16 +181,9 @@ private:
     }
 
     Instrument& m_instrument;
+    std::optional<std::string> m_name;
     Readout m_readout;
-    bool m_answered = false;
 };
-
-/// The identifiers in an answer that lists the other networks.
-std::vector<std::string> networksIn(const std::string& answer) {
-    std::vector<std::string> networks = networksToDelete(sim::unquoted(answer).value_or(answer));
-    std::erase_if(networks, [](const std::string& pi) { return pi.size() != kPiLength || !sim::isHex(pi); });
-    return networks;
-}
 
 const Reading* find(const Readout& readout, std::string_view key, std::string_view network) {
     const auto found = std::find_if(readout.begin(), readout.end(), [&](const Reading& reading) {
@@ -223,11 +233,14 @@ public:
     /// The lists replace each other as a whole.
     void addLists(const std::string& prefix, const std::string& network) {
         if (!once(prefix + network)) return;
+        std::vector<std::pair<std::string, std::string>> lists;
         for (int list = 1; list <= kAfLists; ++list) {
             const std::string key = prefix + std::to_string(list);
+            if (!isKnown(key, network)) return;
             const std::string value = valueIn(m_wanted, key, network);
-            if (!value.empty()) add(key, value, network);
+            if (!value.empty()) lists.emplace_back(key, value);
         }
+        for (const auto& [key, value] : lists) add(key, value, network);
     }
     void addNetworkValue(const std::string& key, const std::string& network) {
         const Row* row = rowOf(key);
@@ -246,9 +259,14 @@ public:
 private:
     /// True for the first time.
     bool once(const std::string& what) { return m_done.insert(what).second; }
+    /// A list or a text that was not read must not be taken for an empty one.
+    [[nodiscard]] bool isKnown(const std::string& key, const std::string& network) const {
+        const Reading* reading = find(m_wanted, key, network);
+        return reading == nullptr || reading->value;
+    }
     /// Text and numbers go out in one command.
     void addRadiotext() {
-        if (!once("RT")) return;
+        if (!isKnown("RT", {}) || !once("RT")) return;
         std::string value = valueIn(m_wanted, "RT_N");
         value = (value.empty() ? "10,0" : value) + "," + valueIn(m_wanted, "RT");
         if (value.find('"') == std::string::npos) addText("RT", coderCommand("RT=" + value));
@@ -271,7 +289,7 @@ bool mustBeginAnew(const Difference& difference) {
 Readout readOut(Instrument& instrument) {
     Questioner questioner(instrument);
     for (const Row& row : kRows) questioner.read(row);
-    for (const std::string& pi : networksIn(questioner.coder("EON-PI").value_or(""))) questioner.readNetwork(pi);
+    questioner.readNetworks();
     return questioner.take();
 }
 
@@ -283,16 +301,19 @@ Readout unanswered(const Readout& readout) {
 
 Differences differences(const Readout& wanted, const Readout& present) {
     Differences differing;
+    const bool networksKnown = find(wanted, kNetwork, {}) == nullptr && find(present, kNetwork, {}) == nullptr;
     for (const Reading& one : wanted) {
+        if (!one.network.empty() && !networksKnown) continue;
         const Reading* other = find(present, one.key, one.network);
         if (other == nullptr) {
-            if (one.key == kNetwork) differing.push_back({one.key, one.network, one.value, std::nullopt});
+            if (networksKnown && one.key == kNetwork)
+                differing.push_back({one.key, one.network, one.value, std::nullopt});
         } else if (one.value && other->value && one.value != other->value) {
             differing.push_back({one.key, one.network, one.value, other->value});
         }
     }
     for (const Reading& other : present) {
-        if (other.key == kNetwork && find(wanted, kNetwork, other.network) == nullptr)
+        if (networksKnown && other.key == kNetwork && find(wanted, kNetwork, other.network) == nullptr)
             differing.push_back({other.key, other.network, std::nullopt, other.value});
     }
     return differing;

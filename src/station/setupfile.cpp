@@ -111,12 +111,14 @@ void keep(const Readout& readout, ProfileText& text) {
     Keeper keeper(text);
     // A data set holds one other network: the one that the coder names first.
     std::string network;
+    bool networksKnown = true;
     for (const Reading& reading : readout) {
         if (network.empty()) network = reading.network;
+        if (reading.key == setting::kEonPi.sendKey && !reading.value) networksKnown = false;
         if (reading.value && (reading.network.empty() || reading.network == network))
             keeper.keep(reading.key, withoutControls(*reading.value));
     }
-    if (!network.empty()) return;
+    if (!network.empty() || !networksKnown) return;
     for (const Setting& setting : kAsRead) {
         if (std::string_view(setting.sendKey).starts_with("EON_")) keeper.keep(setting.sendKey, "");
     }

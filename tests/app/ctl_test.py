@@ -315,6 +315,20 @@ class Read(Ctl):
                                                           expect=FAILED).stderr)
 
 
+    def testARequestToEndStopsBetweenTwoQuestions(self):
+        for call in (("read", "--into", str(self.folder / "Gelesen.INI")), ("diff", "--data-set", "2")):
+            process = subprocess.Popen(self.command("--simulate", "-v", *call), stdout=subprocess.PIPE,
+                                       stderr=subprocess.PIPE, text=True)
+            for line in process.stdout:
+                if '"PI"' in line:
+                    break
+            process.send_signal(signal.SIGINT)
+            rest, problems = process.communicate(timeout=100)
+            self.assertEqual((process.returncode, problems), (FAILED, "kdx-ctl: stopped\n"))
+            self.assertLess(len(rest.splitlines()), 6)
+        self.assertFalse((self.folder / "Gelesen.INI").exists())
+
+
 class Diff(Ctl):
     def testDifferencesAreATableAndExitCode3(self):
         run = self.simulated("diff", "--data-set", "2", expect=DIFFERENT)

@@ -46,7 +46,7 @@ int diff(Laboratory& laboratory, const Diff& what) {
     }
     laboratory.close();
     if (laboratory.result() != kDone) return laboratory.result();
-    return left.empty() ? kDone : kDifferent;
+    return left.empty() && unanswered(*present).empty() ? kDone : kDifferent;
 }
 
 }  // namespace

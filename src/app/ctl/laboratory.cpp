@@ -160,6 +160,9 @@ bool Laboratory::mayBeSent(const Steps& steps) {
 
 void Laboratory::passed(const Traffic& traffic) {
     if (traffic.kind == Traffic::Kind::Logged) return;
+    // Between two questions, never between a question and its answer. What is read after that, to bring back what stood
+    // before, is read to its end.
+    if (traffic.kind == Traffic::Kind::Read && !m_stopped && isStopped()) m_session->instrument.stopSequence();
     const bool written = traffic.kind == Traffic::Kind::Written;
     const std::string text = toUtf8(printableLine(traffic.text, '.'));
     if (m_call.verbose) {

@@ -14,7 +14,7 @@ namespace kdx::ctl {
 
 namespace {
 
-/// Tells what does not come back when the file is applied. @returns whether anything would become another value.
+/// Tells what does not come back when the file is applied. @returns false when a value would become another one.
 bool tellNotKept(Laboratory& laboratory, const std::string& file, const Readout& readout) {
     Output& output = laboratory.output();
     const Profile source = Profile::ofFile(laboratory.data(), file);
@@ -22,18 +22,19 @@ bool tellNotKept(Laboratory& laboratory, const std::string& file, const Readout&
     nlohmann::json& unsent = output.document["not_sent_by_a_data_set"] = nlohmann::json::object();
     Output::Rows rows;
     for (const Reading& reading : lost.unsent) {
-        rows.push_back({"  " + reading.key, toUtf8(*reading.value), meaningOf(reading.key)});
+        rows.push_back(
+            {"  " + nameOf(reading.key, reading.network) + "=" + toUtf8(*reading.value), meaningOf(reading.key)});
         unsent[reading.key] = toUtf8(*reading.value);
     }
-    if (!rows.empty()) output.remark("no data set sends these:");
-    for (const auto& row : rows) output.remark(row[0] + "=" + row[1] + "  (" + row[2] + ")");
+    if (!rows.empty()) output.line("no data set sends these:");
+    output.table(rows);
     nlohmann::json& changed = output.document["not_kept"] = nlohmann::json::array();
     for (const auto& [key, network, wanted, present] : lost.changed) {
         output.problem(nameOf(key, network) + " is \"" + toUtf8(present.value_or("")) + "\" and does not come back: " +
                        (wanted ? "the file makes it \"" + toUtf8(*wanted) + "\"" : "a data set has no place for it"));
         changed.push_back(nameOf(key, network));
     }
-    return !lost.changed.empty();
+    return lost.changed.empty();
 }
 
 int read(Laboratory& laboratory, const std::string& into) {
@@ -58,7 +59,8 @@ int read(Laboratory& laboratory, const std::string& into) {
     }
     laboratory.output().remark("written: " + file);
     tellUnanswered(laboratory.output(), readout);
-    return tellNotKept(laboratory, file, readout) ? kDifferent : kDone;
+    const bool allComesBack = tellNotKept(laboratory, file, readout);
+    return allComesBack && unanswered(readout).empty() ? kDone : kDifferent;
 }
 
 }  // namespace
