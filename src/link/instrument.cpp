@@ -67,6 +67,7 @@ bool Instrument::read(std::string& buffer) {
 
 std::optional<std::string> Instrument::ask(const std::string& question, bool mayBeSilent) {
     constexpr std::size_t kLongestAnswer = 65536;  // one that never ends is none
+    if (m_sequenceStopped) return std::nullopt;
     Send2Gen(question);
     WriteLog("", question, "");
     WaitMs(m_clock, kCommandPauseMs);

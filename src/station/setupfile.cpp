@@ -6,6 +6,7 @@
 
 #include "af/settings.h"
 #include "base/numbers.h"
+#include "coder/keyfacts.h"
 #include "groups/settings.h"
 #include "rds/settings.h"
 #include "settings/profilefile.h"
@@ -74,6 +75,14 @@ std::string quotedWhereNeeded(const std::string& text) {
     return blank || quote ? '"' + text + '"' : text;
 }
 
+/// Whether the instrument can have the value: what a broken one says otherwise is not kept. Texts are free, and there
+/// may be no lists.
+bool isPossible(const std::string& key, const std::string& value) {
+    if (settingOf(kTexts, key) != nullptr) return true;
+    if (value.empty()) return key.starts_with("AF") || key.starts_with("EON_AF");
+    return !wrongValue(key, value);
+}
+
 class Keeper {
 public:
     explicit Keeper(ProfileText& text) : m_text(text) {}
@@ -115,8 +124,9 @@ void keep(const Readout& readout, ProfileText& text) {
     for (const Reading& reading : readout) {
         if (network.empty()) network = reading.network;
         if (reading.key == setting::kEonPi.sendKey && !reading.value) networksKnown = false;
-        if (reading.value && (reading.network.empty() || reading.network == network))
-            keeper.keep(reading.key, withoutControls(*reading.value));
+        const std::string value = withoutControls(reading.value.value_or(""));
+        if (!reading.value || !isPossible(reading.key, value)) continue;
+        if (reading.network.empty() || reading.network == network) keeper.keep(reading.key, value);
     }
     if (!network.empty() || !networksKnown) return;
     for (const Setting& setting : kAsRead) {

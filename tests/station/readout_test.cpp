@@ -212,6 +212,20 @@ TEST_F(ReadoutTest, LineBreaksInAnAnswerBecomeNoSettings) {
     EXPECT_EQ(profile("Gelesen.INI", "RDS", "PI"), "1000");
 }
 
+TEST_F(ReadoutTest, WhatNoInstrumentCanHaveIsNotKept) {
+    Readout readout = lab.readout();
+    for (Reading& reading : readout) {
+        if (reading.key == "PI" || reading.key == "STEREO_MODE") reading.value = "";
+        if (reading.key == "HF-Frequenz") reading.value = "A\"B;*RST";
+    }
+    ProfileText text("[RDS]\r\nPI=D3C2\r\n");
+    keep(readout, text);
+    EXPECT_EQ(text.value("RDS", "PI"), "D3C2");
+    EXPECT_EQ(text.value("FM", "Stereo_Mode"), "");
+    EXPECT_EQ(text.value("VRN", "HF_Frequenz"), "");
+    EXPECT_EQ(text.value("VRN", "HF_Pegel"), "60");
+}
+
 TEST_F(ReadoutTest, BlanksAtTheEdgeAndQuotesComeBack) {
     for (const char* text : {"  AB", "'AB'", " A' B"}) {
         lab.send("PS", text);
