@@ -15,8 +15,8 @@ CTL = COMPLETION = ""
 SCRIPT = """
 source "$1"; shift
 eval "$(complete -p kdx-ctl | sed 's/^complete -F \\([a-z_]*\\) .*/function=\\1/')"
-COMP_WORDS=("$@") COMP_CWORD=$(($# - 1))
-"$function" "$1" "${COMP_WORDS[COMP_CWORD]}" "${COMP_WORDS[COMP_CWORD-1]}"
+COMP_LINE="$*" COMP_POINT=${#COMP_LINE}
+"$function"
 printf '%s\\n' "${COMPREPLY[@]}"
 """
 
@@ -39,6 +39,7 @@ class Completion(unittest.TestCase):
         self.assertEqual(self.complete(""), self.subcommands())
         self.assertEqual(self.complete("--simulate", "--timeout", "3", "qu"), ["query"])
         self.assertEqual(self.complete("--lan", "send", "qu"), ["query"])
+        self.assertEqual(self.complete("--lan=127.0.0.1", "qu"), ["query"])
 
     def testEveryOptionOfTheHelpIsOffered(self):
         own = set(re.findall(r"(?m)^  (?:-\w,)?(--[a-z-]+)", self.help()))
@@ -60,8 +61,11 @@ class Completion(unittest.TestCase):
         keys = self.complete("send", "")
         self.assertEqual(len(keys), 60)
         self.assertEqual(self.complete("send", "TP=1", "HF-F"), ["HF-Frequenz="])
-        self.assertEqual(self.complete("send", "PS", "="), [])
-        self.assertEqual(self.complete("send", "PS", "=", "A"), [])
+        self.assertEqual(self.complete("send", "PS="), [])
+        self.assertEqual(self.complete("send", "PS=A"), [])
+        self.assertEqual(self.complete("send", "HF"), ["HF:PEGEL:STATE=", "HF-Frequenz=", "HF-Pegel="])
+        self.assertEqual(self.complete("send", "HF:PE"), ["PEGEL:STATE="])
+        self.assertEqual(self.complete("send", "HF:PEGEL:"), ["STATE="])
         self.assertEqual(self.complete("query", "freq"), ["frequency"])
         self.assertEqual(len(self.complete("query", "")), 21)
         self.assertEqual(self.complete("query", "--raw", "freq"), ["frequency"])
@@ -75,6 +79,7 @@ class Completion(unittest.TestCase):
             os.mkdir(os.path.join(folder, "lab"))
             open(os.path.join(folder, "lab.INI"), "w").close()
             self.assertEqual(sorted(self.complete("apply", "--file", "la", folder=folder)), ["lab", "lab.INI"])
+            self.assertEqual(sorted(self.complete("apply", "--file=la", folder=folder)), ["lab", "lab.INI"])
             self.assertEqual(self.complete("--app-folder", "la", folder=folder), ["lab"])
             self.assertEqual(sorted(self.complete("replay", "la", folder=folder)), ["lab", "lab.INI"])
 
