@@ -111,6 +111,22 @@ class Calls(Ctl):
                 self.assertEqual([byte for byte in run.stdout + run.stderr if byte < 0x20 and byte != 0x0A], [])
                 run.stderr.decode()
 
+    def testACharacterThatTheInstrumentDoesNotHaveIsToldBeforeAnythingIsSent(self):
+        for call in (("PS=日本",), ("--raw", ":OUTP 日"), ("--coder", "PS=日")):
+            with self.subTest(call):
+                run = self.simulated("-v", "send", "TP=1", *call, expect=WRONG_CALL)
+                self.assertIn("(Windows-1252) has no 日", run.stderr)
+                self.assertEqual(run.stdout, "")
+        for call in ((b"PS=\xff",), (b"--raw", b"\xff")):
+            with self.subTest(call):
+                run = self.simulated("send", *call, expect=WRONG_CALL)
+                self.assertIn(r"its byte \xFF is no UTF-8", run.stderr)
+        self.assertEqual(self.sent("--force", "send", "PS=日本"), [':STEREO:DIRECT "PS=??      "'])
+
+    def testAnUnknownKeyIsToldAlsoWithForce(self):
+        run = self.simulated("--force", "send", "XY=1", expect=WRONG_CALL)
+        self.assertIn("there is no key XY", run.stderr)
+
     def testALogThatCannotBeWrittenIsToldOnce(self):
         (self.folder / "Daten" / "RDS_log.txt").mkdir()
         run = self.simulated("send", "PS=RADIO", "TP=1")

@@ -139,9 +139,10 @@ bool Laboratory::goesOn() {
     return !isStopped() && (!m_failed || m_call.continues);
 }
 
-bool Laboratory::mayBeSent(const std::string& key, const std::string& value) {
-    if (m_call.force) return true;
-    const auto wrong = wrongValue(key, value);
+bool Laboratory::mayBeSent(const std::string& key, const std::string& utf8) {
+    // There is nothing that could be sent for an unknown key.
+    if (m_call.force && isParameter(key)) return true;
+    const auto wrong = wrongTypedValue(key, utf8);
     if (wrong) m_output.problem(*wrong);
     return !wrong;
 }
