@@ -3,6 +3,8 @@
 #include <algorithm>
 #include <array>
 
+#include "base/printable.h"
+
 namespace kdx {
 
 namespace {
@@ -26,6 +28,10 @@ char upper(char c) {
     if (byte == 0x9A || byte == 0x9C || byte == 0x9E) return static_cast<char>(byte - 0x10);
     if (byte == 0xFF) return static_cast<char>(0x9F);
     return c;
+}
+
+bool isContinuation(char byte) {
+    return (static_cast<unsigned char>(byte) & 0xC0U) == 0x80U;
 }
 
 }  // namespace
@@ -59,21 +65,39 @@ std::string fromUtf8(std::string_view text) {
     return bytes;
 }
 
+std::size_t characterLength(std::string_view utf8) {
+    if (utf8.empty()) return 0;
+    const auto first = static_cast<unsigned char>(utf8.front());
+    if (first < 0x80) return 1;
+    const std::size_t length = first >= 0xF0 ? 4 : first >= 0xE0 ? 3 : 2;
+    if (first < 0xC2 || first > 0xF4 || utf8.size() < length) return 0;
+    if (!std::all_of(utf8.begin() + 1, utf8.begin() + static_cast<std::ptrdiff_t>(length), isContinuation)) return 0;
+    // The shortest form only, no halves of pairs, nothing beyond the last code point.
+    const auto second = static_cast<unsigned char>(utf8[1]);
+    const bool wrong = (first == 0xE0 && second < 0xA0) || (first == 0xED && second > 0x9F) ||
+                       (first == 0xF0 && second < 0x90) || (first == 0xF4 && second > 0x8F);
+    return wrong ? 0 : length;
+}
+
+std::string_view firstOutsideCodePage(std::string_view utf8) {
+    while (!utf8.empty()) {
+        const std::string_view character = utf8.substr(0, std::max<std::size_t>(characterLength(utf8), 1));
+        if (character != "?" && fromUtf8(character) == "?") return character;
+        utf8.remove_prefix(character.size());
+    }
+    return {};
+}
+
+std::string noSuchCharacter(std::string_view foreign) {
+    if (isUtf8(foreign)) return "the instrument's character set (Windows-1252) has no " + std::string(foreign);
+    return "its byte " + printable(foreign) + " is no UTF-8";
+}
+
 bool isUtf8(std::string_view text) {
-    // The least code point that takes so many bytes: a longer form of a smaller one is none.
-    constexpr std::array<unsigned, 5> kLeast = {0, 0, 0x80, 0x800, 0x10000};
-    for (std::size_t at = 0; at < text.size();) {
-        const auto lead = static_cast<unsigned char>(text[at]);
-        const std::size_t length = lead < 0x80 ? 1 : lead < 0xC0 ? 0 : lead < 0xE0 ? 2 : lead < 0xF0 ? 3 : 4;
-        if (length == 0 || length > text.size() - at) return false;
-        unsigned code = length == 1 ? lead : lead & (0x7FU >> length);
-        for (const char next : text.substr(at + 1, length - 1)) {
-            if ((static_cast<unsigned char>(next) & 0xC0U) != 0x80) return false;
-            code = code << 6U | (static_cast<unsigned char>(next) & 0x3FU);
-        }
-        const bool surrogate = code >= 0xD800 && code <= 0xDFFF;
-        if (code < kLeast[length] || code > 0x10FFFF || surrogate || lead > 0xF4) return false;
-        at += length;
+    while (!text.empty()) {
+        const std::size_t length = characterLength(text);
+        if (length == 0) return false;
+        text.remove_prefix(length);
     }
     return true;
 }

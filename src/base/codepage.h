@@ -1,5 +1,6 @@
 #pragma once
 
+#include <cstddef>
 #include <string>
 #include <string_view>
 
@@ -14,6 +15,16 @@ namespace kdx {
 
 /// UTF-8 text in Windows-1252; '?' for each character or stray byte that the code page does not have.
 [[nodiscard]] std::string fromUtf8(std::string_view text);
+
+/// How many bytes the UTF-8 character takes that the text begins with; 0 when it begins with none.
+[[nodiscard]] std::size_t characterLength(std::string_view utf8);
+
+/// The first character of the UTF-8 text that the code page does not have, or a byte that belongs to none; empty when
+/// fromUtf8() keeps the text whole. A part of the text.
+[[nodiscard]] std::string_view firstOutsideCodePage(std::string_view utf8);
+
+/// The sentence about it, in UTF-8.
+[[nodiscard]] std::string noSuchCharacter(std::string_view foreign);
 
 /// Whether the bytes are whole characters of UTF-8.
 [[nodiscard]] bool isUtf8(std::string_view text);

@@ -234,6 +234,22 @@ std::optional<std::string> problem(const Row& row, std::string_view value) {
     return std::nullopt;
 }
 
+const Row* rowOf(std::string_view key) {
+    const auto* const row = std::find_if(kRows.begin(), kRows.end(), [key](const Row& r) { return r.key == key; });
+    return row == kRows.end() ? nullptr : row;
+}
+
+std::string noSuchKey(std::string_view key) {
+    return "there is no key " + std::string(key);
+}
+
+std::string sentence(const Row& row, std::string_view utf8, const std::string& why) {
+    std::string text = std::string(row.key).append(" cannot be \"").append(utf8).append("\"");
+    if (!why.empty()) text += ": " + why;
+    const std::string legal = range(row);
+    return text + (legal.empty() ? "." : ". Legal: " + legal + ".");
+}
+
 }  // namespace
 
 const std::vector<KeyFacts>& keyFacts() {
@@ -248,13 +264,18 @@ const std::vector<KeyFacts>& keyFacts() {
 }
 
 std::optional<std::string> wrongValue(std::string_view key, std::string_view value) {
-    const auto* const row = std::find_if(kRows.begin(), kRows.end(), [key](const Row& r) { return r.key == key; });
-    if (row == kRows.end()) return "there is no key " + std::string(key);
+    const Row* const row = rowOf(key);
+    if (row == nullptr) return noSuchKey(key);
     const auto why = problem(*row, value);
-    if (!why) return std::nullopt;
-    std::string text = std::string(key) + " cannot be \"" + toUtf8(std::string(value)) + "\"";
-    if (!why->empty()) text += ": " + *why;
-    return text + ". Legal: " + range(*row) + ".";
+    return why ? std::optional(sentence(*row, toUtf8(value), *why)) : std::nullopt;
+}
+
+std::optional<std::string> wrongTypedValue(std::string_view key, std::string_view utf8) {
+    const Row* const row = rowOf(key);
+    if (row == nullptr) return noSuchKey(key);
+    const std::string_view foreign = firstOutsideCodePage(utf8);
+    if (foreign.empty()) return wrongValue(key, fromUtf8(utf8));
+    return sentence(*row, utf8, noSuchCharacter(foreign));
 }
 
 }  // namespace kdx

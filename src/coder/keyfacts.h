@@ -22,4 +22,7 @@ struct KeyFacts {
 /// An unknown key is wrong too. Values are 8-bit Windows-1252; the sentence is UTF-8.
 [[nodiscard]] std::optional<std::string> wrongValue(std::string_view key, std::string_view value);
 
+/// The same for a value in UTF-8, as it is typed; one that the code page cannot hold is wrong too.
+[[nodiscard]] std::optional<std::string> wrongTypedValue(std::string_view key, std::string_view utf8);
+
 }  // namespace kdx

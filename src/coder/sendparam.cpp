@@ -259,6 +259,12 @@ bool endsItsTextEarly(std::string_view command) {
     return command.starts_with(kCoderCommand) && std::count(command.begin(), command.end(), '"') > 2;
 }
 
+bool leavesItsTextOpen(std::string_view command) {
+    if (!command.starts_with(kCoderCommand)) return false;
+    const std::string_view text = command.substr(kCoderCommand.size());
+    return text.size() < 2 || !text.starts_with('"') || !text.ends_with('"');
+}
+
 ParamSender::ParamSender(Instrument& instrument, ProgramState& state, Clock& clock, std::function<void()> endProgram)
     : m_instrument(instrument), m_state(state), m_clock(clock), m_endProgram(std::move(endProgram)) {}
 

@@ -37,6 +37,9 @@ struct ParamContext {
 /// refuses the rest, or takes it for a command of its own.
 [[nodiscard]] bool endsItsTextEarly(std::string_view command);
 
+/// Whether the command's text for the coder lacks its end, as when only the beginning was kept.
+[[nodiscard]] bool leavesItsTextOpen(std::string_view command);
+
 /// Whether the key table has a row for the key.
 [[nodiscard]] bool isParameter(std::string_view key);
 

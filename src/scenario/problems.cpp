@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <tuple>
 
+#include "base/codepage.h"
 #include "base/printable.h"
 
 namespace kdx::scenario {
@@ -40,20 +41,6 @@ std::vector<Problem> Problems::inOrder() const {
         return std::tie(left.line, left.column) < std::tie(right.line, right.column);
     });
     return all;
-}
-
-std::size_t characterLength(std::string_view utf8) {
-    if (utf8.empty()) return 0;
-    const auto first = static_cast<unsigned char>(utf8.front());
-    if (first < 0x80) return 1;
-    const std::size_t length = first >= 0xF0 ? 4 : first >= 0xE0 ? 3 : 2;
-    if (first < 0xC2 || first > 0xF4 || utf8.size() < length) return 0;
-    if (!std::all_of(utf8.begin() + 1, utf8.begin() + static_cast<std::ptrdiff_t>(length), isContinuation)) return 0;
-    // The shortest form only, no halves of pairs, nothing beyond the last code point.
-    const auto second = static_cast<unsigned char>(utf8[1]);
-    const bool wrong = (first == 0xE0 && second < 0xA0) || (first == 0xED && second > 0x9F) ||
-                       (first == 0xF0 && second < 0x90) || (first == 0xF4 && second > 0x8F);
-    return wrong ? 0 : length;
 }
 
 void addForeignBytes(Problems& problems) {

@@ -34,9 +34,6 @@ private:
     std::vector<Problem> m_found;
 };
 
-/// How many bytes the UTF-8 character takes that the text begins with; 0 when it begins with none.
-[[nodiscard]] std::size_t characterLength(std::string_view utf8);
-
 /// Adds what keeps the text from being read as lines of UTF-8: the first byte that is none, control characters, lines
 /// indented with a tab.
 void addForeignBytes(Problems& problems);

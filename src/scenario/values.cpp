@@ -20,17 +20,6 @@ constexpr std::array kUnits = {Unit{"ms", 1}, Unit{"s", 1000}, Unit{"min", 60'00
 constexpr std::string_view kTimes = "500 ms, 2 s, 1.5 min or 1 h";
 constexpr std::int64_t kOne = 1'000'000;  // of a decimal
 
-/// The place in the text where its first character stands that the code page does not have.
-std::size_t firstUnmappable(std::string_view utf8) {
-    for (std::size_t at = 0; at < utf8.size();) {
-        const std::size_t length = std::max<std::size_t>(characterLength(utf8.substr(at)), 1);
-        const std::string_view character = utf8.substr(at, length);
-        if (character != "?" && fromUtf8(character) == "?") return at;
-        at += length;
-    }
-    return std::string_view::npos;
-}
-
 bool isControl(char character) {
     return static_cast<unsigned char>(character) < 0x20 || character == 0x7F;
 }
@@ -63,14 +52,13 @@ std::optional<std::string> Values::text(const YamlNode& node, std::string_view n
 std::optional<std::string> Values::instrumentText(const YamlNode& node, std::string_view name) {
     const auto utf8 = text(node, name);
     if (!utf8) return std::nullopt;
-    const std::size_t at = firstUnmappable(*utf8);
-    if (at == std::string_view::npos) return fromUtf8(*utf8);
+    const std::string_view foreign = firstOutsideCodePage(*utf8);
+    if (foreign.empty()) return fromUtf8(*utf8);
     // The very place is known when the file holds the text as it is, without escapes.
+    const auto at = static_cast<std::size_t>(foreign.data() - utf8->data());
     const std::string_view before = std::string_view(*utf8).substr(0, at);
     const bool literal = m_problems.text().substr(std::min(node.at, m_problems.text().size())).starts_with(before);
-    const std::string character = utf8->substr(at, std::max<std::size_t>(characterLength(utf8->substr(at)), 1));
-    m_problems.add(literal ? node.at + at : node.at,
-                   std::string(name) + ": the instrument's character set (Windows-1252) has no " + character);
+    m_problems.add(literal ? node.at + at : node.at, std::string(name) + ": " + noSuchCharacter(foreign));
     return std::nullopt;
 }
 

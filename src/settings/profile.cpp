@@ -40,6 +40,11 @@ void Profile::write(const Place& place, std::string_view value) {
     m_data->WriteIni(place.section, place.key, value, fileOf(place));
 }
 
+bool Profile::hasSectionOf(const Place& place) const {
+    const auto text = m_data->profile(fileOf(place));
+    return text && text->anyKey(place.section, [](std::string_view) { return true; });
+}
+
 std::string Profile::fileOf(const Place& place) const {
     if (m_wholeSetup && hasInSetup(place)) return m_file;
     switch (place.file) {

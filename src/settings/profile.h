@@ -47,11 +47,14 @@ public:
     /// Whether more is stored there than read() gives.
     [[nodiscard]] bool holdsMore(const Place& place) const;
     void write(const Place& place, std::string_view value);
+    /// The name of the file that the place is in, as DataFolder takes it.
+    [[nodiscard]] std::string fileOf(const Place& place) const;
+    /// Whether that file has any setting in the place's section.
+    [[nodiscard]] bool hasSectionOf(const Place& place) const;
 
 private:
     Profile(DataFolder& data, const std::string* number, std::string file)
         : m_data(&data), m_dataSet(number), m_file(std::move(file)) {}
-    [[nodiscard]] std::string fileOf(const Place& place) const;
     [[nodiscard]] bool hasInSetup(const Place& place) const;
 
     DataFolder* m_data;

@@ -111,6 +111,22 @@ class Calls(Ctl):
                 self.assertEqual([byte for byte in run.stdout + run.stderr if byte < 0x20 and byte != 0x0A], [])
                 run.stderr.decode()
 
+    def testACharacterThatTheInstrumentDoesNotHaveIsToldBeforeAnythingIsSent(self):
+        for call in (("PS=日本",), ("--raw", ":OUTP 日"), ("--coder", "PS=日")):
+            with self.subTest(call):
+                run = self.simulated("-v", "send", "TP=1", *call, expect=WRONG_CALL)
+                self.assertIn("(Windows-1252) has no 日", run.stderr)
+                self.assertEqual(run.stdout, "")
+        for call in ((b"PS=\xff",), (b"--raw", b"\xff")):
+            with self.subTest(call):
+                run = self.simulated("send", *call, expect=WRONG_CALL)
+                self.assertIn(r"its byte \xFF is no UTF-8", run.stderr)
+        self.assertEqual(self.sent("--force", "send", "PS=日本"), [':STEREO:DIRECT "PS=??      "'])
+
+    def testAnUnknownKeyIsToldAlsoWithForce(self):
+        run = self.simulated("--force", "send", "XY=1", expect=WRONG_CALL)
+        self.assertIn("there is no key XY", run.stderr)
+
     def testALogThatCannotBeWrittenIsToldOnce(self):
         (self.folder / "Daten" / "RDS_log.txt").mkdir()
         run = self.simulated("send", "PS=RADIO", "TP=1")
@@ -187,6 +203,35 @@ class Apply(Ctl):
         for key in ("PS", "PI", "PTY"):
             self.assertIn(f"kdx-ctl: {key} cannot be", run.stderr)
         self.assertIn(':STEREO:DIRECT "PS=A"B     "', self.sent("--force", "apply", "--file", file))
+
+    def testWhatSendingWouldMakeSomethingElseOfIsNamedWithItsPlace(self):
+        file = self.write("bad.ini", "[RDS]\r\nPI=1234\r\nPTY=77\r\nMS=Q\r\n[FM]\r\nPREEMPHASIS=7\r\nRDS=2\r\n"
+                          "MPX_DEV=99999999\r\n")
+        for options in ((), ("--dry-run",)):
+            run = self.simulated("-v", "apply", *options, "--file", file, expect=WRONG_CALL)
+            self.assertEqual(run.stdout, "")
+            for place in ("[RDS] PTY=77", "[RDS] MS=Q", "[FM] PREEMPHASIS=7", "[FM] RDS=2", "[FM] MPX_DEV=99999999"):
+                self.assertIn(" Legal: ", run.stderr)
+                self.assertIn(f"It stands in {file}, {place}.", run.stderr)
+        self.assertIn(":stereo:rds:state OFF", self.sent("--force", "apply", "--file", file))
+        text = (self.folder / "Daten" / "RDS_Allg.INI").read_bytes()
+        (self.folder / "Daten" / "RDS_Allg.INI").write_bytes(text.replace(b"PILOT=1", b"PILOT=x"))
+        run = self.simulated("apply", "--data-set", "2", expect=WRONG_CALL)
+        self.assertIn('PILOT cannot be "x". Legal: 0 or 1. It stands in RDS_Allg.INI, [FM] PILOT=x.', run.stderr)
+
+    def testAFileThatHoldsNoDataSetIsExitCode2(self):
+        for name, text in (("README.md", "# A programme\n"), ("empty.ini", ""), ("binary", "\x00\x01[RDS\x00"),
+                           ("other.ini", "[FM]\r\nRDS=1\r\n")):
+            for call in ("apply", "diff"):
+                run = self.simulated("-v", call, "--file", self.write(name, text), expect=WRONG_CALL)
+                self.assertEqual(run.stdout, "")
+                self.assertIn(f"{name} holds no data set: it has no section [RDS]", run.stderr)
+
+    def testAMissingPiIsTold(self):
+        file = self.write("lab.ini", "[RDS]\r\nPS=RADIO\r\n")
+        run = self.simulated("apply", "--file", file, expect=WRONG_CALL)
+        self.assertIn('PI cannot be "". Legal: four hexadecimal digits.', run.stderr)
+        self.assertIn(':STEREO:DIRECT "PI=    "', self.sent("--force", "apply", "--file", file))
 
 
 class Send(Ctl):
@@ -270,8 +315,8 @@ class Replay(Ctl):
         log = self.write("log.txt", self.LOG + "what is this\r\n" + self.LOG + "PS=1\r\n")
         run = self.simulated("-v", "replay", log, expect=WRONG_CALL)
         self.assertEqual(run.stdout, "")
-        self.assertIn("line 5: not a line of a command log", run.stderr)
-        self.assertIn("line 10: not a line of a command log", run.stderr)
+        self.assertIn("line 6: not a line of a command log", run.stderr)
+        self.assertIn("line 12: not a line of a command log", run.stderr)
 
     def testALineThatADoubleQuoteEndsIsNamedAndNothingIsSent(self):
         bad = ':STEREO:DIRECT "PS=x";*RST"'
@@ -280,7 +325,7 @@ class Replay(Ctl):
             run = self.simulated("-v", "replay", *options, log, expect=WRONG_CALL)
             self.assertEqual(run.stdout, "")
             self.assertEqual(run.stderr.count("\n"), 1)
-            self.assertIn("line 5: a double quote ends the coder command early", run.stderr)
+            self.assertIn("line 6: a double quote ends the coder command early", run.stderr)
         self.assertEqual(self.sent("--force", "replay", log)[-1], bad)
 
     def testAMissingLogIsExitCode2(self):

@@ -48,5 +48,14 @@ TEST(CodePage, KnowsWholeCharactersOfUtf8) {
     }
 }
 
+TEST(CodePage, TheFirstCharacterOutsideItIsFound) {
+    EXPECT_EQ(firstOutsideCodePage(""), "");
+    EXPECT_EQ(firstOutsideCodePage("What? Käse für 5 €"), "");
+    EXPECT_EQ(firstOutsideCodePage("Käse 日本"), "日");
+    EXPECT_EQ(firstOutsideCodePage("\U0001F4FB"), "\U0001F4FB");
+    EXPECT_EQ(firstOutsideCodePage("ä\xFF\xE6"), "\xFF");
+    EXPECT_EQ(firstOutsideCodePage("\xE6\x97"), "\xE6");
+}
+
 }  // namespace
 }  // namespace kdx

@@ -145,5 +145,19 @@ TEST(RdsCodeTest, FollowsTheBasicCharacterSet) {
     EXPECT_EQ(rdsCode('\x99'), std::nullopt);
 }
 
+TEST(WrongTypedValueTest, NamesTheCharacterThatTheInstrumentDoesNotHave) {
+    EXPECT_EQ(
+        wrongTypedValue("PS", "日本"),
+        "PS cannot be \"日本\": the instrument's character set (Windows-1252) has no 日. Legal: at most 8 characters "
+        "of the RDS character set, no double quote.");
+    EXPECT_EQ(
+        wrongTypedValue("PS", "K\xFF"),
+        "PS cannot be \"K\xFF\": its byte \\xFF is no UTF-8. Legal: at most 8 characters of the RDS character set, "
+        "no double quote.");
+    EXPECT_EQ(wrongTypedValue("PS", "Käse?"), std::nullopt);
+    EXPECT_EQ(wrongTypedValue("PTY", "32"), wrongValue("PTY", "32"));
+    EXPECT_EQ(wrongTypedValue("XY", "日"), "there is no key XY");
+}
+
 }  // namespace
 }  // namespace kdx

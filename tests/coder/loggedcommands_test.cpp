@@ -42,6 +42,51 @@ TEST(ReadLoggedCommandsTest, NamesEachLineThatNoProgramOfOursHasWritten) {
     EXPECT_EQ(logged.commands.size(), 2U);
 }
 
+TEST(ReadLoggedCommandsTest, TakesLinesThatEndWithALineFeedAlone) {
+    const auto logged = readLoggedCommands(
+        "             PS= \":STEREO:DIRECT \"PS=RADIO   \"\"\n"
+        "            PS?= Answer \"\"RADIO   \"\n        \"\n"
+        "        Antwort= what ever\n"
+        "             TP= \"TP ON\"\n");
+    EXPECT_EQ(logged.unreadableLines, Numbers());
+    EXPECT_EQ(logged.commands, (Commands{{"PS", R"(:STEREO:DIRECT "PS=RADIO   ")"}, {"TP", "TP ON"}}));
+}
+
+TEST(ReadLoggedCommandsTest, NamesEachCommandThatIsNotWhole) {
+    const std::string whole = "             PS= \":STEREO:DIRECT \"PS=RADIO   \"\"";
+    const std::string key = "             PS= ";
+    for (std::size_t length = 1; length < whole.size(); ++length) {
+        SCOPED_TRACE(length);
+        const auto atEnd = readLoggedCommands(whole + "\r\n" + whole.substr(0, length));
+        EXPECT_EQ(atEnd.commands.size(), 1U);
+        EXPECT_EQ(atEnd.unreadableLines, Numbers{2});
+        if (length == key.size()) continue;  // with a line end that is an empty command
+        const auto between = readLoggedCommands(whole.substr(0, length) + "\r\n" + whole + "\r\n");
+        EXPECT_EQ(between.commands.size(), 1U);
+        EXPECT_EQ(between.unreadableLines, Numbers{1});
+    }
+    EXPECT_EQ(readLoggedCommands(whole).commands.size(), 1U);
+}
+
+TEST(ReadLoggedCommandsTest, AnAnswerThatDoesNotEndIsNamedAndSwallowsNoCommand) {
+    for (const std::string end : {"\n", "\r\n"}) {
+        const std::string good = "             TP= \"TP ON\"" + end;
+        for (const std::string cut : {"Answer \"", "Answer \"98"}) {
+            const auto logged = readLoggedCommands("           FREQ= " + cut + end + good);
+            EXPECT_EQ(logged.unreadableLines, Numbers{1});
+            EXPECT_EQ(logged.commands, (Commands{{"TP", "TP ON"}}));
+            EXPECT_EQ(readLoggedCommands(good + "           FREQ= " + cut).unreadableLines, Numbers{2});
+        }
+    }
+}
+
+TEST(ReadLoggedCommandsTest, LinesThatShowWhatEverAreNoCommands) {
+    const auto logged =
+        readLoggedCommands("             PS= what ever\r\n             PS= a \"b\"\r\n             PS= \r\n");
+    EXPECT_EQ(logged.unreadableLines, Numbers());
+    EXPECT_EQ(logged.commands, Commands());
+}
+
 TEST(ReadLoggedCommandsTest, AnEmptyLogHasNone) {
     EXPECT_TRUE(readLoggedCommands("").commands.empty());
     EXPECT_TRUE(readLoggedCommands("").unreadableLines.empty());

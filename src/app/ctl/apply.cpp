@@ -22,8 +22,8 @@ int apply(Laboratory& laboratory, const Apply& what) {
     Session& session = laboratory.session();
     const auto source = what.source.profile(laboratory);
     if (!source) return kWrongCall;
+    if (!laboratory.mayBeSent(*source)) return kWrongCall;
     session.load(*source);
-    if (!laboratory.mayBeSent(openingSteps(session.station))) return kWrongCall;
     if (what.dryRun) {
         Rehearsal rehearsal(laboratory.data(), laboratory.captions());
         rehearsal.apply(*source);

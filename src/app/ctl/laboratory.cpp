@@ -14,6 +14,7 @@
 #include "settings/generalsettings.h"
 #include "settings/withoutcontrols.h"
 #include "sim/virtualinstrument.h"
+#include "station/wrongsettings.h"
 
 namespace kdx::ctl {
 
@@ -139,23 +140,19 @@ bool Laboratory::goesOn() {
     return !isStopped() && (!m_failed || m_call.continues);
 }
 
-bool Laboratory::mayBeSent(const std::string& key, const std::string& value) {
-    if (m_call.force) return true;
-    const auto wrong = wrongValue(key, value);
+bool Laboratory::mayBeSent(const std::string& key, const std::string& utf8) {
+    // There is nothing that could be sent for an unknown key.
+    if (m_call.force && isParameter(key)) return true;
+    const auto wrong = wrongTypedValue(key, utf8);
     if (wrong) m_output.problem(*wrong);
     return !wrong;
 }
 
-// What a data set does not say, and what the program has no command for, is sent empty as it always was.
-bool Laboratory::mayBeSent(const Steps& steps) {
-    bool legal = true;
-    for (const Step& step : steps) {
-        std::string value = step.value;
-        if (step.kind != Step::Kind::Parameter || value.empty()) continue;
-        if (composeCommand(step.key, value, {}).value_or("").empty()) continue;
-        if (!mayBeSent(step.key, step.value)) legal = false;
-    }
-    return legal;
+bool Laboratory::mayBeSent(const Profile& source) {
+    if (m_call.force) return true;
+    const auto wrong = wrongSettings(source);
+    for (const std::string& sentence : wrong) m_output.problem(sentence);
+    return wrong.empty();
 }
 
 void Laboratory::passed(const Traffic& traffic) {

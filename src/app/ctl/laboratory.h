@@ -39,10 +39,11 @@ public:
     [[nodiscard]] bool goesOn();
     /// kDone, or kFailed when anything failed or was stopped.
     [[nodiscard]] int result() const { return m_failed || m_stopped ? kFailed : kDone; }
-    /// Checks a value against what is legal for the key; tells what is wrong, unless the call is to be forced.
-    [[nodiscard]] bool mayBeSent(const std::string& key, const std::string& value);
-    /// Checks all that a data set's steps send; what is wrong is told.
-    [[nodiscard]] bool mayBeSent(const Steps& steps);
+    /// Checks a value, as it was typed, against what is legal for the key; tells what is wrong, of a known key unless
+    /// the call is to be forced.
+    [[nodiscard]] bool mayBeSent(const std::string& key, const std::string& utf8);
+    /// Checks all that a data set sends; what is wrong is told, unless the call is to be forced.
+    [[nodiscard]] bool mayBeSent(const Profile& source);
     /// Whether the run was stopped, or the user wants to; that is told.
     [[nodiscard]] bool isStopped();
     /// From here on a wish to stop is let be: what is sent puts things back.

@@ -55,7 +55,9 @@ void addReplay(CLI::App& app, Task& task) {
     CLI::App* command = app.add_subcommand("replay", "Send the commands of a command log in their order");
     command->add_option("log", what->log, "a command log (RDS_log.txt)")->required()->type_name("LOG");
     command->add_flag("--check", what->check, "only read the log");
-    command->footer("Example: kdx-ctl replay Daten/RDS_log.txt");
+    command->footer(
+        "Every run appends to the data folder's RDS_log.txt, so send a copy of what is to be kept.\n"
+        "Example: kdx-ctl replay drive.log");
     command->callback([what, &task] { task = [what](Laboratory& laboratory) { return replay(laboratory, *what); }; });
 }
 

@@ -11,9 +11,9 @@ namespace {
 
 bool loadDataSet(Laboratory& laboratory, int number) {
     const auto source = WhichDataSet{number, {}}.profile(laboratory);
-    if (!source || !laboratory.hasSession()) return source.has_value();
-    laboratory.session().load(*source);
-    return laboratory.mayBeSent(openingSteps(laboratory.session().station));
+    if (!source || !laboratory.mayBeSent(*source)) return false;
+    if (laboratory.hasSession()) laboratory.session().load(*source);
+    return true;
 }
 
 }  // namespace

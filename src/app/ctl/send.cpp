@@ -22,7 +22,22 @@ struct Send {
 
 /// What is typed on a command line, as one line of the instrument's characters.
 std::string line(const std::string& utf8) {
-    return withoutControls(fromUtf8(utf8));
+    return fromUtf8(withoutControls(utf8));
+}
+
+/// Whether a command as it stands can go out; what is wrong is told.
+bool isLegal(Laboratory& laboratory, const std::string& command, bool forCoder) {
+    if (laboratory.call().force) return true;
+    std::string why;
+    if (const std::string_view foreign = firstOutsideCodePage(command); !foreign.empty()) {
+        why = noSuchCharacter(foreign);
+    } else if (forCoder && endsItsTextEarly(coderCommand(line(command)))) {
+        why = "a double quote ends it early";
+    }
+    if (why.empty()) return true;
+    laboratory.output().problem((forCoder ? "the coder command " : "the command ") + command +
+                                " cannot be sent: " + why);
+    return false;
 }
 
 int send(Laboratory& laboratory, const Send& what) {
@@ -34,14 +49,12 @@ int send(Laboratory& laboratory, const Send& what) {
             laboratory.output().problem(text + " is not KEY=VALUE");
             return kWrongCall;
         }
-        settings.emplace_back(text.substr(0, equals), line(text.substr(equals + 1)));
-        legal = laboratory.mayBeSent(settings.back().first, settings.back().second) && legal;
+        const std::string value = withoutControls(text.substr(equals + 1));
+        settings.emplace_back(text.substr(0, equals), fromUtf8(value));
+        legal = laboratory.mayBeSent(settings.back().first, value) && legal;
     }
-    for (const std::string& command : what.coder) {
-        if (laboratory.call().force || !endsItsTextEarly(coderCommand(line(command)))) continue;
-        laboratory.output().problem("the coder command " + command + " cannot be sent: a double quote ends it early");
-        legal = false;
-    }
+    for (const std::string& command : what.raw) legal = isLegal(laboratory, command, false) && legal;
+    for (const std::string& command : what.coder) legal = isLegal(laboratory, command, true) && legal;
     if (!legal) return kWrongCall;
     if (!laboratory.open()) return kNoConnection;
     Session& session = laboratory.session();

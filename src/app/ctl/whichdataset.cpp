@@ -3,6 +3,7 @@
 #include <CLI/CLI.hpp>
 
 #include "app/ctl/laboratory.h"
+#include "rds/settings.h"
 
 namespace kdx::ctl {
 
@@ -15,8 +16,13 @@ std::optional<Profile> WhichDataSet::profile(Laboratory& laboratory) const {
     laboratory.state().CurrentDataSet = std::to_string(number);
     const std::string name =
         file.empty() ? dataSetFile(laboratory.state().CurrentDataSet) : std::filesystem::absolute(file).string();
-    if (laboratory.data().profile(name)) return Profile::ofFile(laboratory.data(), name);
-    laboratory.output().problem(name + " cannot be read");
+    if (!laboratory.data().profile(name)) {
+        laboratory.output().problem(name + " cannot be read");
+        return std::nullopt;
+    }
+    const auto source = Profile::ofFile(laboratory.data(), name);
+    if (source.hasSectionOf(setting::kPi.place)) return source;
+    laboratory.output().problem(name + " holds no data set: it has no section [" + setting::kPi.place.section + "]");
     return std::nullopt;
 }
 

@@ -1,0 +1,120 @@
+#include "station/wrongsettings.h"
+
+#include <array>
+#include <optional>
+
+#include "af/aflist.h"
+#include "af/settings.h"
+#include "base/codepage.h"
+#include "base/numbers.h"
+#include "coder/keyfacts.h"
+#include "groups/groupsequence.h"
+#include "groups/settings.h"
+#include "rds/settings.h"
+#include "settings/profile.h"
+#include "stereo/deviation.h"
+#include "stereo/settings.h"
+
+namespace kdx {
+
+namespace {
+
+/// What of a stored text is to be legal for the key.
+enum class Judged {
+    AsStored,
+    Required,    ///< the same, and it must not be missing
+    Impedance,   ///< counts from 1 where it is read, from 0 where the window has stored a choice
+    PilotPhase,  ///< within the limits of the setting, which are narrower than the key's
+    List,        ///< a list without what leads it when it is sent
+    Sequence,    ///< a group sequence: its last comma is not sent
+};
+
+struct Row {
+    Setting setting;
+    Judged judged = Judged::AsStored;
+};
+
+// In the order of sending. Not sent with a data set: the type of the other network, decoder information, stereo mode,
+// ARI details, RDS phase.
+constexpr std::array kRows = {
+    Row{setting::kTotalDeviation},
+    Row{setting::kSource},
+    Row{setting::kImpedance, Judged::Impedance},
+    Row{setting::kPreemphasis},
+    Row{setting::kPilot},
+    Row{setting::kPilotDeviation},
+    Row{setting::kPilotPhase, Judged::PilotPhase},
+    Row{setting::kAri},
+    Row{setting::kRds},
+    Row{setting::kRdsDeviation},
+    Row{setting::kPi, Judged::Required},
+    Row{setting::kPs},
+    Row{setting::kMusicSpeech},
+    Row{setting::kRadiotext},
+    Row{setting::kAfLists[0], Judged::List},
+    Row{setting::kAfLists[1], Judged::List},
+    Row{setting::kAfLists[2], Judged::List},
+    Row{setting::kAfLists[3], Judged::List},
+    Row{setting::kAfLists[4], Judged::List},
+    Row{{setting::kPty.sendKey, setting::kPtyOfDataSet}},
+    Row{setting::kEonPi},
+    Row{setting::kEonTa},
+    Row{setting::kEonTp},
+    Row{setting::kEonPs},
+    Row{setting::kEonAfLists[0], Judged::List},
+    Row{setting::kEonAfLists[1], Judged::List},
+    Row{setting::kEonAfLists[2], Judged::List},
+    Row{setting::kEonAfLists[3], Judged::List},
+    Row{setting::kEonAfLists[4], Judged::List},
+    Row{setting::kGroupSequence, Judged::Sequence},
+    Row{setting::kRfFrequency},
+    Row{setting::kRfLevel},
+    Row{setting::kAudioFrequency},
+};
+
+std::optional<std::string> wrongPhase(const std::string& stored) {
+    auto wrong = wrongValue(setting::kPilotPhase.sendKey, stored);
+    const double degrees = leadingNumber(stored);
+    if (!wrong && (degrees < kLowestPilotPhase || degrees > kHighestPilotPhase)) {
+        wrong = std::string(setting::kPilotPhase.sendKey) + " of a data set cannot be \"" + toUtf8(stored) +
+                "\". Legal: " + std::to_string(kLowestPilotPhase) + " to " + std::to_string(kHighestPilotPhase) +
+                " degrees.";
+    }
+    return wrong;
+}
+
+std::optional<std::string> wrong(const Row& row, const std::string& stored) {
+    const char* const key = row.setting.sendKey;
+    if (stored.empty() && row.judged != Judged::Required) return std::nullopt;
+    switch (row.judged) {
+        case Judged::AsStored:
+        case Judged::Required:
+            return wrongValue(key, stored);
+        case Judged::Impedance:
+            return stored == "0" ? std::nullopt : wrongValue(key, stored);
+        case Judged::PilotPhase:
+            return wrongPhase(stored);
+        case Judged::List:
+            return wrongValue(key, newOrFurtherList(1) + stored);
+        case Judged::Sequence:
+            return wrongValue(key, sequenceToSend(stored));
+    }
+    return std::nullopt;
+}
+
+}  // namespace
+
+std::vector<std::string> wrongSettings(const Profile& source) {
+    std::vector<std::string> sentences;
+    for (const Row& row : kRows) {
+        const Place& place = row.setting.place;
+        const std::string stored = source.read(place);
+        if (const auto sentence = wrong(row, stored)) {
+            sentences.push_back(*sentence + " It stands in " + source.fileOf(place) + ", [" + place.section + "] " +
+                                place.key + "=" + toUtf8(stored) + ".");
+        }
+    }
+    return sentences;
+}
+
+}  // namespace kdx
