@@ -76,11 +76,17 @@ void Output::endProgress() {
     m_progressShown = false;
 }
 
-void Output::finish(int exitCode) {
+int Output::finish(int exitCode) {
     endProgress();
-    if (!m_call.json || m_linewise) return;
-    document["exit_code"] = exitCode;
-    std::puts(document.dump(2, ' ', false, nlohmann::json::error_handler_t::replace).c_str());
+    if (m_linewise) return exitCode;
+    if (m_call.json) {
+        document["exit_code"] = exitCode;
+        std::puts(document.dump(2, ' ', false, nlohmann::json::error_handler_t::replace).c_str());
+    }
+    // Told at the end only: nothing that is being sent stops half-way for it.
+    if (!outputIsLost()) return exitCode;
+    problem("the output cannot be written");
+    return exitCode == kDone || exitCode == kDifferent ? kFailed : exitCode;
 }
 
 void Output::beginLine(std::size_t number, const std::string& place) {

@@ -36,8 +36,8 @@ public:
 
     /// The document of --json; problems and the exit code are added to it.
     nlohmann::json document = nlohmann::json::object();
-    /// Prints the document when the call wants it.
-    void finish(int exitCode);
+    /// Prints the document when the call wants it. @returns the exit code: another one when the result is lost.
+    [[nodiscard]] int finish(int exitCode);
 
     /// From here on each line of input has a document of its own.
     void answerLines() { m_linewise = true; }

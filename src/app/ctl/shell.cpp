@@ -142,7 +142,10 @@ std::unique_ptr<LineSource> prompt(int stop) {
 
 int shell(Laboratory& laboratory) {
     laboratory.output().answerLines();
-    if (!laboratory.open()) return kNoConnection;
+    if (!laboratory.open()) {
+        (void)laboratory.output().endLine(kNoConnection);  // an answer before any line
+        return kNoConnection;
+    }
     laboratory.hold();
     const bool prompted = inputIsTerminal() && outputIsTerminal() && !laboratory.call().json;
     const auto lines = prompted ? prompt(laboratory.stop()) : std::make_unique<PipedLines>(laboratory.stop());
