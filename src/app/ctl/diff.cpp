@@ -60,7 +60,7 @@ void addDiff(CLI::App& app, Task& task) {
         app.add_subcommand("diff", "Compare what the instrument has with what a data set would make of it");
     what->source.addTo(*command);
     command->add_flag("--fix", what->fix, "send what differs, and nothing else");
-    command->footer("Example: kdx-ctl diff --data-set 2");
+    command->footer("--data-set or --file says which.\nExample: kdx-ctl diff --data-set 2");
     command->callback([what, &task] { task = [what](Laboratory& laboratory) { return diff(laboratory, *what); }; });
 }
 

@@ -93,6 +93,12 @@ int called(int argc, const char* const* argv) {
         add(app, task);
     }
     app.footer(
+        "Try these; with --simulate no instrument is needed:\n"
+        "  kdx-ctl --simulate apply --data-set 2\n"
+        "  kdx-ctl --simulate query ps pi rt\n"
+        "  kdx-ctl --simulate send PS=MESSTURM TP=1 HF-Frequenz=98.5\n"
+        "  kdx-ctl apply --data-set 3 --dry-run\n"
+        "  kdx-ctl list keys\n"
         "Without --lan, --gpib or --simulate the instrument is the one of the general settings.\n"
         "Exit codes: 0 done, 1 a command failed, 2 wrong call or unreadable file, 3 differences or warnings,\n"
         "4 no connection.\n"

@@ -183,7 +183,8 @@ void addShell(CLI::App& app, Task& task) {
         "link\n"
         "that is lost is told once; with the next line a new one is tried.\n"
         "Exit code: the greatest that a line had; 0 at a prompt.\n"
-        "Example: kdx-ctl shell < commands.txt");
+        "Example: kdx-ctl shell\n"
+        "Through a pipe: printf 'send PS=RADIO\\nquery ps\\n' | kdx-ctl shell");
     command->callback([&task] { task = shell; });
 }
 
