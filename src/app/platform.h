@@ -43,8 +43,11 @@ void surviveBrokenPipes();
 [[nodiscard]] int endRequests();
 
 /// Opens what of standard input, output and error the caller has closed: else the next file opened would take its place
-/// and get what is printed.
+/// and get what is printed. Writing to such an output fails still.
 void openStandardStreams();
+
+/// Whether something that was printed is lost, and not since its reader has gone away.
+[[nodiscard]] bool outputIsLost();
 
 /// What the standard input has of a line.
 enum class InputLine { NotYet, Whole, Ended };

@@ -5,6 +5,7 @@
 #include <array>
 #include <cerrno>
 #include <csignal>
+#include <cstdio>
 #include <cstdlib>
 #include <system_error>
 
@@ -115,11 +116,17 @@ int endRequests() {
 }
 
 void openStandardStreams() {
-    int opened = -1;
-    do {
-        opened = open("/dev/null", O_RDWR);
-    } while (opened >= 0 && opened <= STDERR_FILENO);
-    if (opened > STDERR_FILENO) close(opened);
+    for (const int stream : {STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO}) {
+        if (fcntl(stream, F_GETFD) >= 0) continue;
+        // The lowest free number is this one.
+        [[maybe_unused]] const int opened = open("/dev/null", stream == STDOUT_FILENO ? O_RDONLY : O_RDWR);
+    }
+}
+
+bool outputIsLost() {
+    if (std::fflush(stdout) == 0 && std::ferror(stdout) == 0) return false;
+    pollfd asked{STDOUT_FILENO, POLLOUT, 0};
+    return poll(&asked, 1, 0) < 0 || (asked.revents & POLLERR) == 0;
 }
 
 InputLine takeInputLine() {

@@ -1,5 +1,6 @@
 #include <windows.h>
 
+#include <cstdio>
 #include <cstdlib>
 #include <string>
 
@@ -58,6 +59,10 @@ int endRequests() {
 }
 
 void openStandardStreams() {}  // there a closed one is none: nothing takes its place
+
+bool outputIsLost() {
+    return std::fflush(stdout) != 0 || std::ferror(stdout) != 0;
+}
 
 InputLine takeInputLine() {
     return InputLine::Ended;  // it cannot be asked without waiting: a pause ends the run, see --yes

@@ -181,7 +181,10 @@ class Held(ctl_test.Ctl):
     def testNoConnectionIsExitCode4BeforeAnyLine(self):
         self.hold("--lan", "127.0.0.9", "--json")
         code, rest, problems = self.end()
-        self.assertEqual((code, rest), (NO_CONNECTION, ""))
+        self.assertEqual((code, rest.count("\n")), (NO_CONNECTION, 1))
+        answer = json.loads(rest)
+        self.assertEqual(answer["exit_code"], NO_CONNECTION)
+        self.assertIn("no connection to 127.0.0.9", answer["problems"][0])
         self.assertEqual(problems.count("no connection to 127.0.0.9"), 1)
 
     def testAFailedCommandMakesTheExitCode(self):

@@ -180,6 +180,13 @@ class Apply(Ctl):
             # The tour leaves out the blanks at a command's end.
             self.assertEqual(shown[:len(applied)], [line.rstrip() for line in applied], f"data set {number}")
 
+    def testNoDataSetIsTakenUnasked(self):
+        for call in (("apply",), ("apply", "--dry-run"), ("diff",), ("diff", "--fix")):
+            with self.subTest(call):
+                run = self.simulated("-v", *call, expect=WRONG_CALL)
+                self.assertEqual(run.stdout, "")
+                self.assertIn("which data set? --data-set N or --file FILE says it", run.stderr)
+
     def testADryRunPrintsNoControlCharacter(self):
         file = self.write("lab.ini", "[RDS]\r\nPS=A\x1bB\r\n")
         run = self.ctl("--force", "apply", "--file", file, "--dry-run")
@@ -446,7 +453,7 @@ class OverTheNetwork(Networked):
         self.assertEqual(self.lan("diff", "--file", file).stdout, "")
 
     def killInTheMiddle(self, *options):
-        process = subprocess.Popen(self.command("--lan", "127.0.0.1", "-v", *options, "apply"),
+        process = subprocess.Popen(self.command("--lan", "127.0.0.1", "-v", *options, "apply", "--data-set", "1"),
                                    stdout=subprocess.PIPE, stderr=subprocess.PIPE, text=True)
         for line in process.stdout:
             if "PS=" in line:
@@ -493,7 +500,7 @@ class OverTheNetwork(Networked):
 
     def testARequestToEndStopsAfterTheRunningCommand(self):
         for request in (signal.SIGINT, signal.SIGTERM):
-            process = subprocess.Popen(self.command("--lan", "127.0.0.1", "-v", "apply"),
+            process = subprocess.Popen(self.command("--lan", "127.0.0.1", "-v", "apply", "--data-set", "1"),
                                        stdout=subprocess.PIPE, stderr=subprocess.PIPE, text=True)
             for line in process.stdout:
                 if "PS=" in line:

@@ -49,9 +49,15 @@ void addApply(CLI::App& app, Task& task) {
     auto what = std::make_shared<Apply>();
     CLI::App* command = app.add_subcommand("apply", "Send a whole data set, as opening the session in the window does");
     what->source.addTo(*command);
-    command->add_flag("--keep-open", what->keepOpen, "leave the instrument in remote at the end");
+    command->add_flag("--keep-open", what->keepOpen, "do not close the link at the end");
     command->add_flag("--dry-run", what->dryRun, "print the commands and send none");
-    command->footer("Example: kdx-ctl apply --data-set 2");
+    command->footer(
+        "--data-set or --file says which. At the end the link is closed; no command that makes the instrument local "
+        "is\n"
+        "ever sent. --keep-open leaves the closing out: an instrument on the GPIB stays in remote as it is; one on the "
+        "LAN\n"
+        "loses the link all the same when the program ends, and decides itself.\n"
+        "Example: kdx-ctl apply --data-set 2");
     command->callback([what, &task] { task = [what](Laboratory& laboratory) { return apply(laboratory, *what); }; });
 }
 

@@ -35,9 +35,12 @@ int diff(Laboratory& laboratory, const Diff& what) {
     tellDifferences(laboratory.output(), "differences", comparison.differing);
     Differences left = comparison.differing;
     if (what.fix && !left.empty()) {
-        for (const auto& [key, command] : commandsFor(comparison.differing, comparison.wanted)) {
+        const SettingCommands commands = commandsFor(comparison.differing, comparison.wanted);
+        laboratory.expect(commands.size());
+        for (const auto& [key, command] : commands) {
             if (laboratory.goesOn()) laboratory.session().params.sendCommand(key, command);
         }
+        laboratory.expect(0);
         if (laboratory.result() == kDone) present = askedFor(laboratory);
         if (!present || laboratory.result() != kDone) return laboratory.result();
         left = compared(laboratory.data(), laboratory.captions(), *source, *present).differing;
@@ -57,7 +60,7 @@ void addDiff(CLI::App& app, Task& task) {
         app.add_subcommand("diff", "Compare what the instrument has with what a data set would make of it");
     what->source.addTo(*command);
     command->add_flag("--fix", what->fix, "send what differs, and nothing else");
-    command->footer("Example: kdx-ctl diff --data-set 2");
+    command->footer("--data-set or --file says which.\nExample: kdx-ctl diff --data-set 2");
     command->callback([what, &task] { task = [what](Laboratory& laboratory) { return diff(laboratory, *what); }; });
 }
 

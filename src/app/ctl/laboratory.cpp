@@ -128,6 +128,7 @@ void Laboratory::close() {
 
 void Laboratory::nextTask() {
     m_failed = false;
+    expect(0);
     if (m_lost) m_session->instrument.close();
 }
 
@@ -163,18 +164,27 @@ void Laboratory::passed(const Traffic& traffic) {
     const bool written = traffic.kind == Traffic::Kind::Written;
     const std::string text = toUtf8(printableLine(traffic.text, '.'));
     if (m_call.verbose) {
-        const std::string status = traffic.status == 0 ? std::string() : "  [" + std::to_string(traffic.status) + "]";
-        m_output.line(timeText(m_clock) + (written ? " -> " : " <- ") + text + status);
+        std::string words;
+        if (traffic.status != 0) (void)describeStatus(traffic.status, words);
+        const std::string status = std::to_string(traffic.status) + (words.empty() ? "" : ": " + words);
+        m_output.line(timeText(m_clock) + (written ? " -> " : " <- ") + text + "  [" + status + "]");
     }
+    if (written && !m_inSteps) m_output.progress(++m_written, m_expected);
     m_output.document["traffic"].push_back(
         {{"direction", written ? "written" : "read"}, {"text", text}, {"status", traffic.status}});
 }
 
 void Laboratory::stepGoesOut(const Step& step, std::size_t number, std::size_t total) {
+    m_inSteps = true;
     if (number > 0) m_output.progress(number, total);
     if (step.kind == Step::Kind::Refused)
         m_output.problem(step.key + " is not sent: the coder cannot take so many frequencies with method B");
     if (!m_finishing && isStopped()) m_session->transmitter.stop();
+}
+
+void Laboratory::stepsEnded() {
+    m_inSteps = false;
+    m_output.endProgress();
 }
 
 bool Laboratory::isStopped() {

@@ -33,6 +33,11 @@ public:
     void hold() { m_held = true; }
     /// The failures of the task before are over; a link that was lost is made anew by open().
     void nextTask();
+    /// So many commands come now, which are counted anew; 0: as many as there are.
+    void expect(std::size_t commands) {
+        m_written = 0;
+        m_expected = commands;
+    }
     /// Waits; false when the user wants to stop, at once then.
     bool pause(std::chrono::milliseconds duration);
     /// After a command outside of steps: whether to go on with the next.
@@ -71,7 +76,7 @@ private:
     void passed(const Traffic& traffic) override;
     void stepGoesOut(const Step& step, std::size_t number, std::size_t total) override;
     void stepAnswered(const Step&, const std::string&) override {}
-    void stepsEnded() override { m_output.endProgress(); }
+    void stepsEnded() override;
 
     bool linkFailed();
     void reconnected();
@@ -91,6 +96,9 @@ private:
     bool m_failed = false;
     bool m_stopped = false;
     bool m_finishing = false;
+    bool m_inSteps = false;      ///< which tell their number themselves
+    std::size_t m_written = 0;   ///< commands and questions besides
+    std::size_t m_expected = 0;  ///< how many there will be; 0 when nobody knows
 };
 
 }  // namespace kdx::ctl

@@ -1,8 +1,10 @@
 // The command line of kdx-ctl.
 #include <CLI/CLI.hpp>
 
+#include <algorithm>
 #include <cstdio>
 #include <exception>
+#include <string_view>
 
 #include "app/ctl/call.h"
 #include "app/ctl/laboratory.h"
@@ -53,8 +55,6 @@ void addManner(CLI::App& app, Call& call) {
 }
 
 int run(const Call& call, const kdx::ctl::Task& task, const char* program) {
-    // Who does not want to read on stops nothing that is half sent.
-    kdx::surviveBrokenPipes();
     kdx::ctl::Output output(call);
     int result = kdx::ctl::kFailed;
     try {
@@ -63,8 +63,18 @@ int run(const Call& call, const kdx::ctl::Task& task, const char* program) {
     } catch (const std::exception& error) {
         output.problem(error.what());
     }
-    output.finish(result);
-    return result;
+    return output.finish(result);
+}
+
+/// What the parser has to say: help that was asked for, or what is wrong with the call.
+int answered(const CLI::App& app, const CLI::ParseError& said, Call call) {
+    kdx::ctl::Output output(call);
+    if (app.exit(said) == 0) {
+        call.json = false;  // help is words
+        return output.finish(kdx::ctl::kDone);
+    }
+    output.note(kdx::shownPath(said.what()));
+    return output.finish(kdx::ctl::kWrongCall);
 }
 
 int called(int argc, const char* const* argv) {
@@ -83,6 +93,12 @@ int called(int argc, const char* const* argv) {
         add(app, task);
     }
     app.footer(
+        "Try these; with --simulate no instrument is needed:\n"
+        "  kdx-ctl --simulate apply --data-set 2\n"
+        "  kdx-ctl --simulate query ps pi rt\n"
+        "  kdx-ctl --simulate send PS=MESSTURM TP=1 HF-Frequenz=98.5\n"
+        "  kdx-ctl apply --data-set 3 --dry-run\n"
+        "  kdx-ctl list keys\n"
         "Without --lan, --gpib or --simulate the instrument is the one of the general settings.\n"
         "Exit codes: 0 done, 1 a command failed, 2 wrong call or unreadable file, 3 differences or warnings,\n"
         "4 no connection.\n"
@@ -92,8 +108,10 @@ int called(int argc, const char* const* argv) {
     });
     try {
         app.parse(argc, argv);
-    } catch (const CLI::ParseError& error) {
-        return app.exit(error) == 0 ? kdx::ctl::kDone : kdx::ctl::kWrongCall;
+    } catch (const CLI::ParseError& said) {
+        // The parser may have given up before it came to that.
+        call.json = std::find(argv, argv + argc, std::string_view("--json")) != argv + argc;
+        return answered(app, said, call);
     }
     return run(call, task, argv[0]);
 }
@@ -102,6 +120,8 @@ int called(int argc, const char* const* argv) {
 
 int main(int argc, char** argv) {
     kdx::openStandardStreams();
+    // Who does not want to read on stops nothing that is half sent.
+    kdx::surviveBrokenPipes();
     try {
         return called(argc, argv);
     } catch (const std::exception& error) {

@@ -18,13 +18,14 @@ std::size_t width(const std::string& text) {
 
 }  // namespace
 
-void Output::line(const std::string& text) const {
+void Output::line(const std::string& text) {
     if (m_call.json) return;
+    endProgress();
     std::puts(text.c_str());
     if (m_call.verbose) std::fflush(stdout);  // what happens is seen when it happens, also through a pipe
 }
 
-void Output::remark(const std::string& text) const {
+void Output::remark(const std::string& text) {
     if (!m_call.quiet) line(text);
 }
 
@@ -37,7 +38,7 @@ void Output::problem(const std::string& problem) {
     note(text);
 }
 
-void Output::table(const Rows& rows) const {
+void Output::table(const Rows& rows) {
     std::vector<std::size_t> widths;
     for (const auto& row : rows) {
         widths.resize(std::max(widths.size(), row.size()));
@@ -55,13 +56,14 @@ void Output::table(const Rows& rows) const {
 
 void Output::progress(std::size_t number, std::size_t total) {
     if (m_call.quiet || m_call.verbose || !errorIsTerminal()) return;
-    std::fprintf(stderr, "\rcommand %zu of %zu ", number, total);
+    const std::string of = total == 0 ? std::string() : " of " + std::to_string(total);
+    std::fprintf(stderr, "\rcommand %zu%s \033[K", number, of.c_str());
     m_progressShown = true;
 }
 
 void Output::waiting(const std::string& until) {
     if (m_call.quiet || m_call.verbose || !errorIsTerminal()) return;
-    std::fprintf(stderr, "\rnext at %s ", until.c_str());
+    std::fprintf(stderr, "\rnext at %s \033[K", until.c_str());
     m_progressShown = true;
 }
 
@@ -76,11 +78,17 @@ void Output::endProgress() {
     m_progressShown = false;
 }
 
-void Output::finish(int exitCode) {
+int Output::finish(int exitCode) {
     endProgress();
-    if (!m_call.json || m_linewise) return;
-    document["exit_code"] = exitCode;
-    std::puts(document.dump(2, ' ', false, nlohmann::json::error_handler_t::replace).c_str());
+    if (m_linewise) return exitCode;
+    if (m_call.json) {
+        document["exit_code"] = exitCode;
+        std::puts(document.dump(2, ' ', false, nlohmann::json::error_handler_t::replace).c_str());
+    }
+    // Told at the end only: nothing that is being sent stops half-way for it.
+    if (!outputIsLost()) return exitCode;
+    problem("the output cannot be written");
+    return exitCode == kDone || exitCode == kDifferent ? kFailed : exitCode;
 }
 
 void Output::beginLine(std::size_t number, const std::string& place) {
@@ -89,6 +97,7 @@ void Output::beginLine(std::size_t number, const std::string& place) {
 }
 
 bool Output::endLine(int exitCode) {
+    endProgress();
     m_place.clear();
     if (m_call.json) {
         document["exit_code"] = exitCode;

@@ -17,16 +17,16 @@ public:
     explicit Output(const Call& call) : m_call(call) {}
 
     /// A line of the result; not with JSON.
-    void line(const std::string& text) const;
+    void line(const std::string& text);
     /// A line that only tells how it goes; not with JSON, not when the call is to be quiet.
-    void remark(const std::string& text) const;
+    void remark(const std::string& text);
     void problem(const std::string& problem);
     using Rows = std::vector<std::vector<std::string>>;
     /// Lines of the result with their columns under each other.
-    void table(const Rows& rows) const;
+    void table(const Rows& rows);
     /// A problem that is known already: for the document only.
     void note(const std::string& text) { document["problems"].push_back(text); }
-    /// Which command of how many goes out; only while the standard error is a terminal.
+    /// Which command of how many (0: nobody knows) goes out; only while the standard error is a terminal.
     void progress(std::size_t number, std::size_t total);
     /// Until when nothing happens; likewise.
     void waiting(const std::string& until);
@@ -36,8 +36,8 @@ public:
 
     /// The document of --json; problems and the exit code are added to it.
     nlohmann::json document = nlohmann::json::object();
-    /// Prints the document when the call wants it.
-    void finish(int exitCode);
+    /// Prints the document when the call wants it. @returns the exit code: another one when the result is lost.
+    [[nodiscard]] int finish(int exitCode);
 
     /// From here on each line of input has a document of its own.
     void answerLines() { m_linewise = true; }

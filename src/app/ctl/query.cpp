@@ -39,6 +39,9 @@ int query(Laboratory& laboratory, const Query& what) {
     if (!laboratory.open()) return kNoConnection;
     Session& session = laboratory.session();
     nlohmann::json& answered = laboratory.output().document["answers"] = nlohmann::json::object();
+    std::size_t questions = 0;
+    for (const ReadBack* readBack : asked) questions += readBack->queries(laboratory.state().eonIdentifier).size();
+    laboratory.expect(questions);
     for (const ReadBack* readBack : asked) {
         if (!laboratory.goesOn()) break;
         const CommandSequence sequence(session.instrument);

@@ -38,10 +38,9 @@ int replay(Laboratory& laboratory, const Replay& what) {
     }
     if (!laboratory.open()) return kNoConnection;
     Session& session = laboratory.session();
-    std::size_t number = 0;
+    laboratory.expect(logged.commands.size());
     for (const auto& [key, command] : logged.commands) {
         if (!laboratory.goesOn()) break;
-        laboratory.output().progress(++number, logged.commands.size());
         session.params.sendCommand(key, command);
     }
     session.close();

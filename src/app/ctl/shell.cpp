@@ -142,7 +142,10 @@ std::unique_ptr<LineSource> prompt(int stop) {
 
 int shell(Laboratory& laboratory) {
     laboratory.output().answerLines();
-    if (!laboratory.open()) return kNoConnection;
+    if (!laboratory.open()) {
+        (void)laboratory.output().endLine(kNoConnection);  // an answer before any line
+        return kNoConnection;
+    }
     laboratory.hold();
     const bool prompted = inputIsTerminal() && outputIsTerminal() && !laboratory.call().json;
     const auto lines = prompted ? prompt(laboratory.stop()) : std::make_unique<PipedLines>(laboratory.stop());
@@ -180,7 +183,8 @@ void addShell(CLI::App& app, Task& task) {
         "link\n"
         "that is lost is told once; with the next line a new one is tried.\n"
         "Exit code: the greatest that a line had; 0 at a prompt.\n"
-        "Example: kdx-ctl shell < commands.txt");
+        "Example: kdx-ctl shell\n"
+        "Through a pipe: printf 'send PS=RADIO\\nquery ps\\n' | kdx-ctl shell");
     command->callback([&task] { task = shell; });
 }
 

@@ -13,7 +13,12 @@ void WhichDataSet::addTo(CLI::App& command) {
 }
 
 std::optional<Profile> WhichDataSet::profile(Laboratory& laboratory) const {
-    laboratory.state().CurrentDataSet = std::to_string(number);
+    // What is sent switches the carrier on: no set is taken unasked.
+    if (!number && file.empty()) {
+        laboratory.output().problem("which data set? --data-set N or --file FILE says it");
+        return std::nullopt;
+    }
+    laboratory.state().CurrentDataSet = std::to_string(number.value_or(1));
     const std::string name =
         file.empty() ? dataSetFile(laboratory.state().CurrentDataSet) : std::filesystem::absolute(file).string();
     if (!laboratory.data().profile(name)) {

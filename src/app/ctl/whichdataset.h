@@ -15,11 +15,11 @@ class Laboratory;
 
 /// The data set that a subcommand works with, as the command line names it.
 struct WhichDataSet {
-    int number = 1;
+    std::optional<int> number;
     std::string file;
 
     void addTo(CLI::App& command);
-    /// Makes it the one at work; nothing when it cannot be read, which is told.
+    /// Makes it the one at work; nothing when none is named or it cannot be read, which is told.
     [[nodiscard]] std::optional<Profile> profile(Laboratory& laboratory) const;
 };
 
