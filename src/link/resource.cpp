@@ -43,4 +43,8 @@ Resource parseResource(std::string_view text) {
     return resource;
 }
 
+std::string resourceText(Resource::Kind kind, const std::string& address) {
+    return (kind == Resource::Kind::Lan ? "TCPIP::" : "GPIB0::") + address + "::INSTR";
+}
+
 }  // namespace kdx

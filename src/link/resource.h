@@ -1,5 +1,6 @@
 #pragma once
 
+#include <string>
 #include <string_view>
 
 namespace kdx {
@@ -21,5 +22,8 @@ struct Resource {
 
 /// Takes "TCPIP::host::INSTR", "TCPIP::host::device::INSTR", "GPIB0::28::INSTR" and the like apart.
 [[nodiscard]] Resource parseResource(std::string_view text);
+
+/// The resource string of an instrument. @param address host or host::device on the LAN, else a GPIB address.
+[[nodiscard]] std::string resourceText(Resource::Kind kind, const std::string& address);
 
 }  // namespace kdx

@@ -31,6 +31,11 @@ void Session::load(const Profile& source) {
     station.load(source);
 }
 
+InstrumentAddress Session::storedAddress() const {
+    const std::string kind = profile.read(setting::kInterface);
+    return {kind, profile.read(kind == "TCPIP" ? setting::kLanAddress : setting::kGpibAddress)};
+}
+
 bool Session::sendOpening() {
     lookUp();
     return transmitter.run(openingSteps(station));

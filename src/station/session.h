@@ -11,6 +11,12 @@
 
 namespace kdx {
 
+/// Where an instrument is.
+struct InstrumentAddress {
+    std::string kind;  ///< "IEC" or "TCPIP"
+    std::string address;
+};
+
 /// What a program that works with one instrument is made of, window or not: the link, what goes over it, and the data
 /// set at work. Everything else is lent and outlives it.
 struct Session {
@@ -27,6 +33,8 @@ struct Session {
     void load(const Profile& source);
     /// Opens the session to the address; see Instrument::open.
     VisaStatus open(const std::string& kind, const std::string& address) { return instrument.open(kind, address); }
+    /// Where the general settings say that the instrument is.
+    [[nodiscard]] InstrumentAddress storedAddress() const;
     /// Sends what belongs to the opening, the whole data set among it. @returns false when it was stopped.
     bool sendOpening();
     /// Sends the whole data set. @returns false when it was stopped.

@@ -84,6 +84,17 @@ class Calls(Ctl):
         self.assertIn("no connection to 127.0.0.9", run.stderr)
         self.assertIn("-1073807343", run.stderr)
 
+    def testWithoutAnAddressTheSettingsThatLackItAreNamed(self):
+        (self.folder / "empty").mkdir()
+        for name in ("empty", "none"):
+            run = subprocess.run([CTL, "--app-folder", self.folder / name, "query", "ps"], capture_output=True,
+                                 text=True, timeout=100)
+            self.assertEqual((run.returncode, run.stdout), (NO_CONNECTION, ""))
+            self.assertIn(f"{name}/Daten/RDS_Allg.INI cannot be read. Name it with --lan", run.stderr)
+        (self.folder / "Daten" / "RDS_Allg.INI").write_bytes(b"[BUS]\r\nINTERFACE=TCPIP\r\n")
+        run = self.ctl("query", "ps", expect=NO_CONNECTION)
+        self.assertIn("RDS_Allg.INI has no address", run.stderr)
+
     def testAGpibAddressNeedsALibrary(self):
         run = self.ctl("--gpib", "28", "query", "ps", expect=NO_CONNECTION)
         self.assertIn("GPIB address 28", run.stderr)

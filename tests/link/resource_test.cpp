@@ -55,5 +55,14 @@ INSTANTIATE_TEST_SUITE_P(OfAnotherKind, ResourceText,
                                            ResourceCase{"USB0::1::2::INSTR", Kind::Unknown, false},
                                            ResourceCase{" TCPIP::host::INSTR", Kind::Unknown, false}));
 
+TEST(ResourceText, IsTakenApartToWhatItWasMadeOf) {
+    EXPECT_EQ(resourceText(Resource::Kind::Lan, "10.0.0.7::inst0"), "TCPIP::10.0.0.7::inst0::INSTR");
+    EXPECT_EQ(resourceText(Resource::Kind::Gpib, "28"), "GPIB0::28::INSTR");
+    const std::string text = resourceText(Resource::Kind::Lan, "host");
+    const Resource parts = parseResource(text);
+    EXPECT_TRUE(parts.wellFormed && parts.kind == Resource::Kind::Lan);
+    EXPECT_EQ(parts.address, "host");
+}
+
 }  // namespace
 }  // namespace kdx

@@ -31,7 +31,7 @@ void addListed(Visa& visa, std::vector<Found>& found) {
         const bool onLan = parts.kind == Resource::Kind::Lan;
         const std::string address(parts.address);
         const bool known = std::any_of(found.begin(), found.end(), [&](const Found& other) {
-            return onLan && other.resource == "TCPIP::" + address + "::INSTR" &&
+            return onLan && other.resource == resourceText(Resource::Kind::Lan, address) &&
                    (parts.device.empty() || equalNoCase(parts.device, LanResource().device));
         });
         if (known) continue;
@@ -69,7 +69,7 @@ int find(Laboratory& laboratory, std::chrono::milliseconds wait) {
     how.stopped = [&laboratory] { return laboratory.isStopped(); };
     std::vector<Found> found;
     for (const std::string& address : discoverLanInstruments(how))
-        found.push_back({"TCPIP::" + address + "::INSTR", "--lan " + address, &lan});
+        found.push_back({resourceText(Resource::Kind::Lan, address), "--lan " + address, &lan});
     addListed(*chosen, found);
     std::vector<std::vector<std::string>> rows;
     for (const Found& instrument : found) {

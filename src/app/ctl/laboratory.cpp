@@ -89,8 +89,7 @@ bool Laboratory::open() {
         return false;
     }
     const Profile& profile = m_session->profile;
-    std::string kind = profile.read(setting::kInterface);
-    std::string address = profile.read(kind == "TCPIP" ? setting::kLanAddress : setting::kGpibAddress);
+    auto [kind, address] = m_session->storedAddress();
     if (m_call.lan) {
         kind = "TCPIP";
         address = withoutControls(*m_call.lan);
@@ -98,6 +97,11 @@ bool Laboratory::open() {
     } else if (m_call.gpib) {
         kind = "IEC";
         address = std::to_string(*m_call.gpib);
+    } else if (address.empty() && !m_call.program.simulate) {
+        m_output.problem("no instrument is named: " + m_data.file(kGeneralSettings).string() +
+                         (m_data.profile(kGeneralSettings) ? " has no address" : " cannot be read") +
+                         ". Name it with --lan or --gpib, or the folder with your settings with --app-folder.");
+        return false;
     }
     if (m_session->open(kind, address) == visa::kSuccess) {
         // Commands about the other network are led by the one of the data set, until another one is sent.
@@ -128,6 +132,7 @@ void Laboratory::close() {
 
 void Laboratory::nextTask() {
     m_failed = false;
+    m_refused = false;
     expect(0);
     if (m_lost) m_session->instrument.close();
 }
@@ -135,6 +140,11 @@ void Laboratory::nextTask() {
 bool Laboratory::pause(std::chrono::milliseconds duration) {
     waitReadable(m_stop, duration);
     return !isStopped();
+}
+
+int Laboratory::result() const {
+    if (m_failed || m_stopped) return kFailed;
+    return m_refused ? kDifferent : kDone;
 }
 
 bool Laboratory::goesOn() {
@@ -177,8 +187,10 @@ void Laboratory::passed(const Traffic& traffic) {
 void Laboratory::stepGoesOut(const Step& step, std::size_t number, std::size_t total) {
     m_inSteps = true;
     if (number > 0) m_output.progress(number, total);
-    if (step.kind == Step::Kind::Refused)
+    if (step.kind == Step::Kind::Refused) {
+        m_refused = true;
         m_output.problem(step.key + " is not sent: the coder cannot take so many frequencies with method B");
+    }
     if (!m_finishing && isStopped()) m_session->transmitter.stop();
 }
 

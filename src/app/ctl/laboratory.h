@@ -42,8 +42,8 @@ public:
     bool pause(std::chrono::milliseconds duration);
     /// After a command outside of steps: whether to go on with the next.
     [[nodiscard]] bool goesOn();
-    /// kDone, or kFailed when anything failed or was stopped.
-    [[nodiscard]] int result() const { return m_failed || m_stopped ? kFailed : kDone; }
+    /// kDone, kFailed when anything failed or was stopped, or kDifferent when a list was refused.
+    [[nodiscard]] int result() const;
     /// Checks a value, as it was typed, against what is legal for the key; tells what is wrong, of a known key unless
     /// the call is to be forced.
     [[nodiscard]] bool mayBeSent(const std::string& key, const std::string& utf8);
@@ -94,6 +94,7 @@ private:
     bool m_held = false;
     bool m_lost = false;  ///< the link, and no new one was made yet
     bool m_failed = false;
+    bool m_refused = false;  ///< a list that the coder cannot take
     bool m_stopped = false;
     bool m_finishing = false;
     bool m_inSteps = false;      ///< which tell their number themselves
