@@ -145,25 +145,6 @@ class Apply(Ctl):
         printed = self.ctl("apply", "--data-set", "3", "--dry-run").stdout.splitlines()
         self.assertEqual(self.sent("apply", "--data-set", "3"), printed)
 
-    def testItIsByteForByteWhatTheWindowSends(self):
-        """The window opens data set 1: every other set is put in its place, beside the carrier that set 1 keeps."""
-        carrier = re.search(rb"(?ms)^\[VRN\].*?(?=^\[|\Z)", (DATA / "Datenset1.INI").read_bytes())[0]
-        for number in "12345":
-            applied = self.ctl("apply", "--data-set", number, "--dry-run").stdout.splitlines()
-            other = self.folder / ("window" + number)
-            shutil.copytree(DATA, other / "Daten")
-            dataSet = (DATA / f"Datenset{number}.INI").read_bytes()
-            if number != "1":
-                dataSet = re.sub(rb"(?ms)^\[VRN\].*?(?=^\[|\Z)", b"", dataSet) + b"\r\n" + carrier
-            (other / "Daten" / "Datenset1.INI").write_bytes(dataSet)
-            tour = subprocess.run([RDS, "--simulate", "--app-folder", str(other), "--tour", str(other / "tour")],
-                                  stdout=subprocess.PIPE, timeout=100,
-                                  env=dict(os.environ, HOME=str(self.folder), QT_QPA_PLATFORM="offscreen"))
-            shown = [line[3:].decode() for line in tour.stdout.splitlines() if line.startswith(b"-> ")]
-            self.assertGreater(len(applied), 30)
-            # The tour leaves out the blanks at a command's end.
-            self.assertEqual(shown[:len(applied)], [line.rstrip() for line in applied], f"data set {number}")
-
     def testNoDataSetIsTakenUnasked(self):
         for call in (("apply",), ("apply", "--dry-run"), ("diff",), ("diff", "--fix")):
             with self.subTest(call):
