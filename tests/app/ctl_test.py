@@ -1,6 +1,6 @@
 """The program kdx-ctl as a script meets it: subcommands, what they send and print, exit codes.
 
-Usage: ctl_test.py PATH-OF-KDX-CTL PATH-OF-KDX-RDS PATH-OF-KDX-SIM
+Usage: ctl_test.py PATH-OF-KDX-CTL PATH-OF-KDX-SIM
 """
 
 import json
@@ -17,7 +17,7 @@ import threading
 import time
 import unittest
 
-CTL = RDS = SIM = ""
+CTL = SIM = ""
 DATA = pathlib.Path(__file__).parents[2] / "Daten"
 DONE, FAILED, WRONG_CALL, DIFFERENT, NO_CONNECTION = 0, 1, 2, 3, 4
 
@@ -435,6 +435,6 @@ class OverTheNetwork(Networked):
 
 
 if __name__ == "__main__":
-    CTL, RDS, SIM = sys.argv[1:4]
-    del sys.argv[1:4]
+    CTL, SIM = sys.argv[1:3]
+    del sys.argv[1:3]
     unittest.main()
