@@ -314,7 +314,7 @@ ErrorCode CoreChannel::unlock(LinkId id, ConnectionId from) {
 
 ErrorCode CoreChannel::destroyLink(LinkId id, ConnectionId from) {
     if (find(id, from) == nullptr) return vxi11::kInvalidLink;
-    removeLink(id);
+    removeLink(id, "closed");
     return vxi11::kNoError;
 }
 
@@ -329,7 +329,7 @@ void CoreChannel::connectionClosed(ConnectionId connection) {
     m_calls.forget(connection);
     for (auto link = m_links.begin(); link != m_links.end();) {
         const auto next = std::next(link);
-        if (link->second.owner == connection) removeLink(link->first);
+        if (link->second.owner == connection) removeLink(link->first, "closed with its connection");
         link = next;
     }
     m_calls.retry();
@@ -364,9 +364,9 @@ void CoreChannel::clear(Link& link) {
     m_device.clear();
 }
 
-void CoreChannel::removeLink(LinkId id) {
+void CoreChannel::removeLink(LinkId id, std::string_view how) {
     if (m_lockHolder == id) m_lockHolder.reset();
-    trace(id, "closed");
+    trace(id, how);
     m_links.erase(id);
 }
 

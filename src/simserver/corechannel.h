@@ -66,7 +66,7 @@ private:
     [[nodiscard]] bool isRoomFor(ConnectionId connection) const;
     LinkId freeId();
     void clear(Link& link);
-    void removeLink(LinkId id);
+    void removeLink(LinkId id, std::string_view how);
     Link* find(LinkId id, ConnectionId from);
     [[nodiscard]] ErrorCode obstacle(const WaitingCall& call);
     void trace(LinkId link, std::string_view what, std::string_view text = {}) const;

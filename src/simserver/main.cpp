@@ -2,6 +2,7 @@
 
 #include "base/clock.h"
 #include "base/printable.h"
+#include "settings/shownpath.h"
 #include "settings/withoutcontrols.h"
 #include "sim/virtualinstrument.h"
 #include "simserver/linewriter.h"
@@ -77,7 +78,7 @@ void declareOptions(CLI::App& commandLine, Options& options) {
     commandLine.footer(kFooter);
     commandLine.get_formatter()->column_width(16);
     commandLine.failure_message([](const CLI::App*, const CLI::Error& error) {
-        return std::string("kdx-sim: ") + error.what() + "; --help lists the options\n";
+        return "kdx-sim: " + kdx::shownPath(error.what()) + "; --help lists the options\n";
     });
 }
 
@@ -186,7 +187,7 @@ int main(int argc, char** argv) {
     try {
         return run(argc, argv);
     } catch (const std::exception& error) {
-        std::cerr << "kdx-sim: " << error.what() << "\n";
+        std::cerr << "kdx-sim: " << kdx::shownPath(error.what()) << "\n";
         return kFailed;
     }
 }

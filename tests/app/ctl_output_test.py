@@ -5,8 +5,10 @@ Usage: ctl_output_test.py PATH-OF-KDX-CTL PATH-OF-KDX-SIM
 
 import json
 import os
+import pathlib
 import pty
 import re
+import resource
 import signal
 import subprocess
 import sys
@@ -46,6 +48,23 @@ class Lost(ctl_test.Networked):
         with open("/dev/full", "wb") as full:
             self.assertEqual(self.into(full, "--lan", "127.0.0.9", "--json", "query", "ps").returncode, NO_CONNECTION)
             self.assertEqual(self.into(full, "--json", "nonsense").returncode, WRONG_CALL)
+
+    def testAFullDiskUnderTheFileThatIsReadIntoLeavesTheOldOneWhole(self):
+        """As on a full disk no file of the program can grow."""
+        file = self.write("Bench.INI", "; bench\r\n[RDS]\r\nPS=OLD\r\n")
+        before = pathlib.Path(file).read_bytes()
+
+        def fill():
+            signal.signal(signal.SIGXFSZ, signal.SIG_IGN)  # else the system ends the program
+            resource.setrlimit(resource.RLIMIT_FSIZE, (0, 0))
+
+        for target in (file, str(self.folder / "New.INI")):
+            with self.subTest(target):
+                run = self.into(subprocess.PIPE, "--simulate", "read", "--into", target, preexec_fn=fill)
+                self.assertEqual((run.returncode, run.stdout), (FAILED, ""))
+                self.assertIn(f"kdx-ctl: {target} cannot be written\n", run.stderr)
+        self.assertEqual(pathlib.Path(file).read_bytes(), before)
+        self.assertEqual(sorted(path.name for path in self.folder.iterdir()), ["Bench.INI", "Daten"])
 
     def testAReaderThatHasGoneIsNoFailure(self):
         for call in (("list", "keys"), ("--simulate", "--json", "query", "all"), ("--help",)):

@@ -14,7 +14,7 @@ import time
 import unittest
 
 import ctl_test
-from ctl_test import DONE, FAILED, NO_CONNECTION, WRONG_CALL
+from ctl_test import DIFFERENT, DONE, FAILED, NO_CONNECTION, WRONG_CALL
 
 SIM = ""
 
@@ -90,9 +90,19 @@ class Piped(ctl_test.Ctl):
         self.assertEqual(len(self.answers("quit\nquery ps\n")), 1)
         self.assertEqual(len(self.answers("exit\nquery ps\n")), 1)
 
+    def testWhatIsReadIntoAFileDiffersInNothing(self):
+        file = str(self.folder / "Bench.INI")
+        lines = ["diff --data-set 2", "diff --data-set 2 --fix", f"read --into {file}", f"diff --file {file}",
+                 "send PS=OTHER", f"diff --file {file}", "diff"]
+        told = self.answers("\n".join(lines), expect=DIFFERENT)
+        self.assertEqual([answer["exit_code"] for answer in told],
+                         [DIFFERENT, DONE, DONE, DONE, DONE, DIFFERENT, WRONG_CALL])
+        self.assertEqual([row["setting"] for row in told[5]["differences"]], ["PS"])
+        self.assertIn("which data set?", told[6]["problems"][0])
+
     def testHelpListsTheCommands(self):
         listed = self.shell("help")
-        for name in ("send", "query", "wait", "help", "quit"):
+        for name in ("send", "query", "diff", "read", "wait", "help", "quit"):
             self.assertIn("\n" + name + " ", "\n" + listed)
         self.assertIn("--raw", self.shell("help send"))
         self.assertIn("--raw", self.answers("send --help")[0]["help"])

@@ -71,6 +71,16 @@ class Options(unittest.TestCase):
                 self.assertEqual((result.returncode, result.stdout), (2, ""))
                 self.assertRegex(result.stderr, r"^kdx-sim: .+\n$")
 
+    def testNoControlCharacterIsPrinted(self):
+        bad = b"x\x1b[2J\xff"
+        for options, exitCode in (([b"--" + bad], 2), ([bad], 2), ([b"--port", bad], 2), ([b"--bind", bad], 1)):
+            with self.subTest(options=options):
+                result = subprocess.run([PROGRAM, *options], capture_output=True, timeout=20)
+                self.assertEqual(result.returncode, exitCode)
+                self.assertIn(b"[2J", result.stderr)
+                self.assertEqual([byte for byte in result.stderr if byte < 0x20 and byte != 0x0A], [])
+                result.stderr.decode()
+
     def testAnAddressThatCannotBeHadIsSaidOnStderrAndExitsWith1(self):
         for address in ("nonsense", "192.0.2.1"):
             result = run("--bind", address)

@@ -137,6 +137,11 @@ void Laboratory::nextTask() {
     if (m_lost) m_session->instrument.close();
 }
 
+void Laboratory::expect(std::size_t commands) {
+    m_written = 0;
+    m_expected = commands;
+}
+
 bool Laboratory::pause(std::chrono::milliseconds duration) {
     waitReadable(m_stop, duration);
     return !isStopped();

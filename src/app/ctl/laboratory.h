@@ -34,10 +34,7 @@ public:
     /// The failures of the task before are over; a link that was lost is made anew by open().
     void nextTask();
     /// So many commands come now, which are counted anew; 0: as many as there are.
-    void expect(std::size_t commands) {
-        m_written = 0;
-        m_expected = commands;
-    }
+    void expect(std::size_t commands);
     /// Waits; false when the user wants to stop, at once then.
     bool pause(std::chrono::milliseconds duration);
     /// After a command outside of steps: whether to go on with the next.
@@ -58,7 +55,6 @@ public:
     /// Lets the session be when the program ends.
     void keepOpen() { m_session->keepOpen(); }
 
-    /// Readable once the user wants to stop.
     [[nodiscard]] int stop() const { return m_stop; }
     /// What instruments are reached by; null when a library that was asked for cannot be used.
     [[nodiscard]] Visa* visa() const { return m_link.visa.get(); }
@@ -97,9 +93,9 @@ private:
     bool m_refused = false;  ///< a list that the coder cannot take
     bool m_stopped = false;
     bool m_finishing = false;
-    bool m_inSteps = false;      ///< which tell their number themselves
-    std::size_t m_written = 0;   ///< commands and questions besides
-    std::size_t m_expected = 0;  ///< how many there will be; 0 when nobody knows
+    bool m_inSteps = false;     ///< which tell their number themselves
+    std::size_t m_written = 0;  ///< commands and questions besides
+    std::size_t m_expected = 0;
 };
 
 }  // namespace kdx::ctl
