@@ -7,6 +7,7 @@ import os
 import pathlib
 import re
 import shlex
+import shutil
 import subprocess
 import sys
 import unittest
@@ -30,6 +31,7 @@ exec {shlex.quote(ctl_test.CTL)} --app-folder {shlex.quote(str(self.folder))} "$
 """)
         self.program.chmod(0o755)
         self.simulated("send", "PS=RADIO")  # so that there is a log
+        shutil.copy(self.folder / "Daten" / "RDS_log.txt", self.folder / "drive.log")
 
     def runs(self, example):
         environment = dict(os.environ, PATH=f"{self.folder}:{os.environ['PATH']}")

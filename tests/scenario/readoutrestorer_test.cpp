@@ -55,7 +55,7 @@ TEST_F(ReadoutRestorerTest, AnInstrumentThatTellsNothingIsNotPlayedTo) {
 }
 
 TEST_F(ReadoutRestorerTest, OneThatTellsNoLongerIsNotRestored) {
-    visa.answersTo = {{coder("PS"), "\"RADIO   \"\n"}, {coder("SRC"), "\"1\"\n"}};
+    visa.answersTo = {{"*IDN?", "KDX\n"}, {coder("PS"), "\"RADIO   \"\n"}};
     scenario::ReadoutRestorer falling(session.instrument);
     EXPECT_TRUE(falling.remember());
     EXPECT_TRUE(falling.commands().has_value());
