@@ -1,0 +1,18 @@
+#pragma once
+
+#include <chrono>
+#include <cstdint>
+#include <ratio>
+
+namespace kdx::air {
+
+/// The sixteenth part of a bit of 1187.5 bit/s (IEC 62106, 4.5): bits and milliseconds are both whole numbers of it.
+using Ticks = std::chrono::duration<std::int64_t, std::ratio<1, 19000>>;
+/// A time of the clock that the instrument runs by.
+using AirTime = std::chrono::sys_time<Ticks>;
+
+inline constexpr int kBitsOfGroup = 104;
+inline constexpr Ticks kBitTime{16};
+inline constexpr Ticks kGroupTime = kBitsOfGroup * kBitTime;
+
+}  // namespace kdx::air
