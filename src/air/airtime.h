@@ -2,7 +2,13 @@
 
 #include <chrono>
 #include <cstdint>
+#include <optional>
 #include <ratio>
+#include <string_view>
+
+namespace kdx {
+class Clock;
+}
 
 namespace kdx::air {
 
@@ -14,5 +20,11 @@ using AirTime = std::chrono::sys_time<Ticks>;
 inline constexpr int kBitsOfGroup = 104;
 inline constexpr Ticks kBitTime{16};
 inline constexpr Ticks kGroupTime = kBitsOfGroup * kBitTime;
+
+/// What the clock shows now, to the millisecond.
+[[nodiscard]] AirTime airTimeOf(const Clock& clock);
+
+/// Reads "2026-01-01 12:00:00"; nothing when that is no time, or not of 2000 to 2099, the years that the coder knows.
+[[nodiscard]] std::optional<AirTime> parseAirTime(std::string_view text);
 
 }  // namespace kdx::air

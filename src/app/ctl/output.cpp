@@ -34,6 +34,11 @@ void Output::problem(const std::string& text) {
     note(text);
 }
 
+void Output::warning(const std::string& text) {
+    std::fprintf(stderr, "warning: %s\n", text.c_str());
+    document["warnings"].push_back(text);
+}
+
 void Output::table(const Rows& rows) const {
     std::vector<std::size_t> widths;
     for (const auto& row : rows) {
