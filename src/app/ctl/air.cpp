@@ -41,9 +41,9 @@ std::optional<std::string> bytesOf(Laboratory& laboratory, const std::string& fi
 }
 
 bool areReadable(Laboratory& laboratory, const std::string& file, const std::vector<std::size_t>& unreadableLines,
-                 const std::string& kind) {
+                 const char* what) {
     for (const std::size_t line : unreadableLines)
-        laboratory.output().problem(file + ", line " + std::to_string(line) + ": not a line of a " + kind);
+        laboratory.output().problem(std::string(file).append(", line ").append(std::to_string(line)).append(what));
     return unreadableLines.empty();
 }
 
@@ -62,7 +62,7 @@ bool addLog(Laboratory& laboratory, const std::string& file, Commands& commands)
     if (!bytes) return false;
     const LoggedCommands logged = readLoggedCommands(*bytes);
     for (const auto& [key, command] : logged.commands) commands.push_back({air::Ticks{0}, command});
-    return areReadable(laboratory, file, logged.unreadableLines, "command log");
+    return areReadable(laboratory, file, logged.unreadableLines, ": not a line of a command log");
 }
 
 bool addCommandFile(Laboratory& laboratory, const std::string& file, Commands& commands) {
@@ -70,7 +70,7 @@ bool addCommandFile(Laboratory& laboratory, const std::string& file, Commands& c
     if (!bytes) return false;
     const air::TimedCommands read = air::readTimedCommands(*bytes);
     commands.insert(commands.end(), read.commands.begin(), read.commands.end());
-    return areReadable(laboratory, file, read.unreadableLines, "command file");
+    return areReadable(laboratory, file, read.unreadableLines, ": not a line of a command file");
 }
 
 /// All that is done to the instrument, in its order; nothing when a part of it cannot be read.
@@ -152,9 +152,10 @@ void addTimes(CLI::App& command, const std::shared_ptr<Air>& what) {
             "--start",
             [what](const std::string& text) {
                 what->start = air::parseAirTime(text);
-                if (!what->start)
+                if (!what->start) {
                     throw CLI::ValidationError("--start",
                                                "takes a time like \"2026-01-01 12:00:00\", not \"" + text + "\"");
+                }
             },
             "when it begins, else now")
         ->type_name("TIME");
