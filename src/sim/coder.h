@@ -9,6 +9,7 @@
 #include "sim/coderclock.h"
 #include "sim/errorqueue.h"
 #include "sim/setup.h"
+#include "sim/transmission.h"
 
 namespace kdx::sim {
 
@@ -27,6 +28,11 @@ public:
     /// Answers a query: a name, for some of them a comma and an argument, a question mark at the end or not ("PS",
     /// "EON PI?", "EON-AFB,D3C2,1"). There is an answer whenever the name is known, even if only an empty one.
     [[nodiscard]] Reply query(std::string_view text) const;
+
+    /// What goes on the air.
+    [[nodiscard]] Transmission transmission() const {
+        return {m_settings, m_openData.last, m_traffic.last, m_clock.lead()};
+    }
 
     /// Stops the clock and forgets the open-data and traffic messages. Memories are kept.
     void reset();

@@ -23,13 +23,15 @@ public:
     void stop() { m_lead.reset(); }
     /// The running time in the same form, or "off".
     [[nodiscard]] std::string text() const;
+    /// How far it runs ahead of the clock handed in; nothing while it is off.
+    [[nodiscard]] std::optional<std::chrono::milliseconds> lead() const { return m_lead; }
 
 private:
     using Time = std::chrono::sys_time<std::chrono::milliseconds>;
     [[nodiscard]] Time now() const;
 
     const Clock& m_clock;
-    std::optional<std::chrono::milliseconds> m_lead;  ///< how far it runs ahead of the clock handed in
+    std::optional<std::chrono::milliseconds> m_lead;
 };
 
 }  // namespace kdx::sim

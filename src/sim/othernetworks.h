@@ -38,6 +38,8 @@ public:
     /// network the coder does not hold is an error and gives an empty answer too, so that nobody waits in vain.
     [[nodiscard]] Reply query(std::string_view name, std::optional<std::string_view> argument) const;
 
+    [[nodiscard]] const std::vector<OtherNetwork>& networks() const { return m_networks; }
+
 private:
     ScpiError add(std::string_view pi);
     ScpiError remove(std::string_view pi);

@@ -39,6 +39,9 @@ public:
     /// several lines is several messages.
     std::string execute(std::string_view message) override;
 
+    /// What goes on the air.
+    [[nodiscard]] Transmission transmission() const { return m_coder.transmission(); }
+
     /// Hears of every command once it has been carried out or refused, its header in full.
     using UnitObserver = std::function<void(const CommandUnit& unit, ScpiError error)>;
     void onUnit(UnitObserver observer) { m_observer = std::move(observer); }

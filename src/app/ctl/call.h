@@ -39,6 +39,7 @@ using Task = std::function<int(Laboratory&)>;
 /// A subcommand adds itself to the command line and sets the task when it was called.
 using AddSubcommand = void (*)(CLI::App& app, Task& task);
 
+void addAir(CLI::App& app, Task& task);
 void addApply(CLI::App& app, Task& task);
 void addCheck(CLI::App& app, Task& task);
 void addDiff(CLI::App& app, Task& task);

@@ -41,8 +41,7 @@ public:
     [[nodiscard]] bool goesOn();
     /// kDone, kFailed when anything failed or was stopped, or kDifferent when a list was refused.
     [[nodiscard]] int result() const;
-    /// Checks a value, as it was typed, against what is legal for the key; tells what is wrong, of a known key unless
-    /// the call is to be forced.
+    /// Checks a value, as typed, against what is legal for the key; what is wrong is told, unless the call is forced.
     [[nodiscard]] bool mayBeSent(const std::string& key, const std::string& utf8);
     /// Checks all that a data set sends; what is wrong is told, unless the call is to be forced.
     [[nodiscard]] bool mayBeSent(const Profile& source);
@@ -54,7 +53,6 @@ public:
     void hasten(double factor) { m_clock.hasten(factor); }
     /// Lets the session be when the program ends.
     void keepOpen() { m_session->keepOpen(); }
-
     [[nodiscard]] int stop() const { return m_stop; }
     /// What instruments are reached by; null when a library that was asked for cannot be used.
     [[nodiscard]] Visa* visa() const { return m_link.visa.get(); }

@@ -38,6 +38,11 @@ void Output::problem(const std::string& problem) {
     note(text);
 }
 
+void Output::warning(const std::string& text) {
+    std::fprintf(stderr, "warning: %s\n", text.c_str());
+    document["warnings"].push_back(text);
+}
+
 void Output::table(const Rows& rows) {
     std::vector<std::size_t> widths;
     for (const auto& row : rows) {

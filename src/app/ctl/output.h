@@ -21,6 +21,8 @@ public:
     /// A line that only tells how it goes; not with JSON, not when the call is to be quiet.
     void remark(const std::string& text);
     void problem(const std::string& problem);
+    /// What does not keep the call from being done.
+    void warning(const std::string& text);
     using Rows = std::vector<std::vector<std::string>>;
     /// Lines of the result with their columns under each other.
     void table(const Rows& rows);
