@@ -11,8 +11,9 @@ import sys
 import tempfile
 import unittest
 
+import shippeddata
+
 CTL = ""
-DATA = pathlib.Path(__file__).parents[2] / "Daten"
 DONE, FAILED, WRONG_CALL = 0, 1, 2
 RDS_ON = ":STEREO:RDS:STATE ON\n"
 
@@ -21,7 +22,7 @@ class Air(unittest.TestCase):
     def setUp(self):
         self.folder = pathlib.Path(tempfile.mkdtemp(prefix="kdx-ctl-air-"))
         self.addCleanup(shutil.rmtree, self.folder)
-        shutil.copytree(DATA, self.folder / "Daten")
+        shippeddata.copyTo(self.folder / "Daten")
 
     def air(self, *arguments, expect=DONE, before=()):
         run = subprocess.run([CTL, "--app-folder", str(self.folder), *before, "air", *arguments], capture_output=True,

@@ -15,9 +15,10 @@ import time
 import unittest
 
 import ctl_test
-from ctl_test import DATA, DIFFERENT, DONE, FAILED, NO_CONNECTION, WRONG_CALL
+import shippeddata
+from ctl_test import DIFFERENT, DONE, FAILED, NO_CONNECTION, WRONG_CALL
 
-SHIPPED = sorted((DATA / "Scenarios").glob("*.yaml"))
+SHIPPED = sorted((shippeddata.DATA / "Scenarios").glob("*.yaml"))
 
 
 class Playing(ctl_test.Ctl):
@@ -79,7 +80,7 @@ class Shipped(Playing):
 
 class Check(Playing):
     def testTheScenarioOfTheReadmeIsRight(self):
-        text = (DATA.parent / "README.md").read_text(encoding="utf-8").split("```yaml\n")[1].split("```")[0]
+        text = (shippeddata.DATA.parent / "README.md").read_text(encoding="utf-8").split("```yaml\n")[1].split("```")[0]
         self.assertEqual(self.ctl("check", self.scenario(text)).stdout, "Announcement on another network: 8 steps\n")
 
     def testARightFileIsToldInOneLine(self):

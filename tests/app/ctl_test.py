@@ -17,8 +17,9 @@ import threading
 import time
 import unittest
 
+import shippeddata
+
 CTL = SIM = ""
-DATA = pathlib.Path(__file__).parents[2] / "Daten"
 DONE, FAILED, WRONG_CALL, DIFFERENT, NO_CONNECTION = 0, 1, 2, 3, 4
 
 
@@ -26,7 +27,7 @@ class Ctl(unittest.TestCase):
     def setUp(self):
         self.folder = pathlib.Path(tempfile.mkdtemp(prefix="kdx-ctl-test-"))
         self.addCleanup(shutil.rmtree, self.folder)
-        shutil.copytree(DATA, self.folder / "Daten")
+        shippeddata.copyTo(self.folder / "Daten")
 
     def command(self, *arguments):
         return [CTL, "--app-folder", str(self.folder), *arguments]
@@ -52,6 +53,7 @@ class Ctl(unittest.TestCase):
 class Calls(Ctl):
     def testAWrongCallIsToldWithExitCode2(self):
         for call in ((), ("nonsense",), ("send",), ("query",), ("apply", "--data-set", "6"), ("list", "nothing"),
+                     ("send", "--eon", "D3C1"),
                      ("--gpib", "31", "query", "ps"), ("--lan", "a", "--gpib", "3", "query", "ps"),
                      ("apply", "--data-set", "1", "--file", "x")):
             with self.subTest(call):
@@ -103,6 +105,10 @@ class Calls(Ctl):
         run = self.ctl("--visa-library", str(self.folder / "none.so"), "query", "ps", expect=NO_CONNECTION)
         self.assertIn("none.so", run.stderr)
 
+    def testAnUnknownSubcommandIsNamed(self):
+        for call in (("sned", "PS=A"), ("--simulate", "sned"), ("--json", "sned")):
+            self.assertIn("there is no subcommand sned", self.ctl(*call, expect=WRONG_CALL).stderr)
+        self.assertIn("A subcommand is required", self.ctl(expect=WRONG_CALL).stderr)
 
     def testNoControlCharacterIsPrinted(self):
         """What the terminal would take for a command: in a name of a file, a key, an address."""
@@ -121,6 +127,13 @@ class Calls(Ctl):
                 self.assertIn(b"[2J", run.stderr)
                 self.assertEqual([byte for byte in run.stdout + run.stderr if byte < 0x20 and byte != 0x0A], [])
                 run.stderr.decode()
+        self.write("Daten/Datenset5.INI", "[RDS]\r\nPS=A\x1b[2J\x7f\u0178\r\nPI=1000\r\n")
+        text = self.ctl("list").stdout
+        self.assertIn("A.[2J.\u0178", text)
+        self.write("Daten/Datenset5.INI", "[RDS]\r\nPI=1000\r\n")
+        with open(self.folder / "Daten" / "Datenset5.INI", "ab") as file:
+            file.write(b"PS=\x81\x8d\r\n")  # what the code page leaves open are control characters too
+        self.assertRegex(self.ctl("list").stdout, r"(?m)^5  \.\.  +1000$")
 
     def testACharacterThatTheInstrumentDoesNotHaveIsToldBeforeAnythingIsSent(self):
         for call in (("PS=日本",), ("--raw", ":OUTP 日"), ("--coder", "PS=日")):
@@ -136,7 +149,7 @@ class Calls(Ctl):
 
     def testAnUnknownKeyIsToldAlsoWithForce(self):
         run = self.simulated("--force", "send", "XY=1", expect=WRONG_CALL)
-        self.assertIn("there is no key XY", run.stderr)
+        self.assertIn("there is no key XY; kdx-ctl list keys names them", run.stderr)
 
     def testALogThatCannotBeWrittenIsToldOnce(self):
         (self.folder / "Daten" / "RDS_log.txt").mkdir()
@@ -267,6 +280,29 @@ class Send(Ctl):
 
     def testWhatIsNoSettingIsToldWithExitCode2(self):
         self.assertIn("PS is not KEY=VALUE", self.simulated("send", "PS", expect=WRONG_CALL).stderr)
+        self.assertIn("NOKEY is not KEY=VALUE", self.simulated("send", "NOKEY", expect=WRONG_CALL).stderr)
+
+    def testAKeyWhoseValueSaysNothingNeedsNone(self):
+        self.assertEqual(self.sent("send", "DEL_RT", "FM_EIN"), [':STEREO:DIRECT "RT=0,0,"', "FM:STAT ON"])
+
+    def testTheAnswerToAQuestionIsShownAndNotTakenForTheNextOne(self):
+        run = self.simulated("send", "PS=RADIO", "--raw", "FREQ?", "--raw", "*IDN?", "--raw", 'STER:DIR "RT=0,0,where?"')
+        self.assertEqual(run.stdout, "100\nKDX,KDX-X4,100001,1.00\n")
+        document = json.loads(self.simulated("--json", "send", "--raw", "FREQ?").stdout)
+        self.assertEqual((document["answers"], document["traffic"][-1]["text"]), (["100"], "100"))
+        silent = self.simulated("--timeout", "0.2", "send", "--raw", "NOTHING?", expect=FAILED)
+        self.assertIn("time-out expired", silent.stderr)
+
+    def testWhichOtherNetworkIsMeantCanBeSaid(self):
+        self.assertEqual(self.sent("send", "EON_TA=1"), [':STEREO:DIRECT "EON-TA=D7A2,1"'])
+        self.assertEqual(self.sent("send", "--eon", "d3c1", "EON_TA=1"), [':STEREO:DIRECT "EON-TA=D3C1,1"'])
+        self.assertEqual(self.sent("send", "--eon", "D3C1", "EON_PI=D3C2", "EON_TA=1"),
+                         [':STEREO:DIRECT "EON-PI=D3C2"', ':STEREO:DIRECT "EON-TA=D3C2,1"'])
+        self.assertIn(':STEREO:DIRECT? "EON-PS,D3C1"', self.sent("query", "--eon", "D3C1", "eon"))
+        for wrong in ("", "D3C", "D3C1A", "D3CX", "\x1b[2J"):
+            for call in (("send", "TA=1"), ("query", "eon")):
+                run = self.simulated(*call, "--eon", wrong, expect=WRONG_CALL)
+                self.assertIn("--eon: takes a PI, four hexadecimal digits", run.stderr)
 
     def testTheLogTellsWhatWasSent(self):
         self.simulated("send", "PS=RADIO")
@@ -284,6 +320,13 @@ class Query(Ctl):
         document = json.loads(self.simulated("query", "all", "--json").stdout)
         self.assertEqual(len(document["answers"]), 20)
         self.assertEqual(document["answers"]["frequency"], {"words": "100 MHz", "answers": ["100"]})
+
+    def testAllOfThemHaveTheirNamesBeforeThem(self):
+        lines = self.simulated("query", "all").stdout.splitlines()
+        self.assertIn("frequency    100 MHz", lines)
+        at = lines.index("ari          ARI aus")
+        self.assertEqual(lines[at + 1:at + 4], ["             ARI Hub: 3500 Hz", "             aus", "             A"])
+        self.assertEqual(len([line for line in lines if not line.startswith(" ")]), 20)
 
     def testAnUnknownNameIsExitCode2(self):
         self.assertIn("no read-back nothing", self.simulated("query", "ps", "nothing", expect=WRONG_CALL).stderr)

@@ -12,7 +12,8 @@ import sys
 import unittest
 
 import ctl_test
-from ctl_test import DATA, DONE, FAILED
+import shippeddata
+from ctl_test import DONE, FAILED
 
 RDS = ""
 
@@ -59,15 +60,15 @@ class Wire(ctl_test.Ctl):
 class TheWindow(Wire):
     def testApplySendsByteForByteWhatTheWindowSends(self):
         """The window opens data set 1: every other set is put in its place, beside the carrier that set 1 keeps."""
-        carrier = re.search(rb"(?ms)^\[VRN\].*?(?=^\[|\Z)", (DATA / "Datenset1.INI").read_bytes())[0]
+        carrier = re.search(rb"(?ms)^\[VRN\].*?(?=^\[|\Z)", (shippeddata.DATA / "Datenset1.INI").read_bytes())[0]
         for number in "12345":
             with self.subTest(number):
                 self.lan("apply", "--data-set", number)
                 applied = self.messages()
                 self.assertGreater(len(applied), 30)
                 other = self.folder / ("window" + number)
-                shutil.copytree(DATA, other / "Daten")
-                dataSet = (DATA / f"Datenset{number}.INI").read_bytes()
+                shippeddata.copyTo(other / "Daten")
+                dataSet = (shippeddata.DATA / f"Datenset{number}.INI").read_bytes()
                 if number != "1":
                     dataSet = re.sub(rb"(?ms)^\[VRN\].*?(?=^\[|\Z)", b"", dataSet) + b"\r\n" + carrier
                 (other / "Daten" / "Datenset1.INI").write_bytes(dataSet)

@@ -14,6 +14,8 @@ import tempfile
 import time
 import unittest
 
+import shippeddata
+
 PROGRAM = ""
 LIBRARY = ""
 PATIENCE = 120  # seconds, on a machine with much else to do
@@ -27,7 +29,7 @@ class Ending(unittest.TestCase):
     def folder(self, name, address, atStart="AUTO"):
         """A program folder whose settings open the session to that address at the start."""
         folder = self.home / name
-        shutil.copytree(pathlib.Path(__file__).parents[2] / "Daten", folder / "Daten")
+        shippeddata.copyTo(folder / "Daten")
         settings = folder / "Daten" / "RDS_Allg.INI"
         text = settings.read_bytes()
         for key, value in (("IECBUS", atStart), ("INTERFACE", "TCPIP"), ("KDX_TCPIP", address)):

@@ -11,6 +11,8 @@ import sys
 import tempfile
 import unittest
 
+import shippeddata
+
 PROGRAM = ""
 
 
@@ -79,7 +81,7 @@ class Program(unittest.TestCase):
 
     def testTheFolderAskedForIsUsedAndNothingElseIsMade(self):
         folder = self.home / "lab"
-        shutil.copytree(pathlib.Path(__file__).parents[2] / "Daten", folder / "DATEN")
+        shippeddata.copyTo(folder / "DATEN")
         result = self.run_("--simulate", "--app-folder", str(folder), "--tour=pictures")
         self.assertEqual(result.returncode, 0, result.stdout + result.stderr)
         self.assertFalse(self.data.exists())
@@ -89,7 +91,7 @@ class Program(unittest.TestCase):
         program = self.home / "kdx" / "kdx-rds"
         program.parent.mkdir()
         shutil.copy(PROGRAM, program)
-        shutil.copytree(pathlib.Path(__file__).parents[2] / "Daten", program.parent / "Daten")
+        shippeddata.copyTo(program.parent / "Daten")
         result = self.run_("--simulate", "--tour", "pictures", program=str(program))
         self.assertEqual(result.returncode, 0, result.stdout + result.stderr)
         self.assertFalse(self.data.exists())
