@@ -78,6 +78,10 @@ bool isDecimal(std::string_view text) {
     return !text.empty() && digitsEnd(text, 0) == text.size();
 }
 
+bool isHex(std::string_view text) {
+    return !text.empty() && text.find_first_not_of("0123456789abcdefABCDEF") == std::string_view::npos;
+}
+
 std::string shortestDecimal(double value) {
     if (value == 0.0) return "0";  // also for -0, which has no text of its own
     // 15 digits hide the last bit's noise: 67.6 * 10 is 676, not 676.0000000000001.

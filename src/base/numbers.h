@@ -14,6 +14,9 @@ namespace kdx {
 /// True for a text of decimal digits only (not empty).
 [[nodiscard]] bool isDecimal(std::string_view text);
 
+/// True for a text of hexadecimal digits only (not empty), in any letter case.
+[[nodiscard]] bool isHex(std::string_view text);
+
 /// The shortest decimal text that reads back as the same number, at most 15 significant digits, with a point and no
 /// leading blank: 675, 2.5, -30. Numbers of 1e15 and more are written with an exponent.
 [[nodiscard]] std::string shortestDecimal(double value);

@@ -123,10 +123,6 @@ bool isWithin(std::string_view text, double lowest, double highest) {
     return number && *number >= lowest && *number <= highest;
 }
 
-bool isHex(std::string_view text, std::size_t digits) {
-    return text.size() == digits && text.find_first_not_of("0123456789abcdefABCDEF") == std::string_view::npos;
-}
-
 bool isGroup(std::string_view group) {
     if (group.empty() || (group.back() != 'A' && group.back() != 'B')) return false;
     group.remove_suffix(1);
@@ -147,8 +143,7 @@ bool isLedFrequencyList(std::string_view text) {
 }
 
 bool isMessage(std::string_view text) {
-    return text.size() == 3 + kGroupDigits && isDecimal(text.substr(0, 2)) && text[2] == ',' &&
-           isHex(text.substr(3), kGroupDigits);
+    return text.size() == 3 + kGroupDigits && isDecimal(text.substr(0, 2)) && text[2] == ',' && isHex(text.substr(3));
 }
 
 std::string joinedWords(std::string_view words) {
@@ -217,7 +212,7 @@ std::optional<std::string> problem(const Row& row, std::string_view value) {
             return unless(value.size() <= static_cast<std::size_t>(row.highest));
         }
         case Kind::Identifier:
-            return unless(isHex(value, kPiLength));
+            return unless(value.size() == kPiLength && isHex(value));
         case Kind::Frequencies:
             return unless(isLedFrequencyList(value));
         case Kind::PlainList:

@@ -4,11 +4,10 @@
 #include "link/deadline.h"
 #include "link/rpcmessage.h"
 #include "vxi11.h"
+#include "vxi11/ipv4networks.h"
 #include "vxi11/xdr.h"
 
 #include <arpa/inet.h>
-#include <ifaddrs.h>
-#include <net/if.h>
 #include <netinet/in.h>
 #include <poll.h>
 #include <rpc/pmap_prot.h>
@@ -27,33 +26,12 @@ namespace {
 
 using std::chrono::steady_clock;
 
-std::uint32_t numberOf(const sockaddr* name) {
-    sockaddr_in address{};
-    std::memcpy(&address, name, sizeof address);
-    return ntohl(address.sin_addr.s_addr);
-}
-
-std::string dotted(std::uint32_t number) {
-    const in_addr address{htonl(number)};
-    std::array<char, INET_ADDRSTRLEN> text{};
-    return inet_ntop(AF_INET, &address, text.data(), text.size());
-}
-
 /// Where everybody in this machine's networks hears a question; and the machine itself, whose port mapper need not
 /// hear what is asked of everybody on the loopback interface.
 std::set<std::uint32_t> placesToAsk() {
     std::set<std::uint32_t> places{INADDR_LOOPBACK};
-    ifaddrs* first = nullptr;
-    if (getifaddrs(&first) != 0) return places;
-    const std::unique_ptr<ifaddrs, decltype(&freeifaddrs)> list(first, &freeifaddrs);
-    for (const ifaddrs* entry = first; entry != nullptr; entry = entry->ifa_next) {
-        if ((entry->ifa_flags & IFF_UP) == 0 || entry->ifa_addr == nullptr || entry->ifa_netmask == nullptr ||
-            entry->ifa_addr->sa_family != AF_INET) {
-            continue;
-        }
-        constexpr std::uint32_t kTooSmall = 0xFFFFFFFE;  // a network of two has no address left for "all"
-        const std::uint32_t mask = numberOf(entry->ifa_netmask);
-        if (mask < kTooSmall) places.insert(numberOf(entry->ifa_addr) | ~mask);
+    for (const vxi11::Ipv4Network& network : vxi11::ipv4Networks()) {
+        if (const auto broadcast = network.broadcast()) places.insert(*broadcast);
     }
     return places;
 }
@@ -118,7 +96,7 @@ std::vector<std::string> discoverLanInstruments(const Discovery& how) {
     gather(socket.number(), question, begin + how.wait, how, found);
     std::vector<std::string> addresses;
     addresses.reserve(found.size());
-    for (const std::uint32_t address : found) addresses.push_back(dotted(address));
+    for (const std::uint32_t address : found) addresses.push_back(vxi11::dotted(address));
     return addresses;
 }
 

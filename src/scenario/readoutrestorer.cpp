@@ -2,21 +2,10 @@
 
 #include <algorithm>
 
-#include "link/commandsequence.h"
-
 namespace kdx::scenario {
 
-namespace {
-
-Readout askedFor(Instrument& instrument) {
-    const CommandSequence sequence(instrument);  // one failure ends all of it
-    return readOut(instrument);
-}
-
-}  // namespace
-
 bool ReadoutRestorer::remember() {
-    m_before = askedFor(m_instrument);
+    m_before = readOut(m_instrument);
     return std::any_of(m_before.begin(), m_before.end(),
                        [](const Reading& reading) { return reading.value.has_value(); });
 }
@@ -39,7 +28,7 @@ std::optional<std::vector<std::string>> ReadoutRestorer::changed() {
 
 /// Nothing when the instrument gave fewer answers than before.
 std::optional<Differences> ReadoutRestorer::differing() const {
-    const Readout present = askedFor(m_instrument);
+    const Readout present = readOut(m_instrument);
     const Readout silent = unanswered(present);
     const Readout silentBefore = unanswered(m_before);
     const bool told = std::all_of(silent.begin(), silent.end(), [&](const Reading& reading) {

@@ -1,9 +1,9 @@
 #include "scenario/values.h"
 
 #include <algorithm>
-#include <array>
 
 #include "base/codepage.h"
+#include "base/duration.h"
 #include "base/numbers.h"
 #include "coder/keyfacts.h"
 #include "scenario/scenario.h"
@@ -12,11 +12,6 @@ namespace kdx::scenario {
 
 namespace {
 
-struct Unit {
-    std::string_view name;
-    std::int64_t milliseconds;
-};
-constexpr std::array kUnits = {Unit{"ms", 1}, Unit{"s", 1000}, Unit{"min", 60'000}, Unit{"h", 3'600'000}};
 constexpr std::string_view kTimes = "500 ms, 2 s, 1.5 min or 1 h";
 constexpr std::int64_t kOne = 1'000'000;  // of a decimal
 
@@ -75,22 +70,15 @@ std::optional<std::string> Values::keyValue(const YamlNode& node, const std::str
 std::optional<std::chrono::milliseconds> Values::time(const YamlNode& node, std::string_view name) {
     const auto written = text(node, name);
     if (!written) return std::nullopt;
-    const std::size_t digits = std::min(written->find_first_not_of("0123456789."), written->size());
-    const std::string_view rest = std::string_view(*written).substr(digits);
-    const std::string_view unitName = rest.substr(std::min(rest.find_first_not_of(' '), rest.size()));
-    const auto amount = readDecimal(std::string_view(*written).substr(0, digits));
-    const auto* const unit =
-        std::find_if(kUnits.begin(), kUnits.end(), [&](const Unit& known) { return known.name == unitName; });
-    if (amount && unitName.empty()) {
-        wrong(node, std::string(name) + " needs a unit: " + std::string(kTimes) + ", not " + quoted(*written));
-    } else if (!amount || unit == kUnits.end()) {
-        wrong(node, std::string(name) + " is a time: " + std::string(kTimes) + ", not " + quoted(*written));
-    } else {
-        const std::int64_t whole = amount->millionths / kOne * unit->milliseconds;
-        const std::int64_t part = amount->millionths % kOne * unit->milliseconds / kOne;
-        const std::chrono::milliseconds time(whole + part);
-        if (time.count() >= 1 && time <= kLongestTime) return time;
+    const auto time = parseDuration(*written);
+    if (!time) {
+        const bool unitMissing = parseDuration(*written + "s").has_value();
+        wrong(node, std::string(name) + (unitMissing ? " needs a unit: " : " is a time: ") + std::string(kTimes) +
+                        ", not " + quoted(*written));
+    } else if (time->count() < 1 || *time > kLongestTime) {
         wrong(node, std::string(name) + " is 1 ms at least and 168 h at most, not " + quoted(*written));
+    } else {
+        return time;
     }
     return std::nullopt;
 }

@@ -174,10 +174,6 @@ std::optional<int> readWhole(std::string_view text) {
     return value;
 }
 
-bool isHex(std::string_view text) {
-    return !text.empty() && text.find_first_not_of("0123456789abcdefABCDEF") == std::string_view::npos;
-}
-
 bool hasControlCharacter(std::string_view text) {
     return std::any_of(text.begin(), text.end(), [](char c) { return static_cast<unsigned char>(c) < 0x20; });
 }

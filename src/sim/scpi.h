@@ -79,9 +79,6 @@ struct NumberWithSuffix {
 /// A whole number that fills the text but for blanks around it; nothing when it is anything else.
 [[nodiscard]] std::optional<int> readWhole(std::string_view text);
 
-/// True for a text of hexadecimal digits only (not empty), in any letter case.
-[[nodiscard]] bool isHex(std::string_view text);
-
 /// True when the text has a control character in it, which neither the air nor an answer could carry.
 [[nodiscard]] bool hasControlCharacter(std::string_view text);
 

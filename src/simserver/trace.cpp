@@ -6,6 +6,7 @@
 #include <cstdint>
 
 #include "base/codepage.h"
+#include "base/numbers.h"
 #include "coder/fieldsizes.h"
 
 namespace kdx::simserver {
@@ -13,7 +14,6 @@ namespace kdx::simserver {
 namespace {
 
 using sim::cutAt;
-using sim::isHex;
 using sim::splitOutsideQuotes;
 
 std::string number(std::uint64_t value) {

@@ -12,7 +12,7 @@
 #include "coder/fieldsizes.h"
 #include "coder/keyfacts.h"
 #include "coder/sendparam.h"
-#include "link/instrument.h"
+#include "link/commandsequence.h"
 #include "sim/scpi.h"
 
 namespace kdx {
@@ -20,11 +20,10 @@ namespace kdx {
 namespace {
 
 enum class Form {
-    Text,      ///< blanks at its end do not count
-    Number,    ///< counts by what it means
-    OnOff,     ///< answered 1 or 0, sent ON or OFF
-    AfList,    ///< sent with "N," or "+," in front
-    RtNumbers  ///< the two numbers before a radiotext
+    Text,    ///< blanks at its end do not count
+    Number,  ///< counts by what it means
+    OnOff,   ///< answered 1 or 0, sent ON or OFF
+    AfList   ///< sent with "N," or "+," in front
 };
 
 struct Row {
@@ -59,7 +58,7 @@ constexpr std::array kRows = {
     Row{"MS", "MS"},
     Row{"DI", "DI", Form::Number},
     Row{"RT", "RT"},
-    Row{"RT_N", "RT-N", Form::RtNumbers},
+    Row{"RT_N", "RT-N"},
     Row{"TEST_M", "BIN", Form::Number},
     Row{"AF1", "AF1", Form::AfList},
     Row{"AF2", "AF2", Form::AfList},
@@ -114,7 +113,6 @@ std::string valueOf(const Row& row, const std::string& answer) {
     text.erase(text.find_last_not_of(" \r") + 1);
     switch (row.form) {
         case Form::Text:
-        case Form::RtNumbers:
             break;
         case Form::Number:
             if (isNumber(text)) text = shortestDecimal(leadingNumber(text));
@@ -132,7 +130,7 @@ std::string valueOf(const Row& row, const std::string& answer) {
 /// The identifiers in an answer that lists the other networks.
 std::vector<std::string> networksIn(const std::string& answer) {
     std::vector<std::string> networks = networksToDelete(sim::unquoted(answer).value_or(answer));
-    std::erase_if(networks, [](const std::string& pi) { return pi.size() != kPiLength || !sim::isHex(pi); });
+    std::erase_if(networks, [](const std::string& pi) { return pi.size() != kPiLength || !isHex(pi); });
     return networks;
 }
 
@@ -287,6 +285,7 @@ bool mustBeginAnew(const Difference& difference) {
 }  // namespace
 
 Readout readOut(Instrument& instrument) {
+    const CommandSequence sequence(instrument);
     Questioner questioner(instrument);
     for (const Row& row : kRows) questioner.read(row);
     questioner.readNetworks();

@@ -36,8 +36,8 @@ struct SettingCommand {
 };
 using SettingCommands = std::vector<SettingCommand>;
 
-/// Asks for everything. Questions that one instrument or another does not know stay without a value, the one for the
-/// other networks under "EON_PI".
+/// Asks for everything, as one sequence: one failure ends all of it. Questions that one instrument or another does not
+/// know stay without a value, the one for the other networks under "EON_PI".
 [[nodiscard]] Readout readOut(Instrument& instrument);
 
 /// What of it the instrument gave no answer to.

@@ -19,45 +19,42 @@ namespace kdx {
 
 namespace {
 
+// Where a key of what was read is another one than that of the setting, it stands beside its place.
 constexpr std::array kAsRead = {
-    Setting{"MPX_SOURCE", setting::kSource.place},
-    Setting{"MPX_IMPEDANZ", setting::kImpedance.place},
-    Setting{"PREEMPHASIS", setting::kPreemphasis.place},
-    Setting{"PILOT", setting::kPilot.place},
-    Setting{"ARI", setting::kAri.place},
-    Setting{"ARI-ID", setting::kAriType.place},
-    Setting{"ARI-BK", setting::kAriArea.place},
-    Setting{"RDS", setting::kRds.place},
+    setting::kSource,
+    setting::kImpedance,
+    setting::kPreemphasis,
+    setting::kPilot,
+    setting::kAri,
+    setting::kAriType,
+    setting::kAriArea,
+    setting::kRds,
     Setting{"RDS_PHASE", setting::kRdsPhase},
-    Setting{"PI", setting::kPi.place},
-    Setting{"PTY", setting::kPtyOfDataSet},
-    Setting{"MS", setting::kMusicSpeech.place},
-    Setting{"DI", setting::kDecoderInfo.place},
-    Setting{"HF-Frequenz", setting::kRfFrequency.place},
-    Setting{"HF-Pegel", setting::kRfLevel.place},
-    Setting{"NF-Frequenz", setting::kAudioFrequency.place},
-    Setting{"EON_PI", setting::kEonPi.place},
+    setting::kPi,
+    Setting{setting::kPty.sendKey, setting::kPtyOfDataSet},
+    setting::kMusicSpeech,
+    setting::kDecoderInfo,
+    setting::kRfFrequency,
+    setting::kRfLevel,
+    setting::kAudioFrequency,
+    setting::kEonPi,
     Setting{"EON_PTY", setting::kEonPty.place},
-    Setting{"EON_TP", setting::kEonTp.place},
-    Setting{"EON_TA", setting::kEonTa.place},
-    Setting{"EON_AFB1", setting::kEonAfLists[0].place},
-    Setting{"EON_AFB2", setting::kEonAfLists[1].place},
-    Setting{"EON_AFB3", setting::kEonAfLists[2].place},
-    Setting{"EON_AFB4", setting::kEonAfLists[3].place},
-    Setting{"EON_AFB5", setting::kEonAfLists[4].place},
-    Setting{"AF1", setting::kAfLists[0].place},
-    Setting{"AF2", setting::kAfLists[1].place},
-    Setting{"AF3", setting::kAfLists[2].place},
-    Setting{"AF4", setting::kAfLists[3].place},
-    Setting{"AF5", setting::kAfLists[4].place},
+    setting::kEonTp,
+    setting::kEonTa,
+    setting::kEonAfLists[0],
+    setting::kEonAfLists[1],
+    setting::kEonAfLists[2],
+    setting::kEonAfLists[3],
+    setting::kEonAfLists[4],
+    setting::kAfLists[0],
+    setting::kAfLists[1],
+    setting::kAfLists[2],
+    setting::kAfLists[3],
+    setting::kAfLists[4],
 };
 
 /// The texts, whose blanks count.
-constexpr std::array kTexts = {
-    Setting{"PS", setting::kPs.place},
-    Setting{"RT", setting::kRadiotext.place},
-    Setting{"EON_PS", setting::kEonPs.place},
-};
+constexpr std::array kTexts = {setting::kPs, setting::kRadiotext, setting::kEonPs};
 
 constexpr std::array kDeviations = {kTotalDeviation, kPilotDeviation, kRdsDeviation, kAriDeviation};
 

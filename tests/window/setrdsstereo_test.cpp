@@ -1,5 +1,8 @@
 #include <gtest/gtest.h>
 
+#include <algorithm>
+
+#include "station/rehearsal.h"
 #include "station/wholedataset.h"
 #include "support/windowtest.h"
 
@@ -29,6 +32,24 @@ TEST_F(SetRdsStereoTest, TheButtonSendsTheDataSetAlone) {
     click("Btn_SetRdsStereo");
     EXPECT_EQ(sent(), kDataSetCommands);
 }
+
+class EachDataSet : public WindowTest, public testing::WithParamInterface<const char*> {};
+
+TEST_P(EachDataSet, IsSentByTheButtonAsItIsSentWithoutAWindow) {
+    folder.copyShipped();
+    folder.write("Datenset1.INI", folder.read(dataSetFile(GetParam())));
+    start();
+    openSession();
+    sent();
+    click("Btn_SetRdsStereo");
+    const Lines byButton = sent();
+    Rehearsal rehearsal(data, captions);
+    rehearsal.apply(session->profile);
+    const Lines& opening = rehearsal.commands();
+    EXPECT_GT(byButton.size(), 20U);
+    EXPECT_NE(std::search(opening.begin(), opening.end(), byButton.begin(), byButton.end()), opening.end());
+}
+INSTANTIATE_TEST_SUITE_P(Shipped, EachDataSet, testing::Values("1", "2", "3", "4", "5"));
 
 TEST_F(SetRdsStereoTest, WhatIsTypedAndNotSentYetGoesOutWithTheDataSet) {
     start();

@@ -7,10 +7,10 @@
 #include "air/broadcast.h"
 #include "air/timedcommands.h"
 #include "app/ctl/laboratory.h"
+#include "app/ctl/readablefile.h"
 #include "app/ctl/whichdataset.h"
 #include "base/duration.h"
 #include "coder/loggedcommands.h"
-#include "settings/profilefile.h"
 #include "station/rehearsal.h"
 
 namespace kdx::ctl {
@@ -33,20 +33,6 @@ struct Air {
 
 using Commands = std::vector<air::TimedCommand>;
 
-/// The bytes of a file; nothing when it cannot be read, which is told.
-std::optional<std::string> bytesOf(Laboratory& laboratory, const std::string& file) {
-    auto bytes = readFile(file);
-    if (!bytes) laboratory.output().problem(file + " cannot be read");
-    return bytes;
-}
-
-bool areReadable(Laboratory& laboratory, const std::string& file, const std::vector<std::size_t>& unreadableLines,
-                 const char* what) {
-    for (const std::size_t line : unreadableLines)
-        laboratory.output().problem(std::string(file).append(", line ").append(std::to_string(line)).append(what));
-    return unreadableLines.empty();
-}
-
 /// Adds what a data set makes of an instrument.
 bool addDataSet(Laboratory& laboratory, const WhichDataSet& source, Commands& commands) {
     const auto profile = source.profile(laboratory);
@@ -58,19 +44,19 @@ bool addDataSet(Laboratory& laboratory, const WhichDataSet& source, Commands& co
 }
 
 bool addLog(Laboratory& laboratory, const std::string& file, Commands& commands) {
-    const auto bytes = bytesOf(laboratory, file);
+    const auto bytes = bytesOf(laboratory.output(), file);
     if (!bytes) return false;
     const LoggedCommands logged = readLoggedCommands(*bytes);
     for (const auto& [key, command] : logged.commands) commands.push_back({air::Ticks{0}, command});
-    return areReadable(laboratory, file, logged.unreadableLines, ": not a line of a command log");
+    return areNone(laboratory.output(), file, logged.unreadableLines, "not a line of a command log");
 }
 
 bool addCommandFile(Laboratory& laboratory, const std::string& file, Commands& commands) {
-    const auto bytes = bytesOf(laboratory, file);
+    const auto bytes = bytesOf(laboratory.output(), file);
     if (!bytes) return false;
     const air::TimedCommands read = air::readTimedCommands(*bytes);
     commands.insert(commands.end(), read.commands.begin(), read.commands.end());
-    return areReadable(laboratory, file, read.unreadableLines, ": not a line of a command file");
+    return areNone(laboratory.output(), file, read.unreadableLines, "not a line of a command file");
 }
 
 /// All that is done to the instrument, in its order; nothing when a part of it cannot be read.
@@ -141,7 +127,7 @@ void addTimes(CLI::App& command, const std::shared_ptr<Air>& what) {
             "--seconds",
             [what](const std::string& text) {
                 const auto duration = parseDuration(text + " s");
-                if (!duration || *duration <= 0s)
+                if (!duration || *duration <= 0s || *duration > 24h)
                     throw CLI::ValidationError("--seconds", "takes up to 86400 seconds, not \"" + text + "\"");
                 what->duration = *duration;
             },

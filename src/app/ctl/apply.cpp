@@ -38,7 +38,7 @@ int apply(Laboratory& laboratory, const Apply& what) {
     if (what.keepOpen) {
         laboratory.keepOpen();
     } else {
-        session.close();
+        laboratory.close();
     }
     return laboratory.result();
 }

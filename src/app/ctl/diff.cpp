@@ -5,7 +5,6 @@
 #include "app/ctl/laboratory.h"
 #include "app/ctl/readings.h"
 #include "app/ctl/whichdataset.h"
-#include "link/commandsequence.h"
 #include "station/comparison.h"
 
 namespace kdx::ctl {
@@ -19,7 +18,6 @@ struct Diff {
 
 /// Asks the instrument for everything; nothing when that failed.
 std::optional<Readout> askedFor(Laboratory& laboratory) {
-    const CommandSequence sequence(laboratory.session().instrument);
     Readout readout = readOut(laboratory.session().instrument);
     return laboratory.result() == kDone ? std::optional(std::move(readout)) : std::nullopt;
 }

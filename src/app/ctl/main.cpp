@@ -66,6 +66,14 @@ int run(const Call& call, const kdx::ctl::Task& task, const char* program) {
     return output.finish(result);
 }
 
+/// What is wrong with the call. The parser misses a subcommand before it looks at a word that is none.
+std::string sentence(const CLI::App& app, const CLI::Error& error) {
+    const auto words = app.remaining();
+    const auto word = std::find_if(words.begin(), words.end(), [](const auto& text) { return !text.starts_with('-'); });
+    const bool unknown = app.get_parent() == nullptr && app.get_subcommands().empty() && word != words.end();
+    return kdx::shownPath(unknown ? "there is no subcommand " + *word : std::string(error.what()));
+}
+
 /// What the parser has to say: help that was asked for, or what is wrong with the call.
 int answered(const CLI::App& app, const CLI::ParseError& said, Call call) {
     kdx::ctl::Output output(call);
@@ -73,7 +81,7 @@ int answered(const CLI::App& app, const CLI::ParseError& said, Call call) {
         call.json = false;  // help is words
         return output.finish(kdx::ctl::kDone);
     }
-    output.note(kdx::shownPath(said.what()));
+    output.note(sentence(app, said));
     return output.finish(kdx::ctl::kWrongCall);
 }
 
@@ -103,8 +111,8 @@ int called(int argc, const char* const* argv) {
         "Exit codes: 0 done, 1 a command failed, 2 wrong call or unreadable file, 3 differences or warnings,\n"
         "4 no connection.\n"
         "kdx-ctl SUBCOMMAND --help says more.");
-    app.failure_message([](const CLI::App*, const CLI::Error& error) {
-        return kdx::shownPath(error.what()) + "\nRun with --help for more information.\n";
+    app.failure_message([](const CLI::App* failed, const CLI::Error& error) {
+        return sentence(*failed, error) + "\nRun with --help for more information.\n";
     });
     try {
         app.parse(argc, argv);

@@ -16,12 +16,27 @@ std::size_t width(const std::string& text) {
     return static_cast<std::size_t>(std::count_if(text.begin(), text.end(), [](char c) { return (c & 0xC0) != 0x80; }));
 }
 
+/// The text with each control character but the line end as a point: what an instrument answers moves no cursor and
+/// colours nothing.
+std::string harmless(const std::string& text) {
+    std::string result;
+    for (std::size_t at = 0; at < text.size(); ++at) {
+        const auto byte = static_cast<unsigned char>(text[at]);
+        // Those of the code page beyond 7F are two bytes, C2 80 to C2 9F.
+        const bool beyond = byte == 0xC2 && at + 1 < text.size() && static_cast<unsigned char>(text[at + 1]) < 0xA0;
+        const bool control = (byte < 0x20 && byte != '\n') || byte == 0x7F || beyond;
+        result += control ? '.' : text[at];
+        if (beyond) ++at;
+    }
+    return result;
+}
+
 }  // namespace
 
 void Output::line(const std::string& text) {
     if (m_call.json) return;
     endProgress();
-    std::puts(text.c_str());
+    std::puts(harmless(text).c_str());
     if (m_call.verbose) std::fflush(stdout);  // what happens is seen when it happens, also through a pipe
 }
 
@@ -39,7 +54,7 @@ void Output::problem(const std::string& problem) {
 }
 
 void Output::warning(const std::string& text) {
-    std::fprintf(stderr, "warning: %s\n", text.c_str());
+    std::fprintf(stderr, "warning: %s\n", harmless(text).c_str());
     document["warnings"].push_back(text);
 }
 
@@ -75,7 +90,7 @@ void Output::waiting(const std::string& until) {
 void Output::prompt(const std::string& text) {
     endProgress();
     std::fflush(stdout);
-    std::fprintf(stderr, "%s\n", text.c_str());
+    std::fprintf(stderr, "%s\n", harmless(text).c_str());
 }
 
 void Output::endProgress() {

@@ -4,7 +4,10 @@
 #include <memory>
 
 #include "app/ctl/laboratory.h"
+#include "app/ctl/othernetwork.h"
 #include "base/codepage.h"
+#include "base/numbers.h"
+#include "base/split.h"
 #include "coder/readback.h"
 #include "link/commandsequence.h"
 
@@ -15,6 +18,7 @@ namespace {
 struct Query {
     std::vector<std::string> names;
     bool raw = false;
+    std::optional<std::string> otherNetwork;
 };
 
 const ReadBack* readBackOf(const std::string& name) {
@@ -22,6 +26,15 @@ const ReadBack* readBackOf(const std::string& name) {
     const auto found = std::find_if(all.begin(), all.end(),
                                     [&](const ReadBack& readBack) { return equalNoCase(readBack.name, name); });
     return found == all.end() ? nullptr : &*found;
+}
+
+/// Who asked for all of them cannot know which is which: further lines of the words stand under the first.
+std::string named(std::string_view name, std::size_t longestName, const std::string& words) {
+    std::string text;
+    for (const std::string_view line : split(words, "\n"))
+        text +=
+            (text.empty() ? padRight(name, longestName + 2) : '\n' + std::string(longestName + 2, ' ')).append(line);
+    return text;
 }
 
 int query(Laboratory& laboratory, const Query& what) {
@@ -38,6 +51,10 @@ int query(Laboratory& laboratory, const Query& what) {
     }
     if (!laboratory.open()) return kNoConnection;
     Session& session = laboratory.session();
+    if (what.otherNetwork) laboratory.setOtherNetwork(*what.otherNetwork);
+    const bool all = std::find(what.names.begin(), what.names.end(), "all") != what.names.end();
+    std::size_t longestName = 0;
+    for (const ReadBack* readBack : asked) longestName = std::max(longestName, std::string_view(readBack->name).size());
     nlohmann::json& answered = laboratory.output().document["answers"] = nlohmann::json::object();
     std::size_t questions = 0;
     for (const ReadBack* readBack : asked) questions += readBack->queries(laboratory.state().eonIdentifier).size();
@@ -53,7 +70,7 @@ int query(Laboratory& laboratory, const Query& what) {
         if (what.raw) {
             for (const auto& answer : bare) laboratory.output().line(answer.get<std::string>());
         } else {
-            laboratory.output().line(words);
+            laboratory.output().line(all ? named(readBack->name, longestName, words) : words);
         }
     }
     laboratory.close();
@@ -69,6 +86,7 @@ void addQuery(CLI::App& app, Task& task) {
         ->required()
         ->type_name("NAME");
     command->add_flag("--raw", what->raw, "the bare answers, one a line");
+    addOtherNetwork(*command, what->otherNetwork);
     command->footer("Example: kdx-ctl query ps pi rt");
     command->callback([what, &task] { task = [what](Laboratory& laboratory) { return query(laboratory, *what); }; });
 }

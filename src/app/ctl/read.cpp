@@ -5,7 +5,6 @@
 #include "app/ctl/laboratory.h"
 #include "app/ctl/readings.h"
 #include "base/codepage.h"
-#include "link/commandsequence.h"
 #include "settings/profilefile.h"
 #include "station/comparison.h"
 #include "station/setupfile.h"
@@ -47,7 +46,6 @@ int read(Laboratory& laboratory, const std::string& into) {
         return kWrongCall;
     }
     if (!laboratory.open()) return kNoConnection;
-    const CommandSequence sequence(laboratory.session().instrument);
     const Readout readout = readOut(laboratory.session().instrument);
     laboratory.close();
     if (laboratory.result() != kDone) return laboratory.result();

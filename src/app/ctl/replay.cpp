@@ -3,8 +3,8 @@
 #include <memory>
 
 #include "app/ctl/laboratory.h"
+#include "app/ctl/readablefile.h"
 #include "coder/loggedcommands.h"
-#include "settings/profilefile.h"
 
 namespace kdx::ctl {
 
@@ -16,24 +16,17 @@ struct Replay {
 };
 
 int replay(Laboratory& laboratory, const Replay& what) {
-    const auto bytes = readFile(what.log);
-    if (!bytes) {
-        laboratory.output().problem(what.log + " cannot be read");
-        return kWrongCall;
-    }
+    Output& output = laboratory.output();
+    const auto bytes = bytesOf(output, what.log);
+    if (!bytes) return kWrongCall;
     const LoggedCommands logged = readLoggedCommands(*bytes);
-    for (const std::size_t line : logged.unreadableLines)
-        laboratory.output().problem(what.log + ", line " + std::to_string(line) + ": not a line of a command log");
-    if (!laboratory.call().force) {
-        for (const std::size_t line : logged.quotedLines) {
-            laboratory.output().problem(what.log + ", line " + std::to_string(line) +
-                                        ": a double quote ends the coder command early");
-        }
-    }
-    if (!logged.unreadableLines.empty() || (!logged.quotedLines.empty() && !laboratory.call().force)) return kWrongCall;
-    laboratory.output().document["commands"] = logged.commands.size();
+    const bool whole = areNone(output, what.log, logged.unreadableLines, "not a line of a command log");
+    const bool legal = laboratory.call().force ||
+                       areNone(output, what.log, logged.quotedLines, "a double quote ends the coder command early");
+    if (!whole || !legal) return kWrongCall;
+    output.document["commands"] = logged.commands.size();
     if (what.check) {
-        laboratory.output().line(std::to_string(logged.commands.size()) + " commands");
+        output.line(std::to_string(logged.commands.size()) + " commands");
         return kDone;
     }
     if (!laboratory.open()) return kNoConnection;
@@ -43,7 +36,7 @@ int replay(Laboratory& laboratory, const Replay& what) {
         if (!laboratory.goesOn()) break;
         session.params.sendCommand(key, command);
     }
-    session.close();
+    laboratory.close();
     return laboratory.result();
 }
 

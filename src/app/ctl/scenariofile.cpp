@@ -1,9 +1,9 @@
 #include "app/ctl/scenariofile.h"
 
 #include "app/ctl/laboratory.h"
+#include "app/ctl/readablefile.h"
 #include "app/ctl/whichdataset.h"
 #include "scenario/reader.h"
-#include "settings/profilefile.h"
 
 namespace kdx::ctl {
 
@@ -19,11 +19,8 @@ bool loadDataSet(Laboratory& laboratory, int number) {
 }  // namespace
 
 std::optional<scenario::Scenario> readScenarioFile(Laboratory& laboratory, const std::string& file) {
-    const auto bytes = readFile(file);
-    if (!bytes) {
-        laboratory.output().problem(file + " cannot be read");
-        return std::nullopt;
-    }
+    const auto bytes = bytesOf(laboratory.output(), file);
+    if (!bytes) return std::nullopt;
     scenario::Reading reading = scenario::readScenario(*bytes, laboratory.call().force);
     for (const auto& [line, column, sentence] : reading.problems)
         laboratory.output().problem(file + ":" + std::to_string(line) + ":" + std::to_string(column) + ": " + sentence);

@@ -23,8 +23,9 @@ int wait(Laboratory& laboratory, const std::vector<std::string>& words) {
     std::string text;
     for (const std::string& word : words) text += (text.empty() ? "" : " ") + word;
     const auto duration = parseDuration(text);
-    if (!duration) {
-        laboratory.output().problem("\"" + text + "\" is no time; wait 2 s, wait 500 ms, a day at most");
+    constexpr std::chrono::hours kLongest{168};
+    if (!duration || *duration > kLongest) {
+        laboratory.output().problem("\"" + text + "\" is no time; wait 2 s, 500 ms, 1.5 min or 1 h, a week at most");
         return kWrongCall;
     }
     return laboratory.pause(*duration) ? kDone : kFailed;
@@ -33,7 +34,7 @@ int wait(Laboratory& laboratory, const std::vector<std::string>& words) {
 void addWait(CLI::App& app, Task& task) {
     auto words = std::make_shared<std::vector<std::string>>();
     CLI::App* command = app.add_subcommand("wait", "Wait before the next line");
-    command->add_option("time", *words, "2 s, 500 ms")->required()->type_name("TIME");
+    command->add_option("time", *words, "2 s, 500 ms, 1.5 min, 1 h")->required()->type_name("TIME");
     command->footer("Example: wait 500 ms");
     command->callback([words, &task] { task = [words](Laboratory& laboratory) { return wait(laboratory, *words); }; });
 }

@@ -1,0 +1,19 @@
+#include "app/ctl/readablefile.h"
+
+#include "app/ctl/output.h"
+#include "settings/profilefile.h"
+
+namespace kdx::ctl {
+
+std::optional<std::string> bytesOf(Output& output, const std::string& file) {
+    auto bytes = readFile(file);
+    if (!bytes) output.problem(file + " cannot be read");
+    return bytes;
+}
+
+bool areNone(Output& output, const std::string& file, const std::vector<std::size_t>& lines, const std::string& wrong) {
+    for (const std::size_t line : lines) output.problem(file + ", line " + std::to_string(line) + ": " + wrong);
+    return lines.empty();
+}
+
+}  // namespace kdx::ctl
