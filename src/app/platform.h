@@ -54,4 +54,7 @@ enum class InputLine { NotYet, Whole, Ended };
 /// Takes a line off the standard input when there is one, without waiting for it.
 [[nodiscard]] InputLine takeInputLine();
 
+/// Throws away what was typed at a terminal and not taken yet; what comes from elsewhere stays.
+void forgetTypedInput();
+
 }  // namespace kdx

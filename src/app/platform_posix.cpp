@@ -1,5 +1,6 @@
 #include <fcntl.h>
 #include <poll.h>
+#include <termios.h>
 #include <unistd.h>
 
 #include <array>
@@ -127,6 +128,10 @@ bool outputIsLost() {
     if (std::fflush(stdout) == 0 && std::ferror(stdout) == 0) return false;
     pollfd asked{STDOUT_FILENO, POLLOUT, 0};
     return poll(&asked, 1, 0) < 0 || (asked.revents & POLLERR) == 0;
+}
+
+void forgetTypedInput() {
+    if (inputIsTerminal()) tcflush(STDIN_FILENO, TCIFLUSH);
 }
 
 InputLine takeInputLine() {

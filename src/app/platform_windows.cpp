@@ -64,6 +64,10 @@ bool outputIsLost() {
     return std::fflush(stdout) != 0 || std::ferror(stdout) != 0;
 }
 
+void forgetTypedInput() {
+    FlushConsoleInputBuffer(GetStdHandle(STD_INPUT_HANDLE));  // fails, and does nothing, where it is no console
+}
+
 InputLine takeInputLine() {
     return InputLine::Ended;  // it cannot be asked without waiting: a pause ends the run, see --yes
 }

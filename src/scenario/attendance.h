@@ -18,7 +18,8 @@ struct Outcome {
     bool reportLost = false;                ///< a row could not be written, which ends a run
     std::size_t unmet = 0;                  ///< expectations that were not met
     bool restored = true;                   ///< the instrument could be asked and told what stood before
-    std::vector<std::string> changed = {};  ///< keys of what does not stand as before all the same
+    std::vector<std::string> changed = {};  ///< keys of what does not stand as before all the same, or may not
+    std::vector<std::string> untold = {};   ///< keys that were sent and whose values nobody knew before
 };
 
 /// Who is with a run: the person before it, and whoever may end it. Asked again and again while it waits.
@@ -28,6 +29,8 @@ public:
     /// False when the run is to end after the running command: it was stopped, or a command failed.
     [[nodiscard]] virtual bool goesOn() = 0;
     enum class Return { NotYet, Pressed, NoLonger };  ///< NoLonger: the input is at its end
+    /// What was typed until now is no answer to what is asked next.
+    virtual void forgetsTyped() = 0;
     /// Whether Return was pressed since it was last asked.
     [[nodiscard]] virtual Return pressed() = 0;
     /// From here on everything is sent, also when the run was stopped: what stood before is to come back.
@@ -55,6 +58,8 @@ public:
     [[nodiscard]] virtual bool remember() = 0;
     /// What brings it back; nothing when the instrument does not tell what it has now.
     [[nodiscard]] virtual std::optional<SettingCommands> commands() = 0;
+    /// Keys of what the instrument did not tell then.
+    [[nodiscard]] virtual std::vector<std::string> untold() const = 0;
     /// Keys of what does not stand as before, after the commands; nothing when the instrument does not tell.
     [[nodiscard]] virtual std::optional<std::vector<std::string>> changed() = 0;
 };

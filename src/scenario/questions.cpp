@@ -49,6 +49,19 @@ std::optional<Question> questionOf(const std::string& name, const std::string& e
     return std::nullopt;
 }
 
+std::vector<QuestionFacts> allQuestions() {
+    std::vector<QuestionFacts> all;
+    for (const ReadBack& readBack : readBacks()) {
+        std::string parts;
+        for (const Query& query : readBack.queries("PI")) parts += (parts.empty() ? "" : ", ") + query.key;
+        all.push_back({readBack.name, readBack.queries({}).size(), readBack.meaning, parts});
+    }
+    for (const std::string_view name : kFurther) all.push_back({std::string(name), 1, {}, std::string(name)});
+    for (const std::string_view name : kOfNetwork)
+        all.push_back({std::string(name), 1, "of the other network", std::string(name) + ",PI"});
+    return all;
+}
+
 std::vector<std::string> ask(Instrument& instrument, const Question& question) {
     const CommandSequence sequence(instrument);
     std::vector<std::string> answers;

@@ -22,6 +22,15 @@ struct Question {
 /// Nothing for an unknown name. @param eonIdentifier PI of the other network at work.
 [[nodiscard]] std::optional<Question> questionOf(const std::string& name, const std::string& eonIdentifier);
 
+/// A question that can be expected an answer to.
+struct QuestionFacts {
+    std::string name;
+    std::size_t answers = 1;
+    std::string meaning;  ///< in English; "" where the coder's own name says it
+    std::string asked;    ///< by the coder's own names, with commas between
+};
+[[nodiscard]] std::vector<QuestionFacts> allQuestions();
+
 /// The instrument's answers as it gave them, without quotation marks, line end and blanks at the end; "" for one that
 /// could not be read.
 [[nodiscard]] std::vector<std::string> ask(Instrument& instrument, const Question& question);

@@ -17,13 +17,7 @@ std::optional<SettingCommands> ReadoutRestorer::commands() {
 
 std::optional<std::vector<std::string>> ReadoutRestorer::changed() {
     const auto differences = differing();
-    if (!differences) return std::nullopt;
-    std::vector<std::string> keys;
-    for (const Difference& difference : *differences) {
-        const bool known = std::find(keys.begin(), keys.end(), difference.key) != keys.end();
-        if (!known) keys.push_back(difference.key);
-    }
-    return keys;
+    return differences ? std::optional(keysOf(*differences)) : std::nullopt;
 }
 
 /// Nothing when the instrument gave fewer answers than before.

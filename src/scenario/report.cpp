@@ -1,6 +1,7 @@
 #include "scenario/report.h"
 
 #include <algorithm>
+#include <fstream>
 #include <string_view>
 
 #include "base/clock.h"
@@ -44,8 +45,16 @@ std::string csvLine(const Row& row) {
     return line + "\r\n";
 }
 
-bool Report::begin() const {
-    return emptyPlainFile(m_file) && add({"time", "step", "key", "value", "command", "status", "answer"});
+std::string Report::begin() const {
+    const Row columns{"time", "step", "key", "value", "command", "status", "answer"};
+    std::string there(csvLine(columns).size(), '\0');
+    std::ifstream file;
+    std::error_code error;
+    if (std::filesystem::is_regular_file(m_file, error)) file.open(m_file, std::ios::binary);
+    file.read(there.data(), static_cast<std::streamsize>(there.size()));
+    const bool isEmpty = file.gcount() == 0;
+    if (!isEmpty && there != csvLine(columns)) return "is there, and is no report that could be written anew";
+    return emptyPlainFile(m_file) && add(columns) ? "" : "cannot be written";
 }
 
 bool Report::add(const Row& row) const {

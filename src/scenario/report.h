@@ -22,6 +22,7 @@ struct Row {
 // Statuses, and keys where there is none of the key table.
 inline constexpr const char* kMet = "met";
 inline constexpr const char* kNotMet = "not met";
+inline constexpr const char* kCutOff = "stopped";
 inline constexpr const char* kReturn = "Return";
 inline constexpr const char* kNoReturn = "no Return";
 inline constexpr const char* kGoesOn = "--yes";
@@ -44,8 +45,9 @@ class Report {
 public:
     explicit Report(std::filesystem::path file) : m_file(std::move(file)) {}
 
-    /// Begins the file anew with the names of the columns. False when it cannot be written.
-    [[nodiscard]] bool begin() const;
+    /// Begins the file anew with the names of the columns. A file that is there and is no report stays as it is.
+    /// @returns why it cannot be done, as "cannot be written"; "" when it is.
+    [[nodiscard]] std::string begin() const;
     /// False when the row is not in the file, or in part only.
     [[nodiscard]] bool add(const Row& row) const;
     [[nodiscard]] const std::filesystem::path& file() const { return m_file; }

@@ -16,12 +16,23 @@ namespace kdx::scenario {
 
 namespace {
 
+constexpr std::chrono::milliseconds kCommandPause{kCommandPauseMs};
+constexpr int kRestoringTries = 5;  // an instrument that keeps silent for some seconds answers again
+constexpr std::chrono::seconds kBetweenTries{1};
 constexpr std::chrono::milliseconds kLongestSleep{50};  // who stops a run or presses Return need not wait longer
 
 using Kind = Action::Kind;
 
 std::string shown(const std::string& bytes) {
     return toUtf8(printableLine(bytes, '.'));
+}
+
+/// Whether sending the one sets the other, as it is read back.
+bool sets(const std::string& sent, const std::string& key) {
+    if (key == "FM" || key == "AM") return sent == key + "_EIN" || sent == key + "_AUS";
+    if (key == "RT" || key == "RT_N") return sent == "RT" || sent == "DEL_RT";
+    if (key.starts_with("EON_")) return sent == "EON_PI" || sent == "EON_DEL" || sent == key;
+    return sent == key || (key.starts_with("AF") && sent.starts_with("AF"));
 }
 
 std::string joined(const std::vector<std::string>& values) {
@@ -68,7 +79,10 @@ Outcome Runner::run(const Scenario& scenario, RunOptions options) {
 
 void Runner::play(const Scenario& scenario) {
     m_place = kOpening;
-    if (scenario.dataSet) m_with.session.sendOpening();
+    if (scenario.dataSet) {
+        m_wholeSent = true;
+        m_with.session.sendOpening();
+    }
     m_place.clear();
     m_schedule.goOnFromNow();
     m_outcome.complete = goesOn() && list(scenario.actions) != Flow::Ends && goesOn();
@@ -76,17 +90,34 @@ void Runner::play(const Scenario& scenario) {
 
 void Runner::bringBack() {
     m_with.attendant.finishes();
+    const std::set<std::string> sent = std::exchange(m_sent, {});
     m_place = kRestoring;
     m_setting = {};
+    m_outcome.restored = bringBackOnce();
+    for (int left = kRestoringTries - 1; left > 0 && !m_outcome.restored; --left) {
+        m_with.clock.sleep(kBetweenTries);
+        m_outcome.restored = bringBackOnce();
+    }
+    if (!m_outcome.restored) m_outcome.changed.assign(sent.begin(), sent.end());
+    for (const std::string& key : m_with.restorer->untold()) {
+        const bool wasSet = m_wholeSent || std::any_of(sent.begin(), sent.end(),
+                                                       [&](const std::string& other) { return sets(other, key); });
+        if (wasSet) m_outcome.untold.push_back(key);
+    }
+}
+
+bool Runner::bringBackOnce() {
     const auto commands = silently([&] { return m_with.restorer->commands(); });
-    for (const auto& [key, command] : commands.value_or(SettingCommands())) {
+    if (!commands) return false;
+    bool allSent = true;
+    for (const auto& [key, command] : *commands) {
         m_setting.first = key;
         m_with.session.params.sendCommand(key, command);
-        if (m_with.session.instrument.LastVisaStatus != visa::kSuccess) m_outcome.restored = false;
+        if (m_with.session.instrument.LastVisaStatus != visa::kSuccess) allSent = false;
     }
     const auto changed = silently([&] { return m_with.restorer->changed(); });
-    m_outcome.restored = m_outcome.restored && commands && changed;
     m_outcome.changed = changed.value_or(std::vector<std::string>());
+    return allSent && changed;
 }
 
 Runner::Flow Runner::list(const std::vector<Action>& actions) {
@@ -110,6 +141,8 @@ Runner::Flow Runner::list(const std::vector<Action>& actions) {
 
 Runner::Flow Runner::one(const Action& action) {
     if (!goesOn()) return Flow::Ends;
+    const bool asks = action.kind == Kind::Pause || action.untilReturn;
+    if (asks && !m_options.nobodyThere) m_with.attendant.forgetsTyped();
     m_with.watcher.begins(m_number.text(), action);
     switch (action.kind) {
         case Kind::Send:
@@ -143,6 +176,9 @@ Runner::Flow Runner::loop(const Action& action) {
         first = std::max<std::size_t>(parts[m_number.parts.size() - 1].pass, 1);
         if (m_number.parts.size() == parts.size()) m_options.from.reset();
     }
+    // Commands before a sweep have taken their time: the first point is to last as long as the others.
+    const bool late = m_with.clock.steadyNow() - m_schedule.due() > kCommandPause;
+    if (action.kind == Kind::Sweep && late) m_schedule.goOnFromNow();
     const bool listens = action.untilReturn && !m_options.nobodyThere;
     if (listens) ++m_listening;
     const Flow flow = passes(action, first);
@@ -208,8 +244,10 @@ Runner::Flow Runner::expect(const Action& action) {
     for (const Action::Expectation& expectation : action.expected) {
         Row row{{}, {}, expectation.name, joined(expectation.values), {}, {}, {}};
         const Flow flow = askUntilMet(expectation, begin + action.time, row, waited);
+        const bool cutOff = row.status == kNotMet && m_with.clock.steadyNow() < begin + action.time;
+        if (cutOff) row.status = kCutOff;  // stopped: it might have been met yet
         tell(row);
-        if (row.status != kMet) ++m_outcome.unmet;
+        if (row.status == kNotMet) ++m_outcome.unmet;
         if (flow != Flow::Next) return flow;
     }
     if (waited) m_schedule.goOnFromNow();
@@ -279,6 +317,7 @@ void Runner::passed(const Traffic& traffic) {
         return;
     }
     const auto& [key, value] = m_setting;
+    if (!key.empty()) m_sent.insert(key);
     tell({{}, {}, key, toUtf8(value), shown(traffic.text), std::to_string(traffic.status), {}});
 }
 

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <optional>
+#include <set>
 #include <string>
 #include <utility>
 #include <vector>
@@ -57,6 +58,8 @@ private:
 
     void play(const Scenario& scenario);
     void bringBack();
+    /// @returns whether all could be asked and sent.
+    bool bringBackOnce();
     template <typename Asks>
     auto silently(Asks asks);
     Flow list(const std::vector<Action>& actions);
@@ -85,6 +88,8 @@ private:
     StepNumber m_number;
     std::string m_place;                            ///< instead of the number, where there is none
     std::pair<std::string, std::string> m_setting;  ///< key and value that go out
+    std::set<std::string> m_sent;                   ///< keys that went out
+    bool m_wholeSent = false;                       ///< a data set, with all its keys
     std::optional<std::string> m_questions;         ///< while an expectation asks: what it has asked
     int m_listening = 0;                            ///< loops that end with a person's Return
     bool m_otherVariant = false;                    ///< of the announcement before a traffic message

@@ -148,7 +148,7 @@ void StepReader::send(const YamlNode& map, Action& action) {
     if (!isNames(map, "send", "send: {PS: MESSTURM, TP: 1}")) return;
     for (const auto& [name, value] : map.members) {
         if (!isKey(name.text)) {
-            m_values.wrong(name, "there is no key " + name.text);
+            m_values.wrong(name, "there is no key " + name.text + "; kdx-ctl list keys names them");
         } else if (const auto legal = m_values.keyValue(value, name.text)) {
             action.settings.emplace_back(name.text, *legal);
         }
@@ -171,7 +171,7 @@ void StepReader::expect(const YamlNode& map, Action& action) {
 void StepReader::expectation(const std::string& name, const YamlNode& at, const YamlNode& value, Action& action) {
     const auto question = questionOf(name, {});
     if (!question) {
-        m_values.wrong(at, "there is no read-back and no question " + name);
+        m_values.wrong(at, "there is no read-back and no question " + name + "; kdx-ctl list questions names them");
         return;
     }
     const std::size_t wanted = question->queries.size();
@@ -190,7 +190,7 @@ void StepReader::expectation(const std::string& name, const YamlNode& at, const 
 void StepReader::sweep(const YamlNode& node, const YamlNode& key, Action& action) {
     const auto name = m_values.text(key, "sweep");
     if (name && !isKey(*name)) {
-        m_values.wrong(key, "there is no key " + *name);
+        m_values.wrong(key, "there is no key " + *name + "; kdx-ctl list keys names them");
     } else if (name && !isNumericKey(*name)) {
         m_values.wrong(key, *name + " is no number that could be swept");
     } else if (name) {
@@ -217,13 +217,20 @@ void StepReader::pointsOf(const YamlNode& node, Action& action) {
         m_values.wrong(*points, "points are a list of numbers, as [60, 40, 20]");
     } else if (points->items.size() > kMostPoints) {
         m_values.wrong(*points, "a sweep has " + std::to_string(kMostPoints) + " points at most");
-    } else {
+    } else if (fits(*points, points->items.size())) {
         for (const YamlNode& point : points->items) {
             const auto number = m_values.number(point, "a point");
             if (number && (action.key.empty() || m_values.isLegal(point, action.key, point.text)))
                 action.points.push_back(point.text);
         }
     }
+}
+
+bool StepReader::fits(const YamlNode& node, std::size_t points) {
+    m_points += points;
+    if (m_points <= kMostPoints) return true;
+    m_values.wrong(node, "all sweeps together have " + std::to_string(kMostPoints) + " points at most");
+    return false;
 }
 
 void StepReader::range(const YamlNode& node, Action& action) {
@@ -249,7 +256,7 @@ void StepReader::range(const YamlNode& node, Action& action) {
                                   std::to_string(countPoints(*first, *last, *one)));
     } else if (action.key.empty() || (m_values.isLegal(*from, action.key, decimalText(*first)) &&
                                       m_values.isLegal(*to, action.key, decimalText(*last)))) {
-        action.points = sweepPoints(*first, *last, *one);
+        if (fits(*step, countPoints(*first, *last, *one))) action.points = sweepPoints(*first, *last, *one);
         // Between legal ends a point can only be wrong by its decimals, which the key may not take.
         if (action.key.empty() || action.points.size() < 2) return;
         (void)m_values.isLegal(*step, action.key, action.points[1]);

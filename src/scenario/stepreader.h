@@ -42,6 +42,8 @@ private:
     void sweep(const YamlNode& node, const YamlNode& key, Action& action);
     void pointsOf(const YamlNode& node, Action& action);
     void range(const YamlNode& node, Action& action);
+    /// Counts the points of one more sweep; false when there are too many, which is told.
+    bool fits(const YamlNode& node, std::size_t points);
     void repeat(const YamlNode& node, const YamlNode& count, Action& action);
     void message(const YamlNode& code, Action& action);
     void loop(const YamlNode& node, Action& action);
@@ -49,6 +51,7 @@ private:
 
     Values& m_values;
     std::size_t m_depth = 0;
+    std::size_t m_points = 0;  ///< of all sweeps
 };
 
 }  // namespace kdx::scenario

@@ -136,7 +136,8 @@ std::vector<std::string> networksIn(const std::string& answer) {
 
 /// Asks for all of them. Every instrument tells its name: one that does not has failed. One that keeps silent at
 /// another question does not know it, but when its answer only was late, the next one would be taken for the answer to
-/// another question: hence it tells its name once more, and when it is another one, nothing further is asked.
+/// another question: hence it tells its name once more, and when it is another one, nothing further is asked; else the
+/// question is put once more.
 class Questioner {
 public:
     explicit Questioner(Instrument& instrument) : m_instrument(instrument), m_name(instrument.ask(kName, false)) {}
@@ -167,9 +168,12 @@ private:
         }
     }
     std::optional<std::string> ask(const std::string& question) {
-        if (!m_name) return std::nullopt;
-        auto answer = m_instrument.ask(question, true);
-        if (!answer && m_instrument.ask(kName, false) != m_name) m_name.reset();
+        constexpr int kTries = 2;  // silence may have been a busy moment
+        std::optional<std::string> answer;
+        for (int left = kTries; left > 0 && m_name && !answer; --left) {
+            answer = m_instrument.ask(question, true);
+            if (!answer && m_instrument.ask(kName, false) != m_name) m_name.reset();
+        }
         return answer;
     }
     void keep(const Row& row, const std::string& network, const std::optional<std::string>& answer) {

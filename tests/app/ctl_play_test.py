@@ -6,6 +6,7 @@ Usage: ctl_play_test.py PATH-OF-KDX-CTL PATH-OF-KDX-SIM
 import csv
 import json
 import os
+import pathlib
 import pty
 import resource
 import signal
@@ -69,7 +70,8 @@ class Shipped(Playing):
             with self.subTest(file.name):
                 self.assertEqual(self.ctl("check", str(file)).stderr, "")
                 report = self.folder / (file.stem + ".csv")
-                run = self.simulated("-q", "play", str(file), "--yes", "--speed", "500", "--report", str(report))
+                run = self.simulated("-q", "play", str(file), "--yes", "--speed", "500", "--report", str(report),
+                                     expect=DIFFERENT)
                 self.assertEqual(run.stdout, "")
                 self.assertRegex(run.stderr, self.NO_LISTS_BEFORE)
                 rows = self.read(report)
@@ -126,7 +128,7 @@ class Calls(Playing):
             example = self.ctl(name, "--help").stdout.split("Example: kdx-ctl ")[1].split()
             run = subprocess.run(self.command("-q", *example), capture_output=True, text=True, cwd=self.folder,
                                  timeout=100)
-            self.assertEqual(run.returncode, DONE, run.stderr)
+            self.assertEqual(run.returncode, DIFFERENT if name == "play" else DONE, run.stderr)
             self.assertRegex(run.stderr, Shipped.NO_LISTS_BEFORE if name == "play" else "^$")
         played = [row for row in self.read(self.folder / "af.csv") if row["step"] != "restore"]
         self.assertEqual((played[-1]["key"], played[-1]["value"]), ("HF-Pegel", "60"))
@@ -151,9 +153,10 @@ class Calls(Playing):
 
     def testAStepThatIsNotThereIsExitCode2(self):
         file = self.scenario("steps: [note: a, {repeat: 2, steps: [note: b]}]")
-        for option, step in (("--from", "3"), ("--until", "1.1"), ("--from", "x"), ("--from", "2#3")):
+        for option, step in (("--from", "3"), ("--until", "1.1"), ("--from", "x"), ("--from", "2#3"),
+                             ("--from", ""), ("--until", "")):
             run = self.simulated("play", file, option, step, expect=WRONG_CALL)
-            self.assertIn(f"there is no step {step};", run.stderr)
+            self.assertIn(f'there is no step "{step}";', run.stderr)
         run = self.simulated("play", file, "--from", "2", "--until", "1", expect=WRONG_CALL)
         self.assertIn("step 1 comes before step 2", run.stderr)
 
@@ -199,7 +202,7 @@ class Plays(Playing):
     def testAnUnmetExpectationIsExitCode3(self):
         run = self.play("steps: [send: {TA: 1}, expect: {TA: 0, within: 1 s}, note: on]", expect=DIFFERENT)
         self.assertEqual(run.stderr, 'kdx-ctl: step 2: expected TA=0, answered was "1"\n'
-                                     'kdx-ctl: 1 expectations were not met\n')
+                                     'kdx-ctl: 1 expectation was not met\n')
         self.assertIn("note: on", run.stdout)
 
     def testADataSetGoesOutFirst(self):
@@ -244,6 +247,21 @@ class Persons(Playing):
         process.send_signal(signal.SIGINT)
         self.assertEqual(process.wait(10), FAILED)
 
+    def testWhatIsTypedAheadAtATerminalIsNoAnswer(self):
+        person, terminal = pty.openpty()
+        self.addCleanup(os.close, person)
+        file = self.scenario("steps: [wait: 600 ms, pause: 'Ready?', note: end]")
+        process = self.begun("--simulate", "-v", "play", file, stdin=terminal)
+        os.close(terminal)
+        self.until(process, "wait")
+        os.write(person, b"\n\n")
+        time.sleep(1)
+        self.assertIsNone(process.poll())
+        os.write(person, b"\n")
+        out, problems = process.communicate(timeout=10)
+        self.assertEqual(process.returncode, DONE, problems)
+        self.assertIn("note: end", out)
+
     def testYesGoesOn(self):
         run = self.play(self.PAUSES, "--yes")
         self.assertEqual(run.stderr, "")
@@ -268,8 +286,20 @@ class Persons(Playing):
 
 class Restored(Playing):
     def testWhatCannotComeBackIsNamed(self):
-        run = self.play("restore: true\nsteps: [send: {AF1: \"N,98.5,87.6\", PS: OTHER}]")
+        run = self.play("restore: true\nsteps: [send: {AF1: \"N,98.5,87.6\", PS: OTHER}]", expect=DIFFERENT)
         self.assertEqual(run.stderr, "kdx-ctl: not as before: AF1\n")
+
+    def testARequestToEndDoesNotStopTheRestoring(self):
+        for request in (signal.SIGINT, signal.SIGTERM):
+            process = self.begun("--simulate", "-v", "play",
+                                 self.scenario("restore: true\nsteps: [send: {PS: OTHER, TA: 1}, note: end]"))
+            self.until(process, "note: end")
+            time.sleep(0.3)
+            process.send_signal(request)
+            out, problems = process.communicate(timeout=100)
+            self.assertEqual((process.returncode, problems), (DONE, ""))
+            self.assertIn('PS=KDX-X4', out)
+            self.assertIn('TA=0', out)
 
     def testAFullDiskUnderTheReportRestoresToo(self):
         def fullDisk():
@@ -283,7 +313,27 @@ class Restored(Playing):
         self.assertIn('PS=KDX-X4', out)
 
 
+class Memory(Playing):
+    def testALongRunTakesNoMoreThanAShortOne(self):
+        def most(passes):
+            process = self.begun("--simulate", "-q", "play", "--speed", "1000", self.scenario(
+                f"steps: [{{repeat: {passes}, steps: [note: a line of some length, send: {{TA: 1}}]}}]"))
+            _, status, used = os.wait4(process.pid, 0)
+            process.returncode = os.waitstatus_to_exitcode(status)
+            self.assertEqual(process.returncode, DONE)
+            return used.ru_maxrss
+
+        self.assertLess(most(20000) - most(100), 4000)  # KiB; each pass kept would be 2
+
+
 class Reports(Playing):
+    def testAFileThatIsNoReportStaysAsItIs(self):
+        text = "steps: [note: a]"
+        file = self.scenario(text)
+        run = self.simulated("play", file, "--report", file, expect=WRONG_CALL)
+        self.assertIn("is there, and is no report", run.stderr)
+        self.assertEqual(pathlib.Path(file).read_text(encoding="utf-8"), text)
+
     TEXT = "steps: [{repeat: 50, steps: [send: {TA: 1}, wait: 10 ms]}]"
 
     def testWhatIsNoPlainFileIsExitCode2BeforeAnythingIsSent(self):
@@ -379,7 +429,8 @@ class OverTheNetwork(Playing, ctl_test.Networked):
         _, problems = process.communicate(timeout=60)
         self.assertEqual(process.returncode, FAILED)
         self.assertEqual(problems.count("the link to the instrument is broken"), 1, problems)
-        self.assertTrue(problems.endswith("kdx-ctl: what stood before could not be brought back\n"), problems)
+        self.assertTrue(problems.endswith("kdx-ctl: what stood before could not be brought back\n"
+                                          "kdx-ctl: perhaps not as before: HF-Pegel, PI, PS, TA\n"), problems)
 
     def testALongWaitEndsAtOnce(self):
         process = self.begun("--lan", "127.0.0.1", "-v", "play", self.scenario("steps: [send: {TA: 1}, wait: 100 h]"))

@@ -171,6 +171,14 @@ class Lists(Ctl):
         self.assertIn({"key": "PTY", "meaning": "programme type", "range": "0 to 31"}, keys)
         self.assertRegex(self.ctl("list", "keys").stdout, r"(?m)^PTY +programme type +0 to 31$")
 
+    def testWhatAScenarioCanExpectAnswersTo(self):
+        lines = self.ctl("list", "questions").stdout.splitlines()
+        self.assertEqual(lines[0].split(), ["name", "answers", "what", "is", "asked"])
+        self.assertIn(["pilot", "3"], [line.split()[:2] for line in lines])
+        self.assertIn(["EON-TA", "1", "EON-TA,PI"], [line.split()[:3] for line in lines])
+        questions = json.loads(self.ctl("--json", "list", "questions").stdout)["questions"]
+        self.assertEqual(len(questions), 31)
+
     def testTheReadBacks(self):
         self.assertEqual(len(self.ctl("list", "queries").stdout.splitlines()), 20)
 

@@ -51,6 +51,7 @@ protected:
         returns.pop_front();
         return Return::Pressed;
     }
+    void forgetsTyped() override { ++forgotten; }
     void finishes() override { heard.emplace_back("finishes"); }
     void begins(const std::string& step, const scenario::Action& action) override {
         begun.push_back(step + " " + scenario::describe(action));
@@ -72,8 +73,10 @@ protected:
     }
     std::optional<SettingCommands> commands() override {
         heard.emplace_back("bring back");
+        if (silentRestores-- > 0) return std::nullopt;
         return SettingCommands{{"TA", direct("TA=0")}};
     }
+    [[nodiscard]] Lines untold() const override { return silentBefore; }
     std::optional<Lines> changed() override { return Lines{}; }
 
     Session session{visa, state, data, captions, clock, [] {}};
@@ -82,6 +85,9 @@ protected:
     std::optional<std::chrono::milliseconds> stopAt;  ///< somebody stops the run
     bool stopped = false;
     bool remembers = true;
+    int silentRestores = 0;                         ///< how often it cannot be asked what it has now
+    int forgotten = 0;                              ///< how often what was typed was thrown away
+    Lines silentBefore;                             ///< keys whose values it does not remember
     std::deque<std::chrono::milliseconds> returns;  ///< when a person presses Return
     bool inputEnds = false;
     Lines begun;

@@ -25,8 +25,8 @@ TEST_F(ReportTest, TheTimeHasItsDay) {
 TEST_F(ReportTest, EveryRowIsInTheFileWhenTheNextThingHappens) {
     const Report file(folder.data() / "report.csv");
     report = &file;
-    folder.write("report.csv", "what stood there before");
-    ASSERT_TRUE(file.begin());
+    folder.write("report.csv", "time,step,key,value,command,status,answer\r\nof the last run");
+    ASSERT_EQ(file.begin(), "");
     EXPECT_EQ(folder.read("report.csv"), "time,step,key,value,command,status,answer\r\n");
     clock.set(36000);
     play("steps: [send: {PS: Süd}, note: \"a, b\"]");
@@ -37,11 +37,23 @@ TEST_F(ReportTest, EveryRowIsInTheFileWhenTheNextThingHappens) {
 }
 
 TEST_F(ReportTest, OnlyAPlainFileIsWritten) {
-    EXPECT_FALSE(Report("/dev/full").begin());
-    EXPECT_FALSE(Report(folder.path()).begin());
-    EXPECT_FALSE(Report(folder.path() / "nothing" / "report.csv").begin());
+    for (const std::filesystem::path& other :
+         {std::filesystem::path("/dev/full"), folder.path(), folder.path() / "nothing" / "report.csv"}) {
+        EXPECT_EQ(Report(other).begin(), "cannot be written") << other;
+    }
     std::filesystem::create_symlink(folder.data() / "other", folder.data() / "link");
-    EXPECT_FALSE(Report(folder.data() / "link").begin());
+    EXPECT_EQ(Report(folder.data() / "link").begin(), "cannot be written");
+}
+
+TEST_F(ReportTest, AFileThatIsNoReportStaysAsItIs) {
+    for (const char* text : {"[RDS]\r\nPS=RADIO\r\n", "x", "time,step,key,value,command,status,answer"}) {
+        folder.write("Datenset3.INI", text);
+        EXPECT_EQ(Report(folder.data() / "Datenset3.INI").begin(),
+                  "is there, and is no report that could be written anew");
+        EXPECT_EQ(folder.read("Datenset3.INI"), text);
+    }
+    folder.write("Datenset3.INI", "");
+    EXPECT_EQ(Report(folder.data() / "Datenset3.INI").begin(), "");
 }
 
 }  // namespace

@@ -33,6 +33,26 @@ TEST_F(RunnerTest, NestedSweepsGoThroughAllPoints) {
     EXPECT_EQ(heard[13], "1#2.1#3.1 TA=1 0");
 }
 
+TEST_F(RunnerTest, TheFirstPointOfASweepLastsAsLongAsTheOthersWhateverWasSentBefore) {
+    play(
+        "steps: [send: {TA: 1, TP: 1, PS: A, PTY: 1, MS: M, PI: ABCD}, {sweep: HF-Pegel, points: [60, 50, 40], "
+        "dwell: 500 ms}]");
+    const std::size_t first = writtenAt.size() - 3;
+    EXPECT_EQ(writtenAt[first + 1] - writtenAt[first], 500);
+    EXPECT_EQ(writtenAt[first + 2] - writtenAt[first + 1], 500);
+}
+
+TEST_F(RunnerTest, WhatWasTypedBeforeIsNoAnswerToAPauseOrALoop) {
+    returns = {1s, 2s};
+    play("steps: [note: a, pause: ready, {repeat: 2, until: Return, steps: [wait: 1 s]}]");
+    EXPECT_EQ(forgotten, 2);
+    forgotten = 0;
+    scenario::RunOptions nobody;
+    nobody.nobodyThere = true;
+    play("steps: [pause: ready]", nobody);
+    EXPECT_EQ(forgotten, 0);
+}
+
 TEST_F(RunnerTest, ATrafficMessageGoesOutWithItsAnnouncementInTurn) {
     play("steps: [{repeat: 2, steps: [tmc: 0B90E400CC]}]");
     EXPECT_EQ(sent(), (Lines{direct("3A=01,106100CD46"), direct("8A=02,0B90E400CC"), direct("3A=01,100066CD46"),

@@ -1,3 +1,5 @@
+#include <algorithm>
+
 #include "scenario/playtest.h"
 #include "support/fulldisk.h"
 
@@ -11,6 +13,33 @@ TEST_F(RunnerStopTest, WhatStoodBeforeComesBackAtTheEnd) {
     const auto outcome = play("restore: true\nsteps: [send: {TA: 1}]");
     EXPECT_TRUE(outcome.complete && outcome.restored);
     EXPECT_EQ(heard, (Lines{"remember", "1 TA=1 0", "finishes", "bring back", "restore TA= 0", "ended"}));
+}
+
+TEST_F(RunnerStopTest, AnInstrumentThatIsSilentForSomeSecondsIsRestoredAllTheSame) {
+    silentRestores = 4;
+    const auto outcome = play("restore: true\nsteps: [send: {TA: 1}]");
+    EXPECT_TRUE(outcome.restored);
+    EXPECT_EQ(std::count(heard.begin(), heard.end(), "bring back"), 5);
+    EXPECT_EQ(sent().back(), direct("TA=0"));
+    EXPECT_GE(clock.steadyNow() - begin, 4s);
+}
+
+TEST_F(RunnerStopTest, WhereNothingCanBeBroughtBackWhatWasSentIsNamed) {
+    silentRestores = 1000;
+    const auto outcome = play("restore: true\nsteps: [send: {TA: 1, PS: OTHER}, send: {TA: 0}]");
+    EXPECT_FALSE(outcome.restored);
+    EXPECT_EQ(outcome.changed, (Lines{"PS", "TA"}));
+    EXPECT_LT(clock.steadyNow() - begin, 10s);
+}
+
+TEST_F(RunnerStopTest, WhatWasNotKnownBeforeIsNamedWhereItWasSent) {
+    silentBefore = {"PI", "RT", "RT_N", "FM", "AF2", "EON_PS", "GROUPSEQ"};
+    EXPECT_EQ(play("restore: true\nsteps: [send: {TA: 1}]").untold, Lines{});
+    EXPECT_EQ(play("restore: true\nsteps: [send: {FM_AUS: 1, AF1: \"N,98.5\"}]").untold, (Lines{"FM", "AF2"}));
+    EXPECT_EQ(play("restore: true\nsteps: [send: {DEL_RT: 1, EON_PI: ABCD}]").untold, (Lines{"RT", "RT_N", "EON_PS"}));
+    folder.copyShipped();
+    session.load(Profile::ofFile(data, dataSetFile("2")));
+    EXPECT_EQ(play("restore: true\ndata_set: 2\nsteps: [note: a]").untold, silentBefore);
 }
 
 TEST_F(RunnerStopTest, WithoutRestoreNothingIsAskedAndNothingComesBack) {
@@ -46,7 +75,10 @@ TEST_F(RunnerStopTest, AStopEndsAPauseAndAnExpectation) {
     EXPECT_EQ(heard, (Lines{"1 pause=ready no Return", "ended"}));
     stopped = false;
     visa.answersTo = {{coder("TA"), "\"1\"\n"}};
-    EXPECT_FALSE(play("steps: [expect: {TA: 0, within: 1 h}, note: never]").complete);
+    const auto outcome = play("steps: [expect: {TA: 0, within: 1 h}, note: never]");
+    EXPECT_FALSE(outcome.complete);
+    EXPECT_EQ(outcome.unmet, 0U);
+    EXPECT_EQ(rows.back().status, "stopped");
     EXPECT_LT(clock.steadyNow() - begin, 2200ms);
 }
 
@@ -81,7 +113,7 @@ TEST_F(RunnerStopTest, AnExceptionRestoresToo) {
 TEST_F(RunnerStopTest, AFullDiskUnderTheReportIsToldOnceAndEndsTheRunRestored) {
     const scenario::Report file(folder.path() / "report.csv");
     report = &file;
-    ASSERT_TRUE(file.begin());
+    ASSERT_EQ(file.begin(), "");
     const FullDisk full;
     const auto outcome = play("restore: true\nsteps: [send: {TA: 1}, send: {TA: 0}]");
     EXPECT_TRUE(outcome.reportLost);

@@ -75,6 +75,7 @@ protected:
         instrument.open("TCPIP", "10.0.0.1");
         visa.answersTo["*IDN?"] = "KDX\n";
     }
+    std::string asked;  ///< last
 };
 
 TEST_F(Forgetful, AQuestionThatTheInstrumentDoesNotKnowStaysWithoutValue) {
@@ -84,6 +85,16 @@ TEST_F(Forgetful, AQuestionThatTheInstrumentDoesNotKnowStaysWithoutValue) {
     EXPECT_EQ(valueOf(readout, "PS"), std::nullopt);
     EXPECT_EQ(unanswered(readout).size(), readout.size() - 1);
     EXPECT_THAT(failures, IsEmpty());
+}
+
+TEST_F(Forgetful, AQuestionThatAMomentOfSilenceMetIsPutOnceMore) {
+    TrafficListener awake(instrument, [this](const Traffic& traffic) {
+        if (traffic.kind == Traffic::Kind::Read && asked == coder("PI")) visa.answersTo[asked] = "\"ABCD\"\n";
+        if (traffic.kind == Traffic::Kind::Written) asked = traffic.text;
+    });
+    const Readout readout = readOut(instrument);
+    EXPECT_EQ(valueOf(readout, "PI"), "ABCD");
+    EXPECT_EQ(unanswered(readout).size(), readout.size() - 1);
 }
 
 TEST_F(Forgetful, AnInstrumentThatNeverAnswersHasFailed) {

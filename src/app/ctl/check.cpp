@@ -13,9 +13,10 @@ int check(Laboratory& laboratory, const std::string& file) {
     const auto scenario = readScenarioFile(laboratory, file);
     if (!scenario) return kWrongCall;
     const std::string title = scenario->title.empty() ? file : scenario->title;
-    laboratory.output().remark(title + ": " + std::to_string(scenario->actions.size()) + " steps");
+    const std::size_t steps = scenario->actions.size();
+    laboratory.output().remark(title + ": " + std::to_string(steps) + (steps == 1 ? " step" : " steps"));
     laboratory.output().document["title"] = scenario->title;
-    laboratory.output().document["steps"] = scenario->actions.size();
+    laboratory.output().document["steps"] = steps;
     return kDone;
 }
 

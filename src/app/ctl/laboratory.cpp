@@ -175,7 +175,8 @@ void Laboratory::passed(const Traffic& traffic) {
     if (traffic.kind == Traffic::Kind::Logged) return;
     // Between two questions, never between a question and its answer. What is read after that, to bring back what stood
     // before, is read to its end.
-    if (traffic.kind == Traffic::Kind::Read && !m_stopped && isStopped()) m_session->instrument.stopSequence();
+    const bool mayStop = traffic.kind == Traffic::Kind::Read && !m_stopped && !m_finishing;
+    if (mayStop && isStopped()) m_session->instrument.stopSequence();
     const bool written = traffic.kind == Traffic::Kind::Written;
     const std::string text = toUtf8(printableLine(traffic.text, '.'));
     if (m_call.verbose) {
@@ -185,6 +186,8 @@ void Laboratory::passed(const Traffic& traffic) {
         m_output.line(timeText(m_clock) + (written ? " -> " : " <- ") + text + "  [" + status + "]");
     }
     if (written && !m_inSteps) m_output.progress(++m_written, m_expected);
+    // What nobody wants to have would grow for as long as a run lasts.
+    if (!m_call.json) return;
     m_output.document["traffic"].push_back(
         {{"direction", written ? "written" : "read"}, {"text", text}, {"status", traffic.status}});
 }

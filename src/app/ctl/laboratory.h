@@ -27,9 +27,6 @@ public:
 
     /// Opens the session; a failure is told. False then.
     [[nodiscard]] bool open();
-    /// Commands and questions about the other network are about this one from here on: 8-bit PI, four hexadecimal
-    /// digits. Without it they are about the one of data set 1, or the one that was sent last.
-    void setOtherNetwork(const std::string& pi) { m_state.eonIdentifier = pi; }
     /// Closes it, unless it is held.
     void close();
     /// One session for several tasks: open() finds it open, close() leaves it so.

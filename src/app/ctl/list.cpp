@@ -7,6 +7,7 @@
 #include "coder/keyfacts.h"
 #include "coder/readback.h"
 #include "rds/settings.h"
+#include "scenario/questions.h"
 
 namespace kdx::ctl {
 
@@ -50,17 +51,32 @@ int listQueries(Laboratory& laboratory) {
     return kDone;
 }
 
+int listQuestions(Laboratory& laboratory) {
+    Output::Rows rows{{"name", "answers", "what is asked", ""}};
+    nlohmann::json& listed = laboratory.output().document["questions"] = nlohmann::json::array();
+    for (const auto& [name, answers, meaning, asked] : scenario::allQuestions()) {
+        rows.push_back({name, std::to_string(answers), asked, meaning});
+        listed.push_back({{"name", name}, {"answers", answers}, {"meaning", meaning}, {"asked", asked}});
+    }
+    laboratory.output().table(rows);
+    return kDone;
+}
+
 }  // namespace
 
 void addList(CLI::App& app, Task& task) {
-    CLI::App* command = app.add_subcommand("list", "List the data sets with PS and PI, the keys, or the read-backs");
+    CLI::App* command =
+        app.add_subcommand("list", "List the data sets with PS and PI, the keys, the read-backs, or more questions");
     auto what = std::make_shared<std::string>("data-sets");
-    command->add_option("what", *what, "data-sets, keys or queries")
-        ->check(CLI::IsMember({"data-sets", "keys", "queries"}))
+    command->add_option("what", *what, "data-sets, keys, queries, or questions: what a scenario can expect answers to")
+        ->check(CLI::IsMember({"data-sets", "keys", "queries", "questions"}))
         ->type_name("WHAT");
     command->footer("Example: kdx-ctl list keys");
     command->callback([what, &task] {
-        task = *what == "keys" ? listKeys : *what == "queries" ? listQueries : listDataSets;
+        task = *what == "keys"        ? listKeys
+               : *what == "queries"   ? listQueries
+               : *what == "questions" ? listQuestions
+                                      : listDataSets;
     });
 }
 

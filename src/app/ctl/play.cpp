@@ -1,6 +1,7 @@
 #include <CLI/CLI.hpp>
 
 #include <memory>
+#include <optional>
 
 #include "app/ctl/laboratory.h"
 #include "app/ctl/scenariofile.h"
@@ -19,8 +20,8 @@ using scenario::Row;
 struct Play {
     std::string file;
     std::string report;
-    std::string from;
-    std::string until;
+    std::optional<std::string> from;
+    std::optional<std::string> until;
     double speed = 1;
     bool yes = false;
 };
@@ -33,6 +34,7 @@ public:
     }
 
     bool goesOn() override { return m_laboratory.goesOn(); }
+    void forgetsTyped() override { forgetTypedInput(); }
     Return pressed() override {
         switch (takeInputLine()) {
             case InputLine::NotYet:
@@ -53,13 +55,15 @@ public:
         if (asks && !m_yes) output().prompt(action.text.empty() ? "Return ends this" : action.text + " (Return)");
     }
     void happened(const Row& row) override {
-        output().document["steps"].push_back({{"time", row.time},
-                                              {"step", row.step},
-                                              {"key", row.key},
-                                              {"value", row.value},
-                                              {"command", row.command},
-                                              {"status", row.status},
-                                              {"answer", row.answer}});
+        if (m_laboratory.call().json) {
+            output().document["steps"].push_back({{"time", row.time},
+                                                  {"step", row.step},
+                                                  {"key", row.key},
+                                                  {"value", row.value},
+                                                  {"command", row.command},
+                                                  {"status", row.status},
+                                                  {"answer", row.answer}});
+        }
         if (row.status == scenario::kNotMet) {
             output().problem("step " + row.step + ": expected " + row.key + "=" + row.value + ", answered was \"" +
                              row.answer + "\"");
@@ -79,30 +83,41 @@ public:
     void ended(const scenario::Outcome& outcome) override {
         output().endProgress();
         if (!outcome.restored) output().problem("what stood before could not be brought back");
-        std::string keys;
-        for (const std::string& key : outcome.changed) keys += (keys.empty() ? "" : ", ") + key;
-        if (!keys.empty()) output().problem("not as before: " + keys);
+        const char* const changed = outcome.restored ? "not as before: " : "perhaps not as before: ";
+        if (!outcome.changed.empty()) output().problem(changed + listed(outcome.changed));
+        if (!outcome.untold.empty()) {
+            output().problem("not brought back, as the instrument did not tell them before: " + listed(outcome.untold));
+        }
         output().document["restored"] = outcome.restored;
         output().document["changed"] = outcome.changed;
-        if (outcome.unmet > 0) output().problem(std::to_string(outcome.unmet) + " expectations were not met");
+        output().document["untold"] = outcome.untold;
+        if (outcome.unmet > 0) {
+            output().problem(std::to_string(outcome.unmet) +
+                             (outcome.unmet == 1 ? " expectation was not met" : " expectations were not met"));
+        }
         output().document["unmet"] = outcome.unmet;
         output().document["complete"] = outcome.complete;
     }
 
 private:
     [[nodiscard]] Output& output() { return m_laboratory.output(); }
+    static std::string listed(const std::vector<std::string>& keys) {
+        std::string text;
+        for (const std::string& key : keys) text += (text.empty() ? "" : ", ") + key;
+        return text;
+    }
 
     Laboratory& m_laboratory;
     bool m_yes;
 };
 
 /// The step of that number; told when there is none.
-bool readStep(Laboratory& laboratory, const scenario::Scenario& scenario, const std::string& text,
+bool readStep(Laboratory& laboratory, const scenario::Scenario& scenario, const std::optional<std::string>& text,
               std::optional<scenario::StepNumber>& number) {
-    if (text.empty()) return true;
-    number = scenario::readStepNumber(text);
+    if (!text) return true;
+    number = scenario::readStepNumber(*text);
     if (number && isStepOf(scenario, *number)) return true;
-    laboratory.output().problem("there is no step " + text + "; steps are named as 4, 4.2 or 4#3.2");
+    laboratory.output().problem("there is no step \"" + *text + "\"; steps are named as 4, 4.2 or 4#3.2");
     return false;
 }
 
@@ -113,7 +128,7 @@ std::optional<scenario::RunOptions> readOptions(Laboratory& laboratory, const sc
     if (!readStep(laboratory, scenario, what.from, options.from)) return std::nullopt;
     if (!readStep(laboratory, scenario, what.until, options.until)) return std::nullopt;
     if (options.from && options.until && isBefore(*options.until, *options.from)) {
-        laboratory.output().problem("step " + what.until + " comes before step " + what.from);
+        laboratory.output().problem("step " + *what.until + " comes before step " + *what.from);
         return std::nullopt;
     }
     return options;
@@ -121,7 +136,8 @@ std::optional<scenario::RunOptions> readOptions(Laboratory& laboratory, const sc
 
 int result(const Laboratory& laboratory, const scenario::Outcome& outcome) {
     if (!outcome.complete || !outcome.restored || laboratory.result() != kDone) return kFailed;
-    return outcome.unmet > 0 ? kDifferent : kDone;
+    const bool asWanted = outcome.unmet == 0 && outcome.changed.empty() && outcome.untold.empty();
+    return asWanted ? kDone : kDifferent;
 }
 
 int play(Laboratory& laboratory, const Play& what) {
@@ -136,8 +152,9 @@ int play(Laboratory& laboratory, const Play& what) {
     const scenario::Report report(what.report.empty() ? scenario->report : what.report);
     laboratory.hasten(what.speed);
     if (!laboratory.open()) return kNoConnection;
-    if (!report.file().empty() && !report.begin()) {
-        laboratory.output().problem("the report " + report.file().string() + " cannot be written");
+    const std::string problem = report.file().empty() ? "" : report.begin();
+    if (!problem.empty()) {
+        laboratory.output().problem("the report " + report.file().string() + " " + problem);
         laboratory.close();
         return kWrongCall;
     }
@@ -168,7 +185,7 @@ void addPlay(CLI::App& app, Task& task) {
         ->type_name("FILE");
     command->footer(
         "Exit codes: 0 done, 1 stopped or a command failed, 2 a mistake in the file or the call,\n"
-        "3 an expectation was not met, 4 no connection.\n"
+        "3 an expectation was not met or something is not as before, 4 no connection.\n"
         "Example: kdx-ctl play Daten/Scenarios/af_handover.yaml --simulate --yes --speed 100 --report af.csv");
     command->callback([what, &task] { task = [what](Laboratory& laboratory) { return play(laboratory, *what); }; });
 }

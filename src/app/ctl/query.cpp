@@ -51,7 +51,7 @@ int query(Laboratory& laboratory, const Query& what) {
     }
     if (!laboratory.open()) return kNoConnection;
     Session& session = laboratory.session();
-    if (what.otherNetwork) laboratory.setOtherNetwork(*what.otherNetwork);
+    if (what.otherNetwork) laboratory.state().eonIdentifier = *what.otherNetwork;
     const bool all = std::find(what.names.begin(), what.names.end(), "all") != what.names.end();
     std::size_t longestName = 0;
     for (const ReadBack* readBack : asked) longestName = std::max(longestName, std::string_view(readBack->name).size());

@@ -91,10 +91,10 @@ int send(Laboratory& laboratory, const Send& what) {
     if (!legal) return kWrongCall;
     if (!laboratory.open()) return kNoConnection;
     Session& session = laboratory.session();
-    if (what.otherNetwork) laboratory.setOtherNetwork(*what.otherNetwork);
+    if (what.otherNetwork) laboratory.state().eonIdentifier = *what.otherNetwork;
     for (const auto& [key, value] : settings) {
         // Commands about the other network are led by the one that was sent last.
-        if (key == setting::kEonPi.sendKey) laboratory.setOtherNetwork(value);
+        if (key == setting::kEonPi.sendKey) laboratory.state().eonIdentifier = value;
         if (laboratory.goesOn()) session.params.SendParam(key, std::string(value));
     }
     for (const std::string& command : what.raw) sendAsItStands(laboratory, line(command));
