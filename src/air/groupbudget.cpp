@@ -172,7 +172,10 @@ void Reckoning::addWarnings(GroupBudget& budget) const {
     const bool has2B = isNamed(GroupType::Radiotext2B);
 
     warn(isSet(What::Networks) && !isNamed(GroupType::Networks14A), "EON is set but 14A has no slot");
-    warn(isNamed(GroupType::Traffic8A) && !isSent(GroupType::OpenData3A), "8A without 3A");
+    // While there is no message yet the announcement may not be there either.
+    const bool isAnnounced =
+        isSet(What::TrafficMessage) ? isSent(GroupType::OpenData3A) : isNamed(GroupType::OpenData3A);
+    warn(isNamed(GroupType::Traffic8A) && !isAnnounced, "8A without 3A");
     warn(isSet(What::TrafficMessage) && !isNamed(GroupType::Traffic8A), "a traffic message is set but 8A has no slot");
     const auto ps = waitOf(What::Ps);
     warn(!ps, "PS is never sent: neither 0A nor 0B has a slot");

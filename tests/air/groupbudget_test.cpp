@@ -123,6 +123,7 @@ TEST_F(GroupBudgetTest, OfNetworks) {
 /// Slots 0A, 3A, 8A: from 0A on 3 groups, from 3A on 2, from 8A on (which means nothing yet) 4.
 TEST_F(GroupBudgetTest, OfTrafficMessagesAwaitsTheirAnnouncementFirst) {
     coder("GS=0A,3A,8A");
+    EXPECT_THAT(budget().warnings, testing::Not(testing::Contains("8A without 3A")));
     coder(kMessage);
     EXPECT_FALSE(item(What::TrafficMessage).wait);
     EXPECT_THAT(budget().warnings,
