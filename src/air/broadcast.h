@@ -37,6 +37,9 @@ public:
     /// Carries out a program message, which shows from the next group on. @param at not before the last one's.
     void execute(std::string_view message, AirTime at);
 
+    /// What is to go on the air; it holds until the next message.
+    [[nodiscard]] sim::Transmission transmission() const { return m_instrument.transmission(); }
+
     /// When the next group begins.
     [[nodiscard]] AirTime time() const { return m_time; }
     /// What goes out for the length of a group, which is over then.

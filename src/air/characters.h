@@ -15,7 +15,7 @@ namespace kdx::air {
 void writeCodes(std::string_view text, std::span<std::uint8_t> codes, const std::string& name, Warnings& warnings);
 
 /// Two characters as a block holds them.
-[[nodiscard]] inline std::uint16_t pairOf(unsigned high, unsigned low) {
+[[nodiscard]] constexpr std::uint16_t pairOf(unsigned high, unsigned low) {
     return static_cast<std::uint16_t>(high << 8U | low);
 }
 

@@ -10,6 +10,8 @@ namespace kdx::air {
 
 namespace {
 
+constexpr std::uint16_t kNoLists = pairOf(kNoFrequencies, kFiller);
+
 struct Frequency {
     std::string_view text;
     double megahertz = 0;
@@ -131,10 +133,14 @@ void AlternativeFrequencies::take(const sim::AfLists& lists, Warnings& warnings)
         const auto append = isMethodB(list) ? appendMethodB : appendMethodA;
         append(pairs, list, numbered("AF", index), warnings);
     }
-    if (pairs.empty()) pairs.push_back(pairOf(kNoFrequencies, kFiller));
+    if (pairs.empty()) pairs.push_back(kNoLists);
     if (pairs == m_pairs) return;
     m_pairs = std::move(pairs);
     m_next = 0;
+}
+
+std::size_t AlternativeFrequencies::size() const {
+    return m_pairs == std::vector{kNoLists} ? 0 : m_pairs.size();
 }
 
 std::uint16_t AlternativeFrequencies::next() {

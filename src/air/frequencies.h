@@ -32,6 +32,8 @@ inline constexpr std::size_t kMostFrequencies = 25;
 class AlternativeFrequencies {
 public:
     void take(const sim::AfLists& lists, Warnings& warnings);
+    /// Groups that all of the lists take; 0 without any.
+    [[nodiscard]] std::size_t size() const;
     /// Block 3 of the next group.
     [[nodiscard]] std::uint16_t next();
 

@@ -21,6 +21,8 @@ public:
     /// @param bursts whether a change of TA is announced at once.
     void take(const std::vector<sim::OtherNetwork>& networks, bool bursts, Warnings& warnings);
     [[nodiscard]] bool empty() const { return m_networks.empty(); }
+    /// Groups 14A that all of them take.
+    [[nodiscard]] std::size_t parts() const { return m_parts.size(); }
 
     /// Of 14A: all of one network, then all of the next one.
     [[nodiscard]] Part nextOf14A();

@@ -11,7 +11,6 @@ namespace kdx::air {
 namespace {
 
 constexpr std::uint8_t kEndMark = 0x0D;
-constexpr std::size_t kSegments = 16;
 constexpr unsigned kFlagB = 0x10;
 
 }  // namespace
@@ -32,9 +31,12 @@ void Radiotext::take(const std::string& text, std::string_view numbers, Warnings
     m_lastText = text;
 }
 
+std::size_t Radiotext::segments(std::size_t size) const {
+    return std::min((m_length + size - 1) / size, kMostSegments);
+}
+
 Radiotext::Segment Radiotext::next(std::size_t size) {
-    const std::size_t count = std::min((m_length + size - 1) / size, kSegments);
-    if (m_segment >= count) m_segment = 0;
+    if (m_segment >= segments(size)) m_segment = 0;
     const std::size_t at = m_segment++;
     return {(m_flag ? kFlagB : 0) | static_cast<unsigned>(at), std::span(m_codes).subspan(at * size, size)};
 }

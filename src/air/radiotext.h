@@ -12,6 +12,9 @@
 
 namespace kdx::air {
 
+/// A segment's address has four bits.
+inline constexpr std::size_t kMostSegments = 16;
+
 /// The radiotext in the segments of groups 2A and 2B (IEC 62106, 6.1.5.3), which share one counter.
 class Radiotext {
 public:
@@ -19,6 +22,9 @@ public:
     /// text toggles that.
     void take(const std::string& text, std::string_view numbers, Warnings& warnings);
     [[nodiscard]] bool empty() const { return m_text.empty(); }
+
+    /// How many segments the text takes. @param size as below.
+    [[nodiscard]] std::size_t segments(std::size_t size) const;
 
     struct Segment {
         unsigned flagAndAddress = 0;  ///< the five last bits of block 2

@@ -16,8 +16,8 @@ import ctl_test
 from ctl_test import DIFFERENT, DONE, NO_CONNECTION
 
 README = pathlib.Path(__file__).parents[2] / "README.md"
-# What they find out: differences, what a file does not keep, that no instrument is in this network.
-ALSO = {"diff": DIFFERENT, "play": DIFFERENT, "read": DIFFERENT, "find": NO_CONNECTION}
+# What they find out: differences, what a file does not keep, warnings, that no instrument is in this network.
+ALSO = {"budget": DIFFERENT, "diff": DIFFERENT, "play": DIFFERENT, "read": DIFFERENT, "find": NO_CONNECTION}
 
 
 class Examples(ctl_test.Ctl):

@@ -5,13 +5,9 @@
 #include <memory>
 
 #include "air/broadcast.h"
-#include "air/timedcommands.h"
+#include "app/ctl/aircommands.h"
 #include "app/ctl/laboratory.h"
-#include "app/ctl/readablefile.h"
-#include "app/ctl/whichdataset.h"
 #include "base/duration.h"
-#include "coder/loggedcommands.h"
-#include "station/rehearsal.h"
 
 namespace kdx::ctl {
 
@@ -21,52 +17,11 @@ using namespace std::chrono_literals;
 
 constexpr std::string_view kStandardOutput = "-";
 
-struct Air {
-    WhichDataSet source;
-    bool appliesSource = false;
-    std::string log;
-    std::string commandFile;
+struct Air : AirCommands {
     std::string groupFile;
     std::chrono::milliseconds duration = 60s;
     std::optional<air::AirTime> start;
 };
-
-using Commands = std::vector<air::TimedCommand>;
-
-/// Adds what a data set makes of an instrument.
-bool addDataSet(Laboratory& laboratory, const WhichDataSet& source, Commands& commands) {
-    const auto profile = source.profile(laboratory);
-    if (!profile) return false;
-    Rehearsal rehearsal(laboratory.data(), laboratory.captions());
-    rehearsal.apply(*profile);
-    for (const std::string& command : rehearsal.commands()) commands.push_back({air::Ticks{0}, command});
-    return true;
-}
-
-bool addLog(Laboratory& laboratory, const std::string& file, Commands& commands) {
-    const auto bytes = bytesOf(laboratory.output(), file);
-    if (!bytes) return false;
-    const LoggedCommands logged = readLoggedCommands(*bytes);
-    for (const auto& [key, command] : logged.commands) commands.push_back({air::Ticks{0}, command});
-    return areNone(laboratory.output(), file, logged.unreadableLines, "not a line of a command log");
-}
-
-bool addCommandFile(Laboratory& laboratory, const std::string& file, Commands& commands) {
-    const auto bytes = bytesOf(laboratory.output(), file);
-    if (!bytes) return false;
-    const air::TimedCommands read = air::readTimedCommands(*bytes);
-    commands.insert(commands.end(), read.commands.begin(), read.commands.end());
-    return areNone(laboratory.output(), file, read.unreadableLines, "not a line of a command file");
-}
-
-/// All that is done to the instrument, in its order; nothing when a part of it cannot be read.
-std::optional<Commands> commandsOf(Laboratory& laboratory, const Air& what) {
-    Commands commands;
-    if (what.appliesSource && !addDataSet(laboratory, what.source, commands)) return std::nullopt;
-    if (!what.log.empty() && !addLog(laboratory, what.log, commands)) return std::nullopt;
-    if (!what.commandFile.empty() && !addCommandFile(laboratory, what.commandFile, commands)) return std::nullopt;
-    return commands;
-}
 
 /// Where the lines of groups go.
 class GroupLines {
@@ -152,13 +107,8 @@ void addTimes(CLI::App& command, const std::shared_ptr<Air>& what) {
 void addAir(CLI::App& app, Task& task) {
     auto what = std::make_shared<Air>();
     CLI::App* command = app.add_subcommand("air", "Write what the virtual coder would transmit with a data set");
-    what->source.addTo(*command);
+    what->addTo(*command);
     addTimes(*command, what);
-    command->add_option("--log", what->log, "carry out the commands of a command log too")->type_name("LOG");
-    command
-        ->add_option("--commands", what->commandFile,
-                     "carry out a command a line too; \"@ 2.5 \" before it: 2.5 s after the start")
-        ->type_name("FILE");
     command->add_option("--groups", what->groupFile, "write the groups there, - for the standard output")
         ->required()
         ->type_name("FILE");

@@ -41,6 +41,7 @@ using AddSubcommand = void (*)(CLI::App& app, Task& task);
 
 void addAir(CLI::App& app, Task& task);
 void addApply(CLI::App& app, Task& task);
+void addBudget(CLI::App& app, Task& task);
 void addCheck(CLI::App& app, Task& task);
 void addDiff(CLI::App& app, Task& task);
 void addFind(CLI::App& app, Task& task);

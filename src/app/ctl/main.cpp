@@ -95,9 +95,10 @@ int called(int argc, const char* const* argv) {
     addTimeout(app, call);
     addManner(app, call);
     kdx::ctl::Task task;
-    for (const auto add : {kdx::ctl::addAir, kdx::ctl::addApply, kdx::ctl::addCheck, kdx::ctl::addDiff,
-                           kdx::ctl::addFind, kdx::ctl::addList, kdx::ctl::addPlay, kdx::ctl::addQuery,
-                           kdx::ctl::addRead, kdx::ctl::addReplay, kdx::ctl::addSend, kdx::ctl::addShell}) {
+    for (const auto add :
+         {kdx::ctl::addAir, kdx::ctl::addApply, kdx::ctl::addBudget, kdx::ctl::addCheck, kdx::ctl::addDiff,
+          kdx::ctl::addFind, kdx::ctl::addList, kdx::ctl::addPlay, kdx::ctl::addQuery, kdx::ctl::addRead,
+          kdx::ctl::addReplay, kdx::ctl::addSend, kdx::ctl::addShell}) {
         add(app, task);
     }
     app.footer(
