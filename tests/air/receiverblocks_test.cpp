@@ -18,6 +18,8 @@ static void PrintTo(const ReceivedGroup& group, std::ostream* out) {
 namespace {
 
 using Bits = std::vector<bool>;
+constexpr std::size_t kBlockBits = 26;
+constexpr std::size_t kGroupBits = 4 * kBlockBits;
 
 ReceivedGroup whole(const Group& group) {
     return {{group.blocks[0], group.blocks[1], group.blocks[2], group.blocks[3]}};
@@ -93,14 +95,14 @@ TEST(ReceivedBlocks, BeginAtAnyBitOfTheFirstGroup) {
 TEST(ReceivedBlocks, WithAnErrorAreMissingAndTheOthersStay) {
     Bits bits;
     for (int i = 0; i < 2; ++i) append(bits, kBasic);
-    for (std::size_t wrong = 104; wrong < 208; ++wrong) {
+    for (std::size_t wrong = kGroupBits; wrong < 2 * kGroupBits; ++wrong) {
         Bits disturbed = bits;
         disturbed[wrong] = !disturbed[wrong];
         BlockReceiver receiver;
         const auto groups = received(receiver, disturbed);
         ASSERT_EQ(groups.size(), 2U) << wrong;
         ReceivedGroup expected = whole(kBasic);
-        expected.blocks.at((wrong - 104) / 26).reset();
+        expected.blocks.at((wrong - kGroupBits) / kBlockBits).reset();
         EXPECT_EQ(groups[1], expected) << wrong;
         EXPECT_EQ(receiver.blocks(), 8U);
         EXPECT_EQ(receiver.wrongBlocks(), 1U);
@@ -111,7 +113,7 @@ TEST(ReceivedBlocks, KeepTheirStepOverAGapOfNoise) {
     std::mt19937 random(1);
     Bits bits;
     append(bits, kBasic);
-    for (int i = 0; i < 8 * 104; ++i) bits.push_back(random() % 2 != 0);
+    for (int i = 0; i < 800; ++i) bits.push_back(random() % 2 != 0);
     append(bits, kBasic);
     BlockReceiver receiver;
     const auto groups = received(receiver, bits);
@@ -124,12 +126,12 @@ TEST(ReceivedBlocks, KeepTheirStepOverAGapOfNoise) {
 TEST(ReceivedBlocks, LoseTheirStepWhenNoneIsRight) {
     Bits bits;
     append(bits, kBasic);
-    bits.insert(bits.end(), 50 * 26, false);
+    bits.insert(bits.end(), 50 * kBlockBits, false);
     BlockReceiver receiver;
     EXPECT_EQ(received(receiver, bits).size(), 1U);
     EXPECT_FALSE(receiver.inStep());
     const auto wrong = receiver.wrongBlocks();
-    (void)received(receiver, Bits(100 * 26, true));
+    (void)received(receiver, Bits(100 * kBlockBits, true));
     EXPECT_EQ(receiver.wrongBlocks(), wrong) << "what is not in step is no block";
 }
 
@@ -188,10 +190,10 @@ TEST(ReceivedBlocks, WithErrorsAtRandomAreNeverWrongOnes) {
         append(bits, sent.back());
     }
     std::vector<bool> isWrong(sent.size() * 4);
-    for (std::size_t at = 2 * 104; at < bits.size(); ++at) {
+    for (std::size_t at = 2 * kGroupBits; at < bits.size(); ++at) {
         if (random() % 500 != 0) continue;
         bits[at] = !bits[at];
-        isWrong[at / 26] = true;
+        isWrong[at / kBlockBits] = true;
     }
     BlockReceiver receiver;
     const auto groups = received(receiver, bits);
