@@ -55,8 +55,7 @@ int amKilohertz(unsigned code) {
 
 void FrequencyLists::take(std::optional<std::uint16_t> pair) {
     if (!pair) {
-        m_awaited = 0;
-        m_amFollows = false;
+        breakOff();
         return;
     }
     const unsigned codes = *pair;
@@ -70,10 +69,28 @@ void FrequencyLists::take(std::optional<std::uint16_t> pair) {
 }
 
 void FrequencyLists::begin(unsigned count) {
+    breakOff();
     m_codes.clear();
     m_awaited = count;
+    ++m_count;
+    if (count > 0) return;
+    m_heard.clear();
+    m_latest = {};
+}
+
+/// A list that was not heard to its end is still on the air: it must not be taken for gone.
+void FrequencyLists::breakOff() {
+    if (m_awaited > 0 && !m_codes.empty()) {
+        for (Heard& heard : m_heard) {
+            if (heard.count == m_awaited && heard.first == m_codes.front()) hearAgain(heard);
+        }
+    }
+    m_awaited = 0;
     m_amFollows = false;
-    if (count == 0) m_heard.clear();
+}
+
+void FrequencyLists::hearAgain(Heard& heard) const {
+    heard.turns = {m_count, heard.turns[0], heard.turns[1]};
 }
 
 void FrequencyLists::takeCode(unsigned code) {
@@ -89,19 +106,17 @@ void FrequencyLists::takeCode(unsigned code) {
 }
 
 void FrequencyLists::endOfList() {
-    FrequencyList list = listOf(m_codes);
-    const auto isList = [&list](const Heard& heard) { return heard.list == list; };
-    const auto known = std::find_if(m_heard.begin(), m_heard.end(), isList);
-    ++m_count;
-    if (known != m_heard.end()) {
-        known->last = m_count;
-    } else {
-        m_heard.push_back({std::move(list), m_count});
+    m_latest = listOf(m_codes);
+    const auto isLatest = [this](const Heard& heard) { return heard.list == m_latest; };
+    const auto known = std::find_if(m_heard.begin(), m_heard.end(), isLatest);
+    if (known == m_heard.end()) {
+        m_heard.push_back({m_latest, m_codes.size(), m_codes.front(), {m_count, 0, 0}});
+        return;
     }
-    // All lists come in turn: one that was missing twice is no longer sent.
-    const auto isGone = [newest = m_count, turn = 2 * m_heard.size()](const Heard& heard) {
-        return newest - heard.last > turn;
-    };
+    // All lists come in turn: one that three turns of this one went without is no longer sent.
+    const std::uint64_t oldest = known->turns.back();
+    hearAgain(*known);
+    const auto isGone = [oldest](const Heard& heard) { return heard.turns.front() < oldest; };
     m_heard.erase(std::remove_if(m_heard.begin(), m_heard.end(), isGone), m_heard.end());
 }
 

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <array>
 #include <cstddef>
 #include <cstdint>
 #include <optional>
@@ -33,20 +34,27 @@ public:
     void take(std::optional<std::uint16_t> pair);
     /// The whole lists, in the order they were first heard. One that is no longer repeated goes.
     [[nodiscard]] std::vector<FrequencyList> lists() const;
+    /// The list that became whole last; an empty one before the first.
+    [[nodiscard]] const FrequencyList& latest() const { return m_latest; }
 
 private:
     struct Heard {
         FrequencyList list;
-        std::uint64_t last = 0;  ///< the count of lists when it came
+        std::size_t count = 0;  ///< of its frequencies, and the first of them: what it begins with
+        int first = 0;
+        std::array<std::uint64_t, 3> turns{};  ///< the last times that it came, the newest first: counts of lists
     };
     void begin(unsigned count);
     void takeCode(unsigned code);
     void endOfList();
+    void breakOff();
+    void hearAgain(Heard& heard) const;
 
     std::vector<int> m_codes;   ///< of the list under way, in kilohertz, one behind the other as they came
     std::size_t m_awaited = 0;  ///< so many make the list whole; 0 while none is under way
     bool m_amFollows = false;
     std::vector<Heard> m_heard;
+    FrequencyList m_latest;
     std::uint64_t m_count = 0;
 };
 

@@ -52,7 +52,7 @@ void ReceivedNetworks::take14A(unsigned bits, std::optional<std::uint16_t> block
     if (variant == 0) beginTurn(place);
     if (variant == kMethodA) {
         m_beside[place].lists.take(block3);
-        m_networks[place].frequencies = m_beside[place].lists.lists();
+        m_networks[place].frequencies = m_beside[place].lists.latest();
     } else if (block3) {
         takeVariant(place, variant, *block3);
     }
@@ -93,13 +93,14 @@ void ReceivedNetworks::takePair(std::size_t place, ReceivedNetwork::Mapped pair)
     beside.pairTurn[index] = beside.turn;
 }
 
-/// A pair that two turns of its network went without is no longer sent.
+/// A pair that three turns of its network went without is no longer sent.
 void ReceivedNetworks::beginTurn(std::size_t place) {
+    constexpr std::uint64_t kLongestAway = 3;
     auto& pairs = m_networks[place].mapped;
     Beside& beside = m_beside[place];
     ++beside.turn;
     for (std::size_t at = pairs.size(); at-- > 0;) {
-        if (beside.turn - beside.pairTurn[at] <= 2) continue;
+        if (beside.turn - beside.pairTurn[at] <= kLongestAway) continue;
         pairs.erase(pairs.begin() + static_cast<std::ptrdiff_t>(at));
         beside.pairTurn.erase(beside.pairTurn.begin() + static_cast<std::ptrdiff_t>(at));
     }

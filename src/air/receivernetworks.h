@@ -19,7 +19,7 @@ struct ReceivedNetwork {
     };
     std::uint16_t pi = 0;
     std::array<std::uint8_t, 8> ps{' ', ' ', ' ', ' ', ' ', ' ', ' ', ' '};  ///< codes of characters
-    std::vector<FrequencyList> frequencies;                                  ///< method A
+    FrequencyList frequencies;                                               ///< method A
     std::vector<Mapped> mapped;
     std::optional<bool> tp;
     std::optional<bool> ta;

@@ -195,11 +195,23 @@ TEST_F(ReceivedFrequencies, OfAListWithAnErrorWaitForTheNext) {
 }
 
 TEST_F(ReceivedFrequencies, ThatAreNoLongerRepeatedGo) {
-    hearPairs({"E105"});
-    for (int i = 0; i < 4; ++i) hearPairs({"E106"});
-    EXPECT_EQ(shown().frequencies.size(), 2U);
+    hearPairs({"E105", "E106", "E107"});
+    for (int i = 0; i < 2; ++i) hearPairs({"E106", "E107"});
+    EXPECT_EQ(shown().frequencies.size(), 3U) << "it may have been missed";
     hearPairs({"E106"});
-    EXPECT_EQ(shown().frequencies, (Lists{{false, 0, {{88100}}}}));
+    EXPECT_EQ(shown().frequencies, (Lists{{false, 0, {{88100}}}, {false, 0, {{88200}}}}));
+}
+
+TEST_F(ReceivedFrequencies, OfAListThatIsNeverHeardToItsEndAgainStay) {
+    hearPairs({"E312", "1278", "E106"});
+    for (int i = 0; i < 5; ++i) hearPairs({"E312", "----", "E106"});
+    EXPECT_EQ(shown().frequencies, (Lists{{true, 89300, {{99500}}}, {false, 0, {{88100}}}}));
+}
+
+TEST_F(ReceivedFrequencies, OfAListThatBeginsAsBeforeGo) {
+    hearPairs({"E312", "1278"});
+    for (int i = 0; i < 4; ++i) hearPairs({"E312", "1279"});
+    EXPECT_EQ(shown().frequencies, (Lists{{true, 89300, {{99600}}}}));
 }
 
 class ReceivedClock : public ReceiverTest {
@@ -273,8 +285,8 @@ TEST_F(ReceivedOtherNetworks, HaveTheirNameInVariants0To3) {
 
 TEST_F(ReceivedOtherNetworks, HaveAListOfMethodAInVariant4) {
     hear({"D3C2 E004 E305 1234", "D3C2 E004 E119 5678", "D3C2 E004 197D 1234"});
-    EXPECT_EQ(network(0).frequencies, (Lists{{false, 0, {{88000}, {90000}, {100000}}}}));
-    EXPECT_EQ(network(1).frequencies, (Lists{{false, 0, {{90000}}}}));
+    EXPECT_EQ(network(0).frequencies, (FrequencyList{false, 0, {{88000}, {90000}, {100000}}}));
+    EXPECT_EQ(network(1).frequencies, (FrequencyList{false, 0, {{90000}}}));
 }
 
 TEST_F(ReceivedOtherNetworks, HaveMappedFrequenciesInVariants5To9) {
@@ -285,9 +297,9 @@ TEST_F(ReceivedOtherNetworks, HaveMappedFrequenciesInVariants5To9) {
               (Mapped{{87600, 90100}, {87600, 94300}, {87600, 107900}, {88000, 90000}, {87600, 531}}));
 }
 
-TEST_F(ReceivedOtherNetworks, LoseAPairThatTwoTurnsWentWithout) {
+TEST_F(ReceivedOtherNetworks, LoseAPairThatThreeTurnsWentWithout) {
     hear({"D3C2 E000 2020 1234", "D3C2 E005 011A 1234", "D3C2 E000 2020 1234", "D3C2 E005 0144 1234",
-          "D3C2 E000 2020 1234", "D3C2 E005 0144 1234"});
+          "D3C2 E000 2020 1234", "D3C2 E005 0144 1234", "D3C2 E000 2020 1234", "D3C2 E005 0144 1234"});
     EXPECT_EQ(network(0).mapped.size(), 2U);
     hear("D3C2 E000 2020 1234");
     EXPECT_EQ(network(0).mapped, (std::vector<ReceivedNetwork::Mapped>{{87600, 94300}}));
