@@ -5,6 +5,7 @@
 #include <charconv>
 #include <cstdint>
 
+#include "air/receivertrafficwords.h"
 #include "base/codepage.h"
 #include "base/numbers.h"
 #include "coder/fieldsizes.h"
@@ -26,117 +27,27 @@ std::uint64_t hexValue(std::string_view digits) {
     return value;
 }
 
-std::string hexDigits(std::uint64_t value, unsigned count) {
-    constexpr std::string_view kDigits = "0123456789ABCDEF";
-    std::string digits;
-    for (unsigned i = count; i > 0; --i) digits += kDigits[(value >> (4 * (i - 1))) & 0xF];
-    return digits;
-}
-
-/// Takes bit fields off a group's contents, the most significant first.
-class BitReader {
-public:
-    BitReader(std::uint64_t bits, unsigned length) : m_bits(bits), m_left(length) {}
-    std::uint64_t take(unsigned count) {
-        m_left -= count;
-        return (m_bits >> m_left) & ((std::uint64_t{1} << count) - 1);
-    }
-
-private:
-    std::uint64_t m_bits;
-    unsigned m_left;
-};
-
 // "02," and ten characters, all hexadecimal digits.
 constexpr std::size_t kGroupPrefix = 3;
 bool isGroup(std::string_view value) {
     return value.size() == kGroupPrefix + kGroupDigits && value[2] == ',' && isHex(value.substr(kGroupPrefix));
 }
 
+air::OpenDataGroup groupOf(std::string_view value) {
+    constexpr std::uint64_t kBits = 0x1F;
+    const std::uint64_t content = hexValue(value.substr(kGroupPrefix));
+    return {static_cast<std::uint8_t>(content >> 32U & kBits), static_cast<std::uint16_t>(content >> 16U),
+            static_cast<std::uint16_t>(content)};
+}
+
 std::string describeTrafficMessage(std::string_view value) {
     if (!isGroup(value)) return "incomplete traffic message";
-    const bool t = value[kGroupPrefix] != '0';
-    BitReader bits(hexValue(value.substr(kGroupPrefix + 1)), 36);
-    const bool single = bits.take(1) == 1;
-    const std::uint64_t duration = bits.take(3);
-    const bool diversion = bits.take(1) == 1;
-    const bool backward = bits.take(1) == 1;
-    const std::uint64_t extent = bits.take(3);
-    const std::uint64_t event = bits.take(11);
-    const std::uint64_t location = bits.take(16);
-    return "traffic message: event " + number(event) + ", location " + number(location) + ", extent " + number(extent) +
-           ", direction " + (backward ? "backward" : "forward") + ", duration " + number(duration) + ", " +
-           (diversion ? "diversion" : "no diversion") + ", F " + (single ? "1" : "0") + ", T " + (t ? "1" : "0");
-}
-
-std::string yesNo(std::uint64_t bit) {
-    return bit == 0 ? "no" : "yes";
-}
-
-// The group that an application's data come in: four bits of type, one of version. Two codes are no group.
-std::string groupName(std::uint64_t code) {
-    constexpr std::uint64_t kNoGroup = 0;
-    constexpr std::uint64_t kFault = 31;
-    if (code == kNoGroup) return "no group of its own";
-    if (code == kFault) return "no group for now (fault)";
-    return "group " + number(code >> 1) + ((code & 1) == 0 ? "A" : "B");
-}
-
-// Seconds, in the two bits that enhanced mode has for each of its times.
-std::string timeOf(std::uint64_t code) {
-    return number(std::uint64_t{1} << code) + " s";
-}
-
-// The 16 bits that an announcement of traffic messages carries (ISO 14819-1); what they mean depends on the variant in
-// front.
-std::string describeSystemInformation(std::uint64_t word) {
-    BitReader bits(word, 16);
-    const std::uint64_t variant = bits.take(2);
-    if (variant == 0) {
-        bits.take(2);  // reserved
-        const std::uint64_t table = bits.take(6);
-        const std::uint64_t alternative = bits.take(1);
-        const std::uint64_t enhanced = bits.take(1);
-        std::string scope;
-        for (const char* area : {"international ", "national ", "regional ", "urban "}) {
-            if (bits.take(1) == 1) scope += area;
-        }
-        return "location table " + number(table) + (table == 0 ? " (encrypted)" : "") + ", alternative frequencies " +
-               yesNo(alternative) + ", enhanced mode " + yesNo(enhanced) + ", scope " +
-               (scope.empty() ? "none" : scope.substr(0, scope.size() - 1));
-    }
-    if (variant == 1) {
-        constexpr std::array<std::uint64_t, 4> kGaps = {3, 5, 8, 11};
-        const std::uint64_t gap = kGaps[bits.take(2)];
-        const std::uint64_t service = bits.take(6);
-        const std::string activity = timeOf(bits.take(2));
-        const std::string window = timeOf(bits.take(2));
-        const std::uint64_t delay = bits.take(2);
-        return "gap of " + number(gap) + " groups, service " + number(service) + ", activity " + activity +
-               ", window " + window + ", delay " + number(delay) + " s";
-    }
-    if (variant == 2) {
-        const std::uint64_t country = bits.take(4);
-        bits.take(2);  // reserved
-        return "location table country " + hexDigits(country, 1) + ", extended country code " +
-               hexDigits(bits.take(8), 2);
-    }
-    return "variant " + number(variant);
+    return fromUtf8(inWords(air::trafficGroupOf(groupOf(value)), {}));
 }
 
 std::string describeOpenData(std::string_view value) {
     if (!isGroup(value)) return "incomplete open-data announcement";
-    BitReader bits(hexValue(value.substr(kGroupPrefix)), 40);
-    bits.take(3);  // the group type has five bits
-    const std::uint64_t group = bits.take(5);
-    const std::uint64_t word = bits.take(16);
-    const std::uint64_t application = bits.take(16);
-    std::string text = "open data in " + groupName(group) + ", application ";
-    text.append(value.substr(value.size() - 4));
-    constexpr std::array<std::uint64_t, 2> kTrafficApplications = {0xCD46, 0xCD47};
-    const bool traffic = std::count(kTrafficApplications.begin(), kTrafficApplications.end(), application) > 0;
-    if (traffic) text += " (traffic messages), " + describeSystemInformation(word);
-    return text;
+    return inWords(air::announcementOf(groupOf(value)));
 }
 
 std::string describePs(std::string_view value) {

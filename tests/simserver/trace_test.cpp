@@ -33,15 +33,20 @@ INSTANTIATE_TEST_SUITE_P(
                   "traffic message: event 1, location 12345, extent 2, direction forward, duration 0, no diversion, "
                   "F 1, T 0"},
         TraceCase{R"(stereo:direct "8a=02,1FFFFFFFFF")",
+                  "tuning information for traffic messages, variant 15: FFFF FFFF, T 1"},
+        TraceCase{R"(:STEREO:DIRECT "8A=02,0FFFFFFFFF")",
                   "traffic message: event 2047, location 65535, extent 7, direction backward, duration 7, diversion, "
-                  "F 1, T 1"},
+                  "F 1, T 0"},
         TraceCase{R"(:STEREO:DIRECT "8A=02,0000000000")",
-                  "traffic message: event 0, location 0, extent 0, direction forward, duration 0, no diversion, F 0, "
-                  "T 0"},
-        // Bits 0 101 | 1 0 100 01101001001 | 0000000000000111, put together by hand.
+                  "administration of encrypted traffic messages: 0000 0000, F 0, T 0"},
+        // Bits 0 0 101 | 1 0 100 01101001001 | 0000000000000111, put together by hand: the first of several groups.
         TraceCase{R"(:STEREO:DIRECT "8A=02,05A3490007")",
-                  "traffic message: event 841, location 7, extent 4, direction forward, duration 5, diversion, F 0, "
-                  "T 0"},
+                  "traffic message of several groups, continuity index 5, first group: event 841, location 7, extent "
+                  "4, direction forward, F 0, T 0"},
+        // Bits 0 0 101 | 0 1 10 000000000001 | 0000000000000111.
+        TraceCase{R"(:STEREO:DIRECT "8A=02,0560010007")",
+                  "traffic message of several groups, continuity index 5, second group, 2 to follow, content 0010007, "
+                  "F 0, T 0"},
         TraceCase{R"(:STEREO:DIRECT "8A=02,-81001303")", "incomplete traffic message"},
         TraceCase{
             R"(:STEREO:DIRECT "3A=01,106100CD46")",
