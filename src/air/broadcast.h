@@ -41,6 +41,8 @@ public:
     [[nodiscard]] AirTime time() const { return m_time; }
     /// What goes out for the length of a group, which is over then.
     OnAir next();
+    /// What the instrument is set to.
+    [[nodiscard]] const sim::InstrumentSettings& settings() const { return m_instrument.transmission().settings; }
 
 private:
     AirTime m_time;
