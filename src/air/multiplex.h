@@ -1,6 +1,5 @@
 #pragma once
 
-#include <array>
 #include <cstddef>
 #include <cstdint>
 #include <optional>
@@ -10,6 +9,7 @@
 #include "air/airtime.h"
 #include "air/baseband.h"
 #include "air/composer.h"
+#include "air/interpolator.h"
 #include "air/mixer.h"
 
 namespace kdx::air {
@@ -30,18 +30,14 @@ public:
     std::span<const float> add(const OnAir& sent, const sim::InstrumentSettings& settings);
 
 private:
-    static constexpr std::size_t kTaps = 10;  ///< ticks that a sample is made of
-
     void applySettings(const MultiplexParts& parts);
-    [[nodiscard]] Block dataSignal() const;
     void addBlock();
 
     int m_rate;
-    std::size_t m_ticksOfBlock;
-    std::array<std::array<float, kTaps>, kBlockSamples> m_weights{};
+    Interpolator m_interpolator;
     Baseband m_baseband;
-    std::vector<float> m_ticks;    ///< the data signal, from kTaps / 2 - 1 ticks before the next block on
-    std::size_t m_tickAt = 0;      ///< where that is
+    std::vector<float> m_ticks;    ///< the data signal, from what the next block needs on
+    std::size_t m_tickAt;          ///< where that is
     std::int64_t m_blockTime = 0;  ///< ticks up to the next block
     std::int64_t m_groupTime = 0;  ///< ticks up to the next group
     bool m_hasData = false;
