@@ -40,7 +40,7 @@ INSTANTIATE_TEST_SUITE_P(Settings, MultiplexData,
                                            DataCase{"PilotBehind", 228000, {":STEREO:PILOT:PHASE -4DEG"}},
                                            DataCase{"PilotBehind", 192000, {":STEREO:PILOT:PHASE -4DEG"}},
                                            DataCase{"Turned", 228000, {":STEREO:RDS:PHASE 123DEG"}},
-                                           DataCase{"Loud", 192000, {":STEREO:DEVIATION 80000HZ", "FREQ 98.5MHZ"}}),
+                                           DataCase{"Loud", 192000, {":STEREO:DEVIATION 80000HZ"}}),
                          nameOfDataCase);
 
 class MultiplexBits : public MultiplexTest {};
