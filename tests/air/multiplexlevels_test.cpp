@@ -77,6 +77,23 @@ TEST_F(MultiplexLevels, TheCarrierOf57KilohertzIsThreeTimesThePilot) {
     }
 }
 
+TEST_F(MultiplexLevels, DataHaveTheirPhaseWhateverThePilotsAndAQuarterTurnMoreBesideAri) {
+    // The pattern of zeros is two lines; what their phases add up to is twice the carrier's.
+    data();
+    pilot();
+    coder("BIN=1");
+    tell(":STEREO:PILOT:PHASE 5DEG");
+    for (const auto& [state, turn] : {std::pair("OFF", 0), std::pair("ON", 90)}) {
+        for (const int degrees : {0, 30, 120}) {
+            tell(":STEREO:RDS:PHASE " + std::to_string(degrees) + "DEG;:STEREO:ARI:STATE " + state);
+            (void)sent(0.1);
+            const auto part = sent(1);
+            const double phases = phaseOf(part, 58187.5) + phaseOf(part, 55812.5);
+            EXPECT_NEAR(std::remainder(phases - 2 * (degrees + turn), 360), 0, 0.01);
+        }
+    }
+}
+
 TEST_F(MultiplexLevels, ChannelsAreThoseOfTheStereoMode) {
     // Without pilot, RDS and ARI the tone has all of the 75 kHz.
     struct Mode {
