@@ -1,14 +1,19 @@
-"""What kdx-ctl air writes: the groups of a data set and of commands, with their times.
+"""What kdx-ctl air writes: the groups of a data set and of commands, with their times, and their multiplex.
 
 Usage: ctl_air_test.py PATH-OF-KDX-CTL
 """
 
+import array
 import json
 import pathlib
+import resource
 import shutil
+import signal
+import struct
 import subprocess
 import sys
 import tempfile
+import time
 import unittest
 
 import shippeddata
@@ -107,6 +112,65 @@ class Air(unittest.TestCase):
             "exit_code": 0, "groups": 1, "lines": ["1000 0008 E0CD 4B44 @2026/01/01 12:00:00.09"],
             "warnings": ['refused: :NONSENSE (-113,"Undefined header")']})
 
+    def wav(self, *arguments):
+        """The rate and the samples of a multiplex that is written."""
+        path = self.folder / "multiplex.wav"
+        self.air("--start", "2026-01-01 12:00:00", "--mpx", str(path), *arguments)
+        content = path.read_bytes()
+        self.assertEqual((content[:4], content[8:12]), (b"RIFF", b"WAVE"))
+        self.assertEqual(struct.unpack("<I", content[4:8])[0], len(content) - 8)
+        chunks, at = {}, 12
+        while at < len(content):
+            name, size = struct.unpack("<4sI", content[at:at + 8])
+            chunks[name] = content[at + 8:at + 8 + size]
+            at += 8 + size + size % 2
+        kind, channels, rate, _, _, bits = struct.unpack("<HHIIHH", chunks[b"fmt "][:16])
+        self.assertEqual(channels, 1)
+        samples = array.array({(3, 32): "f", (1, 16): "h"}[kind, bits], chunks[b"data"])
+        self.assertIn(b"full scale 1.0 = 100 kHz", chunks[b"LIST"])
+        return rate, samples
+
+    def testAMultiplexBeginsWithAGroupAndEndsAfterTheLast(self):
+        """11 groups of 104 bits fit into a second, 0.2 s come after them: 1.163368 s."""
+        rate, samples = self.wav("--data-set", "2", "--seconds", "1")
+        self.assertEqual((rate, len(samples), samples.typecode), (228000, 11 * 104 * 192 + 45600, "f"))
+        self.assertLess(max(map(abs, samples)), 1)
+        self.assertGreater(max(map(abs, samples)), 0.01)
+        rate, samples = self.wav("--data-set", "2", "--seconds", "1", "--rate", "192000", "--format", "s16")
+        self.assertEqual((rate, len(samples), samples.typecode), (192000, 223367, "h"))
+
+    def testWithoutGroupsAMultiplexLastsAsLongAsWasSaid(self):
+        pilot = self.write("pilot.txt", ":STEREO:STATE ON;:STEREO:PILOT:STATE ON;:STEREO:PILOT:DEVIATION 6750HZ\n")
+        pattern = self.write("pattern.txt", ":STEREO:STATE ON\n" + RDS_ON + ':STEREO:DIRECT "BIN=4"\n')
+        for commands, peak in ((pilot, 0.0675), (pattern, 0.02)):
+            _, samples = self.wav("--commands", commands, "--seconds", "0.55")
+            self.assertEqual(len(samples), 125400)
+            self.assertLessEqual(max(samples), peak + 1e-6)
+            self.assertGreater(max(samples), 0.8 * peak)
+        _, samples = self.wav("--seconds", "0.05")
+        self.assertEqual(samples, array.array("f", [0] * 11400))
+
+    def testGroupsAndMultiplexAreOfOneRun(self):
+        path = self.folder / "multiplex.wav"
+        run = self.air("--data-set", "2", "--seconds", "1", "--groups", "-", "--mpx", str(path), before=["--json"])
+        document = json.loads(run.stdout)
+        self.assertEqual((document["groups"], document["samples"], document["exit_code"]), (11, 265248, 0))
+        first = path.read_bytes()
+        self.air("--data-set", "2", "--seconds", "1", "--mpx", str(path))
+        self.assertEqual(path.read_bytes(), first)
+
+    def testCtrlCEndsAMultiplex(self):
+        path = self.folder / "multiplex.wav"
+        with subprocess.Popen([CTL, "--app-folder", str(self.folder), "air", "--data-set", "2", "--seconds", "86400",
+                               "--mpx", str(path)], stderr=subprocess.PIPE, text=True) as run:
+            while not path.exists() or path.stat().st_size < 10000:
+                time.sleep(0.01)
+            run.send_signal(signal.SIGINT)
+            problem = run.stderr.read()
+            self.assertEqual(run.wait(20), FAILED)
+        self.assertIn("stopped", problem)
+        self.assertGreater(path.stat().st_size, 10000)
+
     def testAWrongCallIsToldWithExitCode2(self):
         log = self.write("log.txt", "what is this, a letter?\r\n")
         commands = self.write("commands.txt", "@ soon *RST\n")
@@ -115,7 +179,9 @@ class Air(unittest.TestCase):
                      ("--groups", "-", "--start", "2026-02-30 12:00:00"), ("--groups", "-", "--start", "noon"),
                      ("--groups", "-", "--data-set", "6"), ("--groups", "-", "--commands", "missing.txt"),
                      ("--groups", "-", "--log", "missing.txt"), ("--groups", "-", "--log", log),
-                     ("--groups", "-", "--commands", commands), ("--groups", "-", "--file", "missing.INI")):
+                     ("--groups", "-", "--commands", commands), ("--groups", "-", "--file", "missing.INI"),
+                     ("--mpx", "-"), ("--mpx", str(self.folder / "m.wav"), "--rate", "48000"),
+                     ("--mpx", str(self.folder / "m.wav"), "--format", "s24")):
             with self.subTest(call):
                 run = self.air(*call, expect=WRONG_CALL)
                 self.assertEqual(run.stdout, "")
@@ -126,6 +192,20 @@ class Air(unittest.TestCase):
         self.assertIn("cannot be written", run.stderr)
         if pathlib.Path("/dev/full").exists():
             self.air("--data-set", "2", "--groups", "/dev/full", expect=FAILED)
+
+    def testAMultiplexThatCannotBeWrittenFails(self):
+        def full_disk():
+            signal.signal(signal.SIGXFSZ, signal.SIG_IGN)
+            resource.setrlimit(resource.RLIMIT_FSIZE, (50000, 50000))
+
+        for path, before in ((self.folder / "missing" / "m.wav", None), (self.folder, None),
+                             (self.folder / "m.wav", full_disk)):
+            with self.subTest(path):
+                run = subprocess.run([CTL, "--app-folder", str(self.folder), "air", "--data-set", "2", "--seconds",
+                                      "86400", "--mpx", str(path)], stderr=subprocess.PIPE, text=True, timeout=60,
+                                     preexec_fn=before)
+                self.assertEqual(run.returncode, FAILED)
+                self.assertIn(f"{path} cannot be written", run.stderr)
 
 
 if __name__ == "__main__":
