@@ -28,6 +28,8 @@ MultiplexFile::MultiplexFile(const std::string& file, int rate, SampleFormat for
     });
     m_good = m_file != nullptr;
     if (!m_good) return;
+    // One that ends earlier than it might is a WAV file after all.
+    sf_command(m_file.get(), SFC_RF64_AUTO_DOWNGRADE, nullptr, SF_TRUE);
     // It would hold the time of day, and the same call is to give the same file.
     sf_command(m_file.get(), SFC_SET_ADD_PEAK_CHUNK, nullptr, SF_FALSE);
     m_good = sf_set_string(m_file.get(), SF_STR_COMMENT, "stereo multiplex; full scale 1.0 = 100 kHz deviation") == 0;

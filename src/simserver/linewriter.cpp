@@ -39,8 +39,10 @@ struct LineWriter::Shared {
     }
 };
 
-LineWriter::LineWriter(int descriptor)
-    : m_shared(std::make_shared<Shared>()), m_thread([shared = m_shared, descriptor] { write(*shared, descriptor); }) {}
+LineWriter::LineWriter(int descriptor, std::size_t mostWaiting)
+    : m_mostWaiting(mostWaiting),
+      m_shared(std::make_shared<Shared>()),
+      m_thread([shared = m_shared, descriptor] { write(*shared, descriptor); }) {}
 
 LineWriter::~LineWriter() {
     std::unique_lock guard(m_shared->mutex);
@@ -57,13 +59,21 @@ LineWriter::~LineWriter() {
 
 void LineWriter::print(std::string_view line) {
     const std::lock_guard guard(m_shared->mutex);
-    if (m_shared->waiting.size() + line.size() >= kMostWaiting) {
+    if (m_shared->waiting.size() + line.size() >= m_mostWaiting) {
         ++m_shared->dropped;
         return;
     }
     m_shared->sayWhatWasDropped();
     m_shared->waiting.append(line).append("\n");
     m_shared->changed.notify_all();
+}
+
+bool LineWriter::pass(std::string_view bytes) {
+    const std::lock_guard guard(m_shared->mutex);
+    if (m_shared->waiting.size() + bytes.size() >= m_mostWaiting) return false;
+    m_shared->waiting.append(bytes);
+    m_shared->changed.notify_all();
+    return true;
 }
 
 void LineWriter::write(Shared& shared, int descriptor) {

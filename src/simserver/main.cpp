@@ -6,6 +6,7 @@
 #include "settings/withoutcontrols.h"
 #include "sim/virtualinstrument.h"
 #include "simserver/linewriter.h"
+#include "simserver/liveair.h"
 #include "simserver/portannouncement.h"
 #include "simserver/trace.h"
 #include "simserver/vxi11server.h"
@@ -20,8 +21,10 @@
 #include <charconv>
 #include <csignal>
 #include <exception>
+#include <functional>
 #include <iostream>
 #include <memory>
+#include <optional>
 #include <string>
 #include <string_view>
 #include <system_error>
@@ -43,7 +46,15 @@ struct Options {
     kdx::simserver::Vxi11Options server;
     std::string identification = kdx::sim::kDefaultIdentification;
     bool trace = false;
+    kdx::simserver::LiveAir::Places air;
 };
+
+constexpr std::string_view kStandardOutput = "-";
+
+/// Whether what is on the air goes to the standard output, which is left to it then.
+bool isOutputTaken(const Options& options) {
+    return options.air.groups == kStandardOutput || options.air.multiplex == kStandardOutput;
+}
 
 unsigned short portNumber(const std::string& text) {
     unsigned short port = 0;
@@ -55,8 +66,8 @@ unsigned short portNumber(const std::string& text) {
     return port;
 }
 
-void printLine(std::string_view line) {
-    std::cout << line << std::endl;
+void printLine(std::ostream& stream, std::string_view line) {
+    stream << line << std::endl;
 }
 
 /// Tells the command line where its options belong. Of an option given twice the last counts.
@@ -73,6 +84,17 @@ void declareOptions(CLI::App& commandLine, Options& options) {
         ->take_last();
     commandLine.add_option("--idn", options.identification, "the answer to *IDN?")->type_name("TEXT")->take_last();
     commandLine.add_flag("--trace", options.trace, "print what happens on every link")->disable_flag_override();
+    commandLine
+        .add_option("--groups", options.air.groups,
+                    "write the RDS groups there as they go out, a line each; - for the standard output")
+        ->type_name("FILE")
+        ->take_last();
+    commandLine
+        .add_option("--mpx", options.air.multiplex,
+                    "write the stereo multiplex there as it goes out, 228000 samples a second: a WAV file; - for bare "
+                    "floats to the standard output")
+        ->type_name("FILE")
+        ->take_last();
     commandLine.set_help_flag("--help", "print this and end");
     commandLine.set_version_flag("--version", "kdx-sim " KDX_VERSION, "print the version and end");
     commandLine.footer(kFooter);
@@ -90,8 +112,11 @@ public:
         : VirtualInstrument(clock, identification), m_trace(trace) {
         if (m_trace != nullptr) onUnit([this](const auto& unit, auto error) { explain(unit, error); });
     }
+    /// Who is to hear that a message was carried out.
+    void onExecuted(std::function<void()> executed) { m_executed = std::move(executed); }
     std::string execute(std::string_view message) override {
         std::string answer = VirtualInstrument::execute(message);
+        if (m_executed) m_executed();
         if (!m_words.empty()) m_trace->print("       " + kdx::printable(std::exchange(m_words, {})));
         return answer;
     }
@@ -106,6 +131,7 @@ private:
     }
 
     kdx::simserver::LineWriter* m_trace;
+    std::function<void()> m_executed;
     std::string m_words;  // of the message under way
 };
 
@@ -162,9 +188,18 @@ int serve(const Options& options) {
                                                         {{DEVICE_CORE, DEVICE_CORE_VERSION, server.corePort()},
                                                          {DEVICE_ASYNC, DEVICE_ASYNC_VERSION, server.abortPort()}},
                                                         options.server.bindAddress);
+    std::optional<kdx::simserver::LiveAir> air;
+    if (!options.air.groups.empty() || !options.air.multiplex.empty()) {
+        const auto tell = [](const std::string& problem) {
+            std::cerr << "kdx-sim: " << kdx::shownPath(problem) << std::endl;
+        };
+        air.emplace(server.loop(), instrument, clock, options.air, STDOUT_FILENO, tell);
+        instrument.onExecuted([&air] { air->settingsChanged(); });
+    }
     if (!announcement.problem().empty()) std::cerr << "kdx-sim: " << announcement.problem() << std::endl;
-    printLine("ready: " + options.server.bindAddress + " port " + std::to_string(server.corePort()) + ", " +
-              portMapperText(announcement.way()));
+    printLine(isOutputTaken(options) ? std::cerr : std::cout, "ready: " + options.server.bindAddress + " port " +
+                                                                  std::to_string(server.corePort()) + ", " +
+                                                                  portMapperText(announcement.way()));
     server.run();
     return 0;
 }
@@ -177,6 +212,10 @@ int run(int argc, char** argv) {
         commandLine.parse(argc, argv);
     } catch (const CLI::ParseError& end) {  // thrown to print help or version, too
         return commandLine.exit(end) == 0 ? 0 : kWrongUsage;
+    }
+    if (isOutputTaken(options) && (options.trace || options.air.groups == options.air.multiplex)) {
+        std::cerr << "kdx-sim: only one of --trace, --groups - and --mpx - can have the standard output\n";
+        return kWrongUsage;
     }
     return serve(options);
 }

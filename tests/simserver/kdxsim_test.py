@@ -55,7 +55,8 @@ class Options(unittest.TestCase):
     def testHelpNamesEveryOption(self):
         result = run("--help")
         self.assertEqual((result.returncode, result.stderr), (0, ""))
-        for option in ("--port", "--bind", "--idn", "--trace", "--help", "--version"):
+        for option in ("--port", "--bind", "--idn", "--trace", "--groups", "--mpx", "--help",
+                       "--version"):
             self.assertIn(option, result.stdout)
 
     def testVersion(self):

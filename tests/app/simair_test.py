@@ -1,0 +1,130 @@
+"""What kdx-sim sends on the air while it is worked with: groups and multiplex in real time.
+
+Usage: simair_test.py PATH-OF-KDX-CTL PATH-OF-KDX-SIM
+"""
+
+import array
+import os
+import re
+import resource
+import signal
+import struct
+import subprocess
+import sys
+import time
+import unittest
+
+import ctl_test
+from ctl_test import DONE
+
+FAILED, WRONG_USAGE = 1, 2
+SAMPLES_A_SECOND = 228000
+LINE = re.compile(r"^(?:[0-9A-F]{4} ){4}@\d{4}/\d\d/\d\d \d\d:\d\d:\d\d\.\d\d$")
+
+
+class OnAir(ctl_test.Ctl):
+    def begun(self, *options, ready="stdout", **how):
+        sim = subprocess.Popen([ctl_test.SIM, "--bind", "127.0.0.1", *options], stdout=subprocess.PIPE,
+                               stderr=subprocess.PIPE, **how)
+        self.addCleanup(sim.stdout.close)
+        self.addCleanup(sim.stderr.close)
+        self.addCleanup(sim.wait)
+        self.addCleanup(sim.kill)
+        self.assertIn(b"ready: 127.0.0.1", getattr(sim, ready).readline())
+        return sim
+
+    def sends(self, *settings):
+        self.ctl("--lan", "127.0.0.1", "send", *settings)
+
+    def ended(self, sim):
+        sim.send_signal(signal.SIGTERM)
+        self.assertEqual(sim.wait(10), DONE)
+        return sim.stderr.read().decode()
+
+    def testGroupsGoOutInRealTimeAndFollowWhatIsSent(self):
+        file = self.folder / "groups.txt"
+        sim = self.begun("--groups", str(file))
+        self.sends("STEREO_EIN", "RDS=1", "PI=1111", "GROUPSEQ=0A")
+        time.sleep(1)
+        before = len(file.read_text().splitlines())
+        time.sleep(2)
+        self.assertAlmostEqual(len(file.read_text().splitlines()) - before, 2 / 0.08758, delta=8)
+        self.sends("PI=ABCD")
+        time.sleep(0.5)
+        self.assertEqual(self.ended(sim), "")
+        lines = file.read_text().splitlines()
+        for line in lines:
+            self.assertRegex(line, LINE)
+        identifiers = [line[:4] for line in lines]
+        self.assertEqual(sorted(set(identifiers) - {"1000"}), ["1111", "ABCD"])
+        self.assertEqual(identifiers[-1], "ABCD")
+
+    def testTheStandardOutputTakesGroupsAlone(self):
+        sim = self.begun("--groups", "-", ready="stderr")
+        self.sends("STEREO_EIN", "RDS=1")
+        for _ in range(5):
+            self.assertRegex(sim.stdout.readline().decode().rstrip("\n"), LINE)
+        self.ended(sim)
+
+    def testSamplesComeAsFastAsTheyAreSent(self):
+        sim = self.begun("--mpx", "-", ready="stderr")
+        self.sends("STEREO_EIN", "PILOT=1", "PILOT_HUB=675")
+        time.sleep(0.5)
+        begin = time.monotonic()
+        taken = bytearray()
+        while len(taken) < 4 * SAMPLES_A_SECOND:
+            taken += os.read(sim.stdout.fileno(), 65536)
+        self.assertLess(time.monotonic() - begin, 3)
+        samples = array.array("f", bytes(taken[-4 * 20000:]))
+        self.assertAlmostEqual(max(abs(sample) for sample in samples), 0.0675, delta=0.0007)
+        self.ended(sim)
+
+    def testAReaderThatDoesNotReadHoldsNothingUp(self):
+        sim = self.begun("--mpx", "-", ready="stderr")
+        time.sleep(6)
+        self.sends("PI=1111")
+        self.assertIn("it has gaps", sim.stderr.readline().decode())
+        sim.stdout.close()
+        self.sends("PI=2222")
+        self.ended(sim)
+
+    def testTheFileIsAWholeWavFileAtTheEnd(self):
+        file = self.folder / "air.wav"
+        sim = self.begun("--mpx", str(file), "--groups", str(self.folder / "groups.txt"))
+        time.sleep(1.5)
+        self.assertEqual(self.ended(sim), "")
+        header = file.read_bytes()[:12]
+        self.assertEqual((header[:4], header[8:]), (b"RIFF", b"WAVE"))
+        self.assertEqual(struct.unpack("<I", header[4:8])[0] + 8, file.stat().st_size)
+        self.assertAlmostEqual(file.stat().st_size / 4 / SAMPLES_A_SECOND, 1.5, delta=0.5)
+
+    def testAPlaceThatCannotBeWrittenIsToldAtTheBegin(self):
+        os.mkfifo(self.folder / "pipe")
+        for place, why in (("/dev/full", "is no plain file"), (self.folder, "is no plain file"),
+                           (self.folder / "pipe", "is no plain file"),
+                           (self.folder / "none" / "x", "cannot be written")):
+            for option in ("--groups", "--mpx"):
+                run = subprocess.run([ctl_test.SIM, "--bind", "127.0.0.1", option, str(place)], capture_output=True,
+                                     timeout=10)
+                self.assertEqual(run.returncode, FAILED)
+                self.assertIn(f"kdx-sim: {place} {why}", run.stderr.decode())
+
+    def testADiskThatGetsFullIsToldOnceAndTheInstrumentGoesOn(self):
+        sim = self.begun("--groups", str(self.folder / "groups.txt"), restore_signals=False,
+                         preexec_fn=lambda: resource.setrlimit(resource.RLIMIT_FSIZE, (200, 200)))
+        self.sends("STEREO_EIN", "RDS=1")
+        time.sleep(1.5)
+        self.sends("PI=1111")
+        self.assertEqual(self.ended(sim).count("groups.txt cannot be written"), 1)
+
+    def testTheStandardOutputIsGivenToOneOnly(self):
+        for options in (("--groups", "-", "--mpx", "-"), ("--groups", "-", "--trace"), ("--mpx", "-", "--trace")):
+            run = subprocess.run([ctl_test.SIM, *options], capture_output=True, timeout=10)
+            self.assertEqual((run.returncode, run.stdout), (WRONG_USAGE, b""))
+            self.assertIn(b"only one of", run.stderr)
+
+
+if __name__ == "__main__":
+    ctl_test.CTL, ctl_test.SIM = sys.argv[1:3]
+    del sys.argv[1:3]
+    unittest.main()
