@@ -12,7 +12,6 @@ inline constexpr Place kGpibAddress{KeptIn::General, "ADRESSEN", "KDX_IEEE"};
 inline constexpr Place kLanAddress{KeptIn::General, "ADRESSEN", "KDX_TCPIP"};
 inline constexpr Place kCommandLogOn{KeptIn::General, "ADRESSEN", "Log_Key"};  // the number 1
 inline constexpr Place kLanguage{KeptIn::General, "Sprache", "Sprache"};
-inline constexpr Place kMidnightCorrected{KeptIn::General, "Berichtigungen", "Mitternacht"};  // the number 1
 inline constexpr Place kStandard{KeptIn::General, "Sprache", "RDS_RBDS"};
 
 }  // namespace kdx::setting

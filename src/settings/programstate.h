@@ -3,6 +3,8 @@
 #include <cstdint>
 #include <string>
 
+#include "settings/corrections.h"
+
 namespace kdx {
 
 /// What the whole program shares while it runs; one owner, passed by reference. Texts are 8-bit Windows-1252.
@@ -23,6 +25,8 @@ struct ProgramState {
 
     std::int16_t groupCount = 0;    ///< group buttons pressed since the sequence was started anew
     std::int16_t group8ACount = 0;  ///< how many of those were group 8 (TMC)
+
+    Corrections corrections;
 
     std::int16_t sendMode = 0;  ///< handed to every send; has no effect on what is sent
 };

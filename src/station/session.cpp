@@ -1,7 +1,6 @@
 #include "station/session.h"
 
 #include "base/clock.h"
-#include "base/numbers.h"
 #include "settings/generalsettings.h"
 #include "settings/programstate.h"
 
@@ -27,8 +26,13 @@ void Session::letGo() {
 
 void Session::load(const Profile& source) {
     m_source = source;
-    m_clock.correctMidnight(leadingNumber(source.read(setting::kMidnightCorrected)) == 1);
+    readCorrections();
     station.load(source);
+}
+
+void Session::readCorrections() {
+    m_state.corrections = kdx::readCorrections(profile);
+    m_clock.correctMidnight(m_state.corrections.midnight);
 }
 
 InstrumentAddress Session::storedAddress() const {

@@ -28,9 +28,11 @@ struct Session {
     Session& operator=(const Session&) = delete;
 
     /// Loads the data set of the profile, or of any other source; whatever is looked up at sending comes from there.
-    /// What the general settings correct of the program's ways holds from here on.
+    /// What the general settings correct holds from here on.
     void load() { load(profile); }
     void load(const Profile& source);
+    /// What the general settings correct of the program's ways holds from here on; called anew when they change.
+    void readCorrections();
     /// Opens the session to the address; see Instrument::open.
     VisaStatus open(const std::string& kind, const std::string& address) { return instrument.open(kind, address); }
     /// Where the general settings say that the instrument is.
