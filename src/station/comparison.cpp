@@ -19,7 +19,7 @@ public:
     explicit SentValues(const Profile& source) {
         Station station;
         station.load(source);
-        for (const Step& step : openingSteps(station)) {
+        for (const Step& step : openingSteps(station, readCorrections(source))) {
             std::string value = step.value;
             if (!composeCommand(step.key, value, {}).value_or("").empty()) m_keys.insert(step.key);
         }

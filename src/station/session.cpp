@@ -42,12 +42,12 @@ InstrumentAddress Session::storedAddress() const {
 
 bool Session::sendOpening() {
     lookUp();
-    return transmitter.run(openingSteps(station));
+    return transmitter.run(openingSteps(station, m_state.corrections));
 }
 
 bool Session::sendDataSet() {
     lookUp();
-    return transmitter.run(dataSetSteps(station));
+    return transmitter.run(dataSetSteps(station, m_state.corrections));
 }
 
 void Session::close() {

@@ -7,8 +7,8 @@ namespace kdx {
 
 namespace {
 
-void appendDataSet(Steps& steps, const Station& station) {
-    station.multiplex.appendSteps(steps);
+void appendDataSet(Steps& steps, const Station& station, const Corrections& corrections) {
+    station.multiplex.appendSteps(steps, corrections);
     station.programme.appendSteps(steps);
     station.af.appendSteps(steps);
     station.programme.appendPtySteps(steps);
@@ -40,18 +40,19 @@ Station loadStation(DataFolder& data, const std::string& number) {
     return station;
 }
 
-Steps openingSteps(const Station& station) {
+Steps openingSteps(const Station& station, const Corrections& corrections) {
     Steps steps{{Step::Kind::Identify}};
     for (const char* key : {"AM_AUS", "FM_AUS", "STEREO_EIN"}) appendStep(steps, key, "");
-    station.multiplex.appendOpeningSteps(steps);
-    appendDataSet(steps, station);
+    station.multiplex.appendOpeningSteps(steps, corrections);
+    appendDataSet(steps, station, corrections);
     station.carrier.appendOpeningSteps(steps);
     return steps;
 }
 
-Steps dataSetSteps(const Station& station) {
+Steps dataSetSteps(const Station& station, const Corrections& corrections) {
     Steps steps;
-    appendDataSet(steps, station);
+    station.multiplex.appendImpedanceStep(steps, corrections);
+    appendDataSet(steps, station, corrections);
     return steps;
 }
 

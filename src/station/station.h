@@ -7,6 +7,7 @@
 #include "coder/step.h"
 #include "groups/groupsequence.h"
 #include "rds/programme.h"
+#include "settings/corrections.h"
 #include "stereo/carrier.h"
 #include "stereo/multiplex.h"
 
@@ -33,9 +34,9 @@ struct Station {
 [[nodiscard]] Station loadStation(DataFolder& data, const std::string& number);
 
 /// What is sent when a session has been opened: identification, base state, the whole data set, RF output, audio.
-[[nodiscard]] Steps openingSteps(const Station& station);
+[[nodiscard]] Steps openingSteps(const Station& station, const Corrections& corrections = {});
 /// What is sent when the whole data set is.
-[[nodiscard]] Steps dataSetSteps(const Station& station);
+[[nodiscard]] Steps dataSetSteps(const Station& station, const Corrections& corrections = {});
 /// How a session ends.
 [[nodiscard]] Steps closingSteps();
 

@@ -3,16 +3,24 @@
 #include <string>
 
 #include "coder/step.h"
+#include "settings/corrections.h"
 
 namespace kdx {
 
 class Profile;
+struct Setting;
 
 /// The impedance that every opening of a session puts in force.
 inline constexpr const char* kFirstImpedance = "0";
 
 /// The option chosen of several as it is sent, its index; "" for none (-1).
 [[nodiscard]] std::string optionText(int index);
+
+/// What goes out for an option of the setting, given as its index: that, or where it is corrected the number by which
+/// the dispatcher knows what the panel names; "" for none.
+[[nodiscard]] std::string sentOption(const Setting& setting, const std::string& index, const Corrections& corrections);
+/// The index of the option that goes out so.
+[[nodiscard]] std::string indexOfSent(const Setting& setting, const std::string& sent, const Corrections& corrections);
 
 /// The ARI area code of an option as it is sent: a letter, "A" for index 0; "" for none (-1).
 [[nodiscard]] std::string areaCode(int index);
@@ -37,9 +45,12 @@ struct Multiplex {
     /// Reads what the general settings hold; what cannot be read becomes 0 or no choice.
     void load(const Profile& profile);
     /// Adds what the opening of a session puts in force before the data set.
-    void appendOpeningSteps(Steps& steps) const;
-    /// Adds the part of the data set.
-    void appendSteps(Steps& steps) const;
+    void appendOpeningSteps(Steps& steps, const Corrections& corrections = {}) const;
+    /// Adds the part of the data set; with the stereo mode, which is left out otherwise, where that is corrected.
+    void appendSteps(Steps& steps, const Corrections& corrections = {}) const;
+    /// Adds what the whole data set has besides when it goes out without an opening: the impedance where that is
+    /// corrected, else nothing.
+    void appendImpedanceStep(Steps& steps, const Corrections& corrections) const;
 };
 
 }  // namespace kdx

@@ -9,6 +9,7 @@ namespace kdx::setting {
 inline constexpr Setting kTotalDeviation{"MPX_HUB", {KeptIn::General, "FM", "MPX_DEV"}};
 inline constexpr Setting kSource{"MPX_SOURCE", {KeptIn::General, "FM", "MPX_SOURCE"}};
 // Read as 1 and 2, sent and stored as the option's index from 0, for which the dispatcher has no command at 0.
+// This and the next go out as the panel names them where the user wants it (settings/corrections.h).
 inline constexpr Setting kImpedance{"MPX_IMPEDANZ", {KeptIn::General, "FM", "MPX_IMPEDANZ"}};
 // Sent as the option's index from 0, where the dispatcher counts from 1.
 inline constexpr Setting kStereoMode{"STEREO_MODE", {KeptIn::General, "FM", "Stereo_Mode"}};

@@ -2,6 +2,8 @@
 
 #include <QLabel>
 
+#include "coder/sendparam.h"
+#include "settings/programstate.h"
 #include "settings/storedvalue.h"
 #include "ui/text.h"
 
@@ -44,9 +46,9 @@ void StereoPage::load() {
 
 void StereoPage::stepGoesOut(const Step& step) {
     if (step.key == setting::kImpedance.sendKey) {
-        m_multiplex.impedance = step.value;
+        m_multiplex.impedance = indexOfSent(setting::kImpedance, step.value, m_with.state.corrections);
         FM_Imp_Opt.showValue();
-        m_with.profile.write(setting::kImpedance.place, step.value);
+        m_with.profile.write(setting::kImpedance.place, m_multiplex.impedance);
     }
     m_testMode->stepGoesOut(step);
 }
@@ -58,7 +60,8 @@ void StereoPage::HScroll1_Change() {
 
 void StereoPage::change(const Adjustment& what, const std::string& value) {
     what.value = value;
-    sendAndStore(what.setting, value);
+    m_with.params.SendParam(what.setting.sendKey, sentOption(what.setting, value, m_with.state.corrections));
+    m_with.profile.write(what.setting.place, value);
 }
 
 void StereoPage::changeDeviation(const DeviationBar& bar) {

@@ -1,0 +1,56 @@
+"""What section Berichtigungen of the data folder makes kdx-ctl do, both ways.
+
+Usage: ctl_corrections_test.py PATH-OF-KDX-CTL
+"""
+
+import json
+import sys
+import unittest
+
+import ctl_test
+from ctl_test import DIFFERENT, WRONG_CALL
+
+
+class Corrected(ctl_test.Ctl):
+    def change(self, name, section, key, value):
+        """Puts a value in the place of a section's key, which need not be there."""
+        file = self.folder / "Daten" / name
+        before, after = file.read_bytes().decode("cp1252").split(f"[{section}]\r\n")
+        end = after.find("\r\n[")
+        mine, others = (after, "") if end < 0 else (after[:end], after[end:])
+        lines = [line for line in mine.split("\r\n") if line.split("=")[0] != key]
+        text = "\r\n".join([before + f"[{section}]", f"{key}={value}", *lines]) + others
+        file.write_bytes(text.encode("cp1252"))
+
+    def correct(self, key):
+        self.change("RDS_Allg.INI", "Berichtigungen", key, "1")
+
+    def scenario(self, steps):
+        file = self.folder / "scenario.yaml"
+        file.write_text(f"steps: [{steps}]\n", encoding="utf-8")
+        return str(file)
+
+    def testTheStereoModeGoesOutWithTheDataSet(self):
+        self.change("RDS_Allg.INI", "FM", "Stereo_Mode", "1")
+        self.assertEqual([c for c in self.sent("apply", "--data-set", "1") if "audio:mode" in c], [])
+        self.correct("Stereo_Mode")
+        self.assertEqual([c for c in self.sent("apply", "--data-set", "1") if "audio:mode" in c],
+                         [":stereo:audio:mode RIGHT"])
+        diff = self.simulated("diff", "--data-set", "1", expect=DIFFERENT)
+        self.assertIn("STEREO_MODE", diff.stdout)
+
+    def testTheImpedanceOfAnOpeningIsTheFirstOne(self):
+        self.assertEqual([c for c in self.sent("apply", "--data-set", "1") if ":IMP" in c], [])
+        self.correct("Impedanz")
+        self.assertEqual([c for c in self.sent("apply", "--data-set", "1") if ":IMP" in c],
+                         [":STEREO:EXTERNAL:IMP 600"])
+
+
+
+
+
+
+
+if __name__ == "__main__":
+    ctl_test.CTL = sys.argv.pop(1)
+    unittest.main()

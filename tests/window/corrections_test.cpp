@@ -1,0 +1,83 @@
+#include <gtest/gtest.h>
+
+#include <QComboBox>
+
+#include "window/correctionstest.h"
+
+namespace kdx::test {
+namespace {
+
+class CorrectedSignalTest : public CorrectionsTest {
+protected:
+    CorrectedSignalTest() {
+        setGeneral("FM", "Stereo_Mode", "2");
+        setGeneral("FM", "MPX_IMPEDANZ", "2");
+    }
+    static Lines modes(const Lines& commands) { return beginning(commands, ":stereo:audio:mode"); }
+    static Lines impedances(const Lines& commands) { return beginning(commands, ":STEREO:EXTERNAL:IMP"); }
+    static Lines outputs(const Lines& commands) { return beginning(commands, ":OUTPUT"); }
+};
+
+TEST_F(CorrectedSignalTest, TheStereoModeGoesOutOneBesideThePanelAsDescribed) {
+    EXPECT_EQ(modes(openWith({})), Lines{});
+    EXPECT_EQ(sentBy("Stereo_Opt_1"), Lines{":stereo:audio:mode LEFT"});
+    EXPECT_EQ(general("FM", "Stereo_Mode"), "1");
+    EXPECT_EQ(modes(sentBy("Btn_SetRdsStereo")), Lines{});
+}
+
+TEST_F(CorrectedSignalTest, TheStereoModeGoesOutAsThePanelNamesItWhenCorrected) {
+    EXPECT_EQ(modes(openWith({"Stereo_Mode"})), Lines{":stereo:audio:mode REL"});
+    EXPECT_TRUE(checked("Stereo_Opt_2"));
+    for (const auto& [option, mode] : {std::pair("Stereo_Opt_0", "LEFT"), std::pair("Stereo_Opt_1", "RIGHT"),
+                                       std::pair("Stereo_Opt_3", "REML"), std::pair("Stereo_Opt_4", "RNEL")}) {
+        EXPECT_EQ(sentBy(option), Lines{std::string(":stereo:audio:mode ") + mode});
+        EXPECT_EQ(general("FM", "Stereo_Mode"), std::string(1, option[11]));
+    }
+    EXPECT_EQ(modes(sentBy("Btn_SetRdsStereo")), Lines{":stereo:audio:mode RNEL"});
+    EXPECT_EQ(sentBy("FM_Imp_Opt_1"), Lines{":STEREO:EXTERNAL:IMP 600"}) << "a correction of its own";
+}
+
+TEST_F(CorrectedSignalTest, AModeThatIsNotChosenIsNotSentWhenCorrected) {
+    setGeneral("FM", "Stereo_Mode", "7");
+    EXPECT_EQ(modes(openWith({"Stereo_Mode"})), Lines{});
+}
+
+TEST_F(CorrectedSignalTest, TheImpedanceGoesOutOneBesideThePanelAsDescribed) {
+    const Lines opening = openWith({});
+    EXPECT_EQ(impedances(opening), Lines{});
+    EXPECT_EQ(std::count(opening.begin(), opening.end(), ""), 1) << "the first option has no command";
+    EXPECT_EQ(sentBy("FM_Imp_Opt_1"), Lines{":STEREO:EXTERNAL:IMP 600"});
+    EXPECT_EQ(general("FM", "MPX_IMPEDANZ"), "1");
+    EXPECT_EQ(impedances(sentBy("Btn_SetRdsStereo")), Lines{});
+}
+
+TEST_F(CorrectedSignalTest, TheImpedanceGoesOutAsThePanelNamesItWhenCorrected) {
+    const Lines opening = openWith({"Impedanz"});
+    EXPECT_EQ(impedances(opening), Lines{":STEREO:EXTERNAL:IMP 600"});
+    EXPECT_EQ(std::count(opening.begin(), opening.end(), ""), 0);
+    EXPECT_TRUE(checked("FM_Imp_Opt_0"));
+    EXPECT_EQ(general("FM", "MPX_IMPEDANZ"), "0");
+    EXPECT_EQ(sentBy("FM_Imp_Opt_1"), Lines{":STEREO:EXTERNAL:IMP 100000"});
+    EXPECT_EQ(general("FM", "MPX_IMPEDANZ"), "1");
+    EXPECT_EQ(impedances(sentBy("Btn_SetRdsStereo")), Lines{":STEREO:EXTERNAL:IMP 100000"});
+    EXPECT_TRUE(checked("FM_Imp_Opt_1"));
+    EXPECT_EQ(general("FM", "MPX_IMPEDANZ"), "1");
+    EXPECT_EQ(sentBy("FM_Imp_Opt_0"), Lines{":STEREO:EXTERNAL:IMP 600"});
+    click("GTL_Taste");
+    EXPECT_EQ(impedances(opened()), Lines{":STEREO:EXTERNAL:IMP 600"}) << "also when it is chosen already";
+    EXPECT_EQ(sentBy("Stereo_Opt_1"), Lines{":stereo:audio:mode LEFT"}) << "a correction of its own";
+}
+
+TEST_F(CorrectedSignalTest, WhatIsCorrectedMayChangeWhileTheProgramRuns) {
+    openWith({});
+    EXPECT_EQ(sentBy("Stereo_Opt_1"), Lines{":stereo:audio:mode LEFT"});
+    setGeneral("Berichtigungen", "Stereo_Mode", "1");
+    setGeneral("Berichtigungen", "Mitternacht", "1");
+    EXPECT_EQ(sentBy("Stereo_Opt_1"), Lines{":stereo:audio:mode LEFT"}) << "not before it is read";
+    session->readCorrections();
+    EXPECT_EQ(sentBy("Stereo_Opt_1"), Lines{":stereo:audio:mode RIGHT"});
+    EXPECT_TRUE(clock.midnightCorrected());
+}
+
+}  // namespace
+}  // namespace kdx::test
