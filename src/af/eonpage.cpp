@@ -5,7 +5,9 @@
 #include "af/settings.h"
 #include "coder/sendparam.h"
 #include "link/instrument.h"
+#include "settings/captions.h"
 #include "settings/programstate.h"
+#include "settings/storedvalue.h"
 #include "settings/withoutcontrols.h"
 #include "ui/dialogs.h"
 #include "ui/layouts.h"
@@ -103,8 +105,12 @@ void EonPage::label() {
 
 void EonPage::showStoredProgrammeType() {
     // The change handler stores the type's name, which reads as the number 0: after such a choice a relabelling and the
-    // next start show the first entry.
+    // next start show the first entry, unless that is corrected.
     showProgrammeTypes(EON_PTY_Combo, setting::kEonPtyShown);
+    if (!m_with.state.corrections.eonType) return;
+    const std::string number = programmeTypeNumber(m_with.profile.read(setting::kEonPtyShown), m_with.captions);
+    const QSignalBlocker quiet(EON_PTY_Combo);
+    if (!number.empty()) EON_PTY_Combo->setCurrentIndex(storedEntry(number, kProgrammeTypes));
 }
 
 void EonPage::load() {
@@ -149,9 +155,10 @@ void EonPage::EON_PS_Taste_Click() {
 }
 
 void EonPage::EON_PTY_Combo_Change() {
-    m_network.pty = toBytes(EON_PTY_Combo->currentText());
+    const bool corrected = m_with.state.corrections.eonType;
+    m_network.pty = corrected ? std::to_string(EON_PTY_Combo->currentIndex()) : toBytes(EON_PTY_Combo->currentText());
     m_with.profile.write(setting::kEonPty.place, m_network.pty);
-    m_with.params.SendParam(setting::kEonPty.sendKey, m_network.pty);
+    m_with.params.SendParam(corrected ? setting::kEonType : setting::kEonPty.sendKey, m_network.pty);
 }
 
 void EonPage::EON_TP_Check_Click() {

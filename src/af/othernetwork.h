@@ -7,9 +7,11 @@
 
 #include "af/aflist.h"
 #include "coder/step.h"
+#include "settings/corrections.h"
 
 namespace kdx {
 
+class Captions;
 class Profile;
 
 /// The other network (EON) of a data set, each value as it is sent.
@@ -24,11 +26,15 @@ struct OtherNetwork {
     void load(const Profile& profile);
     /// Only the lists, which are kept in the file and read anew whenever they go out.
     void loadLists(const Profile& profile);
-    /// Adds the removal of the networks that the coder holds, then PI, TA, TP, PS and the lists.
-    void appendSteps(Steps& steps) const;
+    /// Adds the removal of the networks that the coder holds, then PI, TA, TP, PS and the lists; the programme
+    /// type, which reaches the coder by no data set otherwise, where that is corrected and the type is a number.
+    void appendSteps(Steps& steps, const Corrections& corrections = {}) const;
     /// Adds the lists that are not empty.
     void appendListSteps(Steps& steps) const;
 };
+
+/// The number of a programme type as it was stored: its number, or its name in the current list. "" when it is neither.
+[[nodiscard]] std::string programmeTypeNumber(const std::string& stored, const Captions& captions);
 
 // The coder answers "EON PI?" with the identifiers (PI codes, 4 characters each) of the other networks it holds,
 // separated by commas; what leads and ends the list differs between coders. All texts are 8-bit Windows-1252.

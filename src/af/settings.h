@@ -24,6 +24,8 @@ inline constexpr Setting kEonPs{"EON_PS", {KeptIn::DataSet, "RDS", "EON_PS"}};
 // The chosen type's name goes out under the key of the PI, so that the coder gets its first 4 characters as one; the
 // type itself never reaches it. Set-ups live with it.
 inline constexpr Setting kEonPty{"EON_PI", {KeptIn::DataSet, "RDS", "EON_PTY"}};
+// Its own key, under which its number goes out where that is corrected.
+inline constexpr const char* kEonType = "EON_PTY";
 inline constexpr Place kEonPtyShown{KeptIn::DataSet1, "RDS", "EON_PTY"};  // data set 1 whatever set is at work
 inline constexpr Setting kEonTp{"EON_TP", {KeptIn::DataSet, "RDS", "EON_TP"}};
 inline constexpr Setting kEonTa{"EON_TA", {KeptIn::DataSet, "RDS", "EON_TA"}};

@@ -13,6 +13,7 @@ Session::Session(Visa& visa, ProgramState& state, DataFolder& data, const Captio
       transmitter(instrument, params),
       profile(Profile::followingDataSet(data, state.CurrentDataSet)),
       m_state(state),
+      m_captions(captions),
       m_clock(clock),
       m_source(profile) {}
 
@@ -56,7 +57,9 @@ void Session::close() {
 
 void Session::lookUp() {
     station.reload(m_source);
-    m_state.eonIdentifier = station.otherNetwork.pi;  // leads every command about the network
+    OtherNetwork& network = station.otherNetwork;
+    m_state.eonIdentifier = network.pi;  // leads every command about the network
+    if (m_state.corrections.eonType) network.pty = programmeTypeNumber(network.pty, m_captions);
 }
 
 }  // namespace kdx

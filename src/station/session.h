@@ -58,6 +58,7 @@ private:
     void lookUp();
 
     ProgramState& m_state;
+    const Captions& m_captions;
     Clock& m_clock;
     bool m_kept = false;
     Profile m_source;

@@ -38,7 +38,7 @@ constexpr std::array kAsRead = {
     setting::kRfLevel,
     setting::kAudioFrequency,
     setting::kEonPi,
-    Setting{"EON_PTY", setting::kEonPty.place},
+    Setting{setting::kEonType, setting::kEonPty.place},
     setting::kEonTp,
     setting::kEonTa,
     setting::kEonAfLists[0],

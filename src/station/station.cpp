@@ -12,7 +12,7 @@ void appendDataSet(Steps& steps, const Station& station, const Corrections& corr
     station.programme.appendSteps(steps);
     station.af.appendSteps(steps);
     station.programme.appendPtySteps(steps);
-    station.otherNetwork.appendSteps(steps);
+    station.otherNetwork.appendSteps(steps, corrections);
     station.groups.appendSteps(steps);
     station.carrier.appendSteps(steps);
 }

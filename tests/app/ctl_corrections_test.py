@@ -45,6 +45,12 @@ class Corrected(ctl_test.Ctl):
         self.assertEqual([c for c in self.sent("apply", "--data-set", "1") if ":IMP" in c],
                          [":STEREO:EXTERNAL:IMP 600"])
 
+    def testTheOtherNetworksTypeIsANumber(self):
+        self.change("Datenset1.INI", "RDS", "EON_PTY", "Nachrichten")
+        self.assertEqual([c for c in self.sent("apply", "--data-set", "1") if "EON-PTY" in c], [])
+        self.correct("EON_PTY")
+        told = [c for c in self.sent("apply", "--data-set", "1") if "EON-PTY" in c]
+        self.assertEqual([c.split(",")[1] for c in told], ['1"'])
 
 
 

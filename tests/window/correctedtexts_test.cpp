@@ -1,0 +1,70 @@
+#include <gtest/gtest.h>
+
+#include <QComboBox>
+#include <QPalette>
+
+#include "window/correctionstest.h"
+
+namespace kdx::test {
+namespace {
+
+class CorrectedTextsTest : public CorrectionsTest {
+protected:
+    CorrectedTextsTest() {
+        setDataSet1("RDS", "EON_PI", "D3C2");
+        setDataSet1("RDS", "EON_PTY", "4");
+    }
+    static Lines types(const Lines& commands) { return beginning(commands, ":STEREO:DIRECT \"EON-PTY"); }
+    /// What a file holds behind a key, as it stands there.
+    std::string written(const char* file, const std::string& key) const {
+        const std::string bytes = folder.read(file);
+        const std::size_t at = bytes.find("\n" + key + "=") + key.size() + 2;
+        return bytes.substr(at, bytes.find('\r', at) - at);
+    }
+    void answer(std::initializer_list<const char*> answers) {
+        for (const char* text : answers) dialogs.inputs.push_back(QString::fromUtf8(text));
+    }
+    bool isRed(const char* entry) { return find<QLineEdit>(entry)->palette().color(QPalette::Text) == Qt::red; }
+};
+
+TEST_F(CorrectedTextsTest, TheOtherNetworksTypeGoesOutAsAPiAndIsStoredByNameAsDescribed) {
+    EXPECT_EQ(types(openWith({})), Lines{});
+    sent();
+    find<QComboBox>("EON_PTY_Combo")->setCurrentIndex(10);
+    EXPECT_EQ(sent(), Lines{direct("EON-PI=" + text("EON_PTY_Combo").substr(0, 4))});
+    EXPECT_EQ(dataSet1("RDS", "EON_PTY"), text("EON_PTY_Combo"));
+    EXPECT_EQ(types(sentBy("Btn_SetRdsStereo")), Lines{});
+    start();
+    EXPECT_EQ(find<QComboBox>("EON_PTY_Combo")->currentIndex(), 0);
+}
+
+TEST_F(CorrectedTextsTest, TheOtherNetworksTypeGoesOutAndIsStoredAsANumberWhenCorrected) {
+    EXPECT_EQ(types(openWith({"EON_PTY"})), Lines{direct("EON-PTY=D3C2,4")});
+    EXPECT_EQ(find<QComboBox>("EON_PTY_Combo")->currentIndex(), 4);
+    sent();
+    find<QComboBox>("EON_PTY_Combo")->setCurrentIndex(10);
+    EXPECT_EQ(sent(), Lines{direct("EON-PTY=D3C2,10")});
+    EXPECT_EQ(dataSet1("RDS", "EON_PTY"), "10");
+    EXPECT_EQ(types(sentBy("Btn_SetRdsStereo")), Lines{direct("EON-PTY=D3C2,10")});
+    start();
+    EXPECT_EQ(find<QComboBox>("EON_PTY_Combo")->currentIndex(), 10);
+}
+
+TEST_F(CorrectedTextsTest, AStoredNameIsLookedUpInTheListWhenCorrected) {
+    start();
+    const std::string name = captions.programmeType(9);
+    setDataSet1("RDS", "EON_PTY", name);
+    EXPECT_EQ(types(openWith({"EON_PTY"})), Lines{direct("EON-PTY=D3C2,9")});
+    EXPECT_EQ(toBytes(find<QComboBox>("EON_PTY_Combo")->currentText()), name);
+    EXPECT_EQ(dataSet1("RDS", "EON_PTY"), name) << "until another one is chosen";
+}
+
+TEST_F(CorrectedTextsTest, AnUnknownTypeIsNotSentWhenCorrected) {
+    for (const char* unknown : {"", "Polka", "32", "-1"}) {
+        setDataSet1("RDS", "EON_PTY", unknown);
+        EXPECT_EQ(types(openWith({"EON_PTY"})), Lines{}) << unknown;
+    }
+}
+
+}  // namespace
+}  // namespace kdx::test
