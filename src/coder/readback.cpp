@@ -4,6 +4,7 @@
 #include "base/numbers.h"
 #include "link/instrument.h"
 #include "settings/captions.h"
+#include "settings/corrections.h"
 
 namespace kdx {
 
@@ -106,6 +107,11 @@ std::string eon(const Answers& answers, const Captions& /*captions*/) {
     return text;
 }
 
+// The unit is not the one that the level is set in, and the answer is not converted.
+std::string level(const Answers& answers, const Captions& /*captions*/) {
+    return answers[0] + " dBm";
+}
+
 Queries afQueries(const std::string& /*eonIdentifier*/) {
     Queries queries;
     for (int list = 1; list <= 5; ++list) {
@@ -136,6 +142,12 @@ std::vector<std::string> ask(Instrument& instrument, const ReadBack& readBack, c
                                              : instrument.X4_Abfrage(query.label, query.key));
     }
     return answers;
+}
+
+std::string wordsOf(const ReadBack& readBack, const std::vector<std::string>& answers, const Captions& captions,
+                    const Corrections& corrections) {
+    if (readBack.words == level && corrections.levelUnit) return answers[0] + fromUtf8(" dBµV");
+    return readBack.words(answers, captions);
 }
 
 const std::vector<ReadBack>& readBacks() {
@@ -232,7 +244,7 @@ const std::vector<ReadBack>& readBacks() {
          [](Ask) -> Queries {
              return {{"Pegel?", "POW"}};
          },
-         [](const Answers& answers, const Captions&) { return answers[0] + " dBm"; }},
+         level},
     };
     return all;
 }

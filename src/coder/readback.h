@@ -7,6 +7,7 @@ namespace kdx {
 
 class Captions;
 class Instrument;
+struct Corrections;
 
 /// How an answer becomes the text that is shown. Texts are 8-bit Windows-1252; "" stands for a failed read.
 namespace readback {
@@ -45,6 +46,10 @@ struct ReadBack {
 /// @returns the answers in their order, "" for one that could not be read.
 [[nodiscard]] std::vector<std::string> ask(Instrument& instrument, const ReadBack& readBack,
                                            const std::string& eonIdentifier);
+
+/// The answers of the button as the text that is shown, as far as it is corrected.
+[[nodiscard]] std::string wordsOf(const ReadBack& readBack, const std::vector<std::string>& answers,
+                                  const Captions& captions, const Corrections& corrections);
 
 /// All twenty buttons, in the order of their names.
 [[nodiscard]] const std::vector<ReadBack>& readBacks();

@@ -90,7 +90,7 @@ void QueryPage::ask(const ReadBack& readBack) {
 }
 
 void QueryPage::showAnswers() {
-    gelesen->setText(toText(m_asked->words(m_answers, m_with.captions)));
+    gelesen->setText(toText(wordsOf(*m_asked, m_answers, m_with.captions, m_with.state.corrections)));
 }
 
 }  // namespace kdx

@@ -52,6 +52,10 @@ class Corrected(ctl_test.Ctl):
         told = [c for c in self.sent("apply", "--data-set", "1") if "EON-PTY" in c]
         self.assertEqual([c.split(",")[1] for c in told], ['1"'])
 
+    def testTheLevelBearsItsUnit(self):
+        self.assertTrue(self.simulated("query", "level").stdout.endswith(" dBm\n"))
+        self.correct("Pegel")
+        self.assertTrue(self.simulated("query", "level").stdout.endswith(" dBµV\n"))
 
 
 

@@ -68,6 +68,21 @@ TEST_F(CorrectedSignalTest, TheImpedanceGoesOutAsThePanelNamesItWhenCorrected) {
     EXPECT_EQ(sentBy("Stereo_Opt_1"), Lines{":stereo:audio:mode LEFT"}) << "a correction of its own";
 }
 
+TEST_F(CorrectedSignalTest, TheLevelThatIsReadBackBearsTheUnitItWasSetInWhenCorrected) {
+    visa.answersTo["POW?"] = "60.0\n";
+    for (const char* unit : {"dBm", "dBµV"}) {
+        if (std::string(unit) == "dBm") {
+            openWith({});
+        } else {
+            openWith({"Pegel"});
+        }
+        showPage(5);
+        EXPECT_EQ(sentBy("Command22"), Lines{"POW?"});
+        EXPECT_EQ(text("gelesen"), std::string("60.0 ") + unit);
+        click("GTL_Taste");
+    }
+}
+
 TEST_F(CorrectedSignalTest, WhatIsCorrectedMayChangeWhileTheProgramRuns) {
     openWith({});
     EXPECT_EQ(sentBy("Stereo_Opt_1"), Lines{":stereo:audio:mode LEFT"});

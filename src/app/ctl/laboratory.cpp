@@ -64,6 +64,7 @@ Laboratory::Laboratory(const Call& call, Output& output, const char* program, in
     });
     const Profile& profile = m_session->profile;
     m_state.LogEnabled = leadingNumber(profile.read(setting::kCommandLogOn)) == 1;
+    m_session->readCorrections();
     m_captions.load(profile.read(setting::kLanguage), profile.read(setting::kStandard));
     m_session->transmitter.setWatcher(this);
     m_session->instrument.onFailure([this](const std::string&, bool) { return linkFailed(); });

@@ -65,7 +65,8 @@ int query(Laboratory& laboratory, const Query& what) {
         const auto answers = ask(session.instrument, *readBack, laboratory.state().eonIdentifier);
         nlohmann::json bare = nlohmann::json::array();
         for (const std::string& answer : answers) bare.push_back(toUtf8(answer));
-        const std::string words = toUtf8(readBack->words(answers, laboratory.captions()));
+        const std::string words =
+            toUtf8(wordsOf(*readBack, answers, laboratory.captions(), laboratory.state().corrections));
         answered[readBack->name] = {{"words", words}, {"answers", bare}};
         if (what.raw) {
             for (const auto& answer : bare) laboratory.output().line(answer.get<std::string>());
