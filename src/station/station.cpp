@@ -45,7 +45,7 @@ Steps openingSteps(const Station& station, const Corrections& corrections) {
     for (const char* key : {"AM_AUS", "FM_AUS", "STEREO_EIN"}) appendStep(steps, key, "");
     station.multiplex.appendOpeningSteps(steps, corrections);
     appendDataSet(steps, station, corrections);
-    station.carrier.appendOpeningSteps(steps);
+    station.carrier.appendOpeningSteps(steps, corrections);
     return steps;
 }
 

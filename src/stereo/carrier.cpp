@@ -15,8 +15,9 @@ void Carrier::appendSteps(Steps& steps) const {
     appendStep(steps, setting::kRfLevel.sendKey, rfLevel);
 }
 
-void Carrier::appendOpeningSteps(Steps& steps) const {
-    appendStep(steps, setting::kRfOutput, outputText(!outputOn));
+void Carrier::appendOpeningSteps(Steps& steps, const Corrections& corrections) const {
+    const bool stays = corrections.rfOutput && everOpened;
+    appendStep(steps, setting::kRfOutput, outputText(stays ? outputOn : !outputOn));
     appendStep(steps, "NFShape Sinus", "");  // the generator knows no command for it, so it becomes no step
     appendStep(steps, setting::kAudioFrequency.sendKey, audioFrequency);
 }

@@ -3,6 +3,7 @@
 #include <string>
 
 #include "coder/step.h"
+#include "settings/corrections.h"
 
 namespace kdx {
 
@@ -14,12 +15,14 @@ struct Carrier {
     std::string rfLevel;         ///< dBµV
     std::string audioFrequency;  ///< kHz
     bool outputOn = false;       ///< off at first; every opening of a session turns it over
+    bool everOpened = false;     ///< an opening has begun; those after it leave the output where that is corrected
 
     void load(const Profile& profile);
     /// Adds the part of the data set: frequency and level.
     void appendSteps(Steps& steps) const;
-    /// Adds what the opening of a session sends after the data set: the output turned over, the audio generator.
-    void appendOpeningSteps(Steps& steps) const;
+    /// Adds what the opening of a session sends after the data set: the output turned over (or as it stands), the
+    /// audio generator.
+    void appendOpeningSteps(Steps& steps, const Corrections& corrections = {}) const;
 };
 
 /// The RF output's state as it is sent.

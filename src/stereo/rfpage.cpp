@@ -69,6 +69,7 @@ void RfPage::label() {
 }
 
 void RfPage::stepGoesOut(const Step& step) {
+    if (step.kind == Step::Kind::Identify) m_carrier.everOpened = true;  // the first step of an opening
     if (step.key == setting::kRfOutput) showOutput(step.value == outputText(true));
     for (const Value* value : values()) {
         if (step.key == value->setting.sendKey) showValue(*value, toText(step.value));

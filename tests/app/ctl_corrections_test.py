@@ -57,6 +57,11 @@ class Corrected(ctl_test.Ctl):
         self.correct("Pegel")
         self.assertTrue(self.simulated("query", "level").stdout.endswith(" dBµV\n"))
 
+    def testEachApplySwitchesTheOutputOn(self):
+        for correct in (False, True):
+            if correct:
+                self.correct("HF_Ausgang")
+            self.assertIn(":OUTPUT:STAT ON", self.sent("apply", "--data-set", "1"))
 
 
 

@@ -83,6 +83,32 @@ TEST_F(CorrectedSignalTest, TheLevelThatIsReadBackBearsTheUnitItWasSetInWhenCorr
     }
 }
 
+TEST_F(CorrectedSignalTest, EveryOpeningTurnsTheOutputOverAsDescribed) {
+    EXPECT_EQ(outputs(openWith({})), Lines{":OUTPUT:STAT ON"});
+    click("GTL_Taste");
+    EXPECT_EQ(outputs(opened()), Lines{":OUTPUT:STAT OFF"});
+    EXPECT_FALSE(checked("HfOnOffState"));
+}
+
+TEST_F(CorrectedSignalTest, TheOutputStaysAsTheSwitchShowsItWhenCorrected) {
+    EXPECT_EQ(outputs(openWith({"HF_Ausgang"})), Lines{":OUTPUT:STAT ON"});
+    click("GTL_Taste");
+    EXPECT_EQ(outputs(opened()), Lines{":OUTPUT:STAT ON"});
+    EXPECT_TRUE(checked("HfOnOffState"));
+    EXPECT_EQ(sentBy("HfOnOffState"), Lines{":OUTPUT:STAT OFF"});
+    click("GTL_Taste");
+    EXPECT_EQ(outputs(opened()), Lines{":OUTPUT:STAT OFF"});
+    EXPECT_FALSE(checked("HfOnOffState"));
+}
+
+TEST_F(CorrectedSignalTest, AFailedOpeningIsNotTheFirstOne) {
+    visa.openStatus = -1073807343;
+    dialogs.expectedMessages = 1;
+    EXPECT_EQ(openWith({"HF_Ausgang"}), Lines{});
+    visa.openStatus = 0;
+    EXPECT_EQ(outputs(opened()), Lines{":OUTPUT:STAT ON"});
+}
+
 TEST_F(CorrectedSignalTest, WhatIsCorrectedMayChangeWhileTheProgramRuns) {
     openWith({});
     EXPECT_EQ(sentBy("Stereo_Opt_1"), Lines{":stereo:audio:mode LEFT"});
