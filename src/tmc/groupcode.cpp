@@ -25,6 +25,14 @@ constexpr const char* kMessagePrefix = "02,";
 
 }  // namespace
 
+GroupBits withZeros(const GroupBits& bits) {
+    const auto zeros = [](const std::string& field, std::size_t count) {
+        return field == "-" ? std::string(count, '0') : field;
+    };
+    return {zeros(bits.t, 1), zeros(bits.f, 1),      zeros(bits.dp, 3),     zeros(bits.d, 1),
+            zeros(bits.u, 1), zeros(bits.extent, 3), zeros(bits.event, 11), zeros(bits.location, 16)};
+}
+
 std::string groupCode(const GroupBits& bits) {
     const std::string message = bits.f + bits.dp + bits.d + bits.u + bits.extent + bits.event + bits.location;
     std::string code = bits.t;

@@ -21,6 +21,9 @@ struct GroupBits {
     std::string location;  ///< (16)
 };
 
+/// The message with the fields that nobody has chosen yet at 0.
+[[nodiscard]] GroupBits withZeros(const GroupBits& bits);
+
 /// The group code: the T bit, then nine upper-case hexadecimal digits. Fields not chosen yet make the bits too few;
 /// the code is then incomplete, but ten characters all the same.
 [[nodiscard]] std::string groupCode(const GroupBits& bits);

@@ -2,6 +2,7 @@
 
 #include "base/numbers.h"
 #include "settings/datafolder.h"
+#include "settings/programstate.h"
 #include "tmc/groupcode.h"
 #include "tmc/shownlist.h"
 #include "ui/layouts.h"
@@ -127,6 +128,7 @@ void TmcBuilder::label() {
     Page::label();
     TMC_Event_Combo->setPlaceholderText(caption({560, "Eventauswahl"}));
     TMC_Loc_Combo->setPlaceholderText(caption({561, "Locationauswahl"}));
+    TMCGruppe8Maker();
 }
 
 void TmcBuilder::load() {
@@ -134,6 +136,7 @@ void TmcBuilder::load() {
     fillZeroToSeven(DurationCombo);
     TMCInfoOnOff->setText(QStringLiteral("<"));
     TMCInfoOnOff_Click();
+    TMCGruppe8Maker();
 }
 
 void TmcBuilder::reloadLists() {
@@ -181,7 +184,10 @@ void TmcBuilder::TMCInfoOnOff_Click() {
 }
 
 void TmcBuilder::TMCGruppe8Maker() {
-    TMC_Gr8_Label->setText(toText(kdx::groupCode(m_bits->message())));
+    const GroupBits bits = m_bits->message();
+    // While fields are not chosen the code lacks bits, and is sent all the same.
+    const bool corrected = m_with.state.corrections.trafficFields;
+    TMC_Gr8_Label->setText(toText(kdx::groupCode(corrected ? withZeros(bits) : bits)));
 }
 
 }  // namespace kdx

@@ -109,6 +109,28 @@ TEST_F(CorrectedSignalTest, AFailedOpeningIsNotTheFirstOne) {
     EXPECT_EQ(outputs(opened()), Lines{":OUTPUT:STAT ON"});
 }
 
+TEST_F(CorrectedSignalTest, WithoutAllFieldsATrafficMessageLacksBitsAsDescribed) {
+    openWith({});
+    EXPECT_EQ(text("TMC_Gr8_Label"), "-000000000") << "no field is chosen";
+    select("TMC_Var_Combo", 5);
+    select("TMC_Event_Combo", 3);
+    EXPECT_EQ(text("TMC_Gr8_Label").front(), '-') << "the T bit is not chosen";
+}
+
+TEST_F(CorrectedSignalTest, FieldsNobodyChoseCountAs0WhenCorrected) {
+    openWith({"TMC_Felder"});
+    EXPECT_EQ(text("TMC_Gr8_Label"), "0000000000");
+    select("TMC_Var_Combo", 5);
+    EXPECT_EQ(text("TMCBL3_Event"), "-") << "the display tells what was chosen";
+    EXPECT_EQ(text("TMC_Gr8_Label"), "0028000000");
+    click("TMC_Gr8_apply");
+    click("TMC_Senden_Taste");
+    sent();
+    EXPECT_TRUE(tick("TMC_Sende_Timer"));
+    EXPECT_EQ(sent().back(), direct("8A=02,0028000000"));
+    EXPECT_EQ(dataSet1("RDS", "TMC"), "02,0028000000");
+}
+
 TEST_F(CorrectedSignalTest, WhatIsCorrectedMayChangeWhileTheProgramRuns) {
     openWith({});
     EXPECT_EQ(sentBy("Stereo_Opt_1"), Lines{":stereo:audio:mode LEFT"});
