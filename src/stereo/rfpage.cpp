@@ -1,6 +1,7 @@
 #include "stereo/rfpage.h"
 
 #include "coder/sendparam.h"
+#include "settings/programstate.h"
 #include "settings/storedvalue.h"
 #include "stereo/carrier.h"
 #include "ui/dialogs.h"
@@ -92,6 +93,8 @@ void RfPage::enter(const Value& value) {
     } while (!liesBetween(toBytes(answer), lowest, highest));
     showValue(value, answer);
     m_with.params.SendParam(value.setting.sendKey, toBytes(answer));
+    // What is not kept is gone with the next opening, which sends what data set 1 holds.
+    if (m_with.state.corrections.rfValues) m_with.profile.write(value.setting.place, toBytes(answer));
 }
 
 void RfPage::showValue(const Value& value, const QString& text) {

@@ -109,6 +109,34 @@ TEST_F(CorrectedSignalTest, AFailedOpeningIsNotTheFirstOne) {
     EXPECT_EQ(outputs(opened()), Lines{":OUTPUT:STAT ON"});
 }
 
+TEST_F(CorrectedSignalTest, EnteredRfValuesAreForgottenAsDescribed) {
+    openWith({});
+    dialogs.inputs = {QStringLiteral("101.3")};
+    clickLabel("Input_HF_Freq_Label");
+    EXPECT_EQ(sent(), Lines{"FREQ 101.3MHZ"});
+    const std::string kept = dataSet1("VRN", "HF_Frequenz");
+    EXPECT_NE(kept, "101.3");
+    EXPECT_EQ(beginning(sentBy("Btn_SetRdsStereo"), "FREQ"), Lines{"FREQ " + kept + "MHZ"});
+}
+
+TEST_F(CorrectedSignalTest, EnteredRfValuesAreKeptWhenCorrected) {
+    openWith({"HF_Werte"});
+    dialogs.inputs = {QStringLiteral("101.3"), QStringLiteral("0"), QStringLiteral("47.5"), QStringLiteral("2.5"),
+                      QString()};
+    for (const char* label : {"Input_HF_Freq_Label", "Input_HF_Pegel_Label", "Input_AF_Freq_Label"}) clickLabel(label);
+    EXPECT_EQ(sent(), (Lines{"FREQ 101.3MHZ", ":POW 47.5DBUV", ":STEREO:AUDIO:FREQ 2.5KHZ"}));
+    EXPECT_EQ(dataSet1("VRN", "HF_Frequenz"), "101.3");
+    EXPECT_EQ(dataSet1("VRN", "HF_Pegel"), "47.5");
+    EXPECT_EQ(dataSet1("VRN", "NF_Frequenz"), "2.5");
+    clickLabel("Input_HF_Freq_Label");  // cancelled
+    EXPECT_EQ(dataSet1("VRN", "HF_Frequenz"), "101.3");
+    click("GTL_Taste");
+    const Lines again = opened();
+    EXPECT_EQ(beginning(again, "FREQ"), Lines{"FREQ 101.3MHZ"});
+    EXPECT_EQ(beginning(again, ":POW"), Lines{":POW 47.5DBUV"});
+    EXPECT_EQ(again.back(), ":STEREO:AUDIO:FREQ 2.5KHZ");
+}
+
 TEST_F(CorrectedSignalTest, WithoutAllFieldsATrafficMessageLacksBitsAsDescribed) {
     openWith({});
     EXPECT_EQ(text("TMC_Gr8_Label"), "-000000000") << "no field is chosen";
