@@ -189,7 +189,7 @@ std::string range(const Row& row) {
 }
 
 /// Nothing when the value is legal; else why it is not, as far as that is more than not to be within the range.
-std::optional<std::string> problem(const Row& row, std::string_view value) {
+std::optional<std::string> problem(const Row& row, std::string_view value, const Corrections& corrections) {
     const auto unless = [](bool legal) { return legal ? std::nullopt : std::optional<std::string>(std::string()); };
     switch (row.kind) {
         case Kind::Ignored:
@@ -205,7 +205,8 @@ std::optional<std::string> problem(const Row& row, std::string_view value) {
             if (value.find(',') != std::string_view::npos) return "it has a decimal comma";
             return unless(isWithin(value, row.lowest, row.highest));
         case Kind::Text: {
-            if (value.find('"') != std::string_view::npos) return "a double quote ends the text for the coder";
+            if (!corrections.quotes && value.find('"') != std::string_view::npos)
+                return "a double quote ends the text for the coder";
             if (const auto missing = withoutRdsCode(value)) {
                 return "RDS has no code for its character " + toUtf8(std::string(1, *missing));
             }
@@ -258,18 +259,19 @@ const std::vector<KeyFacts>& keyFacts() {
     return all;
 }
 
-std::optional<std::string> wrongValue(std::string_view key, std::string_view value) {
+std::optional<std::string> wrongValue(std::string_view key, std::string_view value, const Corrections& corrections) {
     const Row* const row = rowOf(key);
     if (row == nullptr) return noSuchKey(key);
-    const auto why = problem(*row, value);
+    const auto why = problem(*row, value, corrections);
     return why ? std::optional(sentence(*row, toUtf8(value), *why)) : std::nullopt;
 }
 
-std::optional<std::string> wrongTypedValue(std::string_view key, std::string_view utf8) {
+std::optional<std::string> wrongTypedValue(std::string_view key, std::string_view utf8,
+                                           const Corrections& corrections) {
     const Row* const row = rowOf(key);
     if (row == nullptr) return noSuchKey(key);
     const std::string_view foreign = firstOutsideCodePage(utf8);
-    if (foreign.empty()) return wrongValue(key, fromUtf8(utf8));
+    if (foreign.empty()) return wrongValue(key, fromUtf8(utf8), corrections);
     return sentence(*row, utf8, noSuchCharacter(foreign));
 }
 

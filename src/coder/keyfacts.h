@@ -5,6 +5,8 @@
 #include <string_view>
 #include <vector>
 
+#include "settings/corrections.h"
+
 namespace kdx {
 
 /// What a key of the key table stands for and which values the instrument takes for it, in words.
@@ -20,9 +22,12 @@ struct KeyFacts {
 
 /// Nothing when the instrument takes the value; else what is wrong in words, with the key, the value and what is legal.
 /// An unknown key is wrong too. Values are 8-bit Windows-1252; the sentence is UTF-8.
-[[nodiscard]] std::optional<std::string> wrongValue(std::string_view key, std::string_view value);
+/// @param corrections what they mend on the way to the instrument is not wrong.
+[[nodiscard]] std::optional<std::string> wrongValue(std::string_view key, std::string_view value,
+                                                    const Corrections& corrections = {});
 
 /// The same for a value in UTF-8, as it is typed; one that the code page cannot hold is wrong too.
-[[nodiscard]] std::optional<std::string> wrongTypedValue(std::string_view key, std::string_view utf8);
+[[nodiscard]] std::optional<std::string> wrongTypedValue(std::string_view key, std::string_view utf8,
+                                                         const Corrections& corrections = {});
 
 }  // namespace kdx

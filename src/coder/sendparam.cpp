@@ -232,6 +232,14 @@ std::string formatted(const ParamRow& row, std::string& value, const ParamContex
     return {};
 }
 
+/// What stands between the outer quotes of a command for the coder.
+std::optional<std::string_view> textInside(std::string_view command) {
+    if (!command.starts_with(kCoderCommand)) return std::nullopt;
+    const std::string_view text = command.substr(kCoderCommand.size());
+    if (text.size() < 2 || !text.starts_with('"') || !text.ends_with('"')) return std::nullopt;
+    return text.substr(1, text.size() - 2);
+}
+
 std::string dateText(const Date& date) {
     return twoDigits(date.day) + "." + twoDigits(date.month) + "." + twoDigits(date.year % 100);
 }
@@ -255,14 +263,24 @@ std::string coderCommand(std::string_view command) {
     return std::string(kCoderCommand).append("\"").append(command).append("\"");
 }
 
+std::string quotesDoubled(std::string_view command) {
+    const auto text = textInside(command);
+    if (!text) return std::string(command);
+    std::string doubled;
+    for (const char c : *text) doubled.append(c == '"' ? 2 : 1, c);
+    return std::string(kCoderCommand).append("\"").append(doubled).append("\"");
+}
+
 bool endsItsTextEarly(std::string_view command) {
-    return command.starts_with(kCoderCommand) && std::count(command.begin(), command.end(), '"') > 2;
+    const std::string_view text = textInside(command).value_or("");
+    for (std::size_t at = text.find('"'); at != std::string_view::npos; at = text.find('"', at + 2)) {
+        if (!text.substr(at + 1).starts_with('"')) return true;
+    }
+    return false;
 }
 
 bool leavesItsTextOpen(std::string_view command) {
-    if (!command.starts_with(kCoderCommand)) return false;
-    const std::string_view text = command.substr(kCoderCommand.size());
-    return text.size() < 2 || !text.starts_with('"') || !text.ends_with('"');
+    return command.starts_with(kCoderCommand) && !textInside(command);
 }
 
 ParamSender::ParamSender(Instrument& instrument, ProgramState& state, Clock& clock, std::function<void()> endProgram)
@@ -277,7 +295,7 @@ void ParamSender::SendParam(const std::string& key, std::string& value, const st
     }
     const ParamContext context{m_state.eonIdentifier, m_state.shownClock, timeText(m_clock), dateText(m_clock.today())};
     const std::optional<std::string> command = composeCommand(key, value, context);
-    if (command) sendCommand(key, *command);
+    if (command) sendCommand(key, m_state.corrections.quotes ? quotesDoubled(*command) : *command);
 }
 
 void ParamSender::sendCommand(const std::string& key, const std::string& command) {

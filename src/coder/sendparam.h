@@ -33,8 +33,11 @@ struct ParamContext {
 /// The coder's command as the generator passes it on: inside ":STEREO:DIRECT " and double quotes.
 [[nodiscard]] std::string coderCommand(std::string_view command);
 
-/// Whether a text in the command holds a double quote: the coder takes the text for ended there and the instrument
-/// refuses the rest, or takes it for a command of its own.
+/// The command with the double quotes inside its text doubled, as IEEE 488.2 has it; others stay as they are.
+[[nodiscard]] std::string quotesDoubled(std::string_view command);
+
+/// Whether a text in the command holds a double quote that is not doubled: the coder takes the text for ended there and
+/// the instrument refuses the rest, or takes it for a command of its own.
 [[nodiscard]] bool endsItsTextEarly(std::string_view command);
 
 /// Whether the command's text for the coder lacks its end, as when only the beginning was kept.
@@ -49,7 +52,8 @@ public:
     /// @param endProgram ends the application at once (key "DS").
     ParamSender(Instrument& instrument, ProgramState& state, Clock& clock, std::function<void()> endProgram);
 
-    /// Composes the command, logs it, waits 50 ms and writes it. Unknown keys and "NFShape Sinus" do nothing at all.
+    /// Composes the command (its quotes doubled where that is corrected), logs it, waits 50 ms and writes it. Unknown
+    /// keys and "NFShape Sinus" do nothing at all.
     /// @param value see composeCommand; @param extra1 used by "DS" only; @param extra2 not used;
     /// @param mode one program-wide setting, without effect on what is sent.
     void SendParam(const std::string& key, std::string& value, const std::string& extra1, const std::string& extra2,

@@ -32,7 +32,7 @@ void readMember(const std::string& name, const YamlNode& value, Scenario& scenar
 
 }  // namespace
 
-Reading readScenario(std::string_view utf8, bool force) {
+Reading readScenario(std::string_view utf8, bool force, const Corrections& corrections) {
     Reading reading;
     Problems problems(utf8.starts_with(kUtf8Mark) ? utf8.substr(kUtf8Mark.size()) : utf8);
     if (utf8.size() > kLargestFile) {
@@ -40,7 +40,7 @@ Reading readScenario(std::string_view utf8, bool force) {
         return {{}, problems.inOrder()};
     }
     const YamlNode root = readYaml(problems);
-    Values values(problems, force);
+    Values values(problems, force, corrections);
     if (root.kind == YamlNode::Kind::Map) {
         for (const auto& [name, value] : root.members) {
             if (isOneOf(kWords, name.text)) {

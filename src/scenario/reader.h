@@ -5,6 +5,7 @@
 
 #include "scenario/problems.h"
 #include "scenario/scenario.h"
+#include "settings/corrections.h"
 
 namespace kdx::scenario {
 
@@ -14,7 +15,8 @@ struct Reading {
     std::vector<Problem> problems;  ///< in the order of their places
 };
 
-/// Reads a scenario. @param utf8 the file's bytes; @param force values need not be legal.
-[[nodiscard]] Reading readScenario(std::string_view utf8, bool force = false);
+/// Reads a scenario. @param utf8 the file's bytes; @param force values need not be legal; @param corrections of the
+/// data folder that it is read for.
+[[nodiscard]] Reading readScenario(std::string_view utf8, bool force = false, const Corrections& corrections = {});
 
 }  // namespace kdx::scenario

@@ -12,7 +12,7 @@ bool ReadoutRestorer::remember() {
 
 std::optional<SettingCommands> ReadoutRestorer::commands() {
     const auto differences = differing();
-    return differences ? std::optional(commandsFor(*differences, m_before)) : std::nullopt;
+    return differences ? std::optional(commandsFor(*differences, m_before, m_corrections)) : std::nullopt;
 }
 
 std::optional<std::vector<std::string>> ReadoutRestorer::changed() {

@@ -13,7 +13,8 @@ namespace kdx::scenario {
 /// Keeps everything that can be read back of the instrument.
 class ReadoutRestorer final : public Restorer {
 public:
-    explicit ReadoutRestorer(Instrument& instrument) : m_instrument(instrument) {}
+    explicit ReadoutRestorer(Instrument& instrument, const Corrections& corrections = {})
+        : m_instrument(instrument), m_corrections(corrections) {}
 
     [[nodiscard]] bool remember() override;
     [[nodiscard]] std::vector<std::string> untold() const override { return keysOf(unanswered(m_before)); }
@@ -32,6 +33,7 @@ private:
     }
 
     Instrument& m_instrument;
+    Corrections m_corrections;
     Readout m_before;
 };
 

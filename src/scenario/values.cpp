@@ -116,7 +116,7 @@ std::optional<Decimal> Values::number(const YamlNode& node, std::string_view nam
 
 bool Values::isLegal(const YamlNode& node, const std::string& key, const std::string& value) {
     if (m_force) return true;
-    const auto why = wrongValue(key, value);
+    const auto why = wrongValue(key, value, m_corrections);
     if (why) wrong(node, *why);
     return !why;
 }

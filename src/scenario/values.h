@@ -9,6 +9,7 @@
 #include "scenario/decimal.h"
 #include "scenario/problems.h"
 #include "scenario/yamltree.h"
+#include "settings/corrections.h"
 
 namespace kdx::scenario {
 
@@ -16,7 +17,8 @@ namespace kdx::scenario {
 class Values {
 public:
     /// @param force values for the instrument need not be legal.
-    Values(Problems& problems, bool force) : m_problems(problems), m_force(force) {}
+    Values(Problems& problems, bool force, const Corrections& corrections)
+        : m_problems(problems), m_force(force), m_corrections(corrections) {}
 
     void wrong(const YamlNode& node, const std::string& sentence) { m_problems.add(node.at, sentence); }
 
@@ -24,7 +26,7 @@ public:
     [[nodiscard]] std::optional<std::string> text(const YamlNode& node, std::string_view name);
     /// The same in the instrument's characters.
     [[nodiscard]] std::optional<std::string> instrumentText(const YamlNode& node, std::string_view name);
-    /// A value that the key's command can carry, in the instrument's characters.
+    /// A value that the key's command can carry, in the instrument's characters, as it is to go out.
     [[nodiscard]] std::optional<std::string> keyValue(const YamlNode& node, const std::string& key);
     /// "2 s", "500 ms", "1.5 min", "1 h".
     [[nodiscard]] std::optional<std::chrono::milliseconds> time(const YamlNode& node, std::string_view name);
@@ -38,6 +40,7 @@ public:
 private:
     Problems& m_problems;
     bool m_force;
+    Corrections m_corrections;
 };
 
 }  // namespace kdx::scenario

@@ -200,20 +200,24 @@ std::string valueIn(const Readout& readout, std::string_view key, std::string_vi
 }
 
 /// What makes the wanted values of one key after another the present ones. A text with a double quote goes out by no
-/// command: the instrument would take it for ended there.
+/// command unless its quotes are doubled: the instrument would take it for ended there.
 class Commands {
 public:
-    explicit Commands(const Readout& wanted) : m_wanted(wanted) {}
+    Commands(const Readout& wanted, const Corrections& corrections)
+        : m_wanted(wanted), m_doublesQuotes(corrections.quotes) {}
 
     void add(const std::string& key, std::string value, const std::string& network = {}) {
         const ParamContext context{.eonIdentifier = network, .clockText = {}, .time = {}, .date = {}};
         try {
             const std::string command = composeCommand(key, value, context).value_or("");
-            if (!command.empty() && !endsItsTextEarly(command)) addText(key, command);
+            if (!command.empty()) addText(key, command);
         } catch (const std::overflow_error&) {  // a number that no instrument has: it does not come back
         }
     }
-    void addText(const std::string& key, std::string command) { m_commands.push_back({key, std::move(command)}); }
+    void addText(const std::string& key, const std::string& command) {
+        std::string doubled = quotesDoubled(command);
+        if (m_doublesQuotes || doubled == command) m_commands.push_back({key, std::move(doubled)});
+    }
 
     void addOwn(const std::string& key) {
         const std::string value = valueIn(m_wanted, key);
@@ -271,10 +275,11 @@ private:
         if (!isKnown("RT", {}) || !once("RT")) return;
         std::string value = valueIn(m_wanted, "RT_N");
         value = (value.empty() ? "10,0" : value) + "," + valueIn(m_wanted, "RT");
-        if (value.find('"') == std::string::npos) addText("RT", coderCommand("RT=" + value));
+        addText("RT", coderCommand("RT=" + value));
     }
 
     const Readout& m_wanted;
+    bool m_doublesQuotes;
     SettingCommands m_commands;
     std::set<std::string> m_done;
 };
@@ -322,8 +327,8 @@ Differences differences(const Readout& wanted, const Readout& present) {
     return differing;
 }
 
-SettingCommands commandsFor(const Differences& differing, const Readout& wanted) {
-    Commands commands(wanted);
+SettingCommands commandsFor(const Differences& differing, const Readout& wanted, const Corrections& corrections) {
+    Commands commands(wanted, corrections);
     // Networks that go make room for those that come: the coder holds a limited number.
     std::set<std::string> whole;
     for (const Difference& difference : differing) {

@@ -4,6 +4,8 @@
 #include <string>
 #include <vector>
 
+#include "settings/corrections.h"
+
 namespace kdx {
 
 class Instrument;
@@ -48,8 +50,10 @@ using SettingCommands = std::vector<SettingCommand>;
 [[nodiscard]] Differences differences(const Readout& wanted, const Readout& present);
 
 /// What makes the present values the wanted ones, in the order it is to be sent. The coder cannot be without AF lists
-/// again once it has one, and takes no empty group sequence: these have no command.
-[[nodiscard]] SettingCommands commandsFor(const Differences& differing, const Readout& wanted);
+/// again once it has one, and takes no empty group sequence: these have no command. A text with a double quote has one
+/// where quotes are doubled.
+[[nodiscard]] SettingCommands commandsFor(const Differences& differing, const Readout& wanted,
+                                          const Corrections& corrections = {});
 
 /// What the key stands for, in words; "" for an unknown one.
 [[nodiscard]] std::string meaningOf(const std::string& key);

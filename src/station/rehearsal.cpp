@@ -16,10 +16,11 @@ std::chrono::steady_clock::time_point HastyClock::steadyNow() const {
 Rehearsal::Rehearsal(DataFolder& data, const Captions& captions)
     : m_session(m_visa, m_state, data, captions, m_clock, [this] { m_session.transmitter.stop(); }) {
     m_session.instrument.addWatcher(*this);
+    m_session.readCorrections();
 }
 
 void Rehearsal::become(const Readout& other) {
-    const SettingCommands commands = commandsFor(differences(other, readOut()), other);
+    const SettingCommands commands = commandsFor(differences(other, readOut()), other, m_state.corrections);
     open();
     for (const auto& [key, command] : commands) m_session.params.sendCommand(key, command);
     m_session.close();

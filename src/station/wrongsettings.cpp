@@ -83,13 +83,13 @@ std::optional<std::string> wrongPhase(const std::string& stored) {
     return wrong;
 }
 
-std::optional<std::string> wrong(const Row& row, const std::string& stored) {
+std::optional<std::string> wrong(const Row& row, const std::string& stored, const Corrections& corrections) {
     const char* const key = row.setting.sendKey;
     if (stored.empty() && row.judged != Judged::Required) return std::nullopt;
     switch (row.judged) {
         case Judged::AsStored:
         case Judged::Required:
-            return wrongValue(key, stored);
+            return wrongValue(key, stored, corrections);
         case Judged::Impedance:
             return stored == "0" ? std::nullopt : wrongValue(key, stored);
         case Judged::PilotPhase:
@@ -105,11 +105,12 @@ std::optional<std::string> wrong(const Row& row, const std::string& stored) {
 }  // namespace
 
 std::vector<std::string> wrongSettings(const Profile& source) {
+    const Corrections corrections = readCorrections(source);
     std::vector<std::string> sentences;
     for (const Row& row : kRows) {
         const Place& place = row.setting.place;
         const std::string stored = source.read(place);
-        if (const auto sentence = wrong(row, stored)) {
+        if (const auto sentence = wrong(row, stored, corrections)) {
             sentences.push_back(*sentence + " It stands in " + source.fileOf(place) + ", [" + place.section + "] " +
                                 place.key + "=" + toUtf8(stored) + ".");
         }

@@ -27,10 +27,11 @@ public:
     }
 };
 
-/// Shows the text in red while it has a double quote in it, which would end it for the coder.
+/// Shows the text in red while it has a double quote in it, which would end it for the coder unless it goes out
+/// doubled.
 void markQuote(QLineEdit& entry) {
     QPalette palette = entry.palette();
-    const bool quoted = entry.text().contains(QLatin1Char('"'));
+    const bool quoted = entry.text().contains(QLatin1Char('"')) && !entry.window()->property(kQuotesDoubled).toBool();
     palette.setColor(QPalette::Text, quoted ? QColor(Qt::red) : QApplication::palette(&entry).color(QPalette::Text));
     entry.setPalette(palette);
 }

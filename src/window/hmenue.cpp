@@ -27,6 +27,7 @@
 #include "ui/dialogs.h"
 #include "ui/page.h"
 #include "ui/pictureswitch.h"
+#include "ui/plaintext.h"
 #include "ui/statusrow.h"
 #include "ui/text.h"
 #include "ui/ticker.h"
@@ -187,6 +188,7 @@ void HMenue::startUp() {
     Beschrifter();
     m_s.state.CurrentDataSet = "1";
     m_s.session.load();
+    setProperty(kQuotesDoubled, m_s.state.corrections.quotes);
     loadPages();
     m_s.session.instrument.log.empty();
     if (upperCase(profile.read(setting::kOpenAtStart)) == "AUTO") INIT_Taste_Click();

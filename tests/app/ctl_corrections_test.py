@@ -64,6 +64,21 @@ class Corrected(ctl_test.Ctl):
             self.assertIn(":OUTPUT:STAT ON", self.sent("apply", "--data-set", "1"))
 
 
+    def testAQuoteGoesOutDoubled(self):
+        self.change("Datenset1.INI", "RDS", "RTA", 'sag "ja" x')
+        calls = (("send", 'PS=A"B'), ("send", "--coder", 'PS=A"B'), ("apply", "--data-set", "1"),
+                 ("play", self.scenario("{send: {PS: 'A\"B'}}")))
+        for call in calls:
+            self.assertIn("double quote", self.simulated(*call, expect=WRONG_CALL).stderr)
+        self.correct("Anfuehrung")
+        padded, bare = ':STEREO:DIRECT "PS=A""B     "', ':STEREO:DIRECT "PS=A""B"'
+        text = ':STEREO:DIRECT "RT=10,0,sag ""ja"" x"'
+        for call, command in zip(calls, (padded, bare, text, padded)):
+            self.assertIn(command, self.sent(*call))
+        self.assertEqual(self.sent("send", "--raw", padded), [padded])
+        run = self.simulated("diff", "--data-set", "1", "--fix")
+        self.assertIn('sag "ja" x', run.stdout)
+        self.assertIn("all of it is mended", run.stdout + run.stderr)
 
 
 if __name__ == "__main__":

@@ -193,6 +193,10 @@ TEST_F(ReadoutTest, ATextWithADoubleQuoteIsNotSent) {
         if (reading.key == "PS" || reading.key == "RT") reading.value = "A\"B";
     }
     EXPECT_THAT(commandsFor(differences(wanted, lab.readout()), wanted), IsEmpty());
+    const auto commands = commandsFor(differences(wanted, lab.readout()), wanted, {.quotes = true});
+    ASSERT_EQ(commands.size(), 2U) << "unless quotes are doubled";
+    EXPECT_EQ(commands[0].command, direct("PS=A\"\"B     "));
+    EXPECT_TRUE(commands[1].command.ends_with(",A\"\"B\"")) << commands[1].command;
 }
 
 TEST_F(ReadoutTest, WhatADataSetLeavesAloneIsNoDifference) {

@@ -66,5 +66,32 @@ TEST_F(CorrectedTextsTest, AnUnknownTypeIsNotSentWhenCorrected) {
     }
 }
 
+TEST_F(CorrectedTextsTest, AQuoteGoesOutAsTypedAsDescribed) {
+    openWith({});
+    type("PS_T", "A\"B");
+    EXPECT_EQ(sentBy("PS_Taste"), Lines{direct("PS=A\"B     ")});
+    EXPECT_TRUE(isRed("PS_T"));
+    EXPECT_EQ(session->params.quotedKeys(), std::set<std::string>{"PS"});
+}
+
+TEST_F(CorrectedTextsTest, AQuoteGoesOutDoubledBehindPaddingAndCuttingWhenCorrected) {
+    setDataSet1("RDS", "RTA", "sag \"ja\"");
+    const Lines opening = openWith({"Anfuehrung"});
+    EXPECT_EQ(std::count(opening.begin(), opening.end(), direct("RT=10,0,sag \"\"ja\"\"")), 1);
+    EXPECT_FALSE(isRed("RT_Text1"));
+    type("PS_T", "A\"B");
+    EXPECT_EQ(sentBy("PS_Taste"), Lines{direct("PS=A\"\"B     ")});
+    EXPECT_EQ(dataSet1("RDS", "PS"), "A\"B");
+    EXPECT_EQ(text("Status_3"), "A\"B");
+    EXPECT_FALSE(isRed("PS_T"));
+    type("PS_T", "\"1234567890");
+    EXPECT_EQ(sentBy("PS_Taste"), Lines{direct("PS=\"\"1234567")});
+    type("EON_PS_Text", "\"\"");
+    EXPECT_EQ(sentBy("EON_PS_Taste"), Lines{direct("EON-PS=D3C2,\"\"\"\"      ")});
+    type("RT_Text1", "\"");
+    EXPECT_EQ(sentBy("RT_Taste1"), Lines{direct("RT=10,0,\"\"")});
+    EXPECT_TRUE(session->params.quotedKeys().empty()) << "no text is ended early";
+}
+
 }  // namespace
 }  // namespace kdx::test

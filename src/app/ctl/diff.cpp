@@ -33,7 +33,8 @@ int diff(Laboratory& laboratory, const Diff& what) {
     tellDifferences(laboratory.output(), "differences", comparison.differing);
     Differences left = comparison.differing;
     if (what.fix && !left.empty()) {
-        const SettingCommands commands = commandsFor(comparison.differing, comparison.wanted);
+        const SettingCommands commands =
+            commandsFor(comparison.differing, comparison.wanted, laboratory.state().corrections);
         laboratory.expect(commands.size());
         for (const auto& [key, command] : commands) {
             if (laboratory.goesOn()) laboratory.session().params.sendCommand(key, command);

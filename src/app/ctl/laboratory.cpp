@@ -160,7 +160,7 @@ bool Laboratory::goesOn() {
 bool Laboratory::mayBeSent(const std::string& key, const std::string& utf8) {
     // There is nothing that could be sent for an unknown key.
     if (m_call.force && isParameter(key)) return true;
-    const auto wrong = wrongTypedValue(key, utf8);
+    const auto wrong = wrongTypedValue(key, utf8, m_state.corrections);
     if (wrong) m_output.problem(isParameter(key) ? *wrong : *wrong + "; kdx-ctl list keys names them");
     return !wrong;
 }

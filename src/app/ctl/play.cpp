@@ -159,7 +159,7 @@ int play(Laboratory& laboratory, const Play& what) {
         return kWrongCall;
     }
     Console console(laboratory, what.yes);
-    scenario::ReadoutRestorer restorer(laboratory.session().instrument);
+    scenario::ReadoutRestorer restorer(laboratory.session().instrument, laboratory.state().corrections);
     scenario::Surroundings with{laboratory.session(), laboratory.state(), laboratory.clock(), console, console};
     with.restorer = &restorer;
     if (!report.file().empty()) with.report = &report;

@@ -21,7 +21,7 @@ bool loadDataSet(Laboratory& laboratory, int number) {
 std::optional<scenario::Scenario> readScenarioFile(Laboratory& laboratory, const std::string& file) {
     const auto bytes = bytesOf(laboratory.output(), file);
     if (!bytes) return std::nullopt;
-    scenario::Reading reading = scenario::readScenario(*bytes, laboratory.call().force);
+    scenario::Reading reading = scenario::readScenario(*bytes, laboratory.call().force, laboratory.state().corrections);
     for (const auto& [line, column, sentence] : reading.problems)
         laboratory.output().problem(file + ":" + std::to_string(line) + ":" + std::to_string(column) + ": " + sentence);
     if (!reading.problems.empty()) return std::nullopt;

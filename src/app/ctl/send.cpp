@@ -61,13 +61,19 @@ std::string line(const std::string& utf8) {
     return fromUtf8(withoutControls(utf8));
 }
 
+/// A command for the coder as it goes out.
+std::string forTheCoder(Laboratory& laboratory, const std::string& utf8) {
+    const std::string command = coderCommand(line(utf8));
+    return laboratory.state().corrections.quotes ? quotesDoubled(command) : command;
+}
+
 /// Whether a command as it stands can go out; what is wrong is told.
 bool isLegal(Laboratory& laboratory, const std::string& command, bool forCoder) {
     if (laboratory.call().force) return true;
     std::string why;
     if (const std::string_view foreign = firstOutsideCodePage(command); !foreign.empty()) {
         why = noSuchCharacter(foreign);
-    } else if (forCoder && endsItsTextEarly(coderCommand(line(command)))) {
+    } else if (forCoder && endsItsTextEarly(forTheCoder(laboratory, command))) {
         why = "a double quote ends it early";
     }
     if (why.empty()) return true;
@@ -98,7 +104,7 @@ int send(Laboratory& laboratory, const Send& what) {
         if (laboratory.goesOn()) session.params.SendParam(key, std::string(value));
     }
     for (const std::string& command : what.raw) sendAsItStands(laboratory, line(command));
-    for (const std::string& command : what.coder) sendAsItStands(laboratory, coderCommand(line(command)));
+    for (const std::string& command : what.coder) sendAsItStands(laboratory, forTheCoder(laboratory, command));
     laboratory.close();
     return laboratory.result();
 }
