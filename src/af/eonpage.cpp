@@ -150,7 +150,7 @@ void EonPage::EON_PS_Text_Change() {
 
 void EonPage::EON_PS_Taste_Click() {
     m_network.ps = withoutControls(m_network.ps);
-    m_with.profile.write(setting::kEonPs.place, m_network.ps);
+    storeText(setting::kEonPs, m_network.ps);
     m_with.params.SendParam(setting::kEonPs.sendKey, m_network.ps);
 }
 

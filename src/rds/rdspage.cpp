@@ -71,7 +71,8 @@ void RdsPage::stepGoesOut(const Step& step) {
 // there.
 void RdsPage::PS_Taste_Click() {
     m_programme.ps = withoutControls(toBytes(PS_T->text())).substr(0, kPsLength);
-    sendAndStore(setting::kPs, m_programme.ps);
+    m_with.params.SendParam(setting::kPs.sendKey, std::string(m_programme.ps));
+    storeText(setting::kPs, m_programme.ps);
     m_with.status.show(StatusSlot::Ps, m_programme.ps);
 }
 
@@ -107,7 +108,7 @@ void RdsPage::DI_Opt_Click(int index) {
 
 void RdsPage::RT_Taste1_Click() {
     m_programme.radiotext = withoutControls(m_programme.radiotext);
-    m_with.profile.write(setting::kRadiotext.place, m_programme.radiotext);
+    storeText(setting::kRadiotext, m_programme.radiotext);
     m_with.params.SendParam(setting::kRadiotext.sendKey, m_programme.radiotext);
 }
 

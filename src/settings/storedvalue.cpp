@@ -46,6 +46,13 @@ std::string storedFlag(std::string_view text) {
     return text == "1" ? "1" : "0";
 }
 
+std::string quotedWhereNeeded(const std::string& text) {
+    if (text.empty()) return text;
+    const bool blank = text.front() == ' ' || text.back() == ' ';
+    const bool quote = text.front() == text.back() && (text.front() == '"' || text.front() == '\'');
+    return blank || quote ? '"' + text + '"' : text;
+}
+
 int storedPosition(std::string_view text, int lowest, int highest) {
     const double within = std::clamp(leadingNumber(text), static_cast<double>(lowest), static_cast<double>(highest));
     return static_cast<int>(std::lround(within));

@@ -20,6 +20,10 @@ namespace kdx {
 /// The text of a flag: "1" for a stored "1", else "0".
 [[nodiscard]] std::string storedFlag(std::string_view text);
 
+/// The text as it is to be written so that the same text is read: reading takes off blanks at the edges, and one pair
+/// of quotes.
+[[nodiscard]] std::string quotedWhereNeeded(const std::string& text);
+
 /// The position of a scroll bar for a stored text: the number it begins with (0 when none), rounded to a whole one and
 /// kept within the range.
 [[nodiscard]] int storedPosition(std::string_view text, int lowest, int highest);

@@ -64,14 +64,6 @@ const Setting* settingOf(const auto& settings, std::string_view key) {
     return found == settings.end() ? nullptr : &*found;
 }
 
-/// Reading takes off blanks at the edges, and one pair of quotes.
-std::string quotedWhereNeeded(const std::string& text) {
-    if (text.empty()) return text;
-    const bool blank = text.front() == ' ' || text.back() == ' ';
-    const bool quote = text.front() == text.back() && (text.front() == '"' || text.front() == '\'');
-    return blank || quote ? '"' + text + '"' : text;
-}
-
 /// Whether the instrument can have the value: what a broken one says otherwise is not kept. Texts are free, and there
 /// may be no lists.
 bool isPossible(const std::string& key, const std::string& value) {

@@ -5,6 +5,7 @@
 #include "coder/sendparam.h"
 #include "settings/captions.h"
 #include "settings/profile.h"
+#include "settings/programstate.h"
 #include "settings/storedvalue.h"
 #include "ui/text.h"
 
@@ -20,6 +21,10 @@ void Page::send(const Steps& steps) {
 void Page::sendAndStore(const Setting& setting, const std::string& value) {
     m_with.params.SendParam(setting.sendKey, std::string(value));
     m_with.profile.write(setting.place, value);
+}
+
+void Page::storeText(const Setting& setting, const std::string& text) {
+    m_with.profile.write(setting.place, m_with.state.corrections.edgeBlanks ? quotedWhereNeeded(text) : text);
 }
 
 void Page::showProgrammeTypes(QComboBox* box, const Place& stored) {

@@ -33,6 +33,8 @@ protected:
     /// Sends steps at once, each for itself and without a sequence around them.
     void send(const Steps& steps);
     void sendAndStore(const Setting& setting, const std::string& value);
+    /// Stores a text whose blanks at the edges mean something; they come back where that is corrected.
+    void storeText(const Setting& setting, const std::string& text);
     /// Lists the programme types in the current language and chooses the stored one; no handler runs.
     void showProgrammeTypes(QComboBox* box, const Place& stored);
 };

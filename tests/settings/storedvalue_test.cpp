@@ -53,6 +53,14 @@ TEST(StoredEntry, CountsFromZeroAndTakesNoNumberForTheFirst) {
     for (const char* none : {"32", "-1", "1e300"}) EXPECT_EQ(storedEntry(none, 32), -1) << none;
 }
 
+TEST(QuotedWhereNeeded, KeepsWhatReadingWouldTakeOff) {
+    for (const char* plain : {"", "A B", "A", "\"A", "A\"", "'A\""}) EXPECT_EQ(quotedWhereNeeded(plain), plain);
+    for (const std::string_view edged : {" A", "A ", " ", "\"A\"", "'A'", "\""}) {
+        const std::string text(edged);
+        EXPECT_EQ(quotedWhereNeeded(text), '"' + text + '"');
+    }
+}
+
 TEST(StoredFlag, IsOnForAPlainOneOnly) {
     EXPECT_EQ(storedFlag("1"), "1");
     for (const char* off : {"", "0", "1.0", " 1", "x"}) EXPECT_EQ(storedFlag(off), "0") << off;

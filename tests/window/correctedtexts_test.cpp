@@ -93,5 +93,39 @@ TEST_F(CorrectedTextsTest, AQuoteGoesOutDoubledBehindPaddingAndCuttingWhenCorrec
     EXPECT_TRUE(session->params.quotedKeys().empty()) << "no text is ended early";
 }
 
+TEST_F(CorrectedTextsTest, BlanksAtTheEdgesOfStoredTextsAreLostAsDescribed) {
+    openWith({});
+    type("PS_T", " A B ");
+    EXPECT_EQ(sentBy("PS_Taste"), Lines{direct("PS= A B    ")});
+    EXPECT_EQ(written(kSet1, "PS"), " A B ");
+    EXPECT_EQ(dataSet1("RDS", "PS"), "A B");
+    start();
+    EXPECT_EQ(text("PS_T"), "A B");
+}
+
+TEST_F(CorrectedTextsTest, BlanksAtTheEdgesOfStoredTextsComeBackWhenCorrected) {
+    openWith({"PS_Rand"});
+    type("PS_T", "  MID   ");
+    EXPECT_EQ(sentBy("PS_Taste"), Lines{direct("PS=  MID   ")});
+    type("EON_PS_Text", " EON");
+    EXPECT_EQ(sentBy("EON_PS_Taste"), Lines{direct("EON-PS=D3C2, EON    ")});
+    type("RT_Text1", "Text ");
+    EXPECT_EQ(sentBy("RT_Taste1"), Lines{direct("RT=10,0,Text ")});
+    EXPECT_EQ(written(kSet1, "PS"), "\"  MID   \"");
+    EXPECT_EQ(written(kSet1, "EON_PS"), "\" EON\"");
+    EXPECT_EQ(written(kSet1, "RTA"), "\"Text \"");
+    start();
+    EXPECT_EQ(text("PS_T"), "  MID   ");
+    EXPECT_EQ(text("EON_PS_Text"), " EON");
+    EXPECT_EQ(text("RT_Text1"), "Text ");
+    const Lines opening = opened();
+    for (const char* command : {"PS=  MID   ", "EON-PS=D3C2, EON    ", "RT=10,0,Text "}) {
+        EXPECT_EQ(std::count(opening.begin(), opening.end(), direct(command)), 1) << command;
+    }
+    type("PS_T", "MITTE");
+    click("PS_Taste");
+    EXPECT_EQ(written(kSet1, "PS"), "MITTE");
+}
+
 }  // namespace
 }  // namespace kdx::test
