@@ -3,6 +3,7 @@
 #include "af/aflistset.h"
 #include "settings/profile.h"
 #include "settings/programstate.h"
+#include "settings/storedvalue.h"
 #include "ui/dialogs.h"
 #include "ui/layouts.h"
 #include "ui/text.h"
@@ -73,7 +74,10 @@ void AF_Listenform::AF_TN_Click() {
     while (true) {
         answer = m_with.dialogs.input(caption({162}), caption({161}), answer);
         if (answer.isEmpty()) return;
-        if (answer.contains(QLatin1Char(','))) {
+        const bool known = takeNumber(answer);
+        if (!known) {
+            refuse(164);
+        } else if (answer.contains(QLatin1Char(','))) {
             refuse(166);
         } else if (!isTunedFrequency(toBytes(answer))) {
             refuse(164);
@@ -125,10 +129,23 @@ int AF_Listenform::selectedRow() const {
 }
 
 QString AF_Listenform::checkedEntry() {
-    // Taken as typed, a decimal comma included: "90,1" reads as 90 and becomes two entries of the stored list.
-    if (isAlternativeFrequency(toBytes(Text2->text()))) return Text2->text();
+    // Taken as typed unless that is corrected, a decimal comma included: "90,1" reads as 90 and becomes two entries of
+    // the stored list.
+    QString entry = Text2->text();
+    if (takeNumber(entry) && isAlternativeFrequency(toBytes(entry))) {
+        if (entry != Text2->text()) Text2->setText(entry);
+        return entry;
+    }
     refuse(164);
     return {};
+}
+
+/// Where numbers are checked, makes the text the number that it is; false when it is none.
+bool AF_Listenform::takeNumber(QString& text) const {
+    if (!m_with.state.corrections.decimalComma) return true;
+    const auto number = decimalNumber(toBytes(text));
+    if (number) text = toText(*number);
+    return number.has_value();
 }
 
 void AF_Listenform::refuse(int reason) {

@@ -38,6 +38,7 @@ private:
     [[nodiscard]] int selectedRow() const;
     /// What `Text2` reads when it is an allowed AF; else says so and gives an empty text.
     [[nodiscard]] QString checkedEntry();
+    [[nodiscard]] bool takeNumber(QString& text) const;
     void refuse(int reason);
 
     AfListView m_view;                // AFList_Opt, AF_TN, AF_List1

@@ -11,6 +11,7 @@
 #include "coder/fieldsizes.h"
 #include "coder/rdscharacters.h"
 #include "settings/captions.h"
+#include "settings/storedvalue.h"
 
 namespace kdx {
 
@@ -259,10 +260,16 @@ const std::vector<KeyFacts>& keyFacts() {
     return all;
 }
 
+std::string correctedValue(std::string_view key, const std::string& value, const Corrections& corrections) {
+    const Row* const row = rowOf(key);
+    if (!corrections.decimalComma || row == nullptr || row->kind != Kind::Number) return value;
+    return decimalNumber(value).value_or(value);
+}
+
 std::optional<std::string> wrongValue(std::string_view key, std::string_view value, const Corrections& corrections) {
     const Row* const row = rowOf(key);
     if (row == nullptr) return noSuchKey(key);
-    const auto why = problem(*row, value, corrections);
+    const auto why = problem(*row, correctedValue(key, std::string(value), corrections), corrections);
     return why ? std::optional(sentence(*row, toUtf8(value), *why)) : std::nullopt;
 }
 

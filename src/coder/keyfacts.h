@@ -26,6 +26,10 @@ struct KeyFacts {
 [[nodiscard]] std::optional<std::string> wrongValue(std::string_view key, std::string_view value,
                                                     const Corrections& corrections = {});
 
+/// The value as it is to go out: a number's decimal comma is a point where that is corrected.
+[[nodiscard]] std::string correctedValue(std::string_view key, const std::string& value,
+                                         const Corrections& corrections);
+
 /// The same for a value in UTF-8, as it is typed; one that the code page cannot hold is wrong too.
 [[nodiscard]] std::optional<std::string> wrongTypedValue(std::string_view key, std::string_view utf8,
                                                          const Corrections& corrections = {});

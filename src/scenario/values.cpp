@@ -62,9 +62,9 @@ std::optional<std::string> Values::keyValue(const YamlNode& node, const std::str
     const auto facts = std::find_if(all.begin(), all.end(), [&](const KeyFacts& f) { return f.key == key; });
     const bool matters = facts == all.end() || !facts->range.empty();
     if (!matters && node.kind == YamlNode::Kind::Nothing) return std::string();
-    auto value = instrumentText(node, key);
-    if (value && !isLegal(node, key, *value)) return std::nullopt;
-    return value;
+    const auto value = instrumentText(node, key);
+    if (!value || !isLegal(node, key, *value)) return std::nullopt;
+    return correctedValue(key, *value, m_corrections);
 }
 
 std::optional<std::chrono::milliseconds> Values::time(const YamlNode& node, std::string_view name) {

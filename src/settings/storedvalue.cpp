@@ -6,6 +6,7 @@
 #include <string>
 
 #include "base/numbers.h"
+#include "settings/profilelines.h"
 
 namespace kdx {
 
@@ -56,6 +57,17 @@ std::string quotedWhereNeeded(const std::string& text) {
 int storedPosition(std::string_view text, int lowest, int highest) {
     const double within = std::clamp(leadingNumber(text), static_cast<double>(lowest), static_cast<double>(highest));
     return static_cast<int>(std::lround(within));
+}
+
+std::optional<std::string> decimalNumber(std::string_view text) {
+    std::string number(trimmed(text));
+    std::replace(number.begin(), number.end(), ',', '.');
+    std::string_view digits = number;
+    if (digits.starts_with('-') || digits.starts_with('+')) digits.remove_prefix(1);
+    const std::size_t point = digits.find('.');
+    const std::string_view whole = digits.substr(0, point);
+    const std::string_view decimals = point == std::string_view::npos ? "0" : digits.substr(point + 1);
+    return isDecimal(whole) && isDecimal(decimals) ? std::optional(number) : std::nullopt;
 }
 
 bool liesBetween(std::string_view entered, std::string_view lower, std::string_view upper) {

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <optional>
 #include <string>
 #include <string_view>
 
@@ -27,6 +28,10 @@ namespace kdx {
 /// The position of a scroll bar for a stored text: the number it begins with (0 when none), rounded to a whole one and
 /// kept within the range.
 [[nodiscard]] int storedPosition(std::string_view text, int lowest, int highest);
+
+/// The decimal number that the text is, blanks at its edges left out and a decimal comma taken for a point; nothing for
+/// what is no such number as a whole.
+[[nodiscard]] std::optional<std::string> decimalNumber(std::string_view text);
 
 /// Whether an entered number lies strictly between the limits; both limits themselves are refused. All three are the
 /// leading numbers of the texts, compared in single precision.

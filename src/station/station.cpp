@@ -14,7 +14,7 @@ void appendDataSet(Steps& steps, const Station& station, const Corrections& corr
     station.programme.appendPtySteps(steps);
     station.otherNetwork.appendSteps(steps, corrections);
     station.groups.appendSteps(steps);
-    station.carrier.appendSteps(steps);
+    station.carrier.appendSteps(steps, corrections);
 }
 
 }  // namespace

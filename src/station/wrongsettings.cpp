@@ -22,6 +22,7 @@ namespace {
 /// What of a stored text is to be legal for the key.
 enum class Judged {
     AsStored,
+    Carrier,     ///< a number of the carrier, whose decimal comma may be corrected
     Required,    ///< the same, and it must not be missing
     Impedance,   ///< counts from 1 where it is read, from 0 where the window has stored a choice
     PilotPhase,  ///< within the limits of the setting, which are narrower than the key's
@@ -67,9 +68,9 @@ constexpr std::array kRows = {
     Row{setting::kEonAfLists[3], Judged::List},
     Row{setting::kEonAfLists[4], Judged::List},
     Row{setting::kGroupSequence, Judged::Sequence},
-    Row{setting::kRfFrequency},
-    Row{setting::kRfLevel},
-    Row{setting::kAudioFrequency},
+    Row{setting::kRfFrequency, Judged::Carrier},
+    Row{setting::kRfLevel, Judged::Carrier},
+    Row{setting::kAudioFrequency, Judged::Carrier},
 };
 
 std::optional<std::string> wrongPhase(const std::string& stored) {
@@ -89,6 +90,8 @@ std::optional<std::string> wrong(const Row& row, const std::string& stored, cons
     switch (row.judged) {
         case Judged::AsStored:
         case Judged::Required:
+            return wrongValue(key, stored, {.quotes = corrections.quotes});
+        case Judged::Carrier:
             return wrongValue(key, stored, corrections);
         case Judged::Impedance:
             return stored == "0" ? std::nullopt : wrongValue(key, stored);

@@ -18,8 +18,8 @@ struct Carrier {
     bool everOpened = false;     ///< an opening has begun; those after it leave the output where that is corrected
 
     void load(const Profile& profile);
-    /// Adds the part of the data set: frequency and level.
-    void appendSteps(Steps& steps) const;
+    /// Adds the part of the data set: frequency and level. What is no number is left out where numbers are checked.
+    void appendSteps(Steps& steps, const Corrections& corrections = {}) const;
     /// Adds what the opening of a session sends after the data set: the output turned over (or as it stands), the
     /// audio generator.
     void appendOpeningSteps(Steps& steps, const Corrections& corrections = {}) const;

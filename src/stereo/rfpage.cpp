@@ -86,15 +86,27 @@ void RfPage::enter(const Value& value) {
     const std::string lowest = value.lowest != nullptr ? m_with.profile.read(*value.lowest) : kLowestLevel;
     const std::string highest = value.highest != nullptr ? m_with.profile.read(*value.highest) : kHighestLevel;
     QString answer = toText(m_with.profile.read(value.setting.place));
+    QString why;
     do {
         // What was typed stays in the box, so that it can be corrected.
-        answer = m_with.dialogs.input(caption({value.prompt}), caption({value.prompt + 1}), answer);
+        answer = m_with.dialogs.input(caption({value.prompt}) + why, caption({value.prompt + 1}), answer);
         if (answer.isEmpty()) return;
-    } while (!liesBetween(toBytes(answer), lowest, highest));
+        if (m_with.state.corrections.decimalComma) why = checked(answer, lowest, highest);
+    } while (!why.isEmpty() || !liesBetween(toBytes(answer), lowest, highest));
     showValue(value, answer);
     m_with.params.SendParam(value.setting.sendKey, toBytes(answer));
     // What is not kept is gone with the next opening, which sends what data set 1 holds.
     if (m_with.state.corrections.rfValues) m_with.profile.write(value.setting.place, toBytes(answer));
+}
+
+/// Makes the answer the number that it is. @returns why it is refused, to follow the question; "" when it is not.
+QString RfPage::checked(QString& answer, const std::string& lowest, const std::string& highest) const {
+    const auto number = decimalNumber(toBytes(answer));
+    if (!number) return QLatin1Char('\n') + caption({633, "%1 ist keine Zahl."}).arg(answer);
+    answer = toText(*number);
+    if (liesBetween(*number, lowest, highest)) return {};
+    return QLatin1Char('\n') +
+           caption({634, "%1 liegt nicht zwischen %2 und %3."}).arg(answer, toText(lowest), toText(highest));
 }
 
 void RfPage::showValue(const Value& value, const QString& text) {

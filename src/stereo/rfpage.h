@@ -46,6 +46,7 @@ private:
                      void (RfPage::*handler)());
     void arrange();
     void enter(const Value& value);
+    [[nodiscard]] QString checked(QString& answer, const std::string& lowest, const std::string& highest) const;
     void showValue(const Value& value, const QString& text);
     void showOutput(bool on);
     [[nodiscard]] std::array<Value*, 3> values() {

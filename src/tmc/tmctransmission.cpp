@@ -1,5 +1,7 @@
 #include "tmc/tmctransmission.h"
 
+#include "settings/programstate.h"
+#include "settings/storedvalue.h"
 #include "tmc/groupcode.h"
 #include "tmc/messagedelegate.h"
 #include "tmc/messagelist.h"
@@ -82,6 +84,8 @@ void TmcTransmission::TMC_Senden_Taste_Click() {
 }
 
 bool TmcTransmission::setInterval() {
+    const auto number = decimalNumber(toBytes(txtCycleTime->text()));
+    if (m_with.state.corrections.decimalComma && number) txtCycleTime->setText(toText(*number));
     try {
         TMC_Sende_Timer->setPeriod(cycleTimeMs(toBytes(txtCycleTime->text())));
         return true;

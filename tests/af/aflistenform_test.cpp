@@ -335,6 +335,39 @@ TEST_F(EditorTest, ATunedFrequencyWithACommaGetsTheCommaMessageWhateverItsValue)
     EXPECT_EQ(text("AF_TN"), "87.6");
 }
 
+TEST_F(EditorTest, ADecimalCommaIsAPointWhereThatIsCorrected) {
+    state.corrections.decimalComma = true;
+    dialogs.inputs = {QStringLiteral("98,5")};
+    open();
+    clickTuned();
+    EXPECT_EQ(text("AF_TN"), "98.5");
+    type("Text2", "87,6");
+    click("Command1");
+    EXPECT_EQ(text("Text2"), "87.6");
+    selectRow(0);
+    type("Text2", "90,1");
+    click("AF_OF_add");
+    EXPECT_EQ(rows(), (Lines{"90.1", "90.1", "94.3", "87.6"}));
+    click("Uebernahme_Knopf");
+    EXPECT_EQ(profile(kSet1, "RDS", "AF_LISTE1"), "98.5,90.1,90.1,94.3,87.6");
+}
+
+TEST_F(EditorTest, WhatIsNoNumberIsRefusedWhereThatIsCorrected) {
+    state.corrections.decimalComma = true;
+    dialogs.inputs = {QStringLiteral("98,5x"), QStringLiteral("120,5"), QString()};
+    dialogs.expectedMessages = 4;
+    open();
+    clickTuned();
+    EXPECT_EQ(dialogs.shown[2].preset, QStringLiteral("98,5x"));
+    EXPECT_EQ(dialogs.shown[4].preset, QStringLiteral("120.5"));
+    for (const char* refused : {"90.1 MHz", "87,4"}) {
+        type("Text2", refused);
+        click("Command1");
+    }
+    for (const std::size_t box : {1U, 3U, 5U, 6U}) expectRefusal(box, 164);
+    EXPECT_EQ(rows(), (Lines{"90.1", "94.3"}));
+}
+
 TEST_F(EditorTest, EveryCaptionFitsInEveryLanguage) {
     for (const char* language : {"deutsch", "english", "english US"}) {
         useLanguage(language);

@@ -63,6 +63,20 @@ class Corrected(ctl_test.Ctl):
                 self.correct("HF_Ausgang")
             self.assertIn(":OUTPUT:STAT ON", self.sent("apply", "--data-set", "1"))
 
+    def testADecimalCommaIsAPoint(self):
+        run = self.simulated("send", "HF-Frequenz=98,7", expect=WRONG_CALL)
+        self.assertIn("it has a decimal comma", run.stderr)
+        file = self.scenario('{send: {HF-Frequenz: "98,7"}}')
+        self.simulated("play", file, expect=WRONG_CALL)
+        self.change("Datenset1.INI", "VRN", "HF_Frequenz", "98,7")
+        self.simulated("apply", "--data-set", "1", expect=WRONG_CALL)
+        self.correct("Komma")
+        self.assertEqual(self.sent("send", "HF-Frequenz=98,7", "AF1=N,98.7,90.1"),
+                         ["FREQ 98.7MHZ", ':STEREO:DIRECT "AF=N,98.7,90.1"'])
+        self.assertEqual(self.sent("play", file), ["FREQ 98.7MHZ"])
+        self.assertIn("FREQ 98.7MHZ", self.sent("apply", "--data-set", "1"))
+        self.simulated("send", "HF-Frequenz=98,7x", expect=WRONG_CALL)
+        self.simulated("send", "HF-Frequenz=1.000,5", expect=WRONG_CALL)
 
     def testAQuoteGoesOutDoubled(self):
         self.change("Datenset1.INI", "RDS", "RTA", 'sag "ja" x')

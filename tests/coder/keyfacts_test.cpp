@@ -130,6 +130,21 @@ TEST(WrongValueTest, NamesKeyValueAndTheLegalRange) {
     EXPECT_EQ(wrongValue("ARI-BK", "G"), "ARI-BK cannot be \"G\". Legal: A, B, C, D, E or F.");
 }
 
+TEST(WrongValueTest, WhatIsCorrectedOnTheWayIsNotWrong) {
+    const Corrections all{.decimalComma = true, .quotes = true};
+    for (const auto& [key, value] : {std::pair("HF-Frequenz", "98,7"), std::pair("PS", "A\"B")}) {
+        EXPECT_NE(wrongValue(key, value), std::nullopt);
+        EXPECT_EQ(wrongValue(key, value, all), std::nullopt);
+    }
+    for (const auto& [key, value] : {std::pair("HF-Frequenz", "2000,5"), std::pair("HF-Frequenz", "1,0,0"),
+                                     std::pair("PTY", "1,0"), std::pair("PS", "\"12345678")}) {
+        EXPECT_NE(wrongValue(key, value, all), std::nullopt) << key << "=" << value;
+    }
+    EXPECT_EQ(correctedValue("HF-Frequenz", "98,7", all), "98.7");
+    EXPECT_EQ(correctedValue("HF-Frequenz", "98,7", {}), "98,7");
+    for (const char* key : {"AF1", "PS", "TMC", "XY"}) EXPECT_EQ(correctedValue(key, "98,7", all), "98,7") << key;
+}
+
 TEST(RdsCodeTest, FollowsTheBasicCharacterSet) {
     EXPECT_EQ(rdsCode('A'), 0x41);
     EXPECT_EQ(rdsCode('$'), 0xAB);

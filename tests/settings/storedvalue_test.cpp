@@ -61,6 +61,17 @@ TEST(QuotedWhereNeeded, KeepsWhatReadingWouldTakeOff) {
     }
 }
 
+TEST(DecimalNumber, TakesACommaForAPointAndNothingElse) {
+    for (const auto& [text, number] : {std::pair("98,7", "98.7"), std::pair("98.7", "98.7"), std::pair(" 60 ", "60"),
+                                       std::pair("-0,5", "-0.5"), std::pair("+1", "+1")}) {
+        EXPECT_EQ(decimalNumber(text), number);
+    }
+    for (const char* none :
+         {"", " ", "abc", "98.7x", "1.000,5", "1,2,3", "1e3", ",5", "5,", "--1", "0x10", "1 000", "inf"}) {
+        EXPECT_EQ(decimalNumber(none), std::nullopt) << none;
+    }
+}
+
 TEST(StoredFlag, IsOnForAPlainOneOnly) {
     EXPECT_EQ(storedFlag("1"), "1");
     for (const char* off : {"", "0", "1.0", " 1", "x"}) EXPECT_EQ(storedFlag(off), "0") << off;

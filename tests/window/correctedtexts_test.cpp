@@ -66,6 +66,69 @@ TEST_F(CorrectedTextsTest, AnUnknownTypeIsNotSentWhenCorrected) {
     }
 }
 
+TEST_F(CorrectedTextsTest, ADecimalCommaGoesOutAsTypedAsDescribed) {
+    openWith({});
+    answer({"98,7"});
+    clickLabel("Input_HF_Freq_Label");
+    EXPECT_EQ(sent(), Lines{"FREQ 98,7MHZ"});
+    EXPECT_EQ(text("Input_HF_Freq_Label"), "98,7");
+    answer({"abc", "98.7x"});
+    clickLabel("Input_HF_Freq_Label");
+    EXPECT_EQ(sent(), Lines{"FREQ 98.7xMHZ"});
+}
+
+TEST_F(CorrectedTextsTest, ADecimalCommaIsTakenForAPointWhenCorrected) {
+    openWith({"Komma"});
+    answer({"98,7"});
+    clickLabel("Input_HF_Freq_Label");
+    EXPECT_EQ(sent(), Lines{"FREQ 98.7MHZ"});
+    EXPECT_EQ(text("Input_HF_Freq_Label"), "98.7");
+    EXPECT_EQ(text("Status_17"), "98.7");
+    answer({" 2,25 "});
+    clickLabel("Input_AF_Freq_Label");
+    EXPECT_EQ(sent(), Lines{":STEREO:AUDIO:FREQ 2.25KHZ"});
+}
+
+TEST_F(CorrectedTextsTest, ARefusalSaysWhyInTheBoxThatAsksAgainWhenCorrected) {
+    openWith({"Komma"});
+    answer({"98.7x", "120,5", "60,5"});
+    clickLabel("Input_HF_Pegel_Label");
+    EXPECT_EQ(sent(), Lines{":POW 60.5DBUV"});
+    const auto& boxes = dialogs.shown;
+    ASSERT_EQ(boxes.size(), 3U);
+    const QString question = boxes[0].text;
+    EXPECT_EQ(boxes[1].text, question + QStringLiteral("\n98.7x ist keine Zahl."));
+    EXPECT_EQ(boxes[1].preset, QStringLiteral("98.7x"));
+    EXPECT_EQ(boxes[2].text, question + QStringLiteral("\n120.5 liegt nicht zwischen 0 und 120."));
+    EXPECT_EQ(boxes[2].preset, QStringLiteral("120.5"));
+}
+
+TEST_F(CorrectedTextsTest, AStoredDecimalCommaGoesOutAsAPointWhenCorrected) {
+    setDataSet1("VRN", "HF_Frequenz", "98,7");
+    setDataSet1("VRN", "HF_Pegel", "laut");
+    EXPECT_EQ(beginning(openWith({}), "FREQ"), Lines{"FREQ 98,7MHZ"});
+    const Lines corrected = openWith({"Komma"});
+    EXPECT_EQ(beginning(corrected, "FREQ"), Lines{"FREQ 98.7MHZ"});
+    EXPECT_EQ(beginning(corrected, ":POW"), Lines{}) << "no number";
+    EXPECT_EQ(text("Input_HF_Freq_Label"), "98.7");
+    EXPECT_EQ(beginning(sentBy("Btn_SetRdsStereo"), "FREQ"), Lines{"FREQ 98.7MHZ"});
+}
+
+TEST_F(CorrectedTextsTest, TheCycleTimeTakesADecimalCommaWhenCorrected) {
+    for (const bool corrected : {false, true}) {
+        if (corrected) {
+            openWith({"Komma"});
+        } else {
+            openWith({});
+        }
+        click("TMC_Gr8_apply");
+        type("txtCycleTime", "1,5");
+        click("TMC_Senden_Taste");
+        EXPECT_EQ(find<QTimer>("TMC_Sende_Timer")->interval(), corrected ? 1500 : 1000);
+        EXPECT_EQ(text("txtCycleTime"), corrected ? "1.5" : "1,5");
+    }
+}
+
 TEST_F(CorrectedTextsTest, AQuoteGoesOutAsTypedAsDescribed) {
     openWith({});
     type("PS_T", "A\"B");

@@ -101,7 +101,8 @@ int send(Laboratory& laboratory, const Send& what) {
     for (const auto& [key, value] : settings) {
         // Commands about the other network are led by the one that was sent last.
         if (key == setting::kEonPi.sendKey) laboratory.state().eonIdentifier = value;
-        if (laboratory.goesOn()) session.params.SendParam(key, std::string(value));
+        if (laboratory.goesOn())
+            session.params.SendParam(key, correctedValue(key, value, laboratory.state().corrections));
     }
     for (const std::string& command : what.raw) sendAsItStands(laboratory, line(command));
     for (const std::string& command : what.coder) sendAsItStands(laboratory, forTheCoder(laboratory, command));
