@@ -258,6 +258,12 @@ const std::vector<KeyFacts>& keyFacts() {
     return all;
 }
 
+const KeyFacts* factsOf(std::string_view key) {
+    const auto& all = keyFacts();
+    const auto found = std::find_if(all.begin(), all.end(), [key](const KeyFacts& facts) { return facts.key == key; });
+    return found == all.end() ? nullptr : &*found;
+}
+
 std::optional<std::string> wrongValue(std::string_view key, std::string_view value) {
     const Row* const row = rowOf(key);
     if (row == nullptr) return noSuchKey(key);

@@ -196,10 +196,7 @@ void addAir(CLI::App& app, Task& task) {
     command->footer(
         "Without a data set the instrument is as after switching on.\n"
         "Example: kdx-ctl air --data-set 2 --seconds 10 --groups - --mpx multiplex.wav");
-    command->callback([what, command, &task] {
-        what->appliesSource = command->count("--data-set") + command->count("--file") > 0;
-        task = [what](Laboratory& laboratory) { return onAir(laboratory, *what); };
-    });
+    command->callback([what, &task] { task = [what](Laboratory& laboratory) { return onAir(laboratory, *what); }; });
 }
 
 }  // namespace kdx::ctl
