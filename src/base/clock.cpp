@@ -44,7 +44,7 @@ std::string timeText(const Clock& clock) {
 }
 
 std::string timeText(std::chrono::seconds sinceMidnight) {
-    const auto seconds = static_cast<int>(sinceMidnight.count() % (24 * 3600));
+    const auto seconds = static_cast<int>((sinceMidnight % std::chrono::days(1)).count());
     return twoDigits(seconds / 3600) + ":" + twoDigits(seconds / 60 % 60) + ":" + twoDigits(seconds % 60);
 }
 
