@@ -23,6 +23,7 @@ class TextDisplay final : public QLabel {
 public:
     explicit TextDisplay(QWidget* parent);
     [[nodiscard]] QSize sizeHint() const override;
+    [[nodiscard]] int heightForWidth(int /*width*/) const override { return sizeHint().height(); }
     [[nodiscard]] QSize minimumSizeHint() const override { return sizeHint(); }
 
 protected:

@@ -93,7 +93,7 @@ void OnAirView::arrange() {
         column({note, {columns, 1}, row({Air_Gruppen_Sichern, Air_MPX_Sichern, Air_Kopieren, kRoom, Air_Schliessen})}),
         6);
     // In letters, so that it is the same on every display.
-    resize(fontMetrics().averageCharWidth() * 150, fontMetrics().height() * 46);
+    resize(fontMetrics().averageCharWidth() * 150, fontMetrics().height() * 50);
 }
 
 void OnAirView::label() {

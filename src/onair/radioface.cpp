@@ -62,8 +62,10 @@ RadioFace::RadioFace(const PageContext& with, QWidget* parent) : QGroupBox(paren
                     : i == Radiotext ? static_cast<QLabel*>(new TextDisplay(this))
                                      : new QLabel(this);
         row.value->setObjectName(name);
-        if (i != Ps && i != Radiotext)
+        if (i != Ps && i != Radiotext) {
             row.value->setTextInteractionFlags(Qt::TextSelectableByMouse | Qt::TextSelectableByKeyboard);
+            row.value->setFocusPolicy(Qt::StrongFocus);
+        }
         m_book.spokenAs(row.value, row.heading);
         row.sign = new QLabel(this);
         row.sign->setObjectName(name + QStringLiteral("_Zeichen"));

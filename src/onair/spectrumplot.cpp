@@ -72,6 +72,7 @@ void SpectrumPlot::drawScales(QPainter& painter, const QRect& room) const {
         const int y = qRound(placeOf(decibel, kHighestDecibel, Spectrum::kLowestDecibel, room.top(), room.bottom()));
         painter.setPen(lines);
         painter.drawLine(room.left(), y, room.right(), y);
+        if (decibel == static_cast<int>(Spectrum::kLowestDecibel)) continue;  // its place is the other scale's
         painter.setPen(letters);
         const QString text = decibel == 0 ? QStringLiteral("0 dB") : QString::number(decibel);
         painter.drawText(QRect(0, y - height / 2, room.left() - 4, height), Qt::AlignRight | Qt::AlignVCenter, text);

@@ -57,6 +57,9 @@ QTableWidget* newTable(const char* name, int columns, int stretched, QWidget* pa
     table->horizontalHeader()->setSectionResizeMode(stretched, QHeaderView::Stretch);
     table->horizontalHeader()->setDefaultAlignment(Qt::AlignLeft | Qt::AlignVCenter);
     table->horizontalHeader()->setHighlightSections(false);
+    // What is wrapped needs other heights when its column gets another width.
+    QObject::connect(table->horizontalHeader(), &QHeaderView::sectionResized, table,
+                     &QTableWidget::resizeRowsToContents, Qt::QueuedConnection);
     return table;
 }
 
