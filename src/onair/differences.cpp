@@ -38,7 +38,7 @@ std::optional<Difference> ofText(Row row, const std::string& entry, std::string_
 }
 
 std::optional<Difference> ofPs(const std::string& entry, std::string_view sent) {
-    const auto difference = ofText(Row::Ps, entry, sent, kPsLength);
+    auto difference = ofText(Row::Ps, entry, sent, kPsLength);
     if (difference || entry.size() == kPsLength) return difference;
     return Difference{Row::Ps, Why::Padded, entry};
 }
