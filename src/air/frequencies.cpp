@@ -128,19 +128,18 @@ std::vector<std::uint16_t> mappedPairs(const sim::AfLists& lists, const std::str
 
 void AlternativeFrequencies::take(const sim::AfLists& lists, Warnings& warnings) {
     std::vector<std::uint16_t> pairs;
+    m_lengths.clear();
     for (std::size_t index = 0; index < sim::AfLists::kCount; ++index) {
         const auto list = frequenciesOf(lists.list(index));
         const auto append = isMethodB(list) ? appendMethodB : appendMethodA;
+        const std::size_t before = pairs.size();
         append(pairs, list, numbered("AF", index), warnings);
+        if (pairs.size() > before) m_lengths.push_back(pairs.size() - before);
     }
     if (pairs.empty()) pairs.push_back(kNoLists);
     if (pairs == m_pairs) return;
     m_pairs = std::move(pairs);
     m_next = 0;
-}
-
-std::size_t AlternativeFrequencies::size() const {
-    return m_pairs == std::vector{kNoLists} ? 0 : m_pairs.size();
 }
 
 std::uint16_t AlternativeFrequencies::next() {

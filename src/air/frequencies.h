@@ -32,13 +32,14 @@ inline constexpr std::size_t kMostFrequencies = 25;
 class AlternativeFrequencies {
 public:
     void take(const sim::AfLists& lists, Warnings& warnings);
-    /// Groups that all of the lists take; 0 without any.
-    [[nodiscard]] std::size_t size() const;
+    /// Groups that each of the lists takes.
+    [[nodiscard]] const std::vector<std::size_t>& lengths() const { return m_lengths; }
     /// Block 3 of the next group.
     [[nodiscard]] std::uint16_t next();
 
 private:
     std::vector<std::uint16_t> m_pairs;
+    std::vector<std::size_t> m_lengths;
     std::size_t m_next = 0;
 };
 

@@ -105,7 +105,7 @@ void Reckoning::addShares(GroupBudget& budget) const {
 bool Reckoning::isSet(What what) const {
     switch (what) {
         case What::AfLists:
-            return m_frequencies.size() > 0;
+            return !m_frequencies.lengths().empty();
         case What::Radiotext:
             return !m_radiotext.empty();
         case What::Networks:
@@ -124,11 +124,11 @@ std::optional<Wait> Reckoning::waitFor(What what) const {
         case What::Ps:
             return Places(m_ring, {GroupType::Basic0A, GroupType::Basic0B}).waitFor(kPsSegments);
         case What::AfLists:
-            return Places(m_ring, {GroupType::Basic0A}).waitFor(m_frequencies.size());
+            return Places(m_ring, {GroupType::Basic0A}).waitForLists(m_frequencies.lengths());
         case What::Radiotext:
             return radiotextWait(m_ring, m_radiotext.segments(kCharactersOf2A), m_radiotext.segments(kCharactersOf2B));
         case What::Networks:
-            return Places(m_ring, {GroupType::Networks14A}).waitFor(m_networks.parts());
+            return Places(m_ring, {GroupType::Networks14A}).waitForLists(m_networks.lengths());
         case What::TrafficMessage:
             return trafficWait();
         case What::Ta:

@@ -66,6 +66,33 @@ std::optional<Wait> Places::waitFor(std::size_t count) const {
     return waitOver(groups);
 }
 
+std::optional<Wait> Places::waitForLists(const std::vector<std::size_t>& lengths) const {
+    const std::size_t parts = std::accumulate(lengths.begin(), lengths.end(), std::size_t{0});
+    if (empty() || parts == 0) return std::nullopt;
+    std::vector<std::size_t> needed;  // parts that a radio needs which hears from this one on
+    for (std::size_t part = 0; part < parts; ++part) {
+        std::size_t begin = 0;
+        std::size_t most = 0;
+        for (const std::size_t length : lengths) {
+            most = std::max(most, (begin + parts - part) % parts + length);
+            begin += length;
+        }
+        needed.push_back(most);
+    }
+    // The ring begins with another part each time it comes round, until it begins with the first one again.
+    std::vector<std::size_t> groups;
+    std::size_t part = 0;
+    do {
+        std::size_t next = part;
+        for (std::size_t slot = 0; slot < m_ringSize; ++slot) {
+            groups.push_back(groupsUntil(slot, needed[next]));
+            if (std::binary_search(m_places.begin(), m_places.end(), slot)) next = (next + 1) % parts;
+        }
+        part = next;
+    } while (part != 0);
+    return waitOver(groups);
+}
+
 std::optional<Wait> radiotextWait(const std::vector<GroupType>& ring, std::size_t segmentsOf2A,
                                   std::size_t segmentsOf2B) {
     const std::vector<Carried> period = periodOf(ring, segmentsOf2A, segmentsOf2B);

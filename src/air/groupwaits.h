@@ -31,6 +31,9 @@ public:
     /// The wait for so many of them: what is sent in so many parts, in turn, is whole then. Nothing when there are
     /// none.
     [[nodiscard]] std::optional<Wait> waitFor(std::size_t count) const;
+    /// The wait for lists of so many parts each, which are sent one after the other and then again: of a list nothing
+    /// is understood before its first part, which counts the others.
+    [[nodiscard]] std::optional<Wait> waitForLists(const std::vector<std::size_t>& lengths) const;
 
 private:
     std::size_t m_ringSize;

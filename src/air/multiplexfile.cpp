@@ -47,6 +47,10 @@ void MultiplexFile::goOn(const OnAir& sent, const sim::InstrumentSettings& setti
     }
 }
 
+void MultiplexFile::keepReadable() {
+    if (m_good) sf_command(m_file.get(), SFC_UPDATE_HEADER_NOW, nullptr, 0);
+}
+
 bool MultiplexFile::close() {
     m_file.reset();
     return m_good;

@@ -25,6 +25,8 @@ public:
     void add(const OnAir& sent, const sim::InstrumentSettings& settings);
     /// Goes on with that until the time is over that is asked for, which was not before now.
     void goOn(const OnAir& sent, const sim::InstrumentSettings& settings, Ticks length);
+    /// From here on the file can be read as far as it is written, also when the program is killed.
+    void keepReadable();
     /// False once something could not be written.
     [[nodiscard]] bool good() const { return m_good; }
     [[nodiscard]] std::int64_t samples() const { return m_written; }

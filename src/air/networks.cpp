@@ -28,6 +28,7 @@ constexpr unsigned kPtyPlace = 11;
 void Networks::take(const std::vector<sim::OtherNetwork>& networks, bool bursts, Warnings& warnings) {
     std::vector<Network> present;
     m_parts.clear();
+    m_lengths.clear();
     for (const sim::OtherNetwork& network : networks) {
         present.push_back({hexWord(network.pi), network.tp, network.ta});
         append(network, present.back().pi, warnings);
@@ -58,14 +59,20 @@ void Networks::follow(const std::vector<Network>& networks, bool bursts) {
 
 void Networks::append(const sim::OtherNetwork& network, std::uint16_t pi, Warnings& warnings) {
     const std::string name = "EON " + network.pi;
-    const auto add = [&](unsigned variant, std::uint16_t block3) {
+    const auto addPart = [&](unsigned variant, std::uint16_t block3) {
         m_parts.push_back({static_cast<std::uint8_t>((network.tp ? kTp : 0U) | variant), block3, pi});
+    };
+    const auto add = [&](unsigned variant, std::uint16_t block3) {
+        addPart(variant, block3);
+        m_lengths.push_back(1);
     };
     std::array<std::uint8_t, kPsLength> ps{};
     writeCodes(network.ps, ps, name + " PS", warnings);
     for (std::size_t i = 0; i < ps.size() / 2; ++i)
         add(static_cast<unsigned>(i), pairOf(ps.at(2 * i), ps.at(2 * i + 1)));
-    for (const std::uint16_t codes : methodA(network.methodA, name + " AF method A", warnings)) add(kMethodA, codes);
+    const auto list = methodA(network.methodA, name + " AF method A", warnings);
+    for (const std::uint16_t codes : list) addPart(kMethodA, codes);
+    if (!list.empty()) m_lengths.push_back(list.size());
     unsigned number = 0;
     for (const std::uint16_t pair : mappedPairs(network.lists, name + " AF", warnings))
         add(kFirstPair + number++ % kPairVariants, pair);

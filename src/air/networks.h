@@ -21,8 +21,8 @@ public:
     /// @param bursts whether a change of TA is announced at once.
     void take(const std::vector<sim::OtherNetwork>& networks, bool bursts, Warnings& warnings);
     [[nodiscard]] bool empty() const { return m_networks.empty(); }
-    /// Groups 14A that all of them take.
-    [[nodiscard]] std::size_t parts() const { return m_parts.size(); }
+    /// Groups 14A that each thing takes which is told of them: a list of method A several.
+    [[nodiscard]] const std::vector<std::size_t>& lengths() const { return m_lengths; }
 
     /// Of 14A: all of one network, then all of the next one.
     [[nodiscard]] Part nextOf14A();
@@ -48,6 +48,7 @@ private:
 
     std::vector<Network> m_networks;
     std::vector<Part> m_parts;
+    std::vector<std::size_t> m_lengths;
     std::vector<Burst> m_bursts;
     std::size_t m_nextPart = 0;
     std::size_t m_nextState = 0;

@@ -19,7 +19,7 @@ constexpr std::array<std::uint16_t, 26> kParity = {
     0b1110011111, 0b1100010011, 0b1101010101, 0b1101110110, 0b0110111011, 0b1000000001, 0b1111011100,
     0b0111101110, 0b0011110111, 0b1010100111, 0b1110001111, 0b1100011011};
 
-// The syndromes of the offset words (annex B, table B.1) and the places of their blocks.
+// The syndromes of the offset words (annex B) and the places of their blocks.
 struct Syndrome {
     std::uint16_t value;
     std::size_t place;

@@ -10,7 +10,7 @@ constexpr unsigned kTp = 0x10;
 constexpr unsigned kTaOf14B = 0x08;
 constexpr unsigned kVariant = 0x0F;
 
-// Variants of 14A (IEC 62106, 6.1.5.20, figure 28).
+// Variants of 14A (IEC 62106, 6.1.5.20).
 constexpr unsigned kLastOfPs = 3;
 constexpr unsigned kMethodA = 4;
 constexpr unsigned kFirstPair = 5;

@@ -10,12 +10,14 @@ namespace kdx::air {
 /// Hears of what cannot be sent as it was given, in words (UTF-8).
 using Warn = std::function<void(const std::string& text)>;
 
-/// Tells each thing once, however often settings are looked through.
+/// Tells each thing once, however often settings are looked through, and a thousand things at most.
 class Warnings {
 public:
     explicit Warnings(Warn warn) : m_warn(std::move(warn)) {}
     void add(const std::string& text) {
-        if (m_told.insert(text).second && m_warn) m_warn(text);
+        constexpr std::size_t kMost = 1000;  // whoever sends on and on what cannot go out is not heard for ever
+        if (m_told.size() > kMost || !m_told.insert(text).second || !m_warn) return;
+        m_warn(m_told.size() > kMost ? "further warnings are left out" : text);
     }
 
 private:

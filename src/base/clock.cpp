@@ -40,7 +40,11 @@ void SystemClock::sleep(std::chrono::nanoseconds duration) {
 }
 
 std::string timeText(const Clock& clock) {
-    const int seconds = static_cast<int>(clock.secondsSinceMidnight());
+    return timeText(std::chrono::seconds(static_cast<int>(clock.secondsSinceMidnight())));
+}
+
+std::string timeText(std::chrono::seconds sinceMidnight) {
+    const auto seconds = static_cast<int>((sinceMidnight % std::chrono::days(1)).count());
     return twoDigits(seconds / 3600) + ":" + twoDigits(seconds / 60 % 60) + ":" + twoDigits(seconds % 60);
 }
 

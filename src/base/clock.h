@@ -45,6 +45,8 @@ public:
 
 /// The clock's time of day as "hh:mm:ss".
 [[nodiscard]] std::string timeText(const Clock& clock);
+/// The same for a count of seconds since midnight, of the next day too.
+[[nodiscard]] std::string timeText(std::chrono::seconds sinceMidnight);
 
 /// Waits until the clock's seconds since midnight, held in single precision, have reached start + milliseconds / 1000.
 /// The rounding is the one the instrument's timing was tried out with. A target past midnight is never reached, since

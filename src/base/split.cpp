@@ -12,4 +12,10 @@ std::vector<std::string_view> split(std::string_view text, std::string_view sepa
     }
 }
 
+std::string joined(const std::vector<std::string>& texts, std::string_view separator) {
+    std::string text;
+    for (std::size_t i = 0; i < texts.size(); ++i) text.append(i == 0 ? "" : separator).append(texts[i]);
+    return text;
+}
+
 }  // namespace kdx

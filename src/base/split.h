@@ -1,5 +1,6 @@
 #pragma once
 
+#include <string>
 #include <string_view>
 #include <vector>
 
@@ -7,5 +8,8 @@ namespace kdx {
 
 /// The pieces of the text between the separators, empty ones too; one at least.
 [[nodiscard]] std::vector<std::string_view> split(std::string_view text, std::string_view separator);
+
+/// The texts with the separator between them.
+[[nodiscard]] std::string joined(const std::vector<std::string>& texts, std::string_view separator);
 
 }  // namespace kdx

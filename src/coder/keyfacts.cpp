@@ -260,6 +260,12 @@ const std::vector<KeyFacts>& keyFacts() {
     return all;
 }
 
+const KeyFacts* factsOf(std::string_view key) {
+    const auto& all = keyFacts();
+    const auto found = std::find_if(all.begin(), all.end(), [key](const KeyFacts& facts) { return facts.key == key; });
+    return found == all.end() ? nullptr : &*found;
+}
+
 std::string correctedValue(std::string_view key, const std::string& value, const Corrections& corrections) {
     const Row* const row = rowOf(key);
     if (!corrections.decimalComma || row == nullptr || row->kind != Kind::Number) return value;

@@ -20,6 +20,9 @@ struct KeyFacts {
 /// The facts of every key, in the order of the key table.
 [[nodiscard]] const std::vector<KeyFacts>& keyFacts();
 
+/// Those of one key; null for an unknown one.
+[[nodiscard]] const KeyFacts* factsOf(std::string_view key);
+
 /// Nothing when the instrument takes the value; else what is wrong in words, with the key, the value and what is legal.
 /// An unknown key is wrong too. Values are 8-bit Windows-1252; the sentence is UTF-8.
 /// @param corrections what they mend on the way to the instrument is not wrong.

@@ -69,6 +69,9 @@ public:
 
     /// Keys whose value went out last with a double quote in it.
     [[nodiscard]] const std::set<std::string>& quotedKeys() const { return m_quotedKeys; }
+    /// Hears of every command that is to be written, whether there is a session or not.
+    void onComposed(std::function<void(const std::string& command)> callback) { m_composed = std::move(callback); }
+
     /// Called whenever quotedKeys() changes.
     void onQuotedKeysChanged(std::function<void()> callback) { m_quotedKeysChanged = std::move(callback); }
 
@@ -81,6 +84,7 @@ private:
     std::function<void()> m_endProgram;
     std::set<std::string> m_quotedKeys;
     std::function<void()> m_quotedKeysChanged;
+    std::function<void(const std::string&)> m_composed;
 };
 
 }  // namespace kdx

@@ -23,7 +23,7 @@ void GroupSequence::load(const Profile& profile) {
 void GroupSequence::load(const Profile& profile, const Place& place) {
     groups = profile.read(place);
     composed = false;
-    cut = profile.holdsMore(place);
+    cut = groups.size() == kLongestValue && profile.holdsMore(place);  // looked up only where it can be
 }
 
 void GroupSequence::startAnew() {

@@ -4,6 +4,7 @@
 
 #include "base/clock.h"
 #include "base/numbers.h"
+#include "link/coderquestion.h"
 #include "link/commandsequence.h"
 #include "link/resource.h"
 #include "settings/captions.h"
@@ -83,6 +84,7 @@ std::optional<std::string> Instrument::ask(const std::string& question, bool may
         answer += piece.substr(0, static_cast<std::size_t>(LastRetCount));
     } while (LastVisaStatus == visa::kMaxCountReached && answer.size() < kLongestAnswer);
     answer = cutAtLineFeed(answer);
+    if (answer.ends_with('\r')) answer.pop_back();
     WriteLog("", "Answer ", answer);
     return answer;
 }
@@ -98,7 +100,7 @@ void Instrument::WriteLog(std::string_view key, std::string_view value, std::str
 
 std::string Instrument::X4_Abfrage(const std::string& label, const std::string& key) {
     if (m_sequenceStopped) return {};
-    Send2Gen(":STEREO:DIRECT? \"" + key + "\"");
+    Send2Gen(coderQuestion(key));
     WriteLog(label, ":STEREO:DIRECT? ", key);
     WaitMs(m_clock, kCommandPauseMs);
     const std::string answer = ReadFromGen();

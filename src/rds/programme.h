@@ -11,8 +11,9 @@ class Profile;
 
 /// The own programme's RDS data in a data set, each value as it is sent.
 struct Programme {
-    std::string pi;  ///< as typed, also while it has not been sent yet
-    std::string ps;  ///< at most kPsLength characters; not padded
+    std::string pi;       ///< as typed, also while it has not been sent yet
+    std::string ps;       ///< at most kPsLength characters; not padded
+    std::string psField;  ///< as typed, also what is too long to be sent
     std::string trafficProgramme = "0";
     std::string announcement = "0";
     std::string musicSpeech;  ///< "M" or "S"; "" where the data set says nothing

@@ -4,6 +4,7 @@
 #include "rds/dynamicps.h"
 #include "rds/rdspage.h"
 #include "rds/taframe.h"
+#include "settings/withoutcontrols.h"
 #include "ui/layouts.h"
 
 namespace kdx {
@@ -52,6 +53,8 @@ void RdsPage::create() {
 
 void RdsPage::createService() {
     PS_T = named<QLineEdit>("PS_T", this);
+    connect(PS_T, &QLineEdit::textChanged, this,
+            [this](const QString& text) { m_programme.psField = withoutControls(toBytes(text)); });
     PS_Label = heading("PS_Label", {393, "PS"}, PS_T);
     PS_Taste = sendButton("PS_Taste", " PS", PS_T, &RdsPage::PS_Taste_Click);
     PI_T = wired<QLineEdit>("PI_T", &QLineEdit::textChanged, &RdsPage::PI_T_Change, this);

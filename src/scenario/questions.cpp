@@ -5,6 +5,8 @@
 #include <string_view>
 #include <utility>
 
+#include "base/split.h"
+#include "link/coderquestion.h"
 #include "link/commandsequence.h"
 #include "scenario/decimal.h"
 
@@ -52,9 +54,9 @@ std::optional<Question> questionOf(const std::string& name, const std::string& e
 std::vector<QuestionFacts> allQuestions() {
     std::vector<QuestionFacts> all;
     for (const ReadBack& readBack : readBacks()) {
-        std::string parts;
-        for (const Query& query : readBack.queries("PI")) parts += (parts.empty() ? "" : ", ") + query.key;
-        all.push_back({readBack.name, readBack.queries({}).size(), readBack.meaning, parts});
+        std::vector<std::string> parts;
+        for (const Query& query : readBack.queries("PI")) parts.push_back(query.key);
+        all.push_back({readBack.name, parts.size(), readBack.meaning, joined(parts, ", ")});
     }
     for (const std::string_view name : kFurther) all.push_back({std::string(name), 1, {}, std::string(name)});
     for (const std::string_view name : kOfNetwork)
@@ -66,8 +68,7 @@ std::vector<std::string> ask(Instrument& instrument, const Question& question) {
     const CommandSequence sequence(instrument);
     std::vector<std::string> answers;
     for (const Query& query : question.queries) {
-        const std::string asked =
-            question.generator ? query.key + "?" : std::string(":STEREO:DIRECT? \"").append(query.key).append("\"");
+        const std::string asked = question.generator ? query.key + "?" : coderQuestion(query.key);
         answers.push_back(bareAnswer(instrument.ask(asked, false).value_or("")));
     }
     return answers;

@@ -34,8 +34,7 @@ std::string dateAndTime(const Clock& clock) {
     const int milliseconds = std::min(static_cast<int>(seconds * 1000 + 0.001), kLastOfDay);
     const int whole = milliseconds / 1000;
     return std::to_string(today.year) + "-" + twoDigits(today.month) + "-" + twoDigits(today.day) + " " +
-           twoDigits(whole / 3600) + ":" + twoDigits(whole / 60 % 60) + ":" + twoDigits(whole % 60) + "." +
-           rightmost("00" + std::to_string(milliseconds % 1000), 3);
+           timeText(std::chrono::seconds(whole)) + "." + rightmost("00" + std::to_string(milliseconds % 1000), 3);
 }
 
 std::string csvLine(const Row& row) {

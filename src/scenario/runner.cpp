@@ -6,6 +6,7 @@
 #include "af/settings.h"
 #include "base/codepage.h"
 #include "base/printable.h"
+#include "base/split.h"
 #include "scenario/questions.h"
 #include "settings/programstate.h"
 #include "station/session.h"
@@ -35,10 +36,10 @@ bool sets(const std::string& sent, const std::string& key) {
     return sent == key || (key.starts_with("AF") && sent.starts_with("AF"));
 }
 
-std::string joined(const std::vector<std::string>& values) {
-    std::string text;
-    for (std::size_t i = 0; i < values.size(); ++i) text += (i == 0 ? "" : ",") + shown(values[i]);
-    return text;
+std::string shown(const std::vector<std::string>& values) {
+    std::vector<std::string> texts;
+    for (const std::string& value : values) texts.push_back(shown(value));
+    return joined(texts, ",");
 }
 
 }  // namespace
@@ -242,7 +243,7 @@ Runner::Flow Runner::expect(const Action& action) {
     const Schedule::Time begin = m_with.clock.steadyNow();
     bool waited = false;
     for (const Action::Expectation& expectation : action.expected) {
-        Row row{{}, {}, expectation.name, joined(expectation.values), {}, {}, {}};
+        Row row{{}, {}, expectation.name, shown(expectation.values), {}, {}, {}};
         const Flow flow = askUntilMet(expectation, begin + action.time, row, waited);
         const bool cutOff = row.status == kNotMet && m_with.clock.steadyNow() < begin + action.time;
         if (cutOff) row.status = kCutOff;  // stopped: it might have been met yet
@@ -262,7 +263,7 @@ Runner::Flow Runner::askUntilMet(const Action::Expectation& expectation, Schedul
         m_questions.emplace();
         const auto answers = ask(m_with.session.instrument, question);
         row.command = *std::exchange(m_questions, std::nullopt);
-        row.answer = joined(answers);
+        row.answer = shown(answers);
         const bool met =
             std::equal(answers.begin(), answers.end(), expectation.values.begin(), expectation.values.end(), isAnswer);
         row.status = met ? kMet : kNotMet;

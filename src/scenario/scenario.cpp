@@ -2,6 +2,7 @@
 
 #include "base/codepage.h"
 #include "base/numbers.h"
+#include "base/split.h"
 
 namespace kdx::scenario {
 
@@ -10,12 +11,6 @@ namespace {
 std::string timeWords(std::chrono::milliseconds time) {
     if (time.count() % 1000 != 0 && time < std::chrono::seconds(1)) return std::to_string(time.count()) + " ms";
     return shortestDecimal(static_cast<double>(time.count()) / 1000) + " s";
-}
-
-std::string joined(const std::vector<std::string>& values) {
-    std::string text;
-    for (const std::string& value : values) text += (text.empty() ? "" : ",") + toUtf8(value);
-    return text;
 }
 
 }  // namespace
@@ -36,7 +31,7 @@ std::string describe(const Action& action) {
         case Action::Kind::Expect: {
             std::string text = "expect";
             for (const auto& [name, values] : action.expected)
-                text.append(" ").append(name).append("=" + joined(values));
+                text.append(" ").append(name).append("=" + toUtf8(joined(values, ",")));
             return action.time.count() == 0 ? text : text + " within " + timeWords(action.time);
         }
         case Action::Kind::Sweep:

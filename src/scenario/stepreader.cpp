@@ -3,6 +3,7 @@
 #include <array>
 #include <span>
 
+#include "base/numbers.h"
 #include "coder/keyfacts.h"
 #include "scenario/decimal.h"
 #include "scenario/questions.h"
@@ -54,15 +55,8 @@ std::vector<std::string_view> wordsBeside(const KindWord& kind) {
     return words;
 }
 
-bool isKey(std::string_view key) {
-    const auto& all = keyFacts();
-    return std::any_of(all.begin(), all.end(), [key](const KeyFacts& facts) { return facts.key == key; });
-}
-
-bool isNumericKey(std::string_view key) {
-    const auto& all = keyFacts();
-    return std::any_of(all.begin(), all.end(),
-                       [key](const KeyFacts& facts) { return facts.key == key && facts.isNumber; });
+std::string noSuchKey(const std::string& key) {
+    return "there is no key " + key + "; kdx-ctl list keys names them";
 }
 
 }  // namespace
@@ -147,8 +141,8 @@ bool StepReader::isNames(const YamlNode& node, std::string_view word, std::strin
 void StepReader::send(const YamlNode& map, Action& action) {
     if (!isNames(map, "send", "send: {PS: MESSTURM, TP: 1}")) return;
     for (const auto& [name, value] : map.members) {
-        if (!isKey(name.text)) {
-            m_values.wrong(name, "there is no key " + name.text + "; kdx-ctl list keys names them");
+        if (factsOf(name.text) == nullptr) {
+            m_values.wrong(name, noSuchKey(name.text));
         } else if (const auto legal = m_values.keyValue(value, name.text)) {
             action.settings.emplace_back(name.text, *legal);
         }
@@ -189,9 +183,10 @@ void StepReader::expectation(const std::string& name, const YamlNode& at, const 
 
 void StepReader::sweep(const YamlNode& node, const YamlNode& key, Action& action) {
     const auto name = m_values.text(key, "sweep");
-    if (name && !isKey(*name)) {
-        m_values.wrong(key, "there is no key " + *name + "; kdx-ctl list keys names them");
-    } else if (name && !isNumericKey(*name)) {
+    const KeyFacts* facts = name ? factsOf(*name) : nullptr;
+    if (name && facts == nullptr) {
+        m_values.wrong(key, noSuchKey(*name));
+    } else if (name && !facts->isNumber) {
         m_values.wrong(key, *name + " is no number that could be swept");
     } else if (name) {
         action.key = *name;
@@ -206,9 +201,8 @@ void StepReader::sweep(const YamlNode& node, const YamlNode& key, Action& action
 
 void StepReader::pointsOf(const YamlNode& node, Action& action) {
     const YamlNode* points = memberOf(node, "points");
-    const bool ranged = std::any_of(node.members.begin(), node.members.end(), [](const auto& member) {
-        return member.first.text == "from" || member.first.text == "to" || member.first.text == "step";
-    });
+    const bool ranged =
+        memberOf(node, "from") != nullptr || memberOf(node, "to") != nullptr || memberOf(node, "step") != nullptr;
     if (points == nullptr) {
         range(node, action);
     } else if (ranged) {
@@ -282,9 +276,7 @@ void StepReader::message(const YamlNode& code, Action& action) {
     const auto digits = m_values.text(code, "tmc");
     if (!digits) return;
     action.text = *digits;
-    const bool hexadecimal =
-        digits->size() == kGroupCodeLength && digits->find_first_not_of("0123456789abcdefABCDEF") == std::string::npos;
-    if (!hexadecimal || digits->front() > '1') {
+    if (digits->size() != kGroupCodeLength || !isHex(*digits) || digits->front() > '1') {
         m_values.wrong(code,
                        "tmc takes ten hexadecimal digits, the first 0 or 1, as 0B90E400CC; not \"" + *digits + "\"");
     }

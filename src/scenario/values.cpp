@@ -58,9 +58,8 @@ std::optional<std::string> Values::instrumentText(const YamlNode& node, std::str
 }
 
 std::optional<std::string> Values::keyValue(const YamlNode& node, const std::string& key) {
-    const auto& all = keyFacts();
-    const auto facts = std::find_if(all.begin(), all.end(), [&](const KeyFacts& f) { return f.key == key; });
-    const bool matters = facts == all.end() || !facts->range.empty();
+    const KeyFacts* facts = factsOf(key);
+    const bool matters = facts == nullptr || !facts->range.empty();
     if (!matters && node.kind == YamlNode::Kind::Nothing) return std::string();
     const auto value = instrumentText(node, key);
     if (!value || !isLegal(node, key, *value)) return std::nullopt;

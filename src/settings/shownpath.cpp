@@ -48,4 +48,14 @@ std::string shownPath(const std::filesystem::path& path) {
     return shown;
 }
 
+bool isSameFile(const std::filesystem::path& one, const std::filesystem::path& other) {
+    if (one.empty() || other.empty()) return false;
+    std::error_code error;
+    if (std::filesystem::equivalent(one, other, error)) return true;
+    const auto whole = [&error](const std::filesystem::path& path) {
+        return std::filesystem::weakly_canonical(std::filesystem::absolute(path, error), error);
+    };
+    return whole(one) == whole(other);
+}
+
 }  // namespace kdx

@@ -9,4 +9,7 @@ namespace kdx {
 /// hexadecimal digits, everything else as it is. Never throws: any name a disk can hold can be shown.
 [[nodiscard]] std::string shownPath(const std::filesystem::path& path);
 
+/// Whether two names are of one file, be it there already or not. Empty names are of none.
+[[nodiscard]] bool isSameFile(const std::filesystem::path& one, const std::filesystem::path& other);
+
 }  // namespace kdx

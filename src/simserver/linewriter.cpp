@@ -31,6 +31,7 @@ struct LineWriter::Shared {
     std::condition_variable changed;
     std::string waiting;
     std::size_t dropped = 0;  // since the last line that found room
+    bool works = true;        // once the reader has gone there is nothing left to do but to take the lines away
     bool ending = false;
     bool ended = false;
 
@@ -76,17 +77,23 @@ bool LineWriter::pass(std::string_view bytes) {
     return true;
 }
 
+bool LineWriter::isLost() const {
+    const std::lock_guard guard(m_shared->mutex);
+    return !m_shared->works;
+}
+
 void LineWriter::write(Shared& shared, int descriptor) {
-    bool works = true;  // once the reader has gone there is nothing left to do but to take the lines away
     std::unique_lock guard(shared.mutex);
     for (;;) {
         shared.changed.wait(guard, [&] { return shared.ending || !shared.waiting.empty(); });
         if (shared.ending) shared.sayWhatWasDropped();
         if (shared.waiting.empty()) break;
         const std::string bytes = std::exchange(shared.waiting, {});
+        if (!shared.works) continue;
         guard.unlock();
-        works = works && writeAll(descriptor, bytes);
+        const bool written = writeAll(descriptor, bytes);
         guard.lock();
+        shared.works = written;
     }
     shared.ended = true;
     shared.changed.notify_all();

@@ -24,6 +24,8 @@ public:
     void print(std::string_view line);
     /// Bytes that are no line. False when there is no room for them: they are dropped, and no line says so.
     [[nodiscard]] bool pass(std::string_view bytes);
+    /// Whether something could not be written: nothing is any more then.
+    [[nodiscard]] bool isLost() const;
 
 private:
     struct Shared;

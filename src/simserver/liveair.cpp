@@ -17,8 +17,10 @@ using std::chrono::steady_clock;
 constexpr std::string_view kStream = "-";
 // What comes later than this, as after a machine's sleep, is not made up for.
 constexpr std::chrono::seconds kLongestDelay{1};
-// A clock that was set differs by more from the time that the groups have come to.
-constexpr std::chrono::milliseconds kMostDifference{500};
+// A clock that was set, or runs at another pace, differs by more from the time that the groups have come to: the clock
+// group is to come within 0.1 s of its minute.
+constexpr std::chrono::milliseconds kMostDifference{30};
+constexpr int kGroupsOfASecond = 11;
 constexpr std::chrono::hours kNoEnd{24 * 365};
 constexpr std::size_t kMostWaitingSamples = std::size_t{4} * 1024 * 1024;  // bytes; some four seconds
 
@@ -91,7 +93,9 @@ void LiveAir::endGroup() {
 }
 
 void LiveAir::sendGroup() {
-    const air::AirTime began = air::airTimeOf(m_clock) - air::kGroupTime;
+    // What the clock showed when the group began, wherever this one is late.
+    const auto since = steady_clock::now() - endOf(m_groups);
+    const air::AirTime began = air::airTimeOf(m_clock) - std::chrono::round<air::Ticks>(since);
     if (std::chrono::abs(began - m_time) > kMostDifference) m_time = began;
     const air::OnAir sent = m_composer.next(m_time);
     m_time += air::kGroupTime;
@@ -101,7 +105,7 @@ void LiveAir::sendGroup() {
 
 void LiveAir::writeLine(const std::string& line) {
     if (m_places.groups == kStream) {
-        m_stream->print(line);
+        pass(line + "\n", m_places.groups, "the groups are");
     } else if (!(m_groupFile << line << std::endl)) {
         lost(m_places.groups);
     }
@@ -111,17 +115,26 @@ void LiveAir::writeSamples(const air::OnAir& sent) {
     const sim::InstrumentSettings& settings = m_instrument.transmission().settings;
     if (m_multiplexFile) {
         m_multiplexFile->add(sent, settings);
+        if (m_groups % kGroupsOfASecond == 0) m_multiplexFile->keepReadable();
         if (!m_multiplexFile->good()) lost(m_places.multiplex);
         return;
     }
     const auto bytes = std::as_bytes(m_multiplex->add(sent, settings));
-    if (m_stream->pass({reinterpret_cast<const char*>(bytes.data()), bytes.size()})) return;
-    if (std::exchange(m_tellsOfGaps, false)) m_tell("the multiplex is not read as fast as it is sent: it has gaps");
+    pass({reinterpret_cast<const char*>(bytes.data()), bytes.size()}, m_places.multiplex, "the multiplex is");
+}
+
+void LiveAir::pass(std::string_view bytes, std::string& place, const char* what) {
+    const bool hasRoom = m_stream->pass(bytes);
+    if (m_stream->isLost()) {
+        lost(place);
+    } else if (!hasRoom && std::exchange(m_tellsOfGaps, false)) {
+        m_tell(std::string(what) + " not read as fast as sent: there are gaps");
+    }
 }
 
 /// Tells it once; nothing goes there any more.
 void LiveAir::lost(std::string& place) {
-    m_tell(place + " cannot be written");
+    m_tell((place == kStream ? "the standard output" : place) + " cannot be written any more");
     place.clear();
 }
 

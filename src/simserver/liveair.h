@@ -7,6 +7,7 @@
 #include <optional>
 #include <span>
 #include <string>
+#include <string_view>
 
 #include "air/composer.h"
 #include "air/multiplexfile.h"
@@ -51,6 +52,7 @@ private:
     void sendGroup();
     void writeLine(const std::string& line);
     void writeSamples(const air::OnAir& sent);
+    void pass(std::string_view bytes, std::string& place, const char* what);
     void lost(std::string& place);
     /// When the group that is counted ends.
     [[nodiscard]] PollLoop::TimePoint endOf(std::int64_t groups) const;

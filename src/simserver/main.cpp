@@ -188,10 +188,12 @@ int serve(const Options& options) {
                                                         {{DEVICE_CORE, DEVICE_CORE_VERSION, server.corePort()},
                                                          {DEVICE_ASYNC, DEVICE_ASYNC_VERSION, server.abortPort()}},
                                                         options.server.bindAddress);
+    std::unique_ptr<kdx::simserver::LineWriter> problems;  // whoever does not read them holds nothing up
     std::optional<kdx::simserver::LiveAir> air;
     if (!options.air.groups.empty() || !options.air.multiplex.empty()) {
-        const auto tell = [](const std::string& problem) {
-            std::cerr << "kdx-sim: " << kdx::shownPath(problem) << std::endl;
+        problems = std::make_unique<kdx::simserver::LineWriter>(STDERR_FILENO);
+        const auto tell = [&problems](const std::string& problem) {
+            problems->print("kdx-sim: " + kdx::shownPath(problem));
         };
         air.emplace(server.loop(), instrument, clock, options.air, STDOUT_FILENO, tell);
         instrument.onExecuted([&air] { air->settingsChanged(); });
@@ -215,6 +217,10 @@ int run(int argc, char** argv) {
     }
     if (isOutputTaken(options) && (options.trace || options.air.groups == options.air.multiplex)) {
         std::cerr << "kdx-sim: only one of --trace, --groups - and --mpx - can have the standard output\n";
+        return kWrongUsage;
+    }
+    if (!options.air.groups.empty() && kdx::isSameFile(options.air.groups, options.air.multiplex)) {
+        std::cerr << "kdx-sim: --groups and --mpx name the same file\n";
         return kWrongUsage;
     }
     return serve(options);

@@ -12,6 +12,7 @@
 #include "coder/fieldsizes.h"
 #include "coder/keyfacts.h"
 #include "coder/sendparam.h"
+#include "link/coderquestion.h"
 #include "link/commandsequence.h"
 #include "sim/scpi.h"
 
@@ -110,7 +111,7 @@ bool isNumber(std::string_view text) {
 /// The answer as the row's key takes it.
 std::string valueOf(const Row& row, const std::string& answer) {
     std::string text = sim::unquoted(answer).value_or(answer);
-    text.erase(text.find_last_not_of(" \r") + 1);
+    text.erase(text.find_last_not_of(' ') + 1);
     switch (row.form) {
         case Form::Text:
             break;
@@ -142,9 +143,7 @@ class Questioner {
 public:
     explicit Questioner(Instrument& instrument) : m_instrument(instrument), m_name(instrument.ask(kName, false)) {}
 
-    std::optional<std::string> coder(const std::string& question) {
-        return ask(":STEREO:DIRECT? \"" + question + "\"");
-    }
+    std::optional<std::string> coder(const std::string& question) { return ask(coderQuestion(question)); }
     void read(const Row& row) {
         const std::string question(row.question);
         keep(row, {}, row.generator ? ask(question + "?") : coder(question));
@@ -355,9 +354,8 @@ std::string meaningOf(const std::string& key) {
     if (key == "RT_N") return "radiotext: how often, A/B flag";
     if (key == "FM") return "frequency modulation";
     if (key == "AM") return "amplitude modulation";
-    const auto& facts = keyFacts();
-    const auto found = std::find_if(facts.begin(), facts.end(), [&](const KeyFacts& f) { return f.key == key; });
-    return found == facts.end() ? std::string() : std::string(found->meaning);
+    const KeyFacts* facts = factsOf(key);
+    return facts == nullptr ? std::string() : std::string(facts->meaning);
 }
 
 }  // namespace kdx

@@ -19,6 +19,11 @@ public:
     virtual bool confirm(const QString& title, const QString& text) = 0;
     /// Asks for a text; an empty answer is given for Cancel too.
     virtual QString input(const QString& prompt, const QString& title, const QString& preset) = 0;
+    /// Asks for a file to write to, of a kind like "Text (*.txt)"; an empty answer is given for Cancel too. Nobody is
+    /// there to choose one unless the boxes can ask.
+    virtual QString fileToSave(const QString& /*title*/, const QString& /*preset*/, const QString& /*kind*/) {
+        return {};
+    }
 };
 
 }  // namespace kdx

@@ -1,6 +1,7 @@
 #include "ui/qtdialogs.h"
 
 #include <QApplication>
+#include <QFileDialog>
 #include <QInputDialog>
 #include <QMessageBox>
 #include <QPushButton>
@@ -75,6 +76,16 @@ QString QtDialogs::input(const QString& prompt, const QString& title, const QStr
     box.setOkButtonText(toText(m_captions.own(317, "OK")));
     box.setCancelButtonText(toText(m_captions.own(318, "Abbrechen")));
     return box.exec() == QDialog::Accepted ? withoutControls(box.textValue()) : QString();
+}
+
+QString QtDialogs::fileToSave(const QString& title, const QString& preset, const QString& kind) {
+    if (m_ending()) return {};
+    QFileDialog box(QApplication::activeWindow(), title, {}, kind);
+    box.setAcceptMode(QFileDialog::AcceptSave);
+    box.setLabelText(QFileDialog::Accept, toText(m_captions.own(789, "&Sichern")));
+    box.setLabelText(QFileDialog::Reject, toText(m_captions.own(318, "Abbrechen")));
+    box.selectFile(preset);
+    return box.exec() == QDialog::Accepted ? box.selectedFiles().value(0) : QString();
 }
 
 }  // namespace kdx

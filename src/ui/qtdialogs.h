@@ -20,6 +20,7 @@ public:
     bool messageOrStop(const QString& title, const QString& text) override;
     bool confirm(const QString& title, const QString& text) override;
     QString input(const QString& prompt, const QString& title, const QString& preset) override;
+    QString fileToSave(const QString& title, const QString& preset, const QString& kind) override;
 
 private:
     const Captions& m_captions;

@@ -6,22 +6,18 @@
 #include <QMouseEvent>
 #include <QPushButton>
 #include <QShortcut>
-#include <QStackedWidget>
 #include <QTabBar>
 #include <QTabWidget>
 #include <QTimer>
 
 #include <chrono>
-#include <filesystem>
 
 #include "base/codepage.h"
 #include "base/numbers.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
-#include "settings/folderlock.h"
 #include "settings/generalsettings.h"
 #include "settings/programstate.h"
-#include "settings/shownpath.h"
 #include "tmc/tmclistedit.h"
 #include "ui/controls.h"
 #include "ui/dialogs.h"
@@ -32,11 +28,12 @@
 #include "ui/text.h"
 #include "ui/ticker.h"
 #include "window/connectionbar.h"
-#include "window/logview.h"
 #include "window/mainmenu.h"
+#include "window/notes.h"
 #include "window/pages.h"
+#include "window/pagetabs.h"
 #include "window/progressline.h"
-#include "window/trafficlog.h"
+#include "window/views.h"
 
 namespace kdx {
 
@@ -48,18 +45,6 @@ constexpr int kFirstTabCaption = 10;
 constexpr std::chrono::seconds kRetryInterval{10};  // until what could not be saved is tried again
 constexpr QSize kDesignSize{640, 480};              // pixels at 96 dpi
 
-/// Tells its layout no sizes of its own: the window's size is stated, and asking all nine pages what they need takes a
-/// fifth of the whole start. That every page fits is the tests' concern.
-class PageTabs : public QTabWidget {
-public:
-    explicit PageTabs(QWidget* parent) : QTabWidget(parent) {
-        // Given a size, the stack of pages is not asked for its own at its first showing.
-        findChild<QStackedWidget*>()->resize(parent->size());
-    }
-    [[nodiscard]] QSize sizeHint() const override { return {}; }
-    [[nodiscard]] QSize minimumSizeHint() const override { return {}; }
-};
-
 }  // namespace
 
 HMenue::HMenue(const Surroundings& surroundings)
@@ -70,7 +55,7 @@ HMenue::HMenue(const Surroundings& surroundings)
                                                                   m_s.clock,           m_s.tickers} {
     setObjectName(QStringLiteral("HMenue"));
     setWindowIcon(QIcon(QStringLiteral(":/kdx-rds-64.png")));
-    m_trafficLog = new TrafficLog(m_s.session.instrument, m_s.clock, this);
+    m_views = std::make_unique<Views>(m_context, m_s.session.station, this);
     m_connection = new ConnectionBar(m_context, this);
     connect(m_connection, &ConnectionBar::openRequested, this, &HMenue::INIT_Taste_Click);
     // Every setting was stored when it changed: nothing is left to do at the end.
@@ -144,7 +129,8 @@ void HMenue::createMenu() {
     connect(m_connection, &ConnectionBar::interfaceShown, m_menu, &MainMenu::showInterface);
     connect(m_menu, &MainMenu::relabelRequested, this, &HMenue::Beschrifter);
     connect(m_menu, &MainMenu::listEditorRequested, this, &HMenue::Mnu_TMC_Edit_Click);
-    connect(m_menu, &MainMenu::logRequested, this, &HMenue::Mnu_Info_Log_Click);
+    connect(m_menu, &MainMenu::logRequested, this, [this] { m_views->openLog(); });
+    connect(m_menu, &MainMenu::onAirRequested, this, [this] { m_views->openOnAir(); });
 }
 
 void HMenue::arrange() {
@@ -220,8 +206,7 @@ void HMenue::Beschrifter() {
     SSTab1->setCurrentIndex(0);
     m_status->label(m_s.captions);
     for (Page* page : m_pages) page->label();
-    m_trafficLog->label(m_s.captions);
-    if (m_logView != nullptr) m_logView->label(m_s.captions);
+    m_views->label();
     showNotice();
 }
 
@@ -302,56 +287,12 @@ void HMenue::SSTab1_Click(int page) {
 void HMenue::Mnu_TMC_Edit_Click() {
     TMC_Listedit editor(m_context, this);
     editor.exec();
+    m_views->forgetTexts();
     emit listsEdited();
 }
 
-void HMenue::Mnu_Info_Log_Click() {
-    if (m_logView == nullptr) m_logView = new LogView(*m_trafficLog, m_s.captions, this);
-    m_logView->show();
-    m_logView->raise();
-    m_logView->activateWindow();
-}
-
 void HMenue::showNotice() {
-    m_lowerEdge->setNotice(notes().join(QStringLiteral("  -  ")));
-}
-
-QStringList HMenue::notes() const {
-    QStringList notes;
-    const auto note = [&](const Caption& caption, const QString& what = {}) {
-        const QString text = captionText(m_s.captions, caption);
-        notes += what.isEmpty() ? text : text.arg(what);
-    };
-    if (!m_s.dataProblem.isEmpty()) notes += m_s.dataProblem;
-    if (const QString missing = missingData(); !missing.isEmpty()) {
-        note({322, "Nicht gefunden: %1"}, missing);
-    } else if (!m_startNotice.isEmpty()) {
-        notes += m_startNotice;
-    }
-    QStringList unreadable;
-    if (const auto file = m_s.data.unreadableFile()) unreadable += toText(*file);
-    for (const PictureSwitch* button : findChildren<PictureSwitch*>()) unreadable += button->brokenPicture();
-    unreadable.removeAll(QString());
-    unreadable.removeDuplicates();
-    if (!unreadable.isEmpty()) note({325, "Nicht lesbar: %1"}, unreadable.join(QStringLiteral(", ")));
-    if (const auto unsaved = m_s.data.unsavedFile()) note({312, "Nicht gespeichert: %1"}, toText(*unsaved));
-    if (!m_s.session.instrument.log.isWritable()) note({312, "Nicht gespeichert: %1"}, toText(kCommandLog));
-    if (m_s.claim.isShared()) note({326, "Ein anderes Programm nutzt dieselben Daten"});
-    QStringList quoted;
-    for (const std::string& key : m_s.session.params.quotedKeys()) quoted += toText(key);
-    if (!quoted.isEmpty()) note({327, "Anführungszeichen beendet den Text: %1"}, quoted.join(QStringLiteral(", ")));
-    return notes;
-}
-
-QString HMenue::missingData() const {
-    const std::filesystem::path& folder = m_s.data.path();
-    std::error_code error;
-    if (!std::filesystem::is_directory(folder, error)) return QString::fromStdString(shownPath(folder));
-    // Missing, unreadable, garbage, or without this language: the captions are empty all the same.
-    if (m_s.captions.isEmpty()) {
-        return QStringLiteral("%1 [%2]").arg(QLatin1String(kLanguageFile), toText(m_s.state.language));
-    }
-    return {};
+    m_lowerEdge->setNotice(notes(m_s, *this, m_startNotice).join(QStringLiteral("  -  ")));
 }
 
 }  // namespace kdx

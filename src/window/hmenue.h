@@ -2,6 +2,7 @@
 
 #include <QMainWindow>
 
+#include <memory>
 #include <vector>
 
 #include "station/session.h"
@@ -15,12 +16,11 @@ class QTabWidget;
 namespace kdx {
 
 class ConnectionBar;
-class LogView;
 class MainMenu;
 class Page;
 class ProgressLine;
 class StatusRow;
-class TrafficLog;
+class Views;
 
 /// The one main window: owns the pages and what ties them together.
 class HMenue : public QMainWindow, private StepWatcher {
@@ -57,13 +57,10 @@ private:
     void arrange();
     void SSTab1_Click(int page);
     void Mnu_TMC_Edit_Click();
-    void Mnu_Info_Log_Click();
     void loadPages();
     void showSessionOpen(bool open);
     void watchPictures();
     void showNotice();
-    [[nodiscard]] QStringList notes() const;
-    [[nodiscard]] QString missingData() const;
     bool showInterfaceError(const std::string& text, bool sequenceRuns);
 
     Surroundings m_s;
@@ -77,8 +74,7 @@ private:
     ProgressLine* m_lowerEdge = nullptr;  // progress, and what the user should know
     QString m_startNotice;                // what start-up could not read
     MainMenu* m_menu = nullptr;
-    TrafficLog* m_trafficLog = nullptr;
-    LogView* m_logView = nullptr;
+    std::unique_ptr<Views> m_views;
 };
 
 }  // namespace kdx

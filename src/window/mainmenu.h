@@ -31,6 +31,7 @@ signals:
     void relabelRequested();
     void listEditorRequested();
     void logRequested();
+    void onAirRequested();
 
 private:
     void Mnu_Info_Interface_IEC_Click();
@@ -60,6 +61,7 @@ private:
     QAction* Mnu_Info_RS232 = nullptr;  // present without behaviour
     QAction* Mnu_TMC_Edit = nullptr;
     QAction* Mnu_Info_Log = nullptr;  // opens the live view of the commands
+    QAction* Mnu_Ansicht_OnAir = nullptr;
 };
 
 }  // namespace kdx

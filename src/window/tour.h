@@ -22,6 +22,7 @@ public:
     bool messageOrStop(const QString& title, const QString& text) override;
     bool confirm(const QString& title, const QString& text) override;
     QString input(const QString& prompt, const QString& title, const QString& preset) override;
+    QString fileToSave(const QString& title, const QString& preset, const QString& kind) override;
 
     [[nodiscard]] int count() const { return m_count; }
 

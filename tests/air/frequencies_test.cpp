@@ -126,5 +126,15 @@ TEST_F(Frequencies, ATunedOneWithoutACodeLeavesOutItsListOfMethodB) {
     EXPECT_EQ(warnings, (Groups{"AF list 2: the tuned frequency 86.0 MHz has no code, so the list is left out"}));
 }
 
+TEST(Warnings, WhatIsSentOnAndOnIsToldAThousandTimesAtMost) {
+    std::vector<std::string> told;
+    Warnings warnings([&told](const std::string& text) { told.push_back(text); });
+    for (int twice = 0; twice < 2; ++twice) {
+        for (int number = 0; number < 3000; ++number) warnings.add(std::to_string(number));
+    }
+    EXPECT_EQ(told.size(), 1001U);
+    EXPECT_EQ(told.back(), "further warnings are left out");
+}
+
 }  // namespace
 }  // namespace kdx::air

@@ -94,12 +94,14 @@ TEST_F(GroupBudgetTest, OfMixedRadiotextTellsWhetherItIsEverWhole) {
     EXPECT_THAT(budget().warnings, ElementsAre("2A and 2B in one sequence: their segments have different lengths"));
 }
 
-/// Four frequencies and their count take the pairs 228 + one, two, one + filler: three groups 0A, of each two one.
+/// Four frequencies and their count take the pairs 228 + one, two, one + filler: three groups 0A, from the count on. From
+/// the second pair on it takes five, from the third on four; with every other group 0A, 5, 9 or 7 groups from 0A on, and
+/// 10, 8 or 6 from 2A on.
 TEST_F(GroupBudgetTest, OfAfLists) {
     coder("AF=N,91.7,104.2,88.1,93.6");
-    expectWait(What::AfLists, 3.5, 4);
+    expectWait(What::AfLists, (3 + 5 + 4) / 3.0 + 0.5, 6);
     coder("RT=10,0,HELLO");
-    expectWait(What::AfLists, 6, 7);  // 5 from 0A on, 6 from 2A on
+    expectWait(What::AfLists, (5 + 9 + 7 + 10 + 8 + 6) / 6.0 + 0.5, 11);
     coder("GS=0B,2A");
     EXPECT_TRUE(item(What::AfLists).isSet);
     EXPECT_FALSE(item(What::AfLists).wait);

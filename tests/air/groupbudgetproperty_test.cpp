@@ -32,6 +32,30 @@ Radio collector(NameOf nameOfThing, std::size_t count) {
     };
 }
 
+/// Lists of method A: nothing is understood before the code that counts the frequencies.
+class ListHearer {
+public:
+    void take(std::uint16_t pair) {
+        const unsigned upper = pair >> 8U;
+        if (upper > 224 && upper < 250) {
+            m_list = pair;
+            m_left = upper - 225;
+        } else {
+            m_left -= std::min(m_left, 2U);
+        }
+        if (m_list && m_left == 0) {
+            m_whole.insert(*m_list);
+            m_list.reset();
+        }
+    }
+    [[nodiscard]] std::size_t whole() const { return m_whole.size(); }
+
+private:
+    std::optional<std::uint16_t> m_list;
+    unsigned m_left = 0;
+    std::set<std::uint16_t> m_whole;
+};
+
 /// What a coder that is set by chance sends, group by group, and what a radio makes of it: nothing here is reckoned.
 class GroupBudgetOnTheAir : public AirTest {
 protected:
@@ -86,14 +110,21 @@ protected:
             case What::Ps:
                 return collector([](const Group& g) { return typeOf(g) < 2 ? Name(lastBits(g, 3)) : Name(); }, 4);
             case What::AfLists:
-                return collectorOfAll(
-                    [](const Group& g) { return is(g, GroupType::Basic0A) ? Name(g.blocks[2]) : Name(); });
-            case What::Networks:
-                return collectorOfAll([](const Group& g) {
-                    if (!is(g, GroupType::Networks14A)) return Name();
+                return hearer([](const Group& g) { return is(g, GroupType::Basic0A); }, 1);
+            case What::Networks: {
+                const auto ofList = [](const Group& g) {
+                    return is(g, GroupType::Networks14A) && lastBits(g, 15) == 4;
+                };
+                const auto other = collectorOfAll([ofList](const Group& g) {
+                    if (!is(g, GroupType::Networks14A) || ofList(g)) return Name();
                     return Name(std::uint64_t{lastBits(g, 31)} << 32U | std::uint64_t{g.blocks[2]} << 16U |
                                 g.blocks[3]);
                 });
+                return [lists = hearer(ofList, 0), other](const Group& g) mutable {
+                    const bool isWhole = lists(g);
+                    return other(g) && isWhole;
+                };
+            }
             case What::Radiotext:
                 return radioForRadiotext();
             case What::TrafficMessage:
@@ -105,6 +136,18 @@ protected:
                 break;
         }
         return [](const Group& g) { return typeOf(g) < 2 || is(g, GroupType::Tuning15B); };
+    }
+    /// Waits for all lists that these groups carry, for so many at least.
+    template <typename Carries>
+    Radio hearer(Carries carries, std::size_t least) {
+        ListHearer all;
+        for (const Group& group : m_groups) {
+            if (carries(group)) all.take(group.blocks[2]);
+        }
+        return [carries, count = std::max(all.whole(), least), heard = ListHearer()](const Group& group) mutable {
+            if (carries(group)) heard.take(group.blocks[2]);
+            return heard.whole() >= count;
+        };
     }
     Radio radioForRadiotext() const {
         const std::size_t length = std::min<std::size_t>(m_text + 1, 64);

@@ -21,7 +21,7 @@ TEST_F(ReceivedProgramme, IsUnknownBeforeTheFirstGroup) {
 }
 
 TEST_F(ReceivedProgramme, ShowsThePsSegmentBySegment) {
-    // IEC 62106, 6.1.5.1, figure 12: 0A, segment in the last two bits, two characters in block 4.
+    // IEC 62106, 6.1.5.1: 0A, segment in the last two bits, two characters in block 4.
     hear("D3C2 0409 E0CD 444F");
     EXPECT_EQ(shown().psText(), "  DO    ");
     hear({"D3C2 0408 E0CD 5241", "D3C2 040B E0CD 2D35", "D3C2 040A E0CD 4920"});
@@ -98,7 +98,7 @@ TEST_F(ReceivedProgramme, StaysWhenAnotherPiCameOnlyOnce) {
 class ReceivedRadiotext : public ReceiverTest {};
 
 TEST_F(ReceivedRadiotext, EndsWithItsEndMark) {
-    // 6.1.5.3, figure 15: 2A, flag and segment in the last five bits, four characters.
+    // 6.1.5.3: 2A, flag and segment in the last five bits, four characters.
     hear("D3C2 2400 4865 6C6C");
     EXPECT_EQ(shown().radiotextText(), "Hell");
     EXPECT_FALSE(shown().isRadiotextWhole());
@@ -172,7 +172,7 @@ TEST_F(ReceivedFrequencies, OfSeveralTransmittersAreSeveralLists) {
 }
 
 TEST_F(ReceivedFrequencies, OfLongAndMediumWaveStandBehind250) {
-    // 6.2.1.6.1, tables 12 and 13: code 1 is 153 kHz, 16 is 531 kHz, 135 is 1602 kHz.
+    // 6.2.1.6.1, table 12: code 1 is 153 kHz, 16 is 531 kHz, 135 is 1602 kHz.
     hearPairs({"E412", "FA01", "FA10", "FA87"});
     EXPECT_EQ(shown().frequencies, (Lists{{false, 0, {{89300}, {153}, {531}, {1602}}}}));
 }
@@ -227,7 +227,7 @@ protected:
 
 TEST_F(ReceivedClock, IsTheModifiedJulianDayAndUtc) {
     using namespace std::chrono;
-    // 6.1.5.6, figure 20; the day is the example of annex G, 45218 for the 6th of September 1982: B0A2, of which 01 is
+    // 6.1.5.6; the day is the example of annex G, 45218 for the 6th of September 1982: B0A2, of which 01 is
     // in block 2 and 30A2 before the hour's upper bit in block 3. 01101 is the hour, 011110 the minute, 0 00010 one
     // hour ahead.
     hear("D3C2 4401 6144 D782");
@@ -271,7 +271,7 @@ protected:
 };
 
 TEST_F(ReceivedOtherNetworks, HaveTheirNameInVariants0To3) {
-    // 6.1.5.20, figure 28: 14A, TP of the other network, variant, its PI in block 4.
+    // 6.1.5.20: 14A, TP of the other network, variant, its PI in block 4.
     hear({"D3C2 E010 5241 1234", "D3C2 E013 2D35 1234", "D3C2 E000 4F54 5678"});
     ASSERT_EQ(shown().networks.size(), 2U);
     EXPECT_EQ(network(0).pi, 0x1234);
@@ -321,7 +321,7 @@ TEST_F(ReceivedOtherNetworks, HaveLinkageAndItemNumberInVariants12And14) {
 }
 
 TEST_F(ReceivedOtherNetworks, SwitchByGroup14B) {
-    // 6.2.1.8.2: TP and TA of the other network in front of three reserved bits.
+    // 6.2.1.8: TP and TA of the other network in front of three reserved bits.
     hear({"D3C2 E818 D3C2 1234"});
     EXPECT_EQ(network(0).tp, true);
     EXPECT_EQ(network(0).ta, true);

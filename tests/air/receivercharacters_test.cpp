@@ -14,7 +14,7 @@ std::string shown(std::vector<std::uint8_t> codes) {
 }
 
 TEST(ShownCharacters, AreThoseOfTheBasicSet) {
-    // IEC 62106, annex E, table E.1: one of every column.
+    // IEC 62106, annex E: one of every column.
     EXPECT_EQ(shown({0x20, 0x31, 0x42, 0x5A, 0x61, 0x7A}), " 1BZaz");
     EXPECT_EQ(shown({0x80, 0x91, 0xA9, 0xB2, 0xC1, 0xD7, 0xE4, 0xFE}), "áä€²ÀÖŷŧ");
     EXPECT_EQ(shown({0x24, 0xAB, 0x5E, 0x60, 0x7E, 0x8D, 0x9D, 0xA4, 0xA8}), "¤$―‖¯ßǧǦπ");

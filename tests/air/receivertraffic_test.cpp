@@ -1,5 +1,10 @@
+#include <chrono>
 #include <map>
+#include <string>
+#include <utility>
+#include <vector>
 
+#include "air/broadcast.h"
 #include "air/receivercharacters.h"
 #include "air/receivertest.h"
 #include "air/receivertrafficwords.h"
@@ -227,6 +232,45 @@ TEST_F(ReceivedMessages, AreThreeHundredAtMost) {
     ASSERT_EQ(messages().size(), 300U);
     EXPECT_EQ(messages().front().message.location, 1U);
     EXPECT_EQ(messages().back().message.location, 300U);
+}
+
+/// What the virtual coder sends when it is told one group after the other.
+class SentMessages : public ReceiverTest {
+protected:
+    SentMessages() {
+        tell(":STEREO:RDS:STATE ON");
+        coder("GS=0A,8A,3A");
+    }
+    void tell(const char* command) { m_broadcast.execute(command, m_broadcast.time()); }
+    void coder(const std::string& command) { tell((":STEREO:DIRECT \"" + command + "\"").c_str()); }
+    void hearTurns(int turns) {
+        for (int group = 3 * turns; group > 0; --group) {
+            const auto& [block1, block2, block3, block4] = m_broadcast.next().group.blocks;
+            receiver.take({{block1, block2, block3, block4}});
+        }
+    }
+
+private:
+    Broadcast m_broadcast{AirTime{std::chrono::sys_days{std::chrono::year{2026} / 1 / 1}}, {}};
+};
+
+TEST_F(SentMessages, OfSeveralGroupsArePutTogether) {
+    coder("3A=01,106100CD46");
+    hearTurns(1);
+    for (const char* command : {"8A=02,0190650065", "8A=02,015229C240", "8A=02,0100E55550"}) {
+        coder(command);
+        hearTurns(3);
+    }
+    ASSERT_EQ(shown().traffic.messages.size(), 1U);
+    EXPECT_EQ(shown().traffic.messages[0].message.details.size(), 4U);
+    EXPECT_EQ(shown().traffic.messages[0].times, 3U);
+}
+
+TEST_F(SentMessages, WithoutAnAnnouncementArePassedOver) {
+    coder("8A=02,0890650065");
+    hearTurns(5);
+    EXPECT_TRUE(shown().traffic.messages.empty());
+    EXPECT_EQ(shown().traffic.unannounced, 5U);
 }
 
 struct WordsCase {

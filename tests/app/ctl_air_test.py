@@ -104,6 +104,36 @@ class Air(unittest.TestCase):
             "warning: AF list 1: 108.0 MHz has no code and is left out",
             'warning: PS: "^" has no place in the RDS character set and is sent as a blank'])
 
+    def testWhatTheUserWillHaveWantedOtherwiseIsTold(self):
+        silent = self.air("--groups", "-", "--seconds", "0.5")
+        self.assertEqual((silent.stdout, silent.stderr),
+                         ("", "warning: no group goes out: RDS is off, or a test pattern on\n"))
+        file = self.write("commands.txt", RDS_ON + ":STEREO:STATE OFF\n@ 5 :STEREO:DIRECT \"TA=1\"\n@ 6 *CLS\n")
+        late = self.air("--commands", file, "--mpx", str(self.folder / "x.wav"), "--seconds", "1").stderr
+        self.assertIn("warning: the stereo coder is off: the multiplex is silent\n", late)
+        self.assertIn("warning: commands that come after the end are left out: 2\n", late)
+
+    def testNoFileIsTwoThings(self):
+        file = self.write("commands.txt", RDS_ON)
+        (self.folder / "link").symlink_to(file)
+        for call in (("--groups", "same", "--mpx", "same"), ("--commands", file, "--groups", file),
+                     ("--commands", file, "--mpx", str(self.folder / "link")), ("--log", file, "--groups", file),
+                     ("--groups", "same", "--mpx", "./same")):
+            with self.subTest(call):
+                self.assertIn("is named twice", self.air(*call, "--seconds", "1", expect=WRONG_CALL).stderr)
+        self.assertEqual(pathlib.Path(file).read_text(), RDS_ON)
+
+    def testARequestToEndIsHeardWhileCommandsAreCarriedOut(self):
+        file = self.write("commands.txt", ':STEREO:DIRECT "AF=N,98.5,87.6,88.1,88.2"\n' * 200000)
+        command = [CTL, "--app-folder", str(self.folder), "air", "--commands", file, "--groups", "-"]
+        process = subprocess.Popen(command, stdout=subprocess.DEVNULL, stderr=subprocess.PIPE)
+        time.sleep(1)
+        process.terminate()
+        begin = time.monotonic()
+        self.assertIn(b"stopped", process.communicate(timeout=30)[1])
+        self.assertLess(time.monotonic() - begin, 2)
+        self.assertEqual(process.returncode, FAILED)
+
     def testJsonIsOneDocument(self):
         file = self.write("commands.txt", RDS_ON + ":NONSENSE\n")
         run = self.air("--commands", file, "--groups", "-", "--seconds", "0.1", "--start", "2026-01-01 12:00:00",

@@ -53,7 +53,7 @@ class Ctl(unittest.TestCase):
 class Calls(Ctl):
     def testAWrongCallIsToldWithExitCode2(self):
         for call in ((), ("nonsense",), ("send",), ("query",), ("apply", "--data-set", "6"), ("list", "nothing"),
-                     ("send", "--eon", "D3C1"),
+                     ("send", "--eon", "D3C1"), ("apply", "--file", ""), ("air", "--file", "", "--groups", "-"),
                      ("--gpib", "31", "query", "ps"), ("--lan", "a", "--gpib", "3", "query", "ps"),
                      ("apply", "--data-set", "1", "--file", "x")):
             with self.subTest(call):
@@ -100,6 +100,14 @@ class Calls(Ctl):
     def testAGpibAddressNeedsALibrary(self):
         run = self.ctl("--gpib", "28", "query", "ps", expect=NO_CONNECTION)
         self.assertIn("GPIB address 28", run.stderr)
+
+    def testWithoutALibraryADryRunStillRuns(self):
+        gone = ("--visa-library", str(self.folder / "none.so"))
+        self.assertIn("PS=MESSTURM", self.ctl(*gone, "apply", "--data-set", "1", "--dry-run").stdout)
+        for call in (("apply", "--data-set", "1"), ("find",), ("read", "--into", str(self.folder / "new.INI")),
+                     ("diff", "--data-set", "1"), ("shell",), ("send", "TP=1"), ("query", "all")):
+            with self.subTest(call):
+                self.assertIn("none.so", self.ctl(*gone, *call, expect=NO_CONNECTION).stderr)
 
     def testAVisaLibraryThatCannotBeLoadedIsExitCode4(self):
         run = self.ctl("--visa-library", str(self.folder / "none.so"), "query", "ps", expect=NO_CONNECTION)

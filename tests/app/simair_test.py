@@ -83,10 +83,49 @@ class OnAir(ctl_test.Ctl):
         sim = self.begun("--mpx", "-", ready="stderr")
         time.sleep(6)
         self.sends("PI=1111")
-        self.assertIn("it has gaps", sim.stderr.readline().decode())
+        self.assertIn("there are gaps", sim.stderr.readline().decode())
         sim.stdout.close()
+        time.sleep(0.5)
         self.sends("PI=2222")
+        self.assertIn("the standard output cannot be written any more", self.ended(sim))
+
+    def testProblemsThatNobodyReadsHoldNothingUp(self):
+        sim = self.begun("--groups", str(self.folder / "groups.txt"))
+        lists = [",".join(f"9{i % 10}.{number:04}{i:03}" for i in range(22)) for number in range(60)]
+        text = "".join(f"send --coder AF=N,99.5,{frequencies}\n" for frequencies in lists)
+        run = subprocess.run(self.command("--lan", "127.0.0.1", "shell"), input=text, capture_output=True, text=True,
+                             timeout=100)
+        self.assertEqual(run.returncode, DONE, run.stderr)
+        self.sends("PI=1111")
+        sim.send_signal(signal.SIGTERM)
+        self.assertEqual(sim.wait(10), DONE)
+        self.assertEqual(sim.stderr.readline(), b"kdx-sim: AF list 1: 92.0000002 MHz has no code and is left out\n")
+
+    def testAStallIsMadeUpForInOrder(self):
+        file = self.folder / "groups.txt"
+        sim = self.begun("--groups", str(file))
+        self.sends("STEREO_EIN", "RDS=1")
+        time.sleep(0.5)
+        sim.send_signal(signal.SIGSTOP)
+        time.sleep(0.8)
+        sim.send_signal(signal.SIGCONT)
+        time.sleep(1)
         self.ended(sim)
+        stamps = [line.split("@")[1] for line in file.read_text().splitlines()]
+        self.assertEqual(stamps, sorted(set(stamps)))
+        hundredths = [int(stamp[-5:-3]) * 100 + int(stamp[-2:]) for stamp in stamps]
+        steps = {(after - before) % 6000 for before, after in zip(hundredths, hundredths[1:])}
+        self.assertLess(max(steps), 14)
+
+    def testAFileThatIsKilledIsReadableAsFarAsItIs(self):
+        file = self.folder / "air.wav"
+        sim = self.begun("--mpx", str(file))
+        time.sleep(3)
+        sim.kill()
+        sim.wait()
+        size = struct.unpack("<I", file.read_bytes()[4:8])[0] + 8
+        self.assertGreater(size, 4 * SAMPLES_A_SECOND)
+        self.assertLessEqual(size, file.stat().st_size)
 
     def testTheFileIsAWholeWavFileAtTheEnd(self):
         file = self.folder / "air.wav"
@@ -115,13 +154,17 @@ class OnAir(ctl_test.Ctl):
         self.sends("STEREO_EIN", "RDS=1")
         time.sleep(1.5)
         self.sends("PI=1111")
-        self.assertEqual(self.ended(sim).count("groups.txt cannot be written"), 1)
+        self.assertEqual(self.ended(sim).count("groups.txt cannot be written any more"), 1)
 
     def testTheStandardOutputIsGivenToOneOnly(self):
         for options in (("--groups", "-", "--mpx", "-"), ("--groups", "-", "--trace"), ("--mpx", "-", "--trace")):
             run = subprocess.run([ctl_test.SIM, *options], capture_output=True, timeout=10)
             self.assertEqual((run.returncode, run.stdout), (WRONG_USAGE, b""))
             self.assertIn(b"only one of", run.stderr)
+        same = str(self.folder / "same")
+        run = subprocess.run([ctl_test.SIM, "--groups", same, "--mpx", same], capture_output=True, timeout=10)
+        self.assertEqual((run.returncode, os.path.exists(same)), (WRONG_USAGE, False))
+        self.assertIn(b"name the same file", run.stderr)
 
 
 if __name__ == "__main__":

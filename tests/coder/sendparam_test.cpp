@@ -272,6 +272,22 @@ TEST_F(ParamSenderTest, WithoutASessionItLogsButNeitherPausesNorSends) {
     EXPECT_EQ(log(), "             TP= \":stereo:rds:traffic:program ON\"\r\n");
 }
 
+TEST_F(ParamSenderTest, SomebodyMayHearEveryCommandWithASessionOrWithout) {
+    Lines heard;
+    params.onComposed([&heard](const std::string& command) { heard.push_back(command); });
+    params.SendParam("PS", "RADIO");
+    state.InstrumentOnline = true;
+    params.SendParam("TP", "1");
+    visa.writeStatus = visa::kConnectionLost;
+    params.sendCommand("STORE", test::direct("STORE=1"));
+    EXPECT_EQ(heard,
+              (Lines{R"(:STEREO:DIRECT "PS=RADIO   ")", ":stereo:rds:traffic:program ON", test::direct("STORE=1")}));
+    params.SendParam("NO SUCH KEY", "1");
+    params.onComposed(nullptr);
+    params.SendParam("TP", "0");
+    EXPECT_EQ(heard.size(), 3U);
+}
+
 TEST_F(ParamSenderTest, AValueThatIsNoChoiceLogsAndSendsAnEmptyCommand) {
     // The row exists, so the road is taken to its end: the coder sees an empty write, which it ignores.
     params.SendParam("TP", "2");

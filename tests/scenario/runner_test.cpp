@@ -72,6 +72,11 @@ TEST_F(RunnerTest, ADataSetIsSentAsAtTheOpening) {
     EXPECT_EQ(rows.size(), commands.size());
 }
 
+TEST_F(RunnerTest, AnEmptyAnswerThatIsExpectedIsTold) {
+    play("steps: [expect: {pilot: [\"\", 675, 0]}]");
+    EXPECT_EQ(begun, Lines{"1 expect pilot=,675,0"});
+}
+
 TEST_F(RunnerTest, AnExpectationIsMetByTheAnswerWithoutItsBlanks) {
     visa.answersTo = {{coder("PS"), "\"RADIO   \"\n"}, {coder("TA"), "\"0\"\n"}, {"FREQ?", "98.5\n"}};
     const auto outcome = play("steps: [expect: {PS: RADIO, TA: 0, frequency: 98.50}]");

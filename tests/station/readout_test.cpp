@@ -87,6 +87,11 @@ TEST_F(Forgetful, AQuestionThatTheInstrumentDoesNotKnowStaysWithoutValue) {
     EXPECT_THAT(failures, IsEmpty());
 }
 
+TEST_F(Forgetful, ALineEndOfTwoCharactersIsNoPartOfTheAnswer) {
+    visa.answersTo[coder("PI")] = "\"ABCD\"\r\n";
+    EXPECT_EQ(valueOf(readOut(instrument), "PI"), "ABCD");
+}
+
 TEST_F(Forgetful, AQuestionThatAMomentOfSilenceMetIsPutOnceMore) {
     TrafficListener awake(instrument, [this](const Traffic& traffic) {
         if (traffic.kind == Traffic::Kind::Read && asked == coder("PI")) visa.answersTo[asked] = "\"ABCD\"\n";

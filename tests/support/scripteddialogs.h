@@ -57,15 +57,28 @@ public:
         return answer;
     }
 
+    QString fileToSave(const QString& title, const QString& preset, const QString& kind) override {
+        shown.push_back({Icon::None, title, kind, preset, false});
+        if (files.empty()) {
+            ADD_FAILURE() << "unexpected box for a file: " << title.toStdString();
+            return {};
+        }
+        QString file = files.front();
+        files.pop_front();
+        return file;
+    }
+
     ~ScriptedDialogs() override {
         EXPECT_EQ(expectedMessages, 0) << "a box that was expected did not show";
         EXPECT_TRUE(inputs.empty()) << "an input box that was expected did not show";
+        EXPECT_TRUE(files.empty()) << "a box for a file that was expected did not show";
         EXPECT_TRUE(confirmations.empty()) << "a question that was expected was not asked";
     }
 
     int expectedMessages = 0;        ///< how many message boxes may still come
     bool stopAtFailure = false;      ///< press the button that stops the running sequence
     std::deque<QString> inputs;      ///< answers of the input boxes, in turn; empty for Cancel
+    std::deque<QString> files;       ///< answers of the boxes for a file, in turn; empty for Cancel
     std::deque<bool> confirmations;  ///< answers of the Yes/No boxes, in turn
     std::vector<Shown> shown;        ///< every box, in order
 };

@@ -23,10 +23,10 @@ protected:
     void startOn(std::uint16_t port, const char* host = "127.0.0.1") {
         setGeneral("ADRESSEN", "KDX_TCPIP", host);
         end();
-        link = std::make_unique<LanVisa>(LanOptions{.connectTimeout = 200ms,
-                                                    .ioTimeout = 200ms,
-                                                    .answerMargin = 100ms,
-                                                    .closeTimeout = 200ms,
+        link = std::make_unique<LanVisa>(LanOptions{.connectTimeout = 400ms,
+                                                    .ioTimeout = 400ms,
+                                                    .answerMargin = 200ms,
+                                                    .closeTimeout = 400ms,
                                                     .portMapperPort = port});
         start();
     }
@@ -185,7 +185,7 @@ protected:
         dialogs.expectedMessages = 1;
         const auto begin = steady_clock::now();
         click(button);
-        EXPECT_LT(steady_clock::now() - begin, 900ms);  // connect, I/O and close time-outs are 200, 300 and 200 ms
+        EXPECT_LT(steady_clock::now() - begin, 1800ms);  // connect, I/O and close time-outs are 400, 600 and 400 ms
         EXPECT_EQ(lastBox(), words);
     }
     /// A device that keeps to the rules, at the same address.

@@ -10,6 +10,7 @@
 #include "app/ctl/aircommands.h"
 #include "app/ctl/laboratory.h"
 #include "base/duration.h"
+#include "settings/shownpath.h"
 
 namespace kdx::ctl {
 
@@ -81,15 +82,18 @@ public:
     /// @returns the exit code.
     int run() {
         air::OnAir sent;
+        bool hadGroups = false;
         executeDueCommands();
         for (auto left = air::Ticks{m_what.duration} / air::kGroupTime; left > 0 && goesOn(); --left) {
             executeDueCommands();
             sent = m_broadcast.next();
+            hadGroups = hadGroups || sent.kind == air::OnAir::Kind::Group;
             if (m_lines && sent.kind == air::OnAir::Kind::Group)
                 m_lines->add(air::logLine(sent.group, m_broadcast.time()));
             if (m_multiplex) m_multiplex->add(sent, m_broadcast.transmission().settings);
         }
         if (m_multiplex) endMultiplex(sent);
+        if (goesOn()) tellWhatIsMissing(hadGroups);
         bool isWritten = isOrTold(!m_multiplex || m_multiplex->close(), m_what.multiplexFile);
         isWritten = isOrTold(!m_lines || m_lines->finish(), m_what.groupFile) && isWritten;
         return isWritten ? m_laboratory.result() : kFailed;
@@ -99,8 +103,19 @@ private:
     static constexpr air::Ticks kTail = 200ms;  ///< after the last group, for the filters of a receiver
 
     void executeDueCommands() {
-        for (; m_done < m_commands.size() && m_start + m_commands[m_done].after <= m_broadcast.time(); ++m_done)
+        for (; m_done < m_commands.size() && m_start + m_commands[m_done].after <= m_broadcast.time(); ++m_done) {
+            if (m_laboratory.isStopped()) return;
             m_broadcast.execute(m_commands[m_done].command, m_start + m_commands[m_done].after);
+        }
+    }
+    /// What the user will have wanted otherwise.
+    void tellWhatIsMissing(bool hadGroups) {
+        Output& output = m_laboratory.output();
+        if (!hadGroups) output.warning("no group goes out: RDS is off, or a test pattern on");
+        if (m_multiplex && !m_broadcast.transmission().settings.stereoOn)
+            output.warning("the stereo coder is off: the multiplex is silent");
+        if (const std::size_t left = m_commands.size() - m_done; left > 0)
+            output.warning("commands that come after the end are left out: " + std::to_string(left));
     }
     [[nodiscard]] bool goesOn() { return !m_laboratory.isStopped() && (!m_multiplex || m_multiplex->good()); }
 
@@ -135,6 +150,13 @@ int onAir(Laboratory& laboratory, const Air& what) {
     }
     if (what.multiplexFile == kStandardOutput) {
         laboratory.output().problem("--mpx takes a file: a WAV file cannot be written to the standard output");
+        return kWrongCall;
+    }
+    for (const std::string& written : {what.groupFile, what.multiplexFile}) {
+        const bool isRead = isSameFile(written, what.log) || isSameFile(written, what.commandFile) ||
+                            isSameFile(written, what.source.file);
+        if (!isRead && !isSameFile(what.groupFile, what.multiplexFile)) continue;
+        laboratory.output().problem(written + " is named twice: it cannot be written and be something else");
         return kWrongCall;
     }
     const auto commands = commandsOf(laboratory, what);
@@ -196,10 +218,7 @@ void addAir(CLI::App& app, Task& task) {
     command->footer(
         "Without a data set the instrument is as after switching on.\n"
         "Example: kdx-ctl air --data-set 2 --seconds 10 --groups - --mpx multiplex.wav");
-    command->callback([what, command, &task] {
-        what->appliesSource = command->count("--data-set") + command->count("--file") > 0;
-        task = [what](Laboratory& laboratory) { return onAir(laboratory, *what); };
-    });
+    command->callback([what, &task] { task = [what](Laboratory& laboratory) { return onAir(laboratory, *what); }; });
 }
 
 }  // namespace kdx::ctl

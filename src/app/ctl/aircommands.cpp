@@ -52,7 +52,7 @@ void AirCommands::addTo(CLI::App& command) {
 
 std::optional<Commands> commandsOf(Laboratory& laboratory, const AirCommands& what) {
     Commands commands;
-    if (what.appliesSource && !addDataSet(laboratory, what.source, commands)) return std::nullopt;
+    if (what.source.isNamed() && !addDataSet(laboratory, what.source, commands)) return std::nullopt;
     if (!what.log.empty() && !addLog(laboratory, what.log, commands)) return std::nullopt;
     if (!what.commandFile.empty() && !addCommandFile(laboratory, what.commandFile, commands)) return std::nullopt;
     return commands;

@@ -12,7 +12,6 @@ namespace kdx::ctl {
 /// What is done to the virtual instrument whose transmission is looked at, as the command line names it.
 struct AirCommands {
     WhichDataSet source;
-    bool appliesSource = false;
     std::string log;
     std::string commandFile;
 

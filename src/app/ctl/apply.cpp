@@ -18,23 +18,23 @@ struct Apply {
     bool dryRun = false;
 };
 
-int apply(Laboratory& laboratory, const Apply& what) {
-    Session& session = laboratory.session();
-    const auto source = what.source.profile(laboratory);
-    if (!source) return kWrongCall;
-    if (!laboratory.mayBeSent(*source)) return kWrongCall;
-    session.load(*source);
-    if (what.dryRun) {
-        Rehearsal rehearsal(laboratory.data(), laboratory.captions());
-        rehearsal.apply(*source);
-        for (const std::string& command : rehearsal.commands()) {
-            laboratory.output().line(toUtf8(printable(command, '.')));
-            laboratory.output().document["commands"].push_back(toUtf8(command));
-        }
-        return kDone;
+int tellCommands(Laboratory& laboratory, const Profile& source) {
+    Rehearsal rehearsal(laboratory.data(), laboratory.captions());
+    rehearsal.apply(source);
+    for (const std::string& command : rehearsal.commands()) {
+        laboratory.output().line(toUtf8(printable(command, '.')));
+        laboratory.output().document["commands"].push_back(toUtf8(command));
     }
+    return kDone;
+}
+
+int apply(Laboratory& laboratory, const Apply& what) {
+    const auto source = what.source.profile(laboratory);
+    if (!source || !laboratory.mayBeSent(*source)) return kWrongCall;
+    if (what.dryRun) return tellCommands(laboratory, *source);
+    if (laboratory.hasSession()) laboratory.session().load(*source);
     if (!laboratory.open()) return kNoConnection;
-    session.sendOpening();
+    laboratory.session().sendOpening();
     if (what.keepOpen) {
         laboratory.keepOpen();
     } else {

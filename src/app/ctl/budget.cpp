@@ -64,6 +64,10 @@ void tellDeviations(Output& output, const air::DeviationBudget& budget) {
 }
 
 int judge(Laboratory& laboratory, const AirCommands& what) {
+    if (!what.source.isNamed() && what.log.empty() && what.commandFile.empty()) {
+        (void)what.source.profile(laboratory);  // which tells that none is named
+        return kWrongCall;
+    }
     const auto commands = commandsOf(laboratory, what);
     if (!commands) return kWrongCall;
     Output& output = laboratory.output();
@@ -95,11 +99,7 @@ void addBudget(CLI::App& app, Task& task) {
         "--data-set or --file says which, unless --log or --commands is given; of commands with times all are done.\n"
         "The waits are those of a radio that tunes in at any moment. A warning of a budget makes the exit code 3.\n"
         "Example: kdx-ctl budget --data-set 2");
-    command->callback([what, command, &task] {
-        what->appliesSource = command->count("--data-set") + command->count("--file") > 0 ||
-                              (what->log.empty() && what->commandFile.empty());
-        task = [what](Laboratory& laboratory) { return judge(laboratory, *what); };
-    });
+    command->callback([what, &task] { task = [what](Laboratory& laboratory) { return judge(laboratory, *what); }; });
 }
 
 }  // namespace kdx::ctl

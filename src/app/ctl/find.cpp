@@ -61,8 +61,10 @@ void tell(Laboratory& laboratory, const Found& instrument, std::vector<std::vect
 int find(Laboratory& laboratory, std::chrono::milliseconds wait) {
     Output& output = laboratory.output();
     output.document["instruments"] = nlohmann::json::array();
-    Visa* chosen = laboratory.visa();
-    if (chosen == nullptr) return laboratory.open() ? kFailed : kNoConnection;  // which tells why
+    if (!laboratory.hasSession()) {
+        (void)laboratory.open();  // which tells why
+        return kNoConnection;
+    }
     LanVisa lan(lanOptions(laboratory.call().program));
     Discovery how;
     how.wait = wait;
@@ -70,7 +72,7 @@ int find(Laboratory& laboratory, std::chrono::milliseconds wait) {
     std::vector<Found> found;
     for (const std::string& address : discoverLanInstruments(how))
         found.push_back({resourceText(Resource::Kind::Lan, address), "--lan " + address, &lan});
-    addListed(*chosen, found);
+    addListed(laboratory.visa(), found);
     std::vector<std::vector<std::string>> rows;
     for (const Found& instrument : found) {
         if (laboratory.isStopped()) break;

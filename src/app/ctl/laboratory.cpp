@@ -179,6 +179,9 @@ void Laboratory::passed(const Traffic& traffic) {
     const bool mayStop = traffic.kind == Traffic::Kind::Read && !m_stopped && !m_finishing;
     if (mayStop && isStopped()) m_session->instrument.stopSequence();
     const bool written = traffic.kind == Traffic::Kind::Written;
+    if (written && !m_inSteps) m_output.progress(++m_written, m_expected);
+    // What nobody wants to have would grow for as long as a run lasts.
+    if (!m_call.verbose && !m_call.json) return;
     const std::string text = toUtf8(printableLine(traffic.text, '.'));
     if (m_call.verbose) {
         std::string words;
@@ -186,8 +189,6 @@ void Laboratory::passed(const Traffic& traffic) {
         const std::string status = std::to_string(traffic.status) + (words.empty() ? "" : ": " + words);
         m_output.line(timeText(m_clock) + (written ? " -> " : " <- ") + text + "  [" + status + "]");
     }
-    if (written && !m_inSteps) m_output.progress(++m_written, m_expected);
-    // What nobody wants to have would grow for as long as a run lasts.
     if (!m_call.json) return;
     m_output.document["traffic"].push_back(
         {{"direction", written ? "written" : "read"}, {"text", text}, {"status", traffic.status}});

@@ -54,8 +54,8 @@ public:
     /// Lets the session be when the program ends.
     void keepOpen() { m_session->keepOpen(); }
     [[nodiscard]] int stop() const { return m_stop; }
-    /// What instruments are reached by; null when a library that was asked for cannot be used.
-    [[nodiscard]] Visa* visa() const { return m_link.visa.get(); }
+    /// What instruments are reached by, where there is a session.
+    [[nodiscard]] Visa& visa() const { return *m_link.visa; }
     [[nodiscard]] const Call& call() const { return m_call; }
     [[nodiscard]] Output& output() { return m_output; }
     [[nodiscard]] DataFolder& data() { return m_data; }

@@ -54,6 +54,8 @@ void Output::problem(const std::string& problem) {
 }
 
 void Output::warning(const std::string& text) {
+    endProgress();
+    std::fflush(stdout);
     std::fprintf(stderr, "warning: %s\n", harmless(text).c_str());
     document["warnings"].push_back(text);
 }

@@ -6,7 +6,7 @@
 #include "app/ctl/laboratory.h"
 #include "app/ctl/scenariofile.h"
 #include "app/platform.h"
-#include "base/numbers.h"
+#include "base/split.h"
 #include "scenario/readoutrestorer.h"
 #include "scenario/runner.h"
 
@@ -74,19 +74,18 @@ public:
         }
     }
     void waits(std::chrono::nanoseconds length) override {
-        using namespace std::chrono;
-        const auto end =
-            static_cast<int>(m_laboratory.clock().secondsSinceMidnight() + duration<double>(length).count());
-        output().waiting(twoDigits(end / 3600 % 24) + ":" + twoDigits(end / 60 % 60) + ":" + twoDigits(end % 60));
+        const std::chrono::duration<double> now(m_laboratory.clock().secondsSinceMidnight());
+        output().waiting(timeText(std::chrono::duration_cast<std::chrono::seconds>(now + length)));
     }
     void reportLost() override { output().problem("the report cannot be written any more; the run ends"); }
     void ended(const scenario::Outcome& outcome) override {
         output().endProgress();
         if (!outcome.restored) output().problem("what stood before could not be brought back");
         const char* const changed = outcome.restored ? "not as before: " : "perhaps not as before: ";
-        if (!outcome.changed.empty()) output().problem(changed + listed(outcome.changed));
+        if (!outcome.changed.empty()) output().problem(changed + joined(outcome.changed, ", "));
         if (!outcome.untold.empty()) {
-            output().problem("not brought back, as the instrument did not tell them before: " + listed(outcome.untold));
+            output().problem("not brought back, as the instrument did not tell them before: " +
+                             joined(outcome.untold, ", "));
         }
         output().document["restored"] = outcome.restored;
         output().document["changed"] = outcome.changed;
@@ -101,11 +100,6 @@ public:
 
 private:
     [[nodiscard]] Output& output() { return m_laboratory.output(); }
-    static std::string listed(const std::vector<std::string>& keys) {
-        std::string text;
-        for (const std::string& key : keys) text += (text.empty() ? "" : ", ") + key;
-        return text;
-    }
 
     Laboratory& m_laboratory;
     bool m_yes;

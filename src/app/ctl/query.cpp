@@ -31,9 +31,10 @@ const ReadBack* readBackOf(const std::string& name) {
 /// Who asked for all of them cannot know which is which: further lines of the words stand under the first.
 std::string named(std::string_view name, std::size_t longestName, const std::string& words) {
     std::string text;
-    for (const std::string_view line : split(words, "\n"))
-        text +=
-            (text.empty() ? padRight(name, longestName + 2) : '\n' + std::string(longestName + 2, ' ')).append(line);
+    for (const std::string_view line : split(words, "\n")) {
+        text += text.empty() ? padRight(name, longestName + 2) : '\n' + std::string(longestName + 2, ' ');
+        text += line;
+    }
     return text;
 }
 

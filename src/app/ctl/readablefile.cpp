@@ -12,7 +12,8 @@ std::optional<std::string> bytesOf(Output& output, const std::string& file) {
 }
 
 bool areNone(Output& output, const std::string& file, const std::vector<std::size_t>& lines, const std::string& wrong) {
-    for (const std::size_t line : lines) output.problem(file + ", line " + std::to_string(line) + ": " + wrong);
+    for (const std::size_t line : lines)
+        output.problem(std::string(file).append(", line ").append(std::to_string(line)).append(": ").append(wrong));
     return lines.empty();
 }
 

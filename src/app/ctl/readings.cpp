@@ -2,6 +2,7 @@
 
 #include "app/ctl/output.h"
 #include "base/codepage.h"
+#include "base/split.h"
 
 namespace kdx::ctl {
 
@@ -36,12 +37,11 @@ void tellDifferences(Output& output, const char* name, const Differences& differ
 }
 
 void tellUnanswered(Output& output, const Readout& readout) {
-    std::string names;
-    for (const Reading& reading : unanswered(readout)) {
-        names += (names.empty() ? "" : ", ") + nameOf(reading.key, reading.network);
-        output.document["unanswered"].push_back(nameOf(reading.key, reading.network));
-    }
-    if (!names.empty()) output.problem("the instrument gave no answer to " + names);
+    std::vector<std::string> names;
+    for (const Reading& reading : unanswered(readout)) names.push_back(nameOf(reading.key, reading.network));
+    if (names.empty()) return;
+    output.document["unanswered"] = names;
+    output.problem("the instrument gave no answer to " + joined(names, ", "));
 }
 
 }  // namespace kdx::ctl

@@ -3,6 +3,7 @@
 #include "app/ctl/laboratory.h"
 #include "app/ctl/readablefile.h"
 #include "app/ctl/whichdataset.h"
+#include "base/split.h"
 #include "scenario/reader.h"
 
 namespace kdx::ctl {
@@ -23,7 +24,7 @@ std::optional<scenario::Scenario> readScenarioFile(Laboratory& laboratory, const
     if (!bytes) return std::nullopt;
     scenario::Reading reading = scenario::readScenario(*bytes, laboratory.call().force, laboratory.state().corrections);
     for (const auto& [line, column, sentence] : reading.problems)
-        laboratory.output().problem(file + ":" + std::to_string(line) + ":" + std::to_string(column) + ": " + sentence);
+        laboratory.output().problem(joined({file, std::to_string(line), std::to_string(column), " " + sentence}, ":"));
     if (!reading.problems.empty()) return std::nullopt;
     if (reading.scenario.dataSet && !loadDataSet(laboratory, *reading.scenario.dataSet)) return std::nullopt;
     return std::move(reading.scenario);

@@ -31,9 +31,8 @@ struct Send {
 std::optional<std::pair<std::string, std::string>> keyAndValue(Laboratory& laboratory, const std::string& text) {
     const std::size_t equals = text.find('=');
     if (equals != std::string::npos) return std::pair(text.substr(0, equals), withoutControls(text.substr(equals + 1)));
-    const auto& facts = keyFacts();
-    const auto known = std::find_if(facts.begin(), facts.end(), [&](const KeyFacts& f) { return f.key == text; });
-    if (known != facts.end() && known->range.empty()) return std::pair(text, std::string());  // its value says nothing
+    const KeyFacts* facts = factsOf(text);
+    if (facts != nullptr && facts->range.empty()) return std::pair(text, std::string());  // its value says nothing
     laboratory.output().problem(text + " is not KEY=VALUE");
     return std::nullopt;
 }

@@ -11,6 +11,7 @@
 #include "app/ctl/prompt.h"
 #include "app/platform.h"
 #include "base/duration.h"
+#include "base/split.h"
 
 namespace kdx::ctl {
 
@@ -20,8 +21,7 @@ namespace {
 constexpr std::array<AddSubcommand, 4> kSubcommands = {addSend, addQuery, addDiff, addRead};
 
 int wait(Laboratory& laboratory, const std::vector<std::string>& words) {
-    std::string text;
-    for (const std::string& word : words) text += (text.empty() ? "" : " ") + word;
+    const std::string text = joined(words, " ");
     const auto duration = parseDuration(text);
     constexpr std::chrono::hours kLongest{168};
     if (!duration || *duration > kLongest) {

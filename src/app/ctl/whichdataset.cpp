@@ -9,12 +9,15 @@ namespace kdx::ctl {
 
 void WhichDataSet::addTo(CLI::App& command) {
     auto* set = command.add_option("--data-set", number, "the data set, 1 to 5")->check(CLI::Range(1, 5));
-    command.add_option("--file", file, "any data-set file instead")->type_name("FILE")->excludes(set);
+    const auto isName = [](const std::string& name) {
+        return name.empty() ? std::string("it needs the name of a file") : std::string();
+    };
+    command.add_option("--file", file, "any data-set file instead")->check(isName)->type_name("FILE")->excludes(set);
 }
 
 std::optional<Profile> WhichDataSet::profile(Laboratory& laboratory) const {
     // What is sent switches the carrier on: no set is taken unasked.
-    if (!number && file.empty()) {
+    if (!isNamed()) {
         laboratory.output().problem("which data set? --data-set N or --file FILE says it");
         return std::nullopt;
     }

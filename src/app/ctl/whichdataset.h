@@ -19,6 +19,7 @@ struct WhichDataSet {
     std::string file;
 
     void addTo(CLI::App& command);
+    [[nodiscard]] bool isNamed() const { return number || !file.empty(); }
     /// Makes it the one at work; nothing when none is named or it cannot be read, which is told.
     [[nodiscard]] std::optional<Profile> profile(Laboratory& laboratory) const;
 };

@@ -1,0 +1,60 @@
+#include "window/notes.h"
+
+#include <filesystem>
+
+#include "settings/captions.h"
+#include "settings/datafolder.h"
+#include "settings/folderlock.h"
+#include "settings/programstate.h"
+#include "settings/shownpath.h"
+#include "station/session.h"
+#include "ui/caption.h"
+#include "ui/pictureswitch.h"
+#include "ui/text.h"
+#include "window/surroundings.h"
+
+namespace kdx {
+
+namespace {
+
+QString missingData(const Surroundings& with) {
+    const std::filesystem::path& folder = with.data.path();
+    std::error_code error;
+    if (!std::filesystem::is_directory(folder, error)) return QString::fromStdString(shownPath(folder));
+    // Missing, unreadable, garbage, or without this language: the captions are empty all the same.
+    if (with.captions.isEmpty()) {
+        return QStringLiteral("%1 [%2]").arg(QLatin1String(kLanguageFile), toText(with.state.language));
+    }
+    return {};
+}
+
+}  // namespace
+
+QStringList notes(const Surroundings& with, const QWidget& window, const QString& startNotice) {
+    QStringList notes;
+    const auto note = [&](const Caption& caption, const QString& what = {}) {
+        const QString text = captionText(with.captions, caption);
+        notes += what.isEmpty() ? text : text.arg(what);
+    };
+    if (!with.dataProblem.isEmpty()) notes += with.dataProblem;
+    if (const QString missing = missingData(with); !missing.isEmpty()) {
+        note({322, "Nicht gefunden: %1"}, missing);
+    } else if (!startNotice.isEmpty()) {
+        notes += startNotice;
+    }
+    QStringList unreadable;
+    if (const auto file = with.data.unreadableFile()) unreadable += toText(*file);
+    for (const PictureSwitch* button : window.findChildren<PictureSwitch*>()) unreadable += button->brokenPicture();
+    unreadable.removeAll(QString());
+    unreadable.removeDuplicates();
+    if (!unreadable.isEmpty()) note({325, "Nicht lesbar: %1"}, unreadable.join(QStringLiteral(", ")));
+    if (const auto unsaved = with.data.unsavedFile()) note({312, "Nicht gespeichert: %1"}, toText(*unsaved));
+    if (!with.session.instrument.log.isWritable()) note({312, "Nicht gespeichert: %1"}, toText(kCommandLog));
+    if (with.claim.isShared()) note({326, "Ein anderes Programm nutzt dieselben Daten"});
+    QStringList quoted;
+    for (const std::string& key : with.session.params.quotedKeys()) quoted += toText(key);
+    if (!quoted.isEmpty()) note({327, "Anführungszeichen beendet den Text: %1"}, quoted.join(QStringLiteral(", ")));
+    return notes;
+}
+
+}  // namespace kdx
