@@ -43,15 +43,6 @@ TEST(EndsItsTextEarlyTest, IsACoderCommandWithAQuoteInItsText) {
     EXPECT_TRUE(endsItsTextEarly(R"(:STEREO:DIRECT "PS=A"""B   ")"));
 }
 
-TEST(QuotesDoubledTest, DoublesThoseInsideACoderCommandOnly) {
-    EXPECT_EQ(quotesDoubled(R"(:STEREO:DIRECT "PS=A"B     ")"), R"(:STEREO:DIRECT "PS=A""B     ")");
-    EXPECT_EQ(quotesDoubled(R"(:STEREO:DIRECT "RT=10,0,"x"")"), R"(:STEREO:DIRECT "RT=10,0,""x""")");
-    for (const char* same : {R"(:STEREO:DIRECT "PS=RADIO   ")", R"(FREQ "1"MHZ)", ":STEREO:DIRECT ",
-                             ":STEREO:DIRECT \"", ":STEREO:DIRECT \"\"", ""}) {
-        EXPECT_EQ(quotesDoubled(same), same);
-    }
-}
-
 std::string lettersOf(std::string key) {
     std::erase_if(key, [](unsigned char c) { return std::isalnum(c) == 0; });
     return key;
@@ -386,21 +377,6 @@ TEST_F(ParamSenderTest, AFailedWriteIsReportedOnceAndNotTriedAgain) {
     params.SendParam("TA", "1");
     EXPECT_EQ(failures, Lines{"Fehler: -1073807339"});
     EXPECT_EQ(visa.written.size(), 1U);
-}
-
-TEST_F(ParamSenderTest, QuotesGoOutAsTheyStandOrDoubledAsIsCorrected) {
-    state.InstrumentOnline = true;
-    params.SendParam("PS", "A\"B");
-    EXPECT_EQ(sent(), Lines{test::direct("PS=A\"B     ")});
-    EXPECT_EQ(params.quotedKeys().count("PS"), 1U);
-    state.corrections.quotes = true;
-    std::string value = "A\"B";
-    params.SendParam("PS", value);
-    EXPECT_EQ(sent(), Lines{test::direct("PS=A\"\"B     ")});
-    EXPECT_EQ(value, "A\"B");
-    EXPECT_TRUE(params.quotedKeys().empty());
-    params.SendParam("HF-Frequenz", "\"");
-    EXPECT_EQ(sent(), Lines{"FREQ \"MHZ"}) << "no text of the coder's";
 }
 
 TEST_F(ParamSenderTest, LoggingOffChangesNothingOnTheWire) {
