@@ -75,11 +75,9 @@ void AF_Listenform::AF_TN_Click() {
         answer = m_with.dialogs.input(caption({162}), caption({161}), answer);
         if (answer.isEmpty()) return;
         const bool known = takeNumber(answer);
-        if (!known) {
-            refuse(164);
-        } else if (answer.contains(QLatin1Char(','))) {
+        if (known && answer.contains(QLatin1Char(','))) {
             refuse(166);
-        } else if (!isTunedFrequency(toBytes(answer))) {
+        } else if (!known || !isTunedFrequency(toBytes(answer))) {
             refuse(164);
         } else {
             AF_TN->setText(toText(withOneDecimal(toBytes(answer))));
