@@ -37,8 +37,8 @@ bool sets(const std::string& sent, const std::string& key) {
 }
 
 std::string shown(const std::vector<std::string>& values) {
-    std::vector<std::string> texts;
-    for (const std::string& value : values) texts.push_back(shown(value));
+    std::vector<std::string> texts(values.size());
+    std::transform(values.begin(), values.end(), texts.begin(), [](const std::string& value) { return shown(value); });
     return joined(texts, ",");
 }
 
