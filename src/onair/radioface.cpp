@@ -151,11 +151,12 @@ QString RadioFace::reasonOf(const Difference& difference) const {
         case Difference::Why::Other:
             break;
     }
-    if (difference.row == Difference::Row::StereoMode) {
+    if (difference.row == Difference::Row::StereoMode && !difference.entry.empty()) {
         const auto mode = difference.entry.front() - '0';
-        if (mode >= 0 && mode < static_cast<int>(std::size(kStereoModes)))
+        if (mode >= 0 && mode < static_cast<int>(std::size(kStereoModes))) {
             return caption({795, "Im Fenster heißt diese Einstellung %1"})
                 .arg(caption({kFirstStereoMode + mode, kStereoModes[mode]}));
+        }
     }
     return caption({790, "Eingegeben ist %1"}).arg(entry);
 }

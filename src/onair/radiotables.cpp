@@ -122,9 +122,10 @@ QString RadioTables::whyMarked(const air::ReceivedNetwork& network, const Statio
     const auto digits = QStringLiteral("%1").arg(network.pi, 4, 16, QLatin1Char('0')).toStdString();
     if (!equalNoCase(entered.pi, digits)) return {};
     const std::string_view ps = std::string_view(entered.ps).substr(0, kPsLength);
-    if (const auto character = withoutRdsCode(ps))
+    if (const auto character = withoutRdsCode(ps)) {
         return caption({794, "RDS kennt das Zeichen %1 nicht: das Radio zeigt ein Leerzeichen"})
             .arg(toText(std::string(1, *character)));
+    }
     for (std::size_t i = 0; i < kPsLength; ++i) {
         if (network.ps.at(i) != rdsCode(i < ps.size() ? ps[i] : ' '))
             return caption({790, "Eingegeben ist %1"}).arg(toText(entered.ps));

@@ -58,7 +58,7 @@ std::optional<QStringList> partsOf(const QString& warning, const char* form) {
 }  // namespace
 
 QString warningText(const Captions& captions, const std::string& warning) {
-    const QString text = QString::fromStdString(warning);
+    QString text = QString::fromStdString(warning);
     for (const WarningRow& row : kWarnings) {
         const auto parts = partsOf(text, row.warning);
         if (!parts) continue;
