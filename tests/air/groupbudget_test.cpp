@@ -94,9 +94,9 @@ TEST_F(GroupBudgetTest, OfMixedRadiotextTellsWhetherItIsEverWhole) {
     EXPECT_THAT(budget().warnings, ElementsAre("2A and 2B in one sequence: their segments have different lengths"));
 }
 
-/// Four frequencies and their count take the pairs 228 + one, two, one + filler: three groups 0A from the count on, five
-/// from the second pair on, four from the third. With every other group 0A it is 5, 9 or 7 groups from 0A on, and 10, 8
-/// or 6 from 2A on.
+/// Four frequencies and their count take the pairs 228 + one, two, one + filler: three groups 0A from the count on,
+/// five from the second pair on, four from the third. With every other group 0A it is 5, 9 or 7 groups from 0A on, and
+/// 10, 8 or 6 from 2A on.
 TEST_F(GroupBudgetTest, OfAfLists) {
     coder("AF=N,91.7,104.2,88.1,93.6");
     expectWait(What::AfLists, (3 + 5 + 4) / 3.0 + 0.5, 6);
