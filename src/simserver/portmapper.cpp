@@ -30,15 +30,33 @@ unsigned interfaceOf(msghdr& datagram) {
     return 0;
 }
 
+// A number that is free for one protocol may be taken for the other, so where any will do others are tried.
+std::pair<FileDescriptor, FileDescriptor> listenOnBoth(const std::string& address, unsigned short port) {
+    constexpr int kMostTries = 100;
+    for (int tries = 1;; ++tries) {
+        FileDescriptor tcp = listenTcp(address, port);
+        try {
+            FileDescriptor udp = bindUdp(address, localPort(tcp));
+            return {std::move(tcp), std::move(udp)};
+        } catch (const std::system_error&) {
+            if (port != 0 || tries == kMostTries) throw;
+        }
+    }
+}
+
 }  // namespace
 
 PortMapper::PortMapper(PollLoop& loop, std::vector<PortMapping> mappings, const std::string& address,
                        unsigned short port)
+    : PortMapper(loop, std::move(mappings), address, listenOnBoth(address, port)) {}
+
+PortMapper::PortMapper(PollLoop& loop, std::vector<PortMapping> mappings, const std::string& address,
+                       std::pair<FileDescriptor, FileDescriptor> sockets)
     : RpcProgram(PMAPPROG, PMAPVERS),
       m_loop(loop),
       m_mappings(std::move(mappings)),
-      m_tcp(loop, *this, address, port),
-      m_udp(bindUdp(address, m_tcp.port())) {
+      m_tcp(loop, *this, std::move(sockets.first)),
+      m_udp(std::move(sockets.second)) {
     m_loop.watch(m_udp.number(), POLLIN, [this](short) { answerDatagram(m_udp.number(), kAnyInterface); });
     listenForBroadcasts(address);
 }

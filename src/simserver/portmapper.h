@@ -37,6 +37,8 @@ protected:
     void call(std::uint32_t procedure, std::string_view arguments, ConnectionId from, const RpcReply& reply) override;
 
 private:
+    PortMapper(PollLoop& loop, std::vector<PortMapping> mappings, const std::string& address,
+               std::pair<FileDescriptor, FileDescriptor> sockets);
     void listenForBroadcasts(const std::string& address);
     void answerDatagram(int socket, unsigned onlyInterface);
     [[nodiscard]] unsigned long findPort(unsigned long program, unsigned long protocol) const;

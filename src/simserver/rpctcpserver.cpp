@@ -41,7 +41,10 @@ void setUp(int socket) {
 
 RpcTcpServer::RpcTcpServer(PollLoop& loop, RpcProgram& program, const std::string& address, unsigned short port,
                            SilenceLimits limits)
-    : m_loop(loop), m_program(program), m_listener(listenTcp(address, port)), m_limits(std::move(limits)) {
+    : RpcTcpServer(loop, program, listenTcp(address, port), std::move(limits)) {}
+
+RpcTcpServer::RpcTcpServer(PollLoop& loop, RpcProgram& program, FileDescriptor listener, SilenceLimits limits)
+    : m_loop(loop), m_program(program), m_listener(std::move(listener)), m_limits(std::move(limits)) {
     m_loop.watch(m_listener.number(), POLLIN, [this](short) { acceptClient(); });
     closeStuck();
 }

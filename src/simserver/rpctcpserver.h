@@ -39,6 +39,8 @@ public:
     /// @param address IPv4 address in dotted form; port 0 takes any free one. Throws std::system_error.
     RpcTcpServer(PollLoop& loop, RpcProgram& program, const std::string& address, unsigned short port,
                  SilenceLimits limits = {});
+    /// The same on a socket that listens already.
+    RpcTcpServer(PollLoop& loop, RpcProgram& program, FileDescriptor listener, SilenceLimits limits = {});
     RpcTcpServer(const RpcTcpServer&) = delete;
     RpcTcpServer& operator=(const RpcTcpServer&) = delete;
     ~RpcTcpServer();

@@ -6,9 +6,12 @@
 #include <ifaddrs.h>
 #include <net/if.h>
 #include <poll.h>
+#include <sys/resource.h>
 #include <sys/socket.h>
 
+#include <algorithm>
 #include <array>
+#include <memory>
 #include <optional>
 
 namespace kdx::simserver {
@@ -91,6 +94,9 @@ TEST_F(PortMapperTest, AnswersOverUdpToo) {
     EXPECT_EQ(ask(newWriter.callMessage(3, {})).status, static_cast<std::uint32_t>(PROG_MISMATCH));
 }
 
+/// An address of this machine that no client takes: closed connections would hold its ports for a minute.
+constexpr const char* kQuietAddress = "127.0.0.77";
+
 /// Asks by UDP whoever is at the place for the port of the core channel.
 std::optional<Reply> askAt(const std::string& place, unsigned short port, int timeoutMs) {
     sockaddr_in name{};
@@ -117,13 +123,29 @@ TEST_F(PortMapperTest, AnswersWhatIsAskedOfEverybodyInItsNetwork) {
     EXPECT_EQ(reply->rest, word(4711));
 }
 
+TEST(PortMapper, TakesAPortThatIsFreeForBothProtocols) {
+    constexpr rlim_t kSocketsAndMore = 6000;
+    rlimit files{};
+    ASSERT_EQ(::getrlimit(RLIMIT_NOFILE, &files), 0);
+    files.rlim_cur = std::max(files.rlim_cur, std::min(files.rlim_max, kSocketsAndMore));
+    ASSERT_EQ(::setrlimit(RLIMIT_NOFILE, &files), 0);
+    if (files.rlim_cur < kSocketsAndMore) GTEST_SKIP() << "this machine allows too few open sockets";
+    PollLoop loop;
+    std::vector<std::unique_ptr<PortMapper>> mappers;
+    std::vector<FileDescriptor> inTheWay;
+    for (int count = 0; count < 5000; ++count) inTheWay.push_back(bindUdp(kQuietAddress, 0));
+    for (int count = 0; count < 40; ++count) {
+        mappers.push_back(std::make_unique<PortMapper>(loop, std::vector<PortMapping>(), kQuietAddress, 0));
+    }
+}
+
 TEST(PortMapper, TwoInOneNetworkBothAnswer) {
     PollLoop loop;
     const PortMapper one(loop, {{kCore, 1, 4711}}, "127.0.0.1", 0);
-    const PortMapper two(loop, {{kCore, 1, 4712}}, "127.0.0.2", one.port());
+    const PortMapper two(loop, {{kCore, 1, 4712}}, kQuietAddress, one.port());
     const RunningLoop running(loop);
     EXPECT_TRUE(askAt("127.255.255.255", one.port(), 5000));
-    EXPECT_EQ(askAt("127.0.0.2", one.port(), 5000).value_or(Reply{}).rest, word(4712));
+    EXPECT_EQ(askAt(kQuietAddress, one.port(), 5000).value_or(Reply{}).rest, word(4712));
 }
 
 /// An address of this machine in a network with others; empty when it has none.
