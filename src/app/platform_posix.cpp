@@ -68,11 +68,11 @@ bool isReadable(int descriptor) {
 }
 
 void waitReadable(int descriptor, std::chrono::milliseconds time) {
-    using Clock = std::chrono::steady_clock;
-    const auto end = Clock::now() + time;
+    using std::chrono::steady_clock;
+    const auto end = steady_clock::now() + time;
     pollfd asked{descriptor, POLLIN, 0};  // a negative one is passed over
     for (;;) {
-        const auto left = std::chrono::ceil<std::chrono::milliseconds>(end - Clock::now()).count();
+        const auto left = std::chrono::ceil<std::chrono::milliseconds>(end - steady_clock::now()).count();
         if (left <= 0 || poll(&asked, 1, static_cast<int>(left)) > 0) return;
     }
 }
