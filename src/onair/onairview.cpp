@@ -80,6 +80,7 @@ OnAirView::OnAirView(air::Shadow& shadow, const Station& station, const PageCont
     connect(Air_Schliessen, &QPushButton::clicked, this, &QDialog::close);
     arrange();
     label();
+    Air_Kopieren->setFocus();  // the texts of the radio would show a caret otherwise
 }
 
 void OnAirView::arrange() {

@@ -8,6 +8,7 @@
 #include "onair/differences.h"
 #include "onair/displays.h"
 #include "onair/tables.h"
+#include "onair/warningtexts.h"
 #include "settings/captions.h"
 #include "ui/layouts.h"
 #include "ui/text.h"
@@ -140,8 +141,12 @@ void RadioFace::showValues(const air::Shadow& shadow) {
 QString RadioFace::reasonOf(const Difference& difference) const {
     const QString entry = QLatin1Char('"') + toText(difference.entry) + QLatin1Char('"');
     switch (difference.why) {
-        case Difference::Why::Refused:
-            return caption({791, "Der Coder nimmt %1 nicht an"}).arg(entry);
+        case Difference::Why::Refused: {
+            const QString why = caption({791, "Der Coder nimmt %1 nicht an"}).arg(entry);
+            return difference.entry.find('"') == std::string::npos
+                       ? why
+                       : withRemedy(why, &Corrections::quotes, m_with.captions, m_with.state);
+        }
         case Difference::Why::Cut:
             return caption({792, "Für die Anzeige gekürzt; eingegeben ist %1"}).arg(entry);
         case Difference::Why::Padded:
@@ -154,8 +159,9 @@ QString RadioFace::reasonOf(const Difference& difference) const {
     if (difference.row == Difference::Row::StereoMode && !difference.entry.empty()) {
         const auto mode = difference.entry.front() - '0';
         if (mode >= 0 && mode < static_cast<int>(std::size(kStereoModes))) {
-            return caption({795, "Im Fenster heißt diese Einstellung %1"})
-                .arg(caption({kFirstStereoMode + mode, kStereoModes[mode]}));
+            const QString why = caption({795, "Im Fenster heißt diese Einstellung %1"})
+                                    .arg(caption({kFirstStereoMode + mode, kStereoModes[mode]}));
+            return withRemedy(why, &Corrections::stereoMode, m_with.captions, m_with.state);
         }
     }
     return caption({790, "Eingegeben ist %1"}).arg(entry);

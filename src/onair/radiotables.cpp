@@ -6,6 +6,7 @@
 
 #include <algorithm>
 
+#include "af/othernetwork.h"
 #include "air/receivercharacters.h"
 #include "air/receivertrafficwords.h"
 #include "air/shadow.h"
@@ -13,6 +14,7 @@
 #include "coder/fieldsizes.h"
 #include "coder/rdscharacters.h"
 #include "onair/tables.h"
+#include "onair/warningtexts.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
 #include "station/station.h"
@@ -105,8 +107,7 @@ void RadioTables::showNetworks(const air::Shadow& shadow, const Station& station
         if (radio.groups - network.lastGroup > kForgottenAfter) continue;
         const QString pi = QStringLiteral("%1").arg(network.pi, 4, 16, QLatin1Char('0')).toUpper();
         const QString why = whyMarked(network, station);
-        const QString type =
-            network.pty ? toText(m_with.captions.programmeType(static_cast<std::size_t>(*network.pty))) : QString();
+        const QString type = network.pty ? programmeType(static_cast<std::size_t>(*network.pty)) : QString();
         rows.push_back({{why.isEmpty() ? pi : QString(kDifferenceSign) + QLatin1Char(' ') + pi,
                          QString::fromStdString(air::shownText(network.ps)), type, flag(network.tp), flag(network.ta),
                          frequenciesOf(network)},
@@ -114,6 +115,10 @@ void RadioTables::showNetworks(const air::Shadow& shadow, const Station& station
                         why});
     }
     showRows(Air_EON, rows);
+}
+
+QString RadioTables::programmeType(std::size_t number) const {
+    return toText(m_with.captions.programmeType(number));
 }
 
 /// Only the network that the page is about is one that something was entered for.
@@ -130,7 +135,10 @@ QString RadioTables::whyMarked(const air::ReceivedNetwork& network, const Statio
         if (network.ps.at(i) != rdsCode(i < ps.size() ? ps[i] : ' '))
             return caption({790, "Eingegeben ist %1"}).arg(toText(entered.ps));
     }
-    return {};
+    const std::string type = programmeTypeNumber(entered.pty, m_with.captions);
+    if (type.empty() || type == std::to_string(network.pty.value_or(0))) return {};
+    return withRemedy(caption({790, "Eingegeben ist %1"}).arg(programmeType(std::stoul(type))), &Corrections::eonType,
+                      m_with.captions, m_with.state);
 }
 
 QStringList RadioTables::cellsOf(const air::TrafficMessage& message) {

@@ -35,6 +35,7 @@ private:
     [[nodiscard]] QString whyMarked(const air::ReceivedNetwork& network, const Station& station) const;
     [[nodiscard]] QStringList cellsOf(const air::TrafficMessage& message);
     [[nodiscard]] QString caption(const Caption& caption) const { return captionText(m_with.captions, caption); }
+    [[nodiscard]] QString programmeType(std::size_t number) const;
 
     PageContext m_with;
     CaptionBook m_book;

@@ -2,6 +2,9 @@
 
 #include <QRegularExpression>
 
+#include <algorithm>
+
+#include "settings/programstate.h"
 #include "ui/caption.h"
 
 namespace kdx {
@@ -44,7 +47,17 @@ const WarningRow kWarnings[] = {
     {"the pilot has %1: radios await 6.00 to 7.50 kHz", {818, "Der Pilot hat %1: Radios erwarten 6.00 bis 7.50 kHz"}},
     {"RDS has %1: radios await 1.00 kHz at least", {819, "RDS hat %1: Radios erwarten mindestens 1.00 kHz"}},
     {"refused: %1", {820, "Nicht angenommen: %1"}},
+    {"%1: %2 has no place in the RDS character set and is sent as a blank",
+     {821, "%1: %2 hat keinen Platz im RDS-Zeichensatz und geht als Leerzeichen hinaus"}},
+    {"%1: the tuned frequency %2 MHz has no code, so the list is left out",
+     {822, "%1: die Senderfrequenz %2 MHz hat keinen Code, deshalb entfällt die Liste"}},
+    {"%1: %2 MHz has no code and is left out", {823, "%1: %2 MHz hat keinen Code und entfällt"}},
+    {"further warnings are left out", {824, "Weitere Warnungen entfallen"}},
 };
+
+/// What the transmission calls the settings that it warns of.
+const WarningRow kNames[] = {
+    {"AF list", {826, "AF-Liste"}}, {"AF method A", {827, "AF-Methode A"}}, {"radiotext:", {828, "Radiotext:"}}};
 
 /// What stands for %1 and %2 when the warning is this one.
 std::optional<QStringList> partsOf(const QString& warning, const char* form) {
@@ -65,9 +78,19 @@ QString warningText(const Captions& captions, const std::string& warning) {
         QString shown = captionText(captions, row.caption);
         if (parts->size() == 1) shown = shown.arg(parts->at(0));
         if (parts->size() == 2) shown = shown.arg(parts->at(0), parts->at(1));
+        for (const WarningRow& name : kNames)
+            shown.replace(QLatin1String(name.warning), captionText(captions, name.caption));
         return shown;
     }
     return text;
+}
+
+QString withRemedy(const QString& why, bool Corrections::*correction, const Captions& captions,
+                   const ProgramState& state) {
+    if (state.corrections.*correction) return why;
+    const auto* const key = std::ranges::find(kCorrectionKeys, correction, &CorrectionKey::isOn);
+    return why + QStringLiteral(". ") +
+           captionText(captions, {825, "Die Berichtigung %1 behebt das"}).arg(QLatin1String(key->key));
 }
 
 }  // namespace kdx

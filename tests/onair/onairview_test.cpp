@@ -10,6 +10,7 @@ namespace kdx::test {
 namespace {
 
 using namespace std::chrono_literals;
+using ::testing::AllOf;
 using ::testing::HasSubstr;
 using ::testing::Not;
 
@@ -157,7 +158,63 @@ TEST_F(OnAirViewTest, AStereoModeThatThePanelNamesOtherwiseIsMarked) {
     click("Stereo_Opt_1");
     listen();
     EXPECT_EQ(text("Air_Stereo"), "links");
-    EXPECT_EQ(mark("Air_Stereo"), "Im Fenster heißt diese Einstellung rechts");
+    EXPECT_EQ(mark("Air_Stereo"), "Im Fenster heißt diese Einstellung rechts. Die Berichtigung Stereo_Mode behebt das");
+    state.corrections.stereoMode = true;
+    click("Stereo_Opt_2");
+    click("Stereo_Opt_1");
+    listen();
+    EXPECT_EQ(text("Air_Stereo"), "rechts");
+    EXPECT_EQ(mark("Air_Stereo"), "");
+}
+
+TEST_F(OnAirViewTest, AQuoteThatTheCoderRefusesIsMarkedWithItsCorrection) {
+    open();
+    type("PS_T", "A\"B");
+    click("PS_Taste");
+    listen();
+    EXPECT_EQ(mark("Air_PS"), "Der Coder nimmt \"A\"B\" nicht an. Die Berichtigung Anfuehrung behebt das");
+    state.corrections.quotes = true;
+    listen();
+    EXPECT_EQ(mark("Air_PS"), "Der Coder nimmt \"A\"B\" nicht an") << "not sent again yet";
+    click("PS_Taste");
+    listen();
+    EXPECT_EQ(text("Air_PS"), "A\"B     ");
+}
+
+TEST_F(OnAirViewTest, AnotherNetworksProgrammeTypeIsMarkedWithItsCorrection) {
+    open();
+    listen(30s);
+    EXPECT_EQ(remark("D7A2"), "Eingegeben ist Nachrichten. Die Berichtigung EON_PTY behebt das")
+        << "stored, never sent";
+    select("EON_PTY_Combo", 3);
+    listen(30s);
+    EXPECT_EQ(remark("D7A2"), "Eingegeben ist Information. Die Berichtigung EON_PTY behebt das");
+    state.corrections.eonType = true;
+    select("EON_PTY_Combo", 4);
+    listen(30s);
+    EXPECT_EQ(remark("D7A2"), "");
+}
+
+TEST_F(OnAirViewTest, WhatCannotBeSentIsToldInTheLanguageOfTheWindow) {
+    open();
+    type("PS_T", "A\xC2\xA6");
+    click("PS_Taste");
+    session->params.SendParam("AF1", "N,98.7,108.0");
+    session->params.SendParam("AF2", "+,86.0,86.0,98.7");
+    listen();
+    EXPECT_THAT(
+        cells("Air_Budget"),
+        AllOf(HasSubstr("! PS: \"\xC2\xA6\" hat keinen Platz im RDS-Zeichensatz und geht als Leerzeichen hinaus|"),
+              HasSubstr("! AF-Liste 1: 108.0 MHz hat keinen Code und entfällt|"),
+              HasSubstr("! AF-Liste 2: die Senderfrequenz 86.0 MHz hat keinen Code, deshalb entfällt die Liste|")));
+    action("Mnu_Info_Sprache_E")->trigger();
+    listen();
+    EXPECT_THAT(cells("Air_Budget"), HasSubstr("! AF list 1: 108.0 MHz has no code and is left out|"));
+}
+
+TEST_F(OnAirViewTest, NothingThatCanBeTypedIntoHasTheFocusAtFirst) {
+    open();
+    EXPECT_EQ(view->focusWidget(), find<QPushButton>("Air_Kopieren"));
 }
 
 TEST_F(OnAirViewTest, SpeaksTheLanguageOfTheWindow) {

@@ -54,6 +54,14 @@ protected:
         EXPECT_EQ(sign->text().isEmpty(), sign->toolTip().isEmpty());
         return sign->toolTip().toStdString();
     }
+    /// The tool tip of another network's row in the table; "no such network" when it is not there.
+    std::string remark(const std::string& pi) {
+        for (int row = 0; row < table("Air_EON")->rowCount(); ++row) {
+            const QTableWidgetItem* item = table("Air_EON")->item(row, 0);
+            if (item->text().endsWith(QString::fromStdString(pi))) return item->toolTip().toStdString();
+        }
+        return "no such network";
+    }
     /// All cells of a table, a row a line.
     std::string cells(const char* name) {
         std::string all;
