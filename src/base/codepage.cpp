@@ -55,7 +55,7 @@ std::string fromUtf8(std::string_view text) {
         unsigned code = length == 1 ? lead : lead & (0x7FU >> length);
         for (; got < length && at + got < text.size(); ++got) {
             const auto next = static_cast<unsigned char>(text[at + got]);
-            if ((next & 0xC0U) != 0x80) break;
+            if (!isContinuation(text[at + got])) break;
             code = code << 6U | (next & 0x3FU);
         }
         const bool whole = length > 0 && got == length && code <= 0xFFFF;
@@ -63,6 +63,10 @@ std::string fromUtf8(std::string_view text) {
         at += got == 0 ? 1 : got;
     }
     return bytes;
+}
+
+std::size_t characterCount(std::string_view utf8) {
+    return utf8.size() - static_cast<std::size_t>(std::count_if(utf8.begin(), utf8.end(), isContinuation));
 }
 
 std::size_t characterLength(std::string_view utf8) {

@@ -19,6 +19,9 @@ namespace kdx {
 /// How many bytes the UTF-8 character takes that the text begins with; 0 when it begins with none.
 [[nodiscard]] std::size_t characterLength(std::string_view utf8);
 
+/// Characters of a UTF-8 text.
+[[nodiscard]] std::size_t characterCount(std::string_view utf8);
+
 /// The first character of the UTF-8 text that the code page does not have, or a byte that belongs to none; empty when
 /// fromUtf8() keeps the text whole. A part of the text.
 [[nodiscard]] std::string_view firstOutsideCodePage(std::string_view utf8);

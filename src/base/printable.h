@@ -5,6 +5,12 @@
 
 namespace kdx {
 
+/// Whether the byte is a control character of ASCII.
+[[nodiscard]] constexpr bool isControl(char c) {
+    const auto byte = static_cast<unsigned char>(c);
+    return byte < 0x20 || byte == 0x7F;
+}
+
 /// The text as visible characters of ASCII, so that a line stays a line on any terminal: line feed and carriage return
 /// as \n and \r, other control characters and everything above ASCII as \x and two hexadecimal digits.
 [[nodiscard]] std::string printable(std::string_view text);

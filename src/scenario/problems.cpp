@@ -12,15 +12,7 @@ namespace {
 
 constexpr std::size_t kMostProblems = 50;
 constexpr std::string_view kIndentation = " \t";
-
-bool isContinuation(char byte) {
-    return (static_cast<unsigned char>(byte) & 0xC0U) == 0x80U;
-}
-
-bool isControl(char byte) {
-    const auto code = static_cast<unsigned char>(byte);
-    return (code < 0x20 && byte != '\t' && byte != '\n' && byte != '\r') || code == 0x7F;
-}
+constexpr std::string_view kAllowedControls = "\t\n\r";
 
 }  // namespace
 
@@ -29,10 +21,8 @@ void Problems::add(std::size_t at, const std::string& sentence) {
     const std::string_view before = m_text.substr(0, std::min(at, m_text.size()));
     const std::size_t lineBegin = before.rfind('\n') + 1;  // 0 in the first line: npos + 1
     const auto lines = std::count(before.begin(), before.end(), '\n');
-    const auto column = std::count_if(before.begin() + static_cast<std::ptrdiff_t>(lineBegin), before.end(),
-                                      [](char byte) { return !isContinuation(byte); });
-    m_found.push_back(
-        {static_cast<std::size_t>(lines) + 1, static_cast<std::size_t>(column) + 1, printable(sentence, '.')});
+    const std::size_t column = characterCount(before.substr(lineBegin)) + 1;
+    m_found.push_back({static_cast<std::size_t>(lines) + 1, column, printable(sentence, '.')});
 }
 
 std::vector<Problem> Problems::inOrder() const {
@@ -52,7 +42,8 @@ void addForeignBytes(Problems& problems) {
             problems.add(at, "this is not UTF-8");
             return;
         }
-        if (isControl(text[at])) problems.add(at, "a control character");
+        if (isControl(text[at]) && kAllowedControls.find(text[at]) == std::string_view::npos)
+            problems.add(at, "a control character");
         if (indents && text[at] == '\t') {
             problems.add(at, "a tab indents this line; YAML wants blanks");
             indents = false;

@@ -28,14 +28,6 @@ std::string shown(const std::string& bytes) {
     return toUtf8(printableLine(bytes, '.'));
 }
 
-/// Whether sending the one sets the other, as it is read back.
-bool sets(const std::string& sent, const std::string& key) {
-    if (key == "FM" || key == "AM") return sent == key + "_EIN" || sent == key + "_AUS";
-    if (key == "RT" || key == "RT_N") return sent == "RT" || sent == "DEL_RT";
-    if (key.starts_with("EON_")) return sent == "EON_PI" || sent == "EON_DEL" || sent == key;
-    return sent == key || (key.starts_with("AF") && sent.starts_with("AF"));
-}
-
 std::string shown(const std::vector<std::string>& values) {
     std::vector<std::string> texts(values.size());
     std::transform(values.begin(), values.end(), texts.begin(), [](const std::string& value) { return shown(value); });
@@ -101,8 +93,9 @@ void Runner::bringBack() {
     }
     if (!m_outcome.restored) m_outcome.changed.assign(sent.begin(), sent.end());
     for (const std::string& key : m_with.restorer->untold()) {
-        const bool wasSet = m_wholeSent || std::any_of(sent.begin(), sent.end(),
-                                                       [&](const std::string& other) { return sets(other, key); });
+        const bool wasSet = m_wholeSent || std::any_of(sent.begin(), sent.end(), [&](const std::string& other) {
+                                return setsReading(other, key);
+                            });
         if (wasSet) m_outcome.untold.push_back(key);
     }
 }

@@ -5,6 +5,7 @@
 #include "base/codepage.h"
 #include "base/duration.h"
 #include "base/numbers.h"
+#include "base/printable.h"
 #include "coder/keyfacts.h"
 #include "scenario/scenario.h"
 
@@ -14,10 +15,6 @@ namespace {
 
 constexpr std::string_view kTimes = "500 ms, 2 s, 1.5 min or 1 h";
 constexpr std::int64_t kOne = 1'000'000;  // of a decimal
-
-bool isControl(char character) {
-    return static_cast<unsigned char>(character) < 0x20 || character == 0x7F;
-}
 
 std::string quoted(std::string_view text) {
     return "\"" + std::string(text) + "\"";

@@ -5,6 +5,7 @@
 #include <system_error>
 
 #include "base/codepage.h"
+#include "base/printable.h"
 
 namespace kdx {
 
@@ -22,11 +23,6 @@ std::string bytesOf(const std::filesystem::path& path) {
             return "?";  // half a surrogate pair: no text in any encoding
         }
     }
-}
-
-bool isControl(char c) {
-    const auto byte = static_cast<unsigned char>(c);
-    return byte < 0x20 || byte == 0x7F;
 }
 
 }  // namespace

@@ -1,15 +1,8 @@
 #include "settings/withoutcontrols.h"
 
+#include "base/printable.h"
+
 namespace kdx {
-
-namespace {
-
-bool isControl(char c) {
-    const auto byte = static_cast<unsigned char>(c);
-    return byte < 0x20 || byte == 0x7F;
-}
-
-}  // namespace
 
 std::string withoutControls(std::string_view text) {
     while (!text.empty() && isControl(text.front())) text.remove_prefix(1);

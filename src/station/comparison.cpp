@@ -28,15 +28,12 @@ public:
     [[nodiscard]] bool hold(const std::string& key, const std::string& network) const {
         // All other networks are removed, and what is added begins anew. The first AF list makes all others go.
         if (!network.empty()) return true;
-        if (key.starts_with("AF")) return isSent("AF1");
-        if (key == "RT_N") return isSent("RT");
-        if (key == "FM" || key == "AM") return isSent(key + "_AUS");
-        return isSent(key);
+        if (key.starts_with("AF")) return m_keys.count("AF1") != 0;
+        return std::any_of(m_keys.begin(), m_keys.end(),
+                           [&](const std::string& sent) { return setsReading(sent, key); });
     }
 
 private:
-    [[nodiscard]] bool isSent(const std::string& key) const { return m_keys.count(key) != 0; }
-
     std::set<std::string> m_keys;
 };
 

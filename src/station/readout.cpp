@@ -350,6 +350,13 @@ SettingCommands commandsFor(const Differences& differing, const Readout& wanted,
     return commands.take();
 }
 
+bool setsReading(const std::string& sent, const std::string& key) {
+    if (key == "FM" || key == "AM") return sent == key + "_EIN" || sent == key + "_AUS";
+    if (key == "RT" || key == "RT_N") return sent == "RT" || sent == "DEL_RT";
+    if (key.starts_with("EON_")) return sent == "EON_PI" || sent == "EON_DEL" || sent == key;
+    return sent == key || (key.starts_with("AF") && sent.starts_with("AF"));
+}
+
 std::string meaningOf(const std::string& key) {
     if (key == "RT_N") return "radiotext: how often, A/B flag";
     if (key == "FM") return "frequency modulation";

@@ -55,6 +55,9 @@ using SettingCommands = std::vector<SettingCommand>;
 [[nodiscard]] SettingCommands commandsFor(const Differences& differing, const Readout& wanted,
                                           const Corrections& corrections = {});
 
+/// Whether sending the one key sets the value that is read back under the other.
+[[nodiscard]] bool setsReading(const std::string& sent, const std::string& key);
+
 /// What the key stands for, in words; "" for an unknown one.
 [[nodiscard]] std::string meaningOf(const std::string& key);
 

@@ -5,16 +5,12 @@
 
 #include "app/ctl/call.h"
 #include "app/platform.h"
+#include "base/codepage.h"
 #include "settings/shownpath.h"
 
 namespace kdx::ctl {
 
 namespace {
-
-/// Characters of a UTF-8 text.
-std::size_t width(const std::string& text) {
-    return static_cast<std::size_t>(std::count_if(text.begin(), text.end(), [](char c) { return (c & 0xC0) != 0x80; }));
-}
 
 /// The text with each control character but the line end as a point: what an instrument answers moves no cursor and
 /// colours nothing.
@@ -64,13 +60,13 @@ void Output::table(const Rows& rows) {
     std::vector<std::size_t> widths;
     for (const auto& row : rows) {
         widths.resize(std::max(widths.size(), row.size()));
-        for (std::size_t i = 0; i < row.size(); ++i) widths[i] = std::max(widths[i], width(row[i]));
+        for (std::size_t i = 0; i < row.size(); ++i) widths[i] = std::max(widths[i], characterCount(row[i]));
     }
     for (const auto& row : rows) {
         std::string text;
         for (std::size_t i = 0; i < row.size(); ++i) {
             text += row[i];
-            if (i + 1 < row.size()) text += std::string(widths[i] - width(row[i]) + 2, ' ');
+            if (i + 1 < row.size()) text += std::string(widths[i] - characterCount(row[i]) + 2, ' ');
         }
         line(text);
     }
