@@ -1,5 +1,6 @@
 #include "air/shadow.h"
 
+#include <algorithm>
 #include <utility>
 
 #include "base/clock.h"
@@ -19,12 +20,29 @@ constexpr std::size_t kForgottenAfter = Ticks{5s} / kGroupTime;
 // room for eleven.
 constexpr int kOverdueGroups = 8 * 11;
 
-/// What a command sets: the coder's own name of it, or all before the value.
-std::string settingOf(std::string_view command) {
-    constexpr std::string_view kQuote = "\"";
-    const auto text = command.find(kQuote);
-    if (text != std::string_view::npos) command.remove_prefix(text + 1);
-    return std::string(command.substr(0, command.find_first_of(text != std::string_view::npos ? "=" : " ")));
+constexpr std::size_t kMostRefusals = 100;
+
+/// What a command is about.
+struct Subject {
+    std::string setting;  ///< the coder's own name of it, with the network that it is of, or all before the value
+    bool adds = false;    ///< to what the setting has: the lists "AF=+," and "EON-AFB=" with it
+};
+
+Subject subjectOf(std::string_view command) {
+    const auto quote = command.find('"');
+    if (quote == std::string_view::npos) return {std::string(command.substr(0, command.find(' '))), false};
+    command.remove_prefix(quote + 1);
+    const auto equals = command.find('=');
+    Subject subject{std::string(command.substr(0, equals)), false};
+    if (equals == std::string_view::npos) return subject;
+    std::string_view value = command.substr(equals + 1);
+    const auto comma = value.find(',');
+    if (subject.setting.starts_with("EON-") && comma != std::string_view::npos) {
+        subject.setting += ' ' + upperCase(value.substr(0, comma));
+        value.remove_prefix(comma + 1);
+    }
+    subject.adds = value.starts_with('+');
+    return subject;
 }
 
 GroupType typeOf(const Group& group) {
@@ -37,8 +55,7 @@ Shadow::Shadow(const Clock& clock) : m_clock(clock), m_instrument(clock), m_time
     m_instrument.onUnit([this](const sim::CommandUnit&, sim::ScpiError error) {
         if (error == sim::ScpiError::None) return;
         m_isRefused = true;
-        m_refused[settingOf(m_message)] =
-            "refused: " + toUtf8(printableLine(m_message, '.')) + " (" + sim::errorAnswer(error) + ")";
+        refuse("refused: " + toUtf8(printableLine(m_message, '.')) + " (" + sim::errorAnswer(error) + ")");
     });
 }
 
@@ -47,7 +64,7 @@ void Shadow::take(std::string_view command) {
     m_message = command;
     m_isRefused = false;
     m_instrument.execute(command);
-    if (!m_isRefused) m_refused.erase(settingOf(command));
+    if (!m_isRefused) forgetRefused();
     m_composer.take(m_instrument.transmission());
     m_settings.reset();
     ++m_commands;
@@ -108,16 +125,32 @@ void Shadow::count(const Sent& sent, bool comes) {
     }
 }
 
+void Shadow::refuse(const std::string& text) {
+    forgetRefused();
+    if (m_refused.size() == kMostRefusals) m_refused.erase(m_refused.begin());
+    m_refused.push_back({subjectOf(m_message).setting, m_message, text});
+}
+
+// A command that adds to a setting says nothing of the others that add to it.
+void Shadow::forgetRefused() {
+    const Subject subject = subjectOf(m_message);
+    std::erase_if(m_refused, [&](const Refusal& refusal) {
+        return refusal.setting == subject.setting && (!subject.adds || refusal.command == m_message);
+    });
+}
+
 std::vector<std::string> Shadow::warnings() const {
     std::vector<std::string> warnings;
     Composer fresh([&warnings](const std::string& text) { warnings.push_back(text); });
     fresh.take(m_instrument.transmission());
-    for (const auto& [setting, text] : m_refused) warnings.push_back(text);
+    for (const Refusal& refusal : m_refused) warnings.push_back(refusal.text);
     return warnings;
 }
 
-bool Shadow::isRefused(std::string_view setting) const {
-    return m_refused.find(setting) != m_refused.end();
+bool Shadow::isRefused(std::string_view setting, std::string_view value) const {
+    return std::any_of(m_refused.begin(), m_refused.end(), [&](const Refusal& refusal) {
+        return refusal.setting == setting && refusal.command.find(value) != std::string::npos;
+    });
 }
 
 }  // namespace kdx::air

@@ -61,10 +61,17 @@ public:
     /// What cannot be sent as the settings have it, and the commands that were refused and not sent better since, in
     /// words (UTF-8).
     [[nodiscard]] std::vector<std::string> warnings() const;
-    /// Whether the last command that gave the setting ("PI") was refused.
-    [[nodiscard]] bool isRefused(std::string_view setting) const;
+    /// Whether the coder refused the value when the setting was last to have it ("PI", "EON-PS D7A2").
+    [[nodiscard]] bool isRefused(std::string_view setting, std::string_view value) const;
 
 private:
+    struct Refusal {
+        std::string setting;
+        std::string command;
+        std::string text;  ///< in words
+    };
+    void refuse(const std::string& text);
+    void forgetRefused();
     void begin(AirTime from);
     void sendOne();
     void count(const Sent& sent, bool comes);
@@ -82,8 +89,8 @@ private:
     std::uint64_t m_commands = 0;
     std::size_t m_silence = 0;  ///< so long no group went out
     std::shared_ptr<const sim::InstrumentSettings> m_settings;
-    std::map<std::string, std::string, std::less<>> m_refused;  ///< in words, by what the command sets
-    std::string m_message;                                      ///< under way
+    std::vector<Refusal> m_refused;
+    std::string m_message;  ///< under way
     bool m_isRefused = false;
 };
 

@@ -4,6 +4,7 @@
 #include <optional>
 #include <string_view>
 
+#include "air/groupring.h"
 #include "air/shadow.h"
 #include "base/codepage.h"
 #include "coder/fieldsizes.h"
@@ -53,13 +54,28 @@ std::string flag(bool on) {
     return on ? "1" : "0";
 }
 
+/// How the radiotext that was entered differs from what the groups of the sequence carry of it.
+std::optional<Difference> ofRadiotext(const std::string& entry, const sim::Setup& sent) {
+    if (auto difference = ofText(Row::Radiotext, entry, sent.radiotext, kRadiotextLength)) return difference;
+    const auto ring = air::groupRing(sent.groupSequence);
+    const auto has = [&ring](air::GroupType type) { return std::ranges::find(ring, type) != ring.end(); };
+    if (entry.empty() || has(air::GroupType::Radiotext2A)) return std::nullopt;
+    if (!has(air::GroupType::Radiotext2B)) return Difference{Row::Radiotext, Why::Other, entry};
+    constexpr std::size_t kShortRadiotext = 32;  // of groups 2B
+    if (entry.size() <= kShortRadiotext) return std::nullopt;
+    return Difference{Row::Radiotext, Why::Cut, entry};
+}
+
 class Rows {
 public:
     explicit Rows(const air::Shadow& shadow) : m_shadow(shadow) {}
 
-    /// @param setting the coder's name of it, by which commands are refused; @param entry what they were to set.
-    void add(std::string_view setting, const std::string& entry, std::optional<Difference> difference) {
-        if (difference && difference->why == Why::Other && m_shadow.isRefused(setting))
+    /// @param setting the coder's name of it, by which commands are refused; @param entry what they were to set, of
+    /// which no more than the length goes out.
+    void add(std::string_view setting, const std::string& entry, std::optional<Difference> difference,
+             std::size_t length = std::string_view::npos) {
+        const std::string_view goesOut = std::string_view(entry).substr(0, length);
+        if (difference && difference->why == Why::Other && m_shadow.isRefused(setting, goesOut))
             difference = Difference{difference->row, Why::Refused, entry};
         if (difference) m_rows.push_back(*std::move(difference));
     }
@@ -78,14 +94,16 @@ std::vector<Difference> differences(const air::Shadow& shadow, const Station& st
     Rows rows(shadow);
     if (shadow.radio().pi) {
         const std::string pi = padded(entered.pi, kPiLength);
-        rows.add("PI", entered.pi, ofChoice(Row::Pi, upperCase(pi), sent.pi));
-        rows.add("PS", entered.psField, ofPs(entered.psField, sent.ps));
-        rows.add("RT", entered.radiotext, ofText(Row::Radiotext, entered.radiotext, sent.radiotext, kRadiotextLength));
+        rows.add("PI", entered.pi, ofChoice(Row::Pi, upperCase(pi), sent.pi), kPiLength);
+        rows.add("PS", entered.psField, ofPs(entered.psField, sent.ps), kPsLength);
+        rows.add("RT", entered.radiotext, ofRadiotext(entered.radiotext, sent), kRadiotextLength);
         rows.add("PTY", entered.pty, ofChoice(Row::Pty, entered.pty, std::to_string(sent.pty)));
         rows.add("TP", entered.trafficProgramme, ofChoice(Row::Tp, entered.trafficProgramme, flag(sent.tp)));
         rows.add("TA", entered.announcement, ofChoice(Row::Ta, entered.announcement, flag(sent.ta)));
         rows.add("MS", entered.musicSpeech,
                  ofChoice(Row::MusicSpeech, entered.musicSpeech, sent.musicSpeech == 1 ? "M" : "S"));
+        rows.add("DI", entered.decoderInfo,
+                 ofChoice(Row::DecoderInfo, entered.decoderInfo, std::to_string(sent.decoderInfo)));
     }
     // The panel counts its modes from 0 and sends that number, the coder counts from 1.
     const std::string& mode = station.multiplex.stereoMode;

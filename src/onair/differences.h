@@ -12,7 +12,7 @@ class Shadow;
 
 /// Something that the radio shows otherwise than the entry field or the panel says.
 struct Difference {
-    enum class Row { Pi, Ps, Radiotext, Pty, Tp, Ta, MusicSpeech, StereoMode };
+    enum class Row { Pi, Ps, Radiotext, Pty, Tp, Ta, MusicSpeech, DecoderInfo, StereoMode };
     enum class Why {
         Other,    ///< nothing of the following
         Refused,  ///< the coder did not take it

@@ -89,12 +89,14 @@ void GroupMonitor::label() {
 }
 
 void GroupMonitor::show(const air::Shadow& shadow) {
+    const auto& latest = shadow.sent();
+    const bool goesOut = !latest.empty() && latest.back().what.kind == air::OnAir::Kind::Group;
     std::size_t all = 0;
     for (const auto& [type, groups] : shadow.types()) all += groups.count;
     for (int row = 0; row < Air_Gruppen->rowCount(); ++row) {
         const auto found = shadow.types().find(kTypes.at(static_cast<std::size_t>(row)));
-        const bool isSent = found != shadow.types().end();
-        const int percent = isSent && all > 0 ? static_cast<int>((200 * found->second.count / all + 1) / 2) : 0;
+        const bool isSent = goesOut && found != shadow.types().end();
+        const int percent = isSent ? static_cast<int>((200 * found->second.count / all + 1) / 2) : 0;
         showCell(row, Blocks, isSent ? blocksOf(found->second.latest) : QString());
         QTableWidgetItem* share = Air_Gruppen->item(row, Share);
         if (share->data(kPercent).toInt() != percent) share->setData(kPercent, percent);

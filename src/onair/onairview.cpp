@@ -7,7 +7,11 @@
 #include <QLabel>
 #include <QPushButton>
 #include <QSaveFile>
+#include <QScreen>
+#include <QShowEvent>
 #include <QTimer>
+
+#include <algorithm>
 
 #include "air/multiplexfile.h"
 #include "air/shadow.h"
@@ -23,7 +27,7 @@ namespace kdx {
 
 namespace {
 
-constexpr int kIntervalMs = 200;
+constexpr int kIntervalMs = 250;
 
 /// The groups among what went out, as the lines of a group log.
 QByteArray groupLog(const std::deque<air::Sent>& sent) {
@@ -47,6 +51,19 @@ bool saveMultiplex(const std::deque<air::Sent>& sent, const QString& name) {
                             length);
     for (const air::Sent& one : sent) file.add(one.what, *one.settings);
     return file.close();
+}
+
+/// Where both windows can be seen, if the screen has room for them side by side; else where it is.
+void moveBeside(QWidget& view, const QWidget* window) {
+    if (window == nullptr) return;
+    const QRect screen = window->screen()->availableGeometry();
+    const QRect taken = window->frameGeometry();
+    const int y = std::clamp(taken.top(), screen.top(), std::max(screen.top(), screen.bottom() - view.height()));
+    if (taken.right() + view.width() < screen.right()) {
+        view.move(taken.right() + 1, y);
+    } else if (taken.left() - view.width() > screen.left()) {
+        view.move(taken.left() - view.width() - 1, y);
+    }
 }
 
 }  // namespace
@@ -93,8 +110,9 @@ void OnAirView::arrange() {
         this,
         column({note, {columns, 1}, row({Air_Gruppen_Sichern, Air_MPX_Sichern, Air_Kopieren, kRoom, Air_Schliessen})}),
         6);
-    // In letters, so that it is the same on every display.
-    resize(fontMetrics().averageCharWidth() * 150, fontMetrics().height() * 50);
+    // In letters, so that it is the same on every display, if that has room for it.
+    const QSize wanted(fontMetrics().averageCharWidth() * 150, fontMetrics().height() * 50);
+    resize(wanted.boundedTo(screen()->availableGeometry().size() * 9 / 10));
 }
 
 void OnAirView::label() {
@@ -112,6 +130,13 @@ void OnAirView::forgetTexts() {
 }
 
 void OnAirView::showEvent(QShowEvent* event) {
+    if (!event->spontaneous()) {
+        if (m_place) {
+            move(*m_place);
+        } else {
+            moveBeside(*this, parentWidget());
+        }
+    }
     m_shadow.setWatched(true);
     AirTimer_Timer();
     m_timer->start();
@@ -119,6 +144,7 @@ void OnAirView::showEvent(QShowEvent* event) {
 }
 
 void OnAirView::hideEvent(QHideEvent* event) {
+    if (!event->spontaneous()) m_place = pos();
     m_timer->stop();
     m_shadow.setWatched(false);
     QDialog::hideEvent(event);

@@ -1,6 +1,9 @@
 #pragma once
 
 #include <QDialog>
+#include <QPoint>
+
+#include <optional>
 
 #include "ui/caption.h"
 #include "ui/pagecontext.h"
@@ -50,6 +53,7 @@ private:
     PageContext m_with;
     CaptionBook m_book;
     QTimer* m_timer = nullptr;
+    std::optional<QPoint> m_place;  ///< where it was when it was last open
     RadioFace* m_face = nullptr;
     RadioTables* m_tables = nullptr;
     GroupMonitor* m_groups = nullptr;

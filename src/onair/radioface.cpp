@@ -18,16 +18,16 @@ namespace kdx {
 namespace {
 
 /// As Difference::Row counts, and the clock behind.
-enum Row { Pi, Ps, Radiotext, Pty, Tp, Ta, MusicSpeech, StereoMode, ClockTime };
+enum Row { Pi, Ps, Radiotext, Pty, Tp, Ta, MusicSpeech, DecoderInfo, StereoMode, ClockTime };
 
 struct RowCaption {
     const char* name;
     Caption caption;
 };
 const RowCaption kHeadings[] = {
-    {"Air_PI", {725, "PI"}},   {"Air_PS", {723, "PS"}}, {"Air_RT", {49}},
-    {"Air_PTY", {726, "PTY"}}, {"Air_TP", {727, "TP"}}, {"Air_TA", {728, "TA"}},
-    {"Air_MS", {55}},          {"Air_Stereo", {29}},    {"Air_CT", {54}},
+    {"Air_PI", {725, "PI"}}, {"Air_PS", {723, "PS"}}, {"Air_RT", {49}}, {"Air_PTY", {726, "PTY"}},
+    {"Air_TP", {727, "TP"}}, {"Air_TA", {728, "TA"}}, {"Air_MS", {55}}, {"Air_DI", {829, "DI"}},
+    {"Air_Stereo", {29}},    {"Air_CT", {54}},
 };
 constexpr int kFirstStereoMode = 361;  // the captions of the panel
 constexpr const char* kStereoModes[] = {"links", "rechts", "links = rechts", "links = -rechts", "links =/ rechts"};
@@ -95,6 +95,7 @@ void RadioFace::arrange() {
     place(Ta, 4, 0, 1);
     place(StereoMode, 4, 3, 1);
     place(ClockTime, 5, 0, 1);
+    place(DecoderInfo, 5, 3, 1);
     grid->setColumnStretch(1, 1);
     grid->setColumnStretch(4, 1);
     layOut(this, grid);
@@ -131,6 +132,8 @@ void RadioFace::showValues(const air::Shadow& shadow) {
     showText(m_rows[Tp].value, onOff(radio.tp));
     showText(m_rows[Ta].value, onOff(radio.ta));
     showText(m_rows[MusicSpeech].value, radio.music ? caption({*radio.music ? 56 : 57}) : QString());
+    const auto decoderInfo = radio.decoderInfoNumber();
+    showText(m_rows[DecoderInfo].value, decoderInfo ? QString::number(*decoderInfo) : QString());
     const sim::Setup& sent = shadow.transmission().settings;
     const int mode = sent.stereoMode - 1;
     showText(m_rows[StereoMode].value,
@@ -183,8 +186,12 @@ void RadioFace::mark(Row& row, const QString& why) const {
 
 QString RadioFace::text() const {
     QString text;
-    for (const Row& row : m_rows)
-        text += row.heading->text() + QLatin1Char('\t') + row.value->text() + QLatin1Char('\n');
+    for (const Row& row : m_rows) {
+        text += row.heading->text() + QLatin1Char('\t') + row.value->text();
+        if (const QString why = row.sign->toolTip(); !why.isEmpty())
+            text += QLatin1Char('\t') + QString(kDifferenceSign) + QLatin1Char(' ') + why;
+        text += QLatin1Char('\n');
+    }
     return text;
 }
 

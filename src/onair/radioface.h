@@ -29,7 +29,7 @@ public:
     [[nodiscard]] QString text() const;
 
 private:
-    static constexpr std::size_t kRows = 9;
+    static constexpr std::size_t kRows = 10;
     struct Row {
         QLabel* heading = nullptr;
         QLabel* value = nullptr;

@@ -106,7 +106,7 @@ void RadioTables::showNetworks(const air::Shadow& shadow, const Station& station
     for (const air::ReceivedNetwork& network : radio.networks) {
         if (radio.groups - network.lastGroup > kForgottenAfter) continue;
         const QString pi = QStringLiteral("%1").arg(network.pi, 4, 16, QLatin1Char('0')).toUpper();
-        const QString why = whyMarked(network, station);
+        const QString why = whyMarked(network, shadow, station.otherNetwork);
         const QString type = network.pty ? programmeType(static_cast<std::size_t>(*network.pty)) : QString();
         rows.push_back({{why.isEmpty() ? pi : QString(kDifferenceSign) + QLatin1Char(' ') + pi,
                          QString::fromStdString(air::shownText(network.ps)), type, flag(network.tp), flag(network.ta),
@@ -122,9 +122,9 @@ QString RadioTables::programmeType(std::size_t number) const {
 }
 
 /// Only the network that the page is about is one that something was entered for.
-QString RadioTables::whyMarked(const air::ReceivedNetwork& network, const Station& station) const {
-    const OtherNetwork& entered = station.otherNetwork;
-    const auto digits = QStringLiteral("%1").arg(network.pi, 4, 16, QLatin1Char('0')).toStdString();
+QString RadioTables::whyMarked(const air::ReceivedNetwork& network, const air::Shadow& shadow,
+                               const OtherNetwork& entered) const {
+    const auto digits = QStringLiteral("%1").arg(network.pi, 4, 16, QLatin1Char('0')).toUpper().toStdString();
     if (!equalNoCase(entered.pi, digits)) return {};
     const std::string_view ps = std::string_view(entered.ps).substr(0, kPsLength);
     if (const auto character = withoutRdsCode(ps)) {
@@ -132,9 +132,18 @@ QString RadioTables::whyMarked(const air::ReceivedNetwork& network, const Statio
             .arg(toText(std::string(1, *character)));
     }
     for (std::size_t i = 0; i < kPsLength; ++i) {
-        if (network.ps.at(i) != rdsCode(i < ps.size() ? ps[i] : ' '))
-            return caption({790, "Eingegeben ist %1"}).arg(toText(entered.ps));
+        if (network.ps.at(i) == rdsCode(i < ps.size() ? ps[i] : ' ')) continue;
+        return (shadow.isRefused("EON-PS " + digits, ps) ? caption({791, "Der Coder nimmt %1 nicht an"})
+                                                         : caption({790, "Eingegeben ist %1"}))
+            .arg(toText(entered.ps));
     }
+    const auto differs = [](const std::string& flag, std::optional<bool> on) {
+        return on && flag != (*on ? "1" : "0");
+    };
+    if (differs(entered.tp, network.tp))
+        return caption({790, "Eingegeben ist %1"}).arg(QStringLiteral("TP ") + toText(entered.tp));
+    if (differs(entered.ta, network.ta))
+        return caption({790, "Eingegeben ist %1"}).arg(QStringLiteral("TA ") + toText(entered.ta));
     const std::string type = programmeTypeNumber(entered.pty, m_with.captions);
     if (type.empty() || type == std::to_string(network.pty.value_or(0))) return {};
     return withRemedy(caption({790, "Eingegeben ist %1"}).arg(programmeType(std::stoul(type))), &Corrections::eonType,

@@ -10,6 +10,7 @@ class QTableWidget;
 
 namespace kdx {
 
+struct OtherNetwork;
 struct Station;
 namespace air {
 class Shadow;
@@ -32,7 +33,8 @@ private:
     void showFrequencies(const air::Shadow& shadow);
     void showNetworks(const air::Shadow& shadow, const Station& station);
     void showMessages(const air::Shadow& shadow);
-    [[nodiscard]] QString whyMarked(const air::ReceivedNetwork& network, const Station& station) const;
+    [[nodiscard]] QString whyMarked(const air::ReceivedNetwork& network, const air::Shadow& shadow,
+                                    const OtherNetwork& entered) const;
     [[nodiscard]] QStringList cellsOf(const air::TrafficMessage& message);
     [[nodiscard]] QString caption(const Caption& caption) const { return captionText(m_with.captions, caption); }
     [[nodiscard]] QString programmeType(std::size_t number) const;

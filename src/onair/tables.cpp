@@ -31,6 +31,7 @@ bool showCell(QTableWidget* table, int row, int column, const QString& text, con
     item->setToolTip(as.why);
     item->setFont(font);
     item->setForeground(brush);
+    item->setTextAlignment(Qt::AlignLeft | Qt::AlignTop);  // what belongs to a long list stays where it begins
     return true;
 }
 

@@ -157,15 +157,41 @@ TEST_F(ShadowTest, WarnsOfWhatCannotBeSentWhileItIsSet) {
 
 TEST_F(ShadowTest, ARefusedCommandIsToldUntilOneIsTaken) {
     coder("PI=XYZ ");
-    EXPECT_TRUE(shadow.isRefused("PI"));
+    EXPECT_TRUE(shadow.isRefused("PI", "XYZ"));
+    EXPECT_FALSE(shadow.isRefused("PI", "D3C1")) << "that was never sent";
     EXPECT_THAT(shadow.warnings(), UnorderedElementsAre(HasSubstr("refused: :STEREO:DIRECT \"PI=XYZ \"")));
     coder("PS=ABC     ");
-    EXPECT_TRUE(shadow.isRefused("PI"));
+    EXPECT_TRUE(shadow.isRefused("PI", "XYZ"));
     coder("PI=D3C1");
-    EXPECT_FALSE(shadow.isRefused("PI"));
+    EXPECT_FALSE(shadow.isRefused("PI", "XYZ"));
     EXPECT_TRUE(shadow.warnings().empty());
     shadow.take(":STEREO:PILOT:PHASE 999DEG");
-    EXPECT_TRUE(shadow.isRefused(":STEREO:PILOT:PHASE"));
+    EXPECT_TRUE(shadow.isRefused(":STEREO:PILOT:PHASE", "999DEG"));
+}
+
+TEST_F(ShadowTest, ARefusedListIsToldHoweverManyFollowIt) {
+    coder("AF=N,98.5,66.0");
+    coder("AF=+,98.5,89.3");
+    coder("AF=+,98.5,200");
+    coder("AF=+,98.5,200");
+    EXPECT_THAT(shadow.warnings(), UnorderedElementsAre(HasSubstr("AF=N,98.5,66.0"), HasSubstr("AF=+,98.5,200")));
+    coder("AF=N,98.5,89.3");
+    EXPECT_TRUE(shadow.warnings().empty()) << "all lists begin anew";
+}
+
+TEST_F(ShadowTest, WhatIsRefusedOfOneNetworkIsNoneOfAnothers) {
+    coder("EON-PI=D3C2");
+    coder("EON-PI=D3C3");
+    coder("EON-TP=D3C2,7");
+    coder("EON-TP=D3C3,1");
+    EXPECT_THAT(shadow.warnings(), UnorderedElementsAre(HasSubstr("EON-TP=D3C2,7")));
+    coder("EON-TP=D3C2,1");
+    EXPECT_TRUE(shadow.warnings().empty());
+}
+
+TEST_F(ShadowTest, AHundredRefusalsAreKept) {
+    for (int i = 0; i < 1000; ++i) shadow.take("NO:SUCH:COMMAND" + std::to_string(i) + " 1");
+    EXPECT_EQ(shadow.warnings().size(), 100U);
 }
 
 }  // namespace

@@ -153,6 +153,84 @@ TEST_F(OnAirViewTest, ARefusedPiIsMarked) {
     EXPECT_EQ(mark("Air_PI"), "");
 }
 
+TEST_F(OnAirViewTest, OnlyWhatWasRefusedIsSaidToBeRefused) {
+    open();
+    type("PI_T", "XYZ1");
+    click("Command3");
+    type("PI_T", "D3C1");
+    listen();
+    EXPECT_EQ(mark("Air_PI"), "Eingegeben ist \"D3C1\"") << "that was never sent";
+}
+
+TEST_F(OnAirViewTest, EveryChoiceThatWasNotSentIsMarked) {
+    open();
+    state.InstrumentOnline = false;
+    Programme& entered = session->station.programme;
+    entered.pty = "7";
+    entered.trafficProgramme = text("Air_TP") == "ein" ? "0" : "1";
+    entered.announcement = "1";
+    entered.musicSpeech = "S";
+    entered.decoderInfo = "15";
+    listen();
+    for (const char* row : {"Air_PTY", "Air_TP", "Air_TA", "Air_MS", "Air_DI"}) EXPECT_NE(mark(row), "") << row;
+    EXPECT_EQ(mark("Air_DI"), "Eingegeben ist \"15\"");
+}
+
+TEST_F(OnAirViewTest, ARadiotextThatNoGroupCarriesWholeIsMarked) {
+    open();
+    listen();
+    EXPECT_EQ(mark("Air_RT"), "");
+    session->params.SendParam("GROUPSEQ", "0A,2B");
+    listen();
+    EXPECT_THAT(mark("Air_RT"), HasSubstr("Für die Anzeige gekürzt; eingegeben ist"));
+    session->params.SendParam("GROUPSEQ", "0A");
+    listen();
+    EXPECT_THAT(mark("Air_RT"), HasSubstr("Eingegeben ist"));
+}
+
+TEST_F(OnAirViewTest, AnotherNetworkIsMarkedWhereItDiffers) {
+    open();
+    listen(30s);
+    state.corrections.eonType = true;
+    select("EON_PTY_Combo", 2);
+    select("EON_PTY_Combo", 1);
+    listen(30s);
+    EXPECT_EQ(remark("D7A2"), "");
+    session->station.otherNetwork.tp = "0";
+    listen();
+    EXPECT_EQ(remark("D7A2"), "Eingegeben ist TP 0");
+    session->station.otherNetwork.tp = "1";
+    session->station.otherNetwork.ta = "1";
+    listen();
+    EXPECT_EQ(remark("D7A2"), "Eingegeben ist TA 1");
+    session->station.otherNetwork.ps = "ANDERS";
+    listen();
+    EXPECT_EQ(remark("D7A2"), "Eingegeben ist ANDERS");
+}
+
+TEST_F(OnAirViewTest, NoGroupsAreShownWhileNoneGoOut) {
+    open();
+    listen();
+    EXPECT_THAT(cells("Air_Gruppen"), HasSubstr("%"));
+    session->params.SendParam("RDS", "0");
+    listen(1s);
+    EXPECT_THAT(cells("Air_Gruppen"), Not(HasSubstr("%")));
+    session->params.SendParam("RDS", "1");
+    listen(1s);
+    EXPECT_THAT(cells("Air_Gruppen"), HasSubstr("%"));
+}
+
+TEST_F(OnAirViewTest, OpensBesideTheWindowAndComesBackWhereItWas) {
+    open();
+    const QRect screen = view->screen()->availableGeometry();
+    EXPECT_TRUE(screen.contains(view->geometry()));
+    view->move(screen.topLeft() + QPoint(7, 11));
+    const QPoint place = view->pos();
+    view->close();
+    openView();
+    EXPECT_EQ(view->pos(), place);
+}
+
 TEST_F(OnAirViewTest, AStereoModeThatThePanelNamesOtherwiseIsMarked) {
     open();
     click("Stereo_Opt_1");
