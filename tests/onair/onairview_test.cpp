@@ -295,6 +295,55 @@ TEST_F(OnAirViewTest, NothingThatCanBeTypedIntoHasTheFocusAtFirst) {
     EXPECT_EQ(view->focusWidget(), find<QPushButton>("Air_Kopieren"));
 }
 
+TEST_F(OnAirViewTest, SaysThatItShowsTheVirtualCoder) {
+    open();
+    EXPECT_EQ(text("Air_Hinweis"),
+              "Gezeigt wird, was der virtuelle Coder aus den Befehlen macht; das Gerät selbst wird nicht gehört.");
+}
+
+TEST_F(OnAirViewTest, TheSpectrumAndThePeakDeviationFollowTheMultiplex) {
+    open();
+    const auto shown = [this] {
+        listen(1s);
+        return find("Air_Spektrum")->grab().toImage();
+    };
+    session->params.SendParam("PILOT", "1");
+    const QImage withPilot = shown();
+    EXPECT_THAT(text("Air_Spitzenhub"), ::testing::MatchesRegex("Spitzenhub [0-9]+[.][0-9] kHz"));
+    session->params.SendParam("PILOT", "0");
+    const QImage without = shown();
+    EXPECT_NE(withPilot, without);
+    session->params.SendParam("RDS", "0");
+    EXPECT_NE(shown(), without);
+}
+
+TEST_F(OnAirViewTest, MessagesThatNobodyAnnouncedAreTold) {
+    open();
+    session->params.SendParam("GROUPSEQ", "0A,8A");
+    sendMessage();
+    listen();
+    EXPECT_EQ(cells("Air_TMC"), "\u2260 8A ohne 3A: das Radio übergeht die Meldungen|||||\n");
+}
+
+TEST_F(OnAirViewTest, ANewListOfEventsIsReadAnew) {
+    open();
+    session->params.SendParam("3A", "01,0068000CD46");
+    sendMessage();
+    listen();
+    const std::string before = cell("Air_TMC", 0, 0);
+    std::ifstream list(folder.path() / "Daten" / "Event.txt", std::ios::binary);
+    std::string bytes(std::istreambuf_iterator<char>(list), {});
+    const auto at = bytes.find(QString::fromStdString(before).toLatin1().toStdString());
+    ASSERT_NE(at, std::string::npos) << before;
+    bytes.replace(at, 1, "#");
+    std::ofstream(folder.path() / "Daten" / "Event.txt", std::ios::binary) << bytes;
+    listen();
+    EXPECT_EQ(cell("Air_TMC", 0, 0), before);
+    view->forgetTexts();
+    listen();
+    EXPECT_EQ(cell("Air_TMC", 0, 0), "#" + before.substr(1));
+}
+
 TEST_F(OnAirViewTest, SpeaksTheLanguageOfTheWindow) {
     open();
     select("PTY_Combo1", 4);

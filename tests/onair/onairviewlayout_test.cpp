@@ -1,3 +1,4 @@
+#include <QApplication>
 #include <QHeaderView>
 
 #include "onairviewtest.h"
@@ -38,6 +39,21 @@ TEST_F(OnAirViewLayoutTest, NothingIsCutOffInAnyLanguage) {
             EXPECT_LE(shown->horizontalHeader()->length(), shown->viewport()->width()) << language << ' ' << name;
         }
     }
+}
+
+TEST_F(OnAirViewLayoutTest, NothingIsCutOffAtAnyUsualSizeOfLetters) {
+    const QFont before = QApplication::font();
+    for (const int points : {8, 10, 12}) {
+        QFont font = before;
+        font.setPointSize(points);
+        QApplication::setFont(font);
+        openFull("deutsch");
+        expectNothingCutOff(*view, std::to_string(points) + " points");
+        const QSize least = view->minimumSizeHint();
+        EXPECT_TRUE(least.width() <= 1024 && least.height() <= 740)
+            << "a small screen has room: " << least.width() << " x " << least.height();
+    }
+    QApplication::setFont(before);
 }
 
 TEST_F(OnAirViewLayoutTest, EveryControlCanBeReachedAndHasAName) {
