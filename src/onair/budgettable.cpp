@@ -25,6 +25,10 @@ QString seconds(double value) {
     return QString::number(value, 'f', 2) + QStringLiteral(" s");
 }
 
+QString percent(double share) {
+    return QString::number(100 * share, 'f', 1) + QStringLiteral(" %");
+}
+
 }  // namespace
 
 BudgetTable::BudgetTable(const PageContext& with, QWidget* parent) : QGroupBox(parent), m_with(with) {
@@ -46,6 +50,7 @@ void BudgetTable::show(const air::Shadow& shadow) {
     std::vector<TableRow> rows;
     addWarnings(rows, shadow);
     addWaits(rows, shadow);
+    addShares(rows, shadow);
     addDeviations(rows, shadow);
     showRows(Air_Budget, rows);
 }
@@ -77,13 +82,21 @@ void BudgetTable::addWaits(std::vector<TableRow>& rows, const air::Shadow& shado
     }
 }
 
+void BudgetTable::addShares(std::vector<TableRow>& rows, const air::Shadow& shadow) const {
+    const air::GroupBudget budget = air::groupBudgetOf(shadow.transmission());
+    if (budget.shares.empty()) return;
+    rows.push_back({{caption({751, "Gruppen"}), caption({754, "Anteil"}), QString()}, true});
+    for (const auto& [type, share] : budget.shares) {
+        rows.push_back({{QString::fromStdString(air::nameOf(type)), percent(share), QString()}});
+    }
+}
+
 void BudgetTable::addDeviations(std::vector<TableRow>& rows, const air::Shadow& shadow) const {
     rows.push_back({{caption({760, "Hub"}), QStringLiteral("kHz"), caption({762, "von 75 kHz"})}, true});
     const air::DeviationBudget budget = air::deviationBudgetOf(shadow.transmission().settings);
     for (std::size_t i = 0; i < kParts.size(); ++i) {
         const auto& part = budget.rows.at(i);
-        rows.push_back({{caption(kParts.at(i)), QString::number(part.hertz / 1000, 'f', 2),
-                         QString::number(100 * part.ofHighest, 'f', 1) + QStringLiteral(" %")}});
+        rows.push_back({{caption(kParts.at(i)), QString::number(part.hertz / 1000, 'f', 2), percent(part.ofHighest)}});
     }
 }
 

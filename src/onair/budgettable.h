@@ -30,6 +30,7 @@ public:
 private:
     void addWarnings(std::vector<TableRow>& rows, const air::Shadow& shadow) const;
     void addWaits(std::vector<TableRow>& rows, const air::Shadow& shadow) const;
+    void addShares(std::vector<TableRow>& rows, const air::Shadow& shadow) const;
     void addDeviations(std::vector<TableRow>& rows, const air::Shadow& shadow) const;
     [[nodiscard]] QString caption(const Caption& caption) const { return captionText(m_with.captions, caption); }
 

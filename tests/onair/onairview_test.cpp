@@ -107,6 +107,7 @@ TEST_F(OnAirViewTest, TheBudgetsAreThereWithTheirWarnings) {
     open();
     EXPECT_THAT(cells("Air_Budget"), HasSubstr("Radiotext|"));
     EXPECT_THAT(cells("Air_Budget"), HasSubstr("|von 75 kHz|"));
+    EXPECT_THAT(cells("Air_Budget"), HasSubstr("\nGruppen|Anteil||\n0A|60.0 %||\n2A|20.0 %||\n14A|20.0 %||\n"));
     EXPECT_THAT(cells("Air_Budget"), Not(HasSubstr("8A ohne 3A")));
     session->params.SendParam("GROUPSEQ", "0A,2A,8A");
     listen();
