@@ -9,7 +9,7 @@
 #include "air/multiplexfile.h"
 #include "app/ctl/aircommands.h"
 #include "app/ctl/laboratory.h"
-#include "base/duration.h"
+#include "app/ctl/secondsoption.h"
 #include "settings/shownpath.h"
 
 namespace kdx::ctl {
@@ -164,17 +164,8 @@ int onAir(Laboratory& laboratory, const Air& what) {
 }
 
 void addTimes(CLI::App& command, const std::shared_ptr<Air>& what) {
-    command
-        .add_option_function<std::string>(
-            "--seconds",
-            [what](const std::string& text) {
-                const auto duration = parseDuration(text + " s");
-                if (!duration || *duration <= 0s || *duration > 24h)
-                    throw CLI::ValidationError("--seconds", "takes up to 86400 seconds, not \"" + text + "\"");
-                what->duration = *duration;
-            },
-            "how much of it, 60 when nothing is said")
-        ->type_name("SECONDS");
+    addSeconds(command, {"--seconds", 1ms, 24h, "up to 86400", "how much of it, 60 when nothing is said"},
+               [what](std::chrono::milliseconds time) { what->duration = time; });
     command
         .add_option_function<std::string>(
             "--start",

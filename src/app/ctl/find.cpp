@@ -3,8 +3,8 @@
 #include <memory>
 
 #include "app/ctl/laboratory.h"
+#include "app/ctl/secondsoption.h"
 #include "base/codepage.h"
-#include "base/duration.h"
 #include "base/printable.h"
 #include "link/discovery.h"
 #include "link/lanresource.h"
@@ -92,17 +92,9 @@ int find(Laboratory& laboratory, std::chrono::milliseconds wait) {
 void addFind(CLI::App& app, Task& task) {
     auto wait = std::make_shared<std::chrono::milliseconds>(1000);
     CLI::App* command = app.add_subcommand("find", "Look for instruments in this machine's networks (VXI-11)");
-    command
-        ->add_option_function<std::string>(
-            "--wait",
-            [wait](const std::string& text) {
-                const auto asked = parseDuration(text + " s");
-                if (!asked || *asked > std::chrono::minutes(1))
-                    throw CLI::ValidationError("--wait", "takes 0 to 60 seconds, not \"" + text + "\"");
-                *wait = *asked;
-            },
-            "how long to wait for answers, 0 to 60; else 1")
-        ->type_name("SECONDS");
+    using namespace std::chrono_literals;
+    addSeconds(*command, {"--wait", 0s, 60s, "0 to 60", "how long to wait for answers, 0 to 60; else 1"},
+               [wait](std::chrono::milliseconds time) { *wait = time; });
     command->footer(
         "Each is asked *IDN?. With a VISA library what that lists on the LAN and the GPIB is asked too. Exit code 4 "
         "when\n"

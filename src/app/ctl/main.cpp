@@ -9,8 +9,8 @@
 #include "app/ctl/call.h"
 #include "app/ctl/laboratory.h"
 #include "app/ctl/output.h"
+#include "app/ctl/secondsoption.h"
 #include "app/platform.h"
-#include "base/duration.h"
 #include "settings/shownpath.h"
 
 namespace {
@@ -34,16 +34,12 @@ void addConnection(CLI::App& app, Call& call) {
 
 /// How long an answer may take. Nobody waits ten minutes for one, and a tenth of a second is what a network may need.
 void addTimeout(CLI::App& app, Call& call) {
-    app.add_option_function<std::string>(
-           "--timeout",
-           [&call](const std::string& text) {
-               using namespace std::chrono_literals;
-               call.program.answerTime = kdx::parseDuration(text + " s");
-               if (!call.program.answerTime || *call.program.answerTime < 100ms || *call.program.answerTime > 600s)
-                   throw CLI::ValidationError("--timeout", "takes 0.1 to 600 seconds, not \"" + text + "\"");
-           },
-           "how long an answer may take, 0.1 to 600; else 2 over the LAN, the VISA library's own time with one")
-        ->type_name("SECONDS");
+    using namespace std::chrono_literals;
+    kdx::ctl::addSeconds(
+        app,
+        {"--timeout", 100ms, 600s, "0.1 to 600",
+         "how long an answer may take, 0.1 to 600; else 2 over the LAN, the VISA library's own time with one"},
+        [&call](std::chrono::milliseconds time) { call.program.answerTime = time; });
 }
 
 void addManner(CLI::App& app, Call& call) {
