@@ -2,6 +2,7 @@
 
 #include <QApplication>
 #include <QFileDialog>
+#include <QFileInfo>
 #include <QInputDialog>
 #include <QMessageBox>
 #include <QPushButton>
@@ -82,9 +83,24 @@ QString QtDialogs::fileToSave(const QString& title, const QString& preset, const
     if (m_ending()) return {};
     QFileDialog box(QApplication::activeWindow(), title, {}, kind);
     box.setAcceptMode(QFileDialog::AcceptSave);
+    box.setOption(QFileDialog::DontConfirmOverwrite);  // asked below, in the language of the window
     box.setLabelText(QFileDialog::Accept, toText(m_captions.own(789, "&Sichern")));
     box.setLabelText(QFileDialog::Reject, toText(m_captions.own(318, "Abbrechen")));
     box.selectFile(preset);
+    while (box.exec() == QDialog::Accepted) {
+        const QString file = box.selectedFiles().value(0);
+        const QString question = toText(m_captions.own(898, "%1 überschreiben?")).arg(QFileInfo(file).fileName());
+        if (!QFileInfo::exists(file) || confirm(title, question)) return file;
+    }
+    return {};
+}
+
+QString QtDialogs::fileToOpen(const QString& title, const QString& kind) {
+    if (m_ending()) return {};
+    QFileDialog box(QApplication::activeWindow(), title, {}, kind);
+    box.setFileMode(QFileDialog::ExistingFile);
+    box.setLabelText(QFileDialog::Accept, toText(m_captions.own(317, "OK")));
+    box.setLabelText(QFileDialog::Reject, toText(m_captions.own(318, "Abbrechen")));
     return box.exec() == QDialog::Accepted ? box.selectedFiles().value(0) : QString();
 }
 

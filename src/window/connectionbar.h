@@ -29,7 +29,11 @@ public:
     void chooseInterface(const char* kind);
     /// The address as it stands in the window.
     [[nodiscard]] std::string address() const;
+    /// The same as the session was opened with.
+    [[nodiscard]] QString openAddress() const;
     void showSessionOpen(bool open);
+    /// Tells the connection in words.
+    void showConnection(const QString& words);
 
 signals:
     void openRequested();
@@ -48,7 +52,8 @@ private:
     ClickableLabel* Adr1_Label = nullptr;
     QLabel* Label6 = nullptr;  // heading of a GPIB address
     QPushButton* Ende_Taste = nullptr;
-    QLabel* Image2 = nullptr;  // banner
+    QLabel* Verbindung_Anzeige = nullptr;  // the connection in words
+    QLabel* Image2 = nullptr;              // banner
 };
 
 }  // namespace kdx

@@ -42,8 +42,6 @@ MainMenu::MainMenu(const PageContext& with, const QString& linkDescription, QMai
     Mnu_Info_RDS_RBDS = entry("Mnu_Info_RDS_RBDS", Mnu_Info, &MainMenu::Mnu_Info_RDS_RBDS_Click);
     Mnu_Info_RS232 = entry("Mnu_Info_RS232", Mnu_Info, nullptr);
     Mnu_TMC_Edit = entry("Mnu_TMC_Edit", Mnu_Info, &MainMenu::listEditorRequested);
-    Mnu_Info_Log = entry("Mnu_Info_Log", Mnu_Info, &MainMenu::logRequested);
-    Mnu_Ansicht_OnAir = entry("Mnu_Ansicht_OnAir", Mnu_Info, &MainMenu::onAirRequested);
     for (QAction* choice : {Mnu_Info_Sprache_D, Mnu_Info_Sprache_E, Mnu_Info_Sprache_US, Mnu_Info_RDS_RBDS}) {
         choice->setCheckable(true);
     }
@@ -64,8 +62,6 @@ void MainMenu::label() {
     Mnu_Info_RDS_RBDS->setText(text({305, "RDS /RBDS"}));
     Mnu_Info_RS232->setText(text({303, "RS232_Set"}));
     Mnu_TMC_Edit->setText(text({304, "TMC Edit"}));
-    Mnu_Info_Log->setText(text({680, "Log"}));
-    Mnu_Ansicht_OnAir->setText(text({720, "Auf Sendung"}));
     Mnu_Info_Sprache_D->setChecked(m_with.state.language == "deutsch");
     Mnu_Info_Sprache_E->setChecked(m_with.state.language == "english");
     Mnu_Info_Sprache_US->setChecked(m_with.state.language == "english US");
