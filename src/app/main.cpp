@@ -1,5 +1,6 @@
 // Options and wiring of the program; what there is to test stands elsewhere.
 #include <QSocketNotifier>
+#include <QStandardPaths>
 
 #include <cstdio>
 #include <cstdlib>
@@ -66,6 +67,13 @@ private:
     }
 };
 
+/// Where the window's page and place are kept: what concerns this user's desktop is none of the instrument's settings.
+std::filesystem::path placeFile() {
+    const QString folder = QStandardPaths::writableLocation(QStandardPaths::GenericConfigLocation);
+    return folder.isEmpty() ? std::filesystem::path()
+                            : std::filesystem::path(folder.toStdString()) / "kdx-rds" / "window.ini";
+}
+
 /// Tries a last time to save what could not be, while there is still somebody to tell.
 void saveTheRest(kdx::DataFolder& data) {
     data.retryUnsaved();
@@ -124,7 +132,9 @@ int main(int argc, char** argv) {
     const EndsWithProgram letGo(session);
     kdx::TickerGroup tickers;
     kdx::HMenue window({session, state, data, captions, clock, dialogs, tickers, claim,
-                        QString::fromStdString(link.description), QString::fromStdString(problem), end});
+                        QString::fromStdString(link.description), QString::fromStdString(problem), end,
+                        link.simulated != nullptr, kdx::shippedAppFolder(argv[0]),
+                        options.tourFolder ? std::filesystem::path() : placeFile()});
     application.guarded(window.objectName(), [&] { window.startUp(); });
     if (options.tourFolder) {
         int result = EXIT_FAILURE;

@@ -79,6 +79,12 @@ void ConnectionBar::chooseInterface(const char* kind) {
     Schnittstellen_Toggle();
 }
 
+void ConnectionBar::use(const QString& kind, const QString& address) {
+    const std::string name = toBytes(kind);
+    m_with.profile.write(name == "TCPIP" ? setting::kLanAddress : setting::kGpibAddress, toBytes(address));
+    chooseInterface(name.c_str());
+}
+
 std::string ConnectionBar::address() const {
     return toBytes(Adr1_Label->text());
 }

@@ -27,6 +27,8 @@ public:
     void Schnittstellen_Toggle();
     /// Puts an interface ("IEC" or "TCPIP") in force and keeps it.
     void chooseInterface(const char* kind);
+    /// Puts interface and address in force and keeps both.
+    void use(const QString& kind, const QString& address);
     /// The address as it stands in the window.
     [[nodiscard]] std::string address() const;
     /// The same as the session was opened with.

@@ -6,12 +6,19 @@
 #include <QMenuBar>
 #include <QSettings>
 #include <QShortcut>
+#include <QSignalBlocker>
 #include <QTabWidget>
 
+#include "link/discovery.h"
+#include "settings/programstate.h"
 #include "station/session.h"
 #include "ui/caption.h"
 #include "ui/clickablelabel.h"
+#include "ui/plaintext.h"
+#include "ui/text.h"
+#include "window/connectionbar.h"
 #include "window/mainmenu.h"
+#include "window/settingsdialog.h"
 #include "window/views.h"
 
 namespace kdx {
@@ -20,6 +27,11 @@ namespace {
 
 constexpr const char* kPlaceKey = "window/place";
 constexpr const char* kPageKey = "window/page";
+constexpr const char* kAddressesKey = "addresses/used";
+
+QString fileText(const std::filesystem::path& file) {
+    return QString::fromStdString(file.string());
+}
 
 }  // namespace
 
@@ -27,6 +39,8 @@ Desktop::Desktop(const Surroundings& with, const PageContext& context, Connectio
                  QMainWindow* window)
     : m_with(with),
       m_window(window),
+      m_context(context),
+      m_bar(bar),
       m_pages(pages),
       m_sets(context, with.session, with.shipped, nullptr),
       m_indicators(context, m_sets, bar, with.simulated, nullptr),
@@ -41,17 +55,74 @@ Desktop::Desktop(const Surroundings& with, const PageContext& context, Connectio
 }
 
 Desktop::~Desktop() {
-    if (m_with.placeFile.empty()) return;
-    QSettings kept(QString::fromStdString(m_with.placeFile.string()), QSettings::IniFormat);
+    if (!keepsPlace()) return;
+    QSettings kept(fileText(m_with.placeFile), QSettings::IniFormat);
     kept.setValue(QLatin1String(kPlaceKey), m_window->saveGeometry());
     kept.setValue(QLatin1String(kPageKey), m_pages.currentIndex());
 }
 
 void Desktop::restorePlace() {
-    if (m_with.placeFile.empty()) return;
-    const QSettings kept(QString::fromStdString(m_with.placeFile.string()), QSettings::IniFormat);
+    if (!keepsPlace()) return;
+    const QSettings kept(fileText(m_with.placeFile), QSettings::IniFormat);
     m_window->restoreGeometry(kept.value(QLatin1String(kPlaceKey)).toByteArray());
     m_pages.setCurrentIndex(kept.value(QLatin1String(kPageKey), m_pages.currentIndex()).toInt());
+}
+
+void Desktop::showSessionOpen(bool open) {
+    m_sessionOpen = open;
+    m_indicators.showSessionOpen(open);
+    if (m_settings != nullptr) m_settings->addresses().showSessionOpen(open);
+    if (open) rememberAddress();
+}
+
+/// The latest first.
+void Desktop::rememberAddress() {
+    if (!keepsPlace() || m_with.simulated) return;
+    constexpr int kMost = 20;
+    const QString used = toText(m_with.state.InterfaceKind + ' ' + m_bar.address());
+    QStringList addresses = usedAddresses();
+    addresses.removeAll(used);
+    addresses.prepend(used);
+    QSettings kept(fileText(m_with.placeFile), QSettings::IniFormat);
+    kept.setValue(QLatin1String(kAddressesKey), addresses.mid(0, kMost));
+}
+
+QStringList Desktop::usedAddresses() const {
+    if (!keepsPlace()) return {};
+    return QSettings(fileText(m_with.placeFile), QSettings::IniFormat)
+        .value(QLatin1String(kAddressesKey))
+        .toStringList();
+}
+
+void Desktop::openSettings() {
+    if (m_settings == nullptr) {
+        const auto find = [](const std::function<bool()>& stopped) {
+            Discovery how;
+            how.stopped = stopped;
+            return discoverLanInstruments(how);
+        };
+        m_settings = new SettingsDialog(m_context, find, m_window);
+        connect(m_settings, &SettingsDialog::languageChanged, this, &Desktop::relabelRequested);
+        connect(m_settings, &SettingsDialog::correctionsChanged, this, &Desktop::useCorrections);
+        connect(&m_settings->addresses(), &AddressesPage::chosen, &m_bar, &ConnectionBar::use);
+        m_settings->addresses().showSessionOpen(m_sessionOpen);
+    }
+    m_settings->load();
+    m_settings->addresses().show(usedAddresses());
+    m_settings->show();
+    m_settings->raise();
+    m_settings->activateWindow();
+}
+
+void Desktop::useCorrections() {
+    m_with.session.readCorrections();
+    m_window->setProperty(kQuotesDoubled, m_with.state.corrections.quotes);
+    markQuotes(*m_window);
+    // Labelling shows the first page; the user's own stays, and is not opened anew either: that reads what was stored.
+    const int page = m_pages.currentIndex();
+    const QSignalBlocker quiet(&m_pages);
+    emit relabelRequested();
+    m_pages.setCurrentIndex(page);
 }
 
 void Desktop::createMenus(MainMenu& info, Views& views) {
@@ -71,6 +142,7 @@ void Desktop::createMenus(MainMenu& info, Views& views) {
     connect(Mnu_Ansicht_Lesen, &QAction::triggered, this, &Desktop::readAllRequested);
 
     Mnu_Einstellungen = named<QAction>("Mnu_Einstellungen", m_window);
+    connect(Mnu_Einstellungen, &QAction::triggered, this, &Desktop::openSettings);
     m_window->menuBar()->addAction(Mnu_Einstellungen);
 
     Mnu_Hilfe = menu("Mnu_Hilfe");
@@ -87,6 +159,10 @@ void Desktop::createKeys() {
     const auto* save = new QShortcut(QKeySequence(Qt::CTRL | Qt::Key_S), m_window);
     connect(save, &QShortcut::activated, this,
             [this] { popUp(m_setMenu.savingMenu(), m_indicators.Datensatz_Anzeige); });
+}
+
+void Desktop::showTips() {
+    m_tips.show(*m_window, m_with.captions);
 }
 
 QMenu* Desktop::menu(const char* name) {
@@ -111,6 +187,7 @@ void Desktop::label() {
     const auto text = [this](const Caption& caption) { return captionText(m_with.captions, caption); };
     m_setMenu.label(m_with.captions);
     m_indicators.label();
+    if (m_settings != nullptr) m_settings->label();
     Mnu_Datei->setTitle(text({890, "Da&tei"}));
     Mnu_Datei_Beenden->setText(text({906, "&Beenden"}));
     Mnu_Ansicht->setTitle(text({907, "Ansi&cht"}));

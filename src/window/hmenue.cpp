@@ -187,6 +187,7 @@ void HMenue::startUp() {
     m_s.session.load();
     setProperty(kQuotesDoubled, m_s.state.corrections.quotes);
     loadPages();
+    m_desktop->showTips();
     m_desktop->restorePlace();
     m_s.session.instrument.log.empty();
     if (upperCase(profile.read(setting::kOpenAtStart)) == "AUTO") INIT_Taste_Click();
@@ -220,6 +221,7 @@ void HMenue::Beschrifter() {
     m_status->label(m_s.captions);
     for (Page* page : m_pages) page->label();
     m_views->label();
+    m_desktop->showTips();
     showNotice();
 }
 
@@ -243,6 +245,7 @@ void HMenue::GTL_Taste_Click() {
     m_s.session.close();
     // Only the switched-off pages and the resting timers keep commands away from the closed handle.
     showSessionOpen(false);
+    setWindowTitle(toText(m_s.state.ProgramTitle));
     m_s.tickers.setHeld(true);
 }
 
@@ -258,7 +261,7 @@ void HMenue::stepGoesOut(const Step& step, std::size_t number, std::size_t total
 
 void HMenue::stepAnswered(const Step& step, const std::string& answer) {
     if (step.kind != Step::Kind::Identify) return;
-    setWindowTitle(toText(answer));
+    setWindowTitle(withBlanks(toText(answer)));
     m_s.tickers.setHeld(false);
     showSessionOpen(true);
 }
