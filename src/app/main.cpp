@@ -25,6 +25,7 @@
 #include "ui/text.h"
 #include "ui/ticker.h"
 #include "window/hmenue.h"
+#include "window/secondprogram.h"
 #include "window/tour.h"
 
 namespace {
@@ -103,6 +104,12 @@ int main(int argc, char** argv) {
         std::fprintf(stderr, "kdx-rds: %s\n", link.description.c_str());
         return EXIT_FAILURE;
     }
+    std::error_code error;
+    if (options.appFolder && !std::filesystem::is_directory(*options.appFolder, error)) {
+        std::fprintf(stderr, "kdx-rds: --app-folder: there is no folder %s\n",
+                     kdx::shownPath(*options.appFolder).c_str());
+        return kUsageError;
+    }
     if (!kdx::hasDisplay()) {
         if (!options.tourFolder) {
             std::fputs("kdx-rds: there is no display; --tour DIR works without one.\n", stderr);
@@ -127,6 +134,8 @@ int main(int argc, char** argv) {
         dialogs.message(kdx::Dialogs::Icon::Critical, kdx::toText(captions.own(313, "Fehler")),
                         kdx::toText(captions.own(314, "Bei \"%1\": %2")).arg(doing, error));
     });
+    if (options.tourFolder && claim.isShared()) data.setReadOnly();
+    if (!options.tourFolder && !kdx::goesOnBesideAnother(claim, data, captions, dialogs)) return EXIT_SUCCESS;
     const auto end = [&application] { application.end(); };
     kdx::Session session(*link.visa, state, data, captions, clock, end);
     const EndsWithProgram letGo(session);

@@ -17,6 +17,7 @@ public:
         const Captions& captions, std::function<bool()> ending = [] { return false; });
 
     void message(Icon icon, const QString& title, const QString& text, const QString& details = {}) override;
+    void about(const QString& text, const QString& madeOf, const QString& details) override;
     bool messageOrStop(const QString& title, const QString& text) override;
     bool confirm(const QString& title, const QString& text) override;
     QString input(const QString& prompt, const QString& title, const QString& preset) override;

@@ -79,7 +79,8 @@ void CorrectionsPage::label() {
     for (std::size_t i = 0; i < kTexts.size(); ++i) {
         const QString text = captionText(m_with.captions, kTexts[i]);
         const QString title = text.section(QStringLiteral(": "), 0, 0);
-        const QString sentence = text.section(QStringLiteral(": "), 1);
+        QString sentence = text.section(QStringLiteral(": "), 1);
+        if (!sentence.isEmpty()) sentence[0] = sentence[0].toUpper();
         Berichtigung[i]->setText(title);
         Berichtigung[i]->setToolTip(sentence);
         m_sentences[i]->setText(sentence);

@@ -82,7 +82,7 @@ void DataSets::keep(const fs::path& file) {
     const auto text = textAtWork();
     const DataSetContent content =
         dataSetAtWork(text ? *text : ProfileText(), m_session.station, m_with.state.corrections.edgeBlanks);
-    if (!writeDataSet(content, file)) tellNotSaved(file);
+    if (!mayWrite(file) || !writeDataSet(content, file)) tellNotSaved(file);
 }
 
 void DataSets::rename() {
@@ -96,7 +96,8 @@ void DataSets::restore() {
     if (!canBeRestored() || !m_with.dialogs.confirm(title(), question)) return;
     const auto shipped = readFile(shippedFile());
     const fs::path file = m_with.data.file(fileAtWork());
-    if (!shipped || !writeDataSet(storedDataSet(ProfileText(*shipped)), file)) return tellNotSaved(file);
+    if (!shipped || !mayWrite(file) || !writeDataSet(storedDataSet(ProfileText(*shipped)), file))
+        return tellNotSaved(file);
     load(whatIsAtWork());
 }
 
@@ -124,6 +125,12 @@ bool DataSets::canBeRestored() const {
     std::error_code error;
     return !file.empty() && fs::is_regular_file(file, error) &&
            !fs::equivalent(file, m_with.data.file(fileAtWork()), error);
+}
+
+/// A folder that is only read stays so; what the user saves elsewhere is his own.
+bool DataSets::mayWrite(const fs::path& file) const {
+    std::error_code error;
+    return !m_with.data.isReadOnly() || !fs::equivalent(file.parent_path(), m_with.data.path(), error);
 }
 
 std::string DataSets::fileAtWork() const {

@@ -45,6 +45,7 @@ private:
 
     PageContext m_with;
     QString m_linkDescription;
+    QMainWindow* m_window;
 
     QMenu* Mnu_Info = nullptr;
     QMenu* Mnu_Info_Interface = nullptr;

@@ -12,6 +12,7 @@
 #include <QPushButton>
 #include <QTemporaryFile>
 #include <QTimer>
+#include <QWindow>
 
 #include <functional>
 
@@ -138,6 +139,31 @@ TEST_F(QtDialogsTest, AnAnswerHasNoControlCharacters) {
         box.accept();
     });
     EXPECT_EQ(dialogs.input(QString(), QString(), QString()), QStringLiteral(" lab 7"));
+}
+
+TEST_F(QtDialogsTest, TheAboutBoxHasNoTitleAndDetailsToBeOpened) {
+    meet<QMessageBox>([](QMessageBox& box) {
+        EXPECT_EQ(box.windowTitle(), QString());
+        EXPECT_EQ(box.windowHandle()->title(), QStringLiteral(" ")) << "an empty one would become the program's name";
+        EXPECT_EQ(box.icon(), QMessageBox::Warning);
+        EXPECT_EQ(box.text(), QStringLiteral("Text"));
+        EXPECT_EQ(box.informativeText(), QStringLiteral("Made of"));
+        EXPECT_EQ(box.detailedText(), QStringLiteral("Tried"));
+        button(box, "&Details")->click();
+        QCoreApplication::processEvents();
+        EXPECT_EQ(button(box, "&Details")->text(), QStringLiteral("&Details"));
+        button(box, "OK")->click();
+    });
+    dialogs.about(QStringLiteral("Text"), QStringLiteral("Made of"), QStringLiteral("Tried"));
+    EXPECT_TRUE(met);
+}
+
+TEST_F(QtDialogsTest, AnAboutBoxWithoutDetailsHasOneButton) {
+    meet<QMessageBox>([](QMessageBox& box) {
+        EXPECT_EQ(box.buttons().size(), 1);
+        box.close();
+    });
+    dialogs.about(QStringLiteral("Text"), QStringLiteral("Made of"), QString());
 }
 
 TEST_F(QtDialogsTest, AFileThatIsThereIsOverwrittenAfterAQuestionOnly) {
