@@ -20,6 +20,7 @@ public:
 
     /// Chooses and shows the list that the data set names.
     void load() override;
+    void showDataSet() override { AfPage::load(); }
     /// Says so when a list is refused.
     void stepGoesOut(const Step& step) override;
 

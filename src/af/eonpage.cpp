@@ -106,9 +106,10 @@ void EonPage::label() {
 void EonPage::showStoredProgrammeType() {
     // The change handler stores the type's name, which reads as the number 0: after such a choice a relabelling and the
     // next start show the first entry, unless that is corrected.
-    showProgrammeTypes(EON_PTY_Combo, setting::kEonPtyShown);
+    const Place& shown = m_with.state.dataSetChosen ? setting::kEonPty.place : setting::kEonPtyShown;
+    showProgrammeTypes(EON_PTY_Combo, shown);
     if (!m_with.state.corrections.eonType) return;
-    const std::string number = programmeTypeNumber(m_with.profile.read(setting::kEonPtyShown), m_with.captions);
+    const std::string number = programmeTypeNumber(m_with.profile.read(shown), m_with.captions);
     const QSignalBlocker quiet(EON_PTY_Combo);
     if (!number.empty()) EON_PTY_Combo->setCurrentIndex(storedEntry(number, kProgrammeTypes));
 }
@@ -124,6 +125,12 @@ void EonPage::load() {
     showStoredProgrammeType();
     m_view.chooseStored(m_with.profile.read(setting::kShownEonAfList));
     if (const int chosen = m_view.options().chosen(); chosen >= 0) EON_AFB_Opt_Click(chosen);
+}
+
+void EonPage::showDataSet() {
+    // Still led by the old network's identifier; nothing else would end what was announced there.
+    if (EON_TA_Zeit->isEnabled()) m_with.params.SendParam(setting::kEonTa.sendKey, "0");
+    EonPage::load();
 }
 
 /// Every EON command is led by the program-wide identifier, which is this network's PI always.

@@ -29,6 +29,8 @@ public:
     void label() override;
     /// The switch shows off whatever is held.
     void load() override;
+    /// An announcement of the network left behind ends.
+    void showDataSet() override;
 
     /// Replaces how the list editor is opened; the call returns when the editor has closed. By default the editor's
     /// window is shown, modal over this one.

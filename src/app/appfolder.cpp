@@ -15,4 +15,8 @@ std::filesystem::path appFolder(const Options& options, const char* program, std
     return chooseAppFolder(places, problem);
 }
 
+std::filesystem::path shippedAppFolder(const char* program) {
+    return shippedFolder(programFolder(program), KDX_SHIPPED_DATA);
+}
+
 }  // namespace kdx

@@ -1,5 +1,6 @@
 // Options and wiring of the program; what there is to test stands elsewhere.
 #include <QSocketNotifier>
+#include <QStandardPaths>
 
 #include <cstdio>
 #include <cstdlib>
@@ -24,6 +25,7 @@
 #include "ui/text.h"
 #include "ui/ticker.h"
 #include "window/hmenue.h"
+#include "window/secondprogram.h"
 #include "window/tour.h"
 
 namespace {
@@ -66,6 +68,13 @@ private:
     }
 };
 
+/// Where the window's page and place are kept: what concerns this user's desktop is none of the instrument's settings.
+std::filesystem::path placeFile() {
+    const QString folder = QStandardPaths::writableLocation(QStandardPaths::GenericConfigLocation);
+    return folder.isEmpty() ? std::filesystem::path()
+                            : std::filesystem::path(folder.toStdString()) / "kdx-rds" / "window.ini";
+}
+
 /// Tries a last time to save what could not be, while there is still somebody to tell.
 void saveTheRest(kdx::DataFolder& data) {
     data.retryUnsaved();
@@ -95,6 +104,12 @@ int main(int argc, char** argv) {
         std::fprintf(stderr, "kdx-rds: %s\n", link.description.c_str());
         return EXIT_FAILURE;
     }
+    std::error_code error;
+    if (options.appFolder && !std::filesystem::is_directory(*options.appFolder, error)) {
+        std::fprintf(stderr, "kdx-rds: --app-folder: there is no folder %s\n",
+                     kdx::shownPath(*options.appFolder).c_str());
+        return kUsageError;
+    }
     if (!kdx::hasDisplay()) {
         if (!options.tourFolder) {
             std::fputs("kdx-rds: there is no display; --tour DIR works without one.\n", stderr);
@@ -119,12 +134,16 @@ int main(int argc, char** argv) {
         dialogs.message(kdx::Dialogs::Icon::Critical, kdx::toText(captions.own(313, "Fehler")),
                         kdx::toText(captions.own(314, "Bei \"%1\": %2")).arg(doing, error));
     });
+    if (options.tourFolder && claim.isShared()) data.setReadOnly();
+    if (!options.tourFolder && !kdx::goesOnBesideAnother(claim, data, captions, dialogs)) return EXIT_SUCCESS;
     const auto end = [&application] { application.end(); };
     kdx::Session session(*link.visa, state, data, captions, clock, end);
     const EndsWithProgram letGo(session);
     kdx::TickerGroup tickers;
     kdx::HMenue window({session, state, data, captions, clock, dialogs, tickers, claim,
-                        QString::fromStdString(link.description), QString::fromStdString(problem), end});
+                        QString::fromStdString(link.description), QString::fromStdString(problem), end,
+                        link.simulated != nullptr, kdx::shippedAppFolder(argv[0]),
+                        options.tourFolder ? std::filesystem::path() : placeFile()});
     application.guarded(window.objectName(), [&] { window.startUp(); });
     if (options.tourFolder) {
         int result = EXIT_FAILURE;

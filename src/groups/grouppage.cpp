@@ -118,8 +118,10 @@ void GroupPage::stepGoesOut(const Step& step) {
 }
 
 void GroupPage::showStored() {
-    // Data set 1 whatever set is at work, although sending stores in the one at work.
-    m_sequence.load(m_with.profile, setting::kShownGroupSequence);
+    // Data set 1 whatever set is at work, although sending stores in the one at work; only a set that the user chose
+    // is shown itself.
+    m_sequence.load(m_with.profile,
+                    m_with.state.dataSetChosen ? setting::kGroupSequence.place : setting::kShownGroupSequence);
     m_with.state.storedGroupSequence = m_sequence.groups;
     showSequence();
 }

@@ -21,6 +21,7 @@ public:
     void label() override;
     /// Start-up: shows the sequence of data set 1; both counters start at 0.
     void load() override;
+    void showDataSet() override { GroupPage::load(); }
     /// Shows the sequence of data set 1 again, in place of what was composed.
     void opened() override;
     /// The sequence that goes out is stored in the data set at work.

@@ -8,11 +8,11 @@
 namespace kdx {
 
 void CommandLog::empty() {
-    note(emptyPlainFile(m_data.file(kCommandLog)));
+    if (!m_data.isReadOnly()) note(emptyPlainFile(m_data.file(kCommandLog)));
 }
 
 void CommandLog::append(std::string_view line) {
-    note(appendToPlainFile(m_data.file(kCommandLog), std::string(line) + "\r\n"));
+    if (!m_data.isReadOnly()) note(appendToPlainFile(m_data.file(kCommandLog), std::string(line) + "\r\n"));
 }
 
 void CommandLog::retry() {

@@ -33,10 +33,16 @@ QueryPage::QueryPage(const PageContext& with, QWidget* parent) : Page(with, pare
 void QueryPage::create() {
     for (const ReadBack& readBack : readBacks()) {
         auto* button = captioned<QPushButton>(readBack.button, {readBack.caption, readBack.design}, this);
-        connect(button, &QPushButton::clicked, this, [this, &readBack] { ask(readBack); });
+        connect(button, &QPushButton::clicked, this, [this, &readBack] { ask({&readBack}); });
         m_buttons.push_back(button);
     }
-    gelesen = captioned<QLabel>("gelesen", {139}, this);
+    m_shown = new QScrollArea(this);
+    gelesen = captioned<QLabel>("gelesen", {139}, m_shown);
+    m_shown->setWidget(gelesen);
+    m_shown->setWidgetResizable(true);
+    m_shown->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    m_shown->setFrameStyle(QFrame::NoFrame);
+    m_book.spoken(m_shown, {139});
     gelesen->setFrameStyle(QFrame::Panel | QFrame::Sunken);
     gelesen->setAlignment(Qt::AlignLeft | Qt::AlignTop);
     gelesen->setWordWrap(true);
@@ -45,7 +51,7 @@ void QueryPage::create() {
     QFont larger = font();
     larger.setPointSizeF(1.2 * larger.pointSizeF());  // read from a distance, with the hands at the instrument
     gelesen->setFont(larger);
-    gelesen->setMinimumHeight(gelesen->fontMetrics().lineSpacing() * 10 + 16);
+    m_shown->setMinimumHeight(gelesen->fontMetrics().lineSpacing() * 10 + 16);
 }
 
 void QueryPage::arrange() {
@@ -67,30 +73,43 @@ void QueryPage::arrange() {
         across = 0;
         if (++lines == kCoderRows) buttons->addWidget(line(), lines++, 0, 1, kColumns);
     }
-    layOut(this, column({buttons, line(), {gelesen, 1}}), 8);
+    layOut(this, column({buttons, line(), {m_shown, 1}}), 8);
 }
 
 void QueryPage::label() {
     Page::label();
-    if (m_asked != nullptr) showAnswers();
+    if (!m_answers.empty()) showAnswers();
 }
 
 void QueryPage::Fragen_Schalter(bool on) {
     for (QPushButton* button : m_buttons) button->setEnabled(on);
 }
 
-void QueryPage::ask(const ReadBack& readBack) {
+void QueryPage::askAll() {
+    std::vector<const ReadBack*> all;
+    for (const int index : kOrder) all.push_back(&readBacks()[static_cast<std::size_t>(index)]);
+    ask(all);
+}
+
+void QueryPage::ask(const std::vector<const ReadBack*>& readBacks) {
     if (!m_with.state.InstrumentOnline) return;
     const CommandSequence sequence(m_with.instrument);
     // Kept here while they come: a box of a failed question lets another button be pressed.
-    std::vector<std::string> answers = kdx::ask(m_with.instrument, readBack, m_with.state.eonIdentifier);
+    std::vector<Answered> answers;
+    for (const ReadBack* readBack : readBacks) {
+        std::vector<std::string> answer = kdx::ask(m_with.instrument, *readBack, m_with.state.eonIdentifier);
+        if (!answers.empty() && m_with.instrument.isSequenceStopped()) break;  // the rest was not asked
+        answers.push_back({readBack, std::move(answer)});
+    }
     m_answers = std::move(answers);
-    m_asked = &readBack;
     showAnswers();
 }
 
 void QueryPage::showAnswers() {
-    gelesen->setText(toText(wordsOf(*m_asked, m_answers, m_with.captions, m_with.state.corrections)));
+    QStringList words;
+    for (const auto& [asked, answers] : m_answers)
+        words += toText(wordsOf(*asked, answers, m_with.captions, m_with.state.corrections));
+    gelesen->setText(words.join(QLatin1Char('\n')));
 }
 
 }  // namespace kdx

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QPushButton>
+#include <QScrollArea>
 
 #include <string>
 #include <vector>
@@ -22,19 +23,26 @@ public:
 
     /// Switches the read-back buttons on or off.
     void Fragen_Schalter(bool on);
+    /// What all buttons do, one after the other; shows all answers.
+    void askAll();
 
 private:
     void create();
     void arrange();
 
+    struct Answered {
+        const ReadBack* asked;
+        std::vector<std::string> answers;
+    };
+
     /// What every button does: ask its questions in turn and show the answers; nothing while no session is open.
-    void ask(const ReadBack& readBack);
+    void ask(const std::vector<const ReadBack*>& readBacks);
     void showAnswers();
 
     std::vector<QPushButton*> m_buttons;  // `Command1`, `Command4` to `Command22`, in that order
+    QScrollArea* m_shown = nullptr;       ///< around the label: all answers together are long
     QLabel* gelesen = nullptr;            // the read-back label
-    const ReadBack* m_asked = nullptr;    ///< whose answers are shown; none at first
-    std::vector<std::string> m_answers;
+    std::vector<Answered> m_answers;      ///< what is shown; nothing at first
 };
 
 }  // namespace kdx

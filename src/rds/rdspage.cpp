@@ -34,7 +34,8 @@ void RdsPage::label() {
 
 void RdsPage::fillProgrammeTypes() {
     showProgrammeTypes(PTY_Combo1, setting::kPty.place);
-    m_programme.pty = std::to_string(PTY_Combo1->currentIndex());
+    // The stored type of data set 1 is put in force, unless the user chose a set: its type is in force then.
+    if (!m_with.state.dataSetChosen) m_programme.pty = std::to_string(PTY_Combo1->currentIndex());
     showProgrammeType();
 }
 
@@ -45,9 +46,21 @@ void RdsPage::showProgrammeType() {
 
 void RdsPage::load() {
     m_ta->load();
+    m_dynamicPs->showStopped();
+    showProgramme();
+    if (!std::exchange(m_loaded, true)) Zeit_Taste_Click();
+}
+
+void RdsPage::showDataSet() {
+    // What the set says nothing about must not stay from the one before.
+    m_with.status.show(StatusSlot::MusicSpeech, QString());
+    m_with.status.show(StatusSlot::Pty, QString());
+    showProgramme();
+}
+
+void RdsPage::showProgramme() {
     PS_T->setText(toText(m_with.profile.read(setting::kPs.place)));  // whole, also what is too long to be sent
     m_with.status.show(StatusSlot::Ps, m_programme.ps);
-    m_dynamicPs->showStopped();
     PI_T->setText(toText(m_programme.pi));
     m_with.status.show(StatusSlot::Pi, m_programme.pi);
     RT_Text1->setText(toText(m_programme.radiotext));
@@ -59,7 +72,6 @@ void RdsPage::load() {
     if (chosen) showMusicSpeech();
     DI_Opt.choose(storedOption(m_programme.decoderInfo, 0, static_cast<int>(DI_Opt.size()) - 1));
     showProgrammeType();
-    if (!std::exchange(m_loaded, true)) Zeit_Taste_Click();
 }
 
 void RdsPage::stepGoesOut(const Step& step) {

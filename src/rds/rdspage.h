@@ -31,6 +31,7 @@ public:
     void label() override;
     /// The first time the clock is switched on.
     void load() override;
+    void showDataSet() override;
     void stepGoesOut(const Step& step) override;
 
 private:
@@ -53,6 +54,7 @@ private:
     void Timer1_Timer();
     void Uhr_Zeit_DblClick();
 
+    void showProgramme();
     void fillProgrammeTypes();
     void showProgrammeType();
     void showMusicSpeech();

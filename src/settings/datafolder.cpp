@@ -109,6 +109,7 @@ DataFolder::UnsavedFile& DataFolder::unsavedPart(std::string_view fileName) {
 }
 
 bool DataFolder::save(const UnsavedFile& unsaved) {
+    if (m_readOnly) return false;
     bool saved = false;
     // Reading, changing and writing are one step: another program on the same folder would lose what comes between.
     return underFolderLock(m_path, [&] { saved = changeFile(unsaved); }) && saved;

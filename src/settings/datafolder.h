@@ -51,6 +51,10 @@ public:
     /// with the next write to the same file or with retryUnsaved().
     void WriteIni(std::string_view section, std::string_view key, std::string_view value, std::string_view fileName);
 
+    /// From now on nothing in the folder is written: values count as ones that cannot be.
+    void setReadOnly() { m_readOnly = true; }
+    [[nodiscard]] bool isReadOnly() const { return m_readOnly; }
+
     /// Tries to write what could not be written so far, and looks again at what could not be read.
     void retryUnsaved();
 
@@ -94,6 +98,7 @@ private:
     std::vector<UnsavedFile> m_unsaved;             // the one that failed last at the end
     mutable std::vector<std::string> m_unreadable;  // likewise
     std::function<void()> m_noticeChanged;
+    bool m_readOnly = false;
 };
 
 }  // namespace kdx

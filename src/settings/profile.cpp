@@ -14,7 +14,7 @@ constexpr std::string_view kCarrierSection = "VRN";
 }  // namespace
 
 Profile Profile::ofFile(DataFolder& data, const std::filesystem::path& file) {
-    Profile profile(data, nullptr, file.string());
+    Profile profile(data, nullptr, nullptr, file.string());
     const auto text = data.profile(profile.m_file);
     profile.m_wholeSetup = text != nullptr && text->anyKey(kMultiplexSection, [](std::string_view) { return true; });
     return profile;
@@ -51,6 +51,7 @@ std::string Profile::fileOf(const Place& place) const {
         case KeptIn::General:
             return kGeneralSettings;
         case KeptIn::DataSet:
+            if (m_opened != nullptr && !m_opened->empty()) return *m_opened;
             return m_dataSet != nullptr ? dataSetFile(*m_dataSet) : m_file;
         case KeptIn::DataSet1:
             break;

@@ -33,8 +33,10 @@ struct Setting {
 class Profile {
 public:
     /// @param number of the data set at work, "1" to "5"; lent and outliving the profile, its changes are followed.
-    [[nodiscard]] static Profile followingDataSet(DataFolder& data, const std::string& number) {
-        return {data, &number, {}};
+    /// @param opened a file that takes the place of the data set's while it is not empty; lent and followed likewise.
+    [[nodiscard]] static Profile followingDataSet(DataFolder& data, const std::string& number,
+                                                  const std::string* opened = nullptr) {
+        return {data, &number, opened, {}};
     }
     /// The same with any file in the place of a data set's. One that has a section "FM" holds a whole set-up: the
     /// multiplex, which data sets leave to the general settings, and the carrier come from there too, as far as it has
@@ -53,12 +55,13 @@ public:
     [[nodiscard]] bool hasSectionOf(const Place& place) const;
 
 private:
-    Profile(DataFolder& data, const std::string* number, std::string file)
-        : m_data(&data), m_dataSet(number), m_file(std::move(file)) {}
+    Profile(DataFolder& data, const std::string* number, const std::string* opened, std::string file)
+        : m_data(&data), m_dataSet(number), m_opened(opened), m_file(std::move(file)) {}
     [[nodiscard]] bool hasInSetup(const Place& place) const;
 
     DataFolder* m_data;
     const std::string* m_dataSet;
+    const std::string* m_opened;
     std::string m_file;
     bool m_wholeSetup = false;
 };

@@ -14,6 +14,8 @@ struct ProgramState {
     bool InstrumentOnline = false;  ///< set by the first successful open; closing leaves it set
     bool LogEnabled = false;
     std::string CurrentDataSet = "1";  ///< "1" to "5"
+    std::string openedFile;            ///< absolute: the file at work in the place of a data set's; usually none
+    bool dataSetChosen = false;        ///< by the user: what is described as read from data set 1 follows the choice
 
     std::string eonIdentifier;  ///< PI of the other network being edited; leads every EON command
     std::string shownClock;     ///< what `Uhr_Zeit` reads: the time that is sent to the coder

@@ -11,7 +11,7 @@ Session::Session(Visa& visa, ProgramState& state, DataFolder& data, const Captio
     : instrument(visa, state, data, captions, clock),
       params(instrument, state, clock, std::move(endProgram)),
       transmitter(instrument, params),
-      profile(Profile::followingDataSet(data, state.CurrentDataSet)),
+      profile(Profile::followingDataSet(data, state.CurrentDataSet, &state.openedFile)),
       m_state(state),
       m_captions(captions),
       m_clock(clock),
@@ -29,6 +29,11 @@ void Session::load(const Profile& source) {
     m_source = source;
     readCorrections();
     station.load(source);
+}
+
+void Session::loadDataSet() {
+    m_source = profile;
+    station.loadDataSet(profile);
 }
 
 void Session::readCorrections() {

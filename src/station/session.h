@@ -31,6 +31,8 @@ struct Session {
     /// What the general settings correct holds from here on.
     void load() { load(profile); }
     void load(const Profile& source);
+    /// Loads the data set at work, another one than before; multiplex and carrier belong to none and stay.
+    void loadDataSet();
     /// What the general settings correct of the program's ways holds from here on; called anew when they change.
     void readCorrections();
     /// Opens the session to the address; see Instrument::open.

@@ -21,11 +21,15 @@ void appendDataSet(Steps& steps, const Station& station, const Corrections& corr
 
 void Station::load(const Profile& profile) {
     multiplex.load(profile);
+    loadDataSet(profile);
+    carrier.load(profile);
+}
+
+void Station::loadDataSet(const Profile& profile) {
     programme.load(profile);
     af.load(profile);
     otherNetwork.load(profile);
     groups.load(profile);
-    carrier.load(profile);
 }
 
 void Station::reload(const Profile& profile) {

@@ -26,6 +26,8 @@ struct Station {
 
     /// Reads the data set of the profile, the multiplex of the general settings and the carrier of data set 1.
     void load(const Profile& profile);
+    /// Reads what the data set alone holds; multiplex and carrier stay as they are.
+    void loadDataSet(const Profile& profile);
     /// Reads anew what lives in its files and is looked up whenever it goes out: AF lists and the carrier's values.
     void reload(const Profile& profile);
 };

@@ -125,7 +125,8 @@ bool TMC_Listedit::Location_Anhaengen() {
 
 bool TMC_Listedit::append(QListView* list, ShownList* entries, const QLabel* text, const QLabel* code,
                           const char* fileName) {
-    if (!appendToTmcList(m_with.data.file(fileName), toBytes(text->text()), toBytes(code->text()))) {
+    if (m_with.data.isReadOnly() ||
+        !appendToTmcList(m_with.data.file(fileName), toBytes(text->text()), toBytes(code->text()))) {
         const QString failure = caption({624, "%1 kann nicht gespeichert werden."});
         m_with.dialogs.message(Dialogs::Icon::Exclamation, windowTitle(), failure.arg(QLatin1String(fileName)));
         return false;

@@ -12,6 +12,11 @@ public:
     virtual ~Dialogs() = default;
     /// Shows a text with an OK button, details in smaller print under it, and waits for it.
     virtual void message(Icon icon, const QString& title, const QString& text, const QString& details = {}) = 0;
+    /// Shows what the program is, in a box without a title: the text, what it is made of in smaller print, and details
+    /// that the user may open.
+    virtual void about(const QString& text, const QString& madeOf, const QString& /*details*/) {
+        message(Icon::Exclamation, {}, text, madeOf);
+    }
     /// Shows a failure as a critical box with an OK button and one that stops the running sequence; true for the
     /// latter.
     virtual bool messageOrStop(const QString& title, const QString& text) = 0;
@@ -24,6 +29,8 @@ public:
     virtual QString fileToSave(const QString& /*title*/, const QString& /*preset*/, const QString& /*kind*/) {
         return {};
     }
+    /// Asks for a file to read; else the same.
+    virtual QString fileToOpen(const QString& /*title*/, const QString& /*kind*/) { return {}; }
 };
 
 }  // namespace kdx

@@ -24,6 +24,8 @@ public:
     /// Start-up: shows what the data set and the general settings hold. Nothing is stored; nothing is sent but by
     /// handlers that are said to run.
     virtual void load() {}
+    /// Another data set was loaded: shows what it holds. Nothing is stored.
+    virtual void showDataSet() {}
     /// The page was opened by its tab.
     virtual void opened() {}
     /// A step of a running sequence goes out: shows what belongs to this page, and stores what sending it stores.

@@ -48,4 +48,8 @@ void keepTextPlain(QObject& control) {
     }
 }
 
+void markQuotes(const QWidget& window) {
+    for (QLineEdit* entry : window.findChildren<QLineEdit*>()) markQuote(*entry);
+}
+
 }  // namespace kdx

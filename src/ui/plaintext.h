@@ -1,6 +1,7 @@
 #pragma once
 
 class QObject;
+class QWidget;
 
 namespace kdx {
 
@@ -11,5 +12,8 @@ inline constexpr const char* kQuotesDoubled = "quotesDoubled";
 /// caption or an answer of the instrument must not make the program fetch a picture. What is typed or pasted into an
 /// entry loses its control characters: line ends copied along would end the command or the line of the file.
 void keepTextPlain(QObject& control);
+
+/// Marks the entries with a double quote anew, when kQuotesDoubled was changed.
+void markQuotes(const QWidget& window);
 
 }  // namespace kdx

@@ -2,9 +2,11 @@
 
 #include <QApplication>
 #include <QFileDialog>
+#include <QFileInfo>
 #include <QInputDialog>
 #include <QMessageBox>
 #include <QPushButton>
+#include <QWindow>
 
 #include <utility>
 
@@ -29,6 +31,12 @@ QMessageBox::Icon boxIcon(Dialogs::Icon icon) {
     return QMessageBox::NoIcon;
 }
 
+/// A window without a title is given the program's name by the toolkit.
+void leaveTitleEmpty(QMessageBox& box) {
+    box.winId();  // makes the window whose title is meant
+    box.windowHandle()->setTitle(QStringLiteral(" "));
+}
+
 bool isClicked(const QMessageBox& box, const QAbstractButton* button) {
     return box.clickedButton() == button;
 }
@@ -43,6 +51,22 @@ void QtDialogs::message(Icon icon, const QString& title, const QString& text, co
     QMessageBox box(boxIcon(icon), title, text, QMessageBox::NoButton, QApplication::activeWindow());
     box.setInformativeText(details);
     box.addButton(toText(m_captions.own(317, "OK")), QMessageBox::AcceptRole);
+    box.exec();
+}
+
+void QtDialogs::about(const QString& text, const QString& madeOf, const QString& details) {
+    if (m_ending()) return;
+    QMessageBox box(QMessageBox::Warning, {}, text, QMessageBox::NoButton, QApplication::activeWindow());
+    box.setInformativeText(madeOf);
+    box.setDetailedText(details);
+    // The only button so far; the toolkit calls it anew at every click.
+    for (QAbstractButton* button : box.buttons()) {
+        const auto name = [this, button] { button->setText(toText(m_captions.own(947, "&Einzelheiten"))); };
+        name();
+        QObject::connect(button, &QAbstractButton::clicked, button, name, Qt::QueuedConnection);
+    }
+    box.addButton(toText(m_captions.own(317, "OK")), QMessageBox::AcceptRole);
+    leaveTitleEmpty(box);
     box.exec();
 }
 
@@ -82,9 +106,24 @@ QString QtDialogs::fileToSave(const QString& title, const QString& preset, const
     if (m_ending()) return {};
     QFileDialog box(QApplication::activeWindow(), title, {}, kind);
     box.setAcceptMode(QFileDialog::AcceptSave);
+    box.setOption(QFileDialog::DontConfirmOverwrite);  // asked below, in the language of the window
     box.setLabelText(QFileDialog::Accept, toText(m_captions.own(789, "&Sichern")));
     box.setLabelText(QFileDialog::Reject, toText(m_captions.own(318, "Abbrechen")));
     box.selectFile(preset);
+    while (box.exec() == QDialog::Accepted) {
+        const QString file = box.selectedFiles().value(0);
+        const QString question = toText(m_captions.own(898, "%1 überschreiben?")).arg(QFileInfo(file).fileName());
+        if (!QFileInfo::exists(file) || confirm(title, question)) return file;
+    }
+    return {};
+}
+
+QString QtDialogs::fileToOpen(const QString& title, const QString& kind) {
+    if (m_ending()) return {};
+    QFileDialog box(QApplication::activeWindow(), title, {}, kind);
+    box.setFileMode(QFileDialog::ExistingFile);
+    box.setLabelText(QFileDialog::Accept, toText(m_captions.own(317, "OK")));
+    box.setLabelText(QFileDialog::Reject, toText(m_captions.own(318, "Abbrechen")));
     return box.exec() == QDialog::Accepted ? box.selectedFiles().value(0) : QString();
 }
 

@@ -17,10 +17,12 @@ public:
         const Captions& captions, std::function<bool()> ending = [] { return false; });
 
     void message(Icon icon, const QString& title, const QString& text, const QString& details = {}) override;
+    void about(const QString& text, const QString& madeOf, const QString& details) override;
     bool messageOrStop(const QString& title, const QString& text) override;
     bool confirm(const QString& title, const QString& text) override;
     QString input(const QString& prompt, const QString& title, const QString& preset) override;
     QString fileToSave(const QString& title, const QString& preset, const QString& kind) override;
+    QString fileToOpen(const QString& title, const QString& kind) override;
 
 private:
     const Captions& m_captions;

@@ -26,6 +26,8 @@ constexpr std::array kPairs = {
     Pair{9, "TA", 0, "TA", 3},         Pair{8, "M / S", 1, "Label1", 7},   Pair{5, "PTY", 4, "Label1", 16},
 };
 
+constexpr int kFirstPair = 2;  // the columns between the pairs are free for further ones
+
 QFont arial(const QFont& base) {
     QFont font = base;
     font.setFamilies(arialFamilies());
@@ -40,27 +42,39 @@ StatusRow::StatusRow(QWidget* parent) : QWidget(parent) {
     grid->setHorizontalSpacing(3);
     grid->setVerticalSpacing(1);
     Gen1_Label = named<QLabel>("Gen1_Label", QStringLiteral("Status :"), this);
-    grid->addWidget(Gen1_Label, 0, 0, 2, 1);
-    int column = 1;
+    grid->addWidget(Gen1_Label, 0, 0);
+    int column = kFirstPair;
     for (const Pair& pair : kPairs) {
         Status[pair.heading] = element<QLabel>("Status", pair.heading, QString::fromUtf8(pair.caption), this);
         Status[pair.value] = element<QLabel>("Status", pair.value, QString::fromUtf8(pair.design), this);
-        for (QLabel* label : {Status[pair.heading], Status[pair.value]}) {
-            label->setFont(arial(font()));
-            label->setAlignment(Qt::AlignCenter);
-        }
-        QLabel* value = Status[pair.value];
-        value->setFrameStyle(QFrame::Panel | QFrame::Sunken);
-        value->setAutoFillBackground(true);
-        value->setAccessibleName(QString::fromUtf8(pair.caption));
-        const QString sample(pair.widest, pair.widest > 8 ? QLatin1Char('e') : QLatin1Char('0'));
-        value->setMinimumWidth(value->fontMetrics().horizontalAdvance(sample) + 6);
-        value->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Fixed);
-        grid->addWidget(Status[pair.heading], 0, column);
-        grid->addWidget(value, 1, column);
-        grid->setColumnStretch(column, pair.widest);
-        ++column;
+        Status[pair.value]->setAccessibleName(QString::fromUtf8(pair.caption));
+        addPair(column, Status[pair.heading], Status[pair.value], pair.widest);
+        column += 2;
     }
+}
+
+void StatusRow::addPair(int column, QLabel* heading, QLabel* value, int widest) {
+    for (QLabel* label : {heading, value}) {
+        label->setFont(arial(font()));
+        label->setAlignment(Qt::AlignCenter);
+    }
+    value->setFrameStyle(QFrame::Panel | QFrame::Sunken);
+    value->setAutoFillBackground(true);
+    const QString sample(widest, widest > 8 ? QLatin1Char('e') : QLatin1Char('0'));
+    value->setMinimumWidth(value->fontMetrics().horizontalAdvance(sample) + 6);
+    value->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Fixed);
+    auto* grid = static_cast<QGridLayout*>(layout());
+    grid->addWidget(heading, 0, column);
+    grid->addWidget(value, 1, column);
+    grid->setColumnStretch(column, widest);
+}
+
+void StatusRow::add(Place place, QLabel* heading, QLabel* value, int widest) {
+    addPair(place == Place::Front ? kFirstPair - 1 : kFirstPair + 3, heading, value, widest);
+}
+
+void StatusRow::addMark(QWidget* mark) {
+    static_cast<QGridLayout*>(layout())->addWidget(mark, 1, 0, Qt::AlignCenter);
 }
 
 void StatusRow::label(const Captions& captions) {

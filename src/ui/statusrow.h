@@ -31,6 +31,13 @@ public:
 
     explicit StatusRow(QWidget* parent);
 
+    /// Where a pair that is none of the array's stands: before the others, or beside the level.
+    enum class Place { Front, BesideLevel };
+    /// Adds a heading with a value under it. @param widest characters of the widest value: its share of the row.
+    void add(Place place, QLabel* heading, QLabel* value, int widest);
+    /// Adds a small mark under `Gen1_Label`.
+    void addMark(QWidget* mark);
+
     /// Captions the headings in the current language; the values stay.
     void label(const Captions& captions);
 
@@ -44,6 +51,8 @@ public:
 
 private:
     [[nodiscard]] QLabel* at(StatusSlot slot) const { return Status.at(static_cast<std::size_t>(slot)); }
+
+    void addPair(int column, QLabel* heading, QLabel* value, int widest);
 
     QLabel* Gen1_Label = nullptr;
     std::array<QLabel*, kSlots> Status{};

@@ -31,6 +31,14 @@ namespace kdx {
     return plain;
 }
 
+/// A text as a title shows it: each control character as a blank.
+[[nodiscard]] inline QString withBlanks(QString text) {
+    for (QChar& c : text) {
+        if (c < QChar(0x20) || c == QChar(0x7F)) c = QLatin1Char(' ');
+    }
+    return text;
+}
+
 /// The window's text as 8-bit Windows-1252; a character the code page does not have becomes '?', one a character.
 [[nodiscard]] inline std::string toBytes(const QString& text) {
     std::string bytes;

@@ -15,6 +15,21 @@
 
 namespace kdx {
 
+namespace {
+
+constexpr int kBannerWidth = 240;
+
+/// From the large picture, so that it is as sharp as the display.
+QPixmap banner(qreal pixelRatio) {
+    QPixmap picture(QStringLiteral(":/banner@2x.png"));
+    picture.setDevicePixelRatio(1);
+    picture = picture.scaledToWidth(qRound(kBannerWidth * pixelRatio), Qt::SmoothTransformation);
+    picture.setDevicePixelRatio(pixelRatio);
+    return picture;
+}
+
+}  // namespace
+
 ConnectionBar::ConnectionBar(const PageContext& with, QWidget* parent) : QWidget(parent), m_with(with) {
     Frame8 = named<QGroupBox>("Frame8", this);
     INIT_Taste = named<QPushButton>("INIT_Taste", QStringLiteral("IEC &Bus INIT"), Frame8);
@@ -31,11 +46,16 @@ ConnectionBar::ConnectionBar(const PageContext& with, QWidget* parent) : QWidget
     Ende_Taste = m_book.captioned<QPushButton>("Ende_Taste", {6}, this);
     connect(Ende_Taste, &QPushButton::clicked, this, &ConnectionBar::endRequested);
     Image2 = named<QLabel>("Image2", this);
-    Image2->setPixmap(QPixmap(QStringLiteral(":/banner.png")));
+    Image2->setPixmap(banner(devicePixelRatioF()));
     Image2->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
 
     layOut(Frame8, row({INIT_Taste, Label6, Adr1_Label, Adr1_VScroll}));
-    auto* whole = row({Frame8, Ende_Taste, kRoom, Image2});
+    Verbindung_Anzeige = named<QLabel>("Verbindung_Anzeige", this);
+    Verbindung_Anzeige->setSizePolicy(QSizePolicy::Ignored,
+                                      QSizePolicy::Fixed);  // a host name may be long: see the tip
+    auto* state = column({row({Ende_Taste, kRoom}), Verbindung_Anzeige});
+    state->setSpacing(1);
+    auto* whole = row({Frame8, {state, 1}, Image2});
     whole->setSpacing(8);
     layOut(this, whole, 0);
 }
@@ -59,8 +79,23 @@ void ConnectionBar::chooseInterface(const char* kind) {
     Schnittstellen_Toggle();
 }
 
+void ConnectionBar::use(const QString& kind, const QString& address) {
+    const std::string name = toBytes(kind);
+    m_with.profile.write(name == "TCPIP" ? setting::kLanAddress : setting::kGpibAddress, toBytes(address));
+    chooseInterface(name.c_str());
+}
+
 std::string ConnectionBar::address() const {
     return toBytes(Adr1_Label->text());
+}
+
+QString ConnectionBar::openAddress() const {
+    return isLan() ? Adr1_Label->text() : QStringLiteral("GPIB ") + Adr1_Label->text();
+}
+
+void ConnectionBar::showConnection(const QString& words) {
+    Verbindung_Anzeige->setText(words);
+    Verbindung_Anzeige->setToolTip(words);
 }
 
 void ConnectionBar::Adr1_Label_Click() {

@@ -27,9 +27,15 @@ public:
     void Schnittstellen_Toggle();
     /// Puts an interface ("IEC" or "TCPIP") in force and keeps it.
     void chooseInterface(const char* kind);
+    /// Puts interface and address in force and keeps both.
+    void use(const QString& kind, const QString& address);
     /// The address as it stands in the window.
     [[nodiscard]] std::string address() const;
+    /// The same as the session was opened with.
+    [[nodiscard]] QString openAddress() const;
     void showSessionOpen(bool open);
+    /// Tells the connection in words.
+    void showConnection(const QString& words);
 
 signals:
     void openRequested();
@@ -48,7 +54,8 @@ private:
     ClickableLabel* Adr1_Label = nullptr;
     QLabel* Label6 = nullptr;  // heading of a GPIB address
     QPushButton* Ende_Taste = nullptr;
-    QLabel* Image2 = nullptr;  // banner
+    QLabel* Verbindung_Anzeige = nullptr;  // the connection in words
+    QLabel* Image2 = nullptr;              // banner
 };
 
 }  // namespace kdx

@@ -28,6 +28,7 @@
 #include "ui/text.h"
 #include "ui/ticker.h"
 #include "window/connectionbar.h"
+#include "window/desktop.h"
 #include "window/mainmenu.h"
 #include "window/notes.h"
 #include "window/pages.h"
@@ -129,8 +130,18 @@ void HMenue::createMenu() {
     connect(m_connection, &ConnectionBar::interfaceShown, m_menu, &MainMenu::showInterface);
     connect(m_menu, &MainMenu::relabelRequested, this, &HMenue::Beschrifter);
     connect(m_menu, &MainMenu::listEditorRequested, this, &HMenue::Mnu_TMC_Edit_Click);
-    connect(m_menu, &MainMenu::logRequested, this, [this] { m_views->openLog(); });
-    connect(m_menu, &MainMenu::onAirRequested, this, [this] { m_views->openOnAir(); });
+    m_desktop = std::make_unique<Desktop>(m_s, m_context, *m_connection, *SSTab1, this);
+    m_desktop->createMenus(*m_menu, *m_views);
+    connect(m_desktop.get(), &Desktop::relabelRequested, this, &HMenue::Beschrifter);
+    connect(m_desktop.get(), &Desktop::readAllRequested, this, [this] {
+        if (!SSTab1->isEnabled()) return;
+        SSTab1->setCurrentIndex(kQueryPage);
+        emit readAllRequested();
+    });
+    connect(m_desktop.get(), &Desktop::sendRequested, this, &HMenue::SetRdsStereo);
+    connect(m_desktop.get(), &Desktop::dataSetLoaded, this, [this] {
+        for (Page* page : m_pages) page->showDataSet();
+    });
 }
 
 void HMenue::arrange() {
@@ -176,6 +187,8 @@ void HMenue::startUp() {
     m_s.session.load();
     setProperty(kQuotesDoubled, m_s.state.corrections.quotes);
     loadPages();
+    m_desktop->showTips();
+    m_desktop->restorePlace();
     m_s.session.instrument.log.empty();
     if (upperCase(profile.read(setting::kOpenAtStart)) == "AUTO") INIT_Taste_Click();
 }
@@ -199,6 +212,7 @@ void HMenue::Beschrifter() {
     m_s.captions.load(m_s.state.language, m_s.state.standard);
     m_menu->label();
     m_connection->label();
+    m_desktop->label();
     GTL_Taste->setText(captionText(m_s.captions, {300, "Local"}));
     for (int i = 0; i < SSTab1->count(); ++i) {
         SSTab1->setTabText(i, captionText(m_s.captions, {kFirstTabCaption + i}));
@@ -207,6 +221,7 @@ void HMenue::Beschrifter() {
     m_status->label(m_s.captions);
     for (Page* page : m_pages) page->label();
     m_views->label();
+    m_desktop->showTips();
     showNotice();
 }
 
@@ -230,6 +245,7 @@ void HMenue::GTL_Taste_Click() {
     m_s.session.close();
     // Only the switched-off pages and the resting timers keep commands away from the closed handle.
     showSessionOpen(false);
+    setWindowTitle(toText(m_s.state.ProgramTitle));
     m_s.tickers.setHeld(true);
 }
 
@@ -245,7 +261,7 @@ void HMenue::stepGoesOut(const Step& step, std::size_t number, std::size_t total
 
 void HMenue::stepAnswered(const Step& step, const std::string& answer) {
     if (step.kind != Step::Kind::Identify) return;
-    setWindowTitle(toText(answer));
+    setWindowTitle(withBlanks(toText(answer)));
     m_s.tickers.setHeld(false);
     showSessionOpen(true);
 }
@@ -260,6 +276,7 @@ void HMenue::showSessionOpen(bool open) {
     Frame7->setEnabled(open);
     m_connection->showSessionOpen(open);
     m_menu->showSessionOpen(open);
+    m_desktop->showSessionOpen(open);
 }
 
 bool HMenue::showInterfaceError(const std::string& text, bool sequenceRuns) {

@@ -16,6 +16,7 @@ class QTabWidget;
 namespace kdx {
 
 class ConnectionBar;
+class Desktop;
 class MainMenu;
 class Page;
 class ProgressLine;
@@ -41,6 +42,8 @@ public:
 
 signals:
     void sessionOpened();
+    /// Everything is to be asked back.
+    void readAllRequested();
     /// The editor of the event and location lists was closed.
     void listsEdited();
 
@@ -75,6 +78,7 @@ private:
     QString m_startNotice;                // what start-up could not read
     MainMenu* m_menu = nullptr;
     std::unique_ptr<Views> m_views;
+    std::unique_ptr<Desktop> m_desktop;
 };
 
 }  // namespace kdx

@@ -1,6 +1,8 @@
 #include "window/mainmenu.h"
 
 #include <QAction>
+#include <QCoreApplication>
+#include <QIcon>
 #include <QMainWindow>
 #include <QMenu>
 #include <QMenuBar>
@@ -14,7 +16,7 @@
 namespace kdx {
 
 MainMenu::MainMenu(const PageContext& with, const QString& linkDescription, QMainWindow* window)
-    : QObject(window), m_with(with), m_linkDescription(linkDescription) {
+    : QObject(window), m_with(with), m_linkDescription(linkDescription), m_window(window) {
     const auto subMenu = [this, window](const char* name) {
         auto* menu = named<QMenu>(name, window);
         Mnu_Info->addMenu(menu);
@@ -42,8 +44,6 @@ MainMenu::MainMenu(const PageContext& with, const QString& linkDescription, QMai
     Mnu_Info_RDS_RBDS = entry("Mnu_Info_RDS_RBDS", Mnu_Info, &MainMenu::Mnu_Info_RDS_RBDS_Click);
     Mnu_Info_RS232 = entry("Mnu_Info_RS232", Mnu_Info, nullptr);
     Mnu_TMC_Edit = entry("Mnu_TMC_Edit", Mnu_Info, &MainMenu::listEditorRequested);
-    Mnu_Info_Log = entry("Mnu_Info_Log", Mnu_Info, &MainMenu::logRequested);
-    Mnu_Ansicht_OnAir = entry("Mnu_Ansicht_OnAir", Mnu_Info, &MainMenu::onAirRequested);
     for (QAction* choice : {Mnu_Info_Sprache_D, Mnu_Info_Sprache_E, Mnu_Info_Sprache_US, Mnu_Info_RDS_RBDS}) {
         choice->setCheckable(true);
     }
@@ -52,6 +52,8 @@ MainMenu::MainMenu(const PageContext& with, const QString& linkDescription, QMai
 void MainMenu::label() {
     const auto text = [this](const Caption& caption) { return captionText(m_with.captions, caption); };
     Mnu_Info->setTitle(text({0}));
+    // Without a title there would be nothing to click; the language is chosen in here.
+    Mnu_Info->setIcon(Mnu_Info->title().isEmpty() ? m_window->windowIcon() : QIcon());
     Mnu_Info_Ueber->setText(text({1}));
     Mnu_Info_Sprache->setTitle(text({2}));
     Mnu_Info_Sprache_D->setText(text({3}));
@@ -64,8 +66,6 @@ void MainMenu::label() {
     Mnu_Info_RDS_RBDS->setText(text({305, "RDS /RBDS"}));
     Mnu_Info_RS232->setText(text({303, "RS232_Set"}));
     Mnu_TMC_Edit->setText(text({304, "TMC Edit"}));
-    Mnu_Info_Log->setText(text({680, "Log"}));
-    Mnu_Ansicht_OnAir->setText(text({720, "Auf Sendung"}));
     Mnu_Info_Sprache_D->setChecked(m_with.state.language == "deutsch");
     Mnu_Info_Sprache_E->setChecked(m_with.state.language == "english");
     Mnu_Info_Sprache_US->setChecked(m_with.state.language == "english US");
@@ -93,11 +93,20 @@ void MainMenu::Mnu_Info_Interface_COM_Click() {
 }
 
 void MainMenu::Mnu_Info_Ueber_Click() {
-    m_with.dialogs.message(Dialogs::Icon::Exclamation, QString(),
-                           QStringLiteral("\nRDS/Stereo Remote Software for KDX-X4\n\n"
-                                          "Supported IEEE-Interface: National Instruments\n\n"
-                                          "VISA I/O standard\n\n"),
-                           m_linkDescription);
+    const auto line = [this](const Caption& caption, const QString& what) {
+        return captionText(m_with.captions, caption) + QStringLiteral(": ") + what;
+    };
+    // The link in use stands in the first line, what was tried in vain after it.
+    const QString link = m_linkDescription.section(QLatin1Char('\n'), 0, 0);
+    const QString tried = m_linkDescription.section(QLatin1Char('\n'), 1);
+    const QStringList about{QStringLiteral("KDX-RDS %1").arg(QCoreApplication::applicationVersion()),
+                            line({916, "Lizenz"}, QStringLiteral("MIT")), line({917, "Verbindung"}, link),
+                            line({918, "Bibliotheken"},
+                                 QStringLiteral("Qt %1, libtirpc, CLI11, liquid-dsp").arg(QLatin1String(qVersion())))};
+    m_with.dialogs.about(QStringLiteral("\nRDS/Stereo Remote Software for KDX-X4\n\n"
+                                        "Supported IEEE-Interface: National Instruments\n\n"
+                                        "VISA I/O standard\n\n"),
+                         about.join(QLatin1Char('\n')), tried);
 }
 
 void MainMenu::Mnu_Info_Hinweis_Click() {

@@ -25,18 +25,17 @@ public:
     /// While a session is open the interface stays; the serial entry is then off for good.
     void showSessionOpen(bool open);
 
+    void Mnu_Info_Ueber_Click();
+
 signals:
     void interfaceChosen(const char* kind);
     /// Language or standard was changed: everything is to be captioned anew.
     void relabelRequested();
     void listEditorRequested();
-    void logRequested();
-    void onAirRequested();
 
 private:
     void Mnu_Info_Interface_IEC_Click();
     void Mnu_Info_Interface_COM_Click();
-    void Mnu_Info_Ueber_Click();
     void Mnu_Info_Hinweis_Click();
     void Mnu_Info_Sprache_D_Click();
     void Mnu_Info_Sprache_E_Click();
@@ -46,6 +45,7 @@ private:
 
     PageContext m_with;
     QString m_linkDescription;
+    QMainWindow* m_window;
 
     QMenu* Mnu_Info = nullptr;
     QMenu* Mnu_Info_Interface = nullptr;
@@ -60,8 +60,6 @@ private:
     QAction* Mnu_Info_RDS_RBDS = nullptr;
     QAction* Mnu_Info_RS232 = nullptr;  // present without behaviour
     QAction* Mnu_TMC_Edit = nullptr;
-    QAction* Mnu_Info_Log = nullptr;  // opens the live view of the commands
-    QAction* Mnu_Ansicht_OnAir = nullptr;
 };
 
 }  // namespace kdx

@@ -17,15 +17,12 @@ namespace kdx {
 
 namespace {
 
-QString missingData(const Surroundings& with) {
-    const std::filesystem::path& folder = with.data.path();
+/// The language file's absence is told in both languages: no other text can be looked up.
+QString missingLanguageFile(const Surroundings& with) {
+    const std::filesystem::path file = with.data.file(kLanguageFile);
     std::error_code error;
-    if (!std::filesystem::is_directory(folder, error)) return QString::fromStdString(shownPath(folder));
-    // Missing, unreadable, garbage, or without this language: the captions are empty all the same.
-    if (with.captions.isEmpty()) {
-        return QStringLiteral("%1 [%2]").arg(QLatin1String(kLanguageFile), toText(with.state.language));
-    }
-    return {};
+    if (std::filesystem::exists(file, error)) return {};
+    return QStringLiteral("Nicht gefunden / not found: ") + QString::fromStdString(shownPath(file));
 }
 
 }  // namespace
@@ -37,8 +34,12 @@ QStringList notes(const Surroundings& with, const QWidget& window, const QString
         notes += what.isEmpty() ? text : text.arg(what);
     };
     if (!with.dataProblem.isEmpty()) notes += with.dataProblem;
-    if (const QString missing = missingData(with); !missing.isEmpty()) {
-        note({322, "Nicht gefunden: %1"}, missing);
+    if (const QString missing = missingLanguageFile(with); with.captions.isEmpty() && !missing.isEmpty()) {
+        notes += missing;
+    } else if (with.captions.isEmpty()) {
+        // Unreadable, garbage, or without this language: the captions are empty all the same.
+        note({322, "Nicht gefunden: %1"},
+             QStringLiteral("%1 [%2]").arg(QLatin1String(kLanguageFile), toText(with.state.language)));
     } else if (!startNotice.isEmpty()) {
         notes += startNotice;
     }
@@ -48,8 +49,11 @@ QStringList notes(const Surroundings& with, const QWidget& window, const QString
     unreadable.removeAll(QString());
     unreadable.removeDuplicates();
     if (!unreadable.isEmpty()) note({325, "Nicht lesbar: %1"}, unreadable.join(QStringLiteral(", ")));
-    if (const auto unsaved = with.data.unsavedFile()) note({312, "Nicht gespeichert: %1"}, toText(*unsaved));
+    if (const auto unsaved = with.data.unsavedFile(); unsaved && !with.data.isReadOnly()) {
+        note({312, "Nicht gespeichert: %1"}, toText(*unsaved));
+    }
     if (!with.session.instrument.log.isWritable()) note({312, "Nicht gespeichert: %1"}, toText(kCommandLog));
+    if (with.data.isReadOnly()) note({920, "Nur zum Lesen geöffnet: nichts wird gespeichert"});
     if (with.claim.isShared()) note({326, "Ein anderes Programm nutzt dieselben Daten"});
     QStringList quoted;
     for (const std::string& key : with.session.params.quotedKeys()) quoted += toText(key);

@@ -46,6 +46,7 @@ Page* makeEon(const PageContext& with, Station& station, HMenue& window) {
 Page* makeQueries(const PageContext& with, Station& /*station*/, HMenue& window) {
     auto* page = new QueryPage(with, &window);
     QObject::connect(&window, &HMenue::sessionOpened, page, [page] { page->Fragen_Schalter(true); });
+    QObject::connect(&window, &HMenue::readAllRequested, page, &QueryPage::askAll);
     return page;
 }
 

@@ -2,6 +2,7 @@
 
 #include <QString>
 
+#include <filesystem>
 #include <functional>
 
 namespace kdx {
@@ -24,10 +25,13 @@ struct Surroundings {
     Clock& clock;
     Dialogs& dialogs;
     TickerGroup& tickers;
-    const FolderClaim& claim;          ///< on the data folder
-    QString linkDescription;           ///< how instruments are reached, for the about box
-    QString dataProblem;               ///< what is wrong with the data folder, in words; usually nothing
-    std::function<void()> endProgram;  ///< ends the program at once
+    const FolderClaim& claim;           ///< on the data folder
+    QString linkDescription;            ///< how instruments are reached, for the about box
+    QString dataProblem;                ///< what is wrong with the data folder, in words; usually nothing
+    std::function<void()> endProgram;   ///< ends the program at once
+    bool simulated = false;             ///< the instrument is the virtual one inside the program
+    std::filesystem::path shipped{};    ///< the program's folder as it was shipped; none where it is not known
+    std::filesystem::path placeFile{};  ///< keeps the window's page and place; none: they are not kept
 };
 
 }  // namespace kdx

@@ -50,6 +50,12 @@ class Program(unittest.TestCase):
                 self.assertEqual((result.returncode, result.stdout), (2, ""))
                 self.assertRegex(result.stderr, r"^kdx-rds: .+\nTry kdx-rds --help.\n$")
 
+    def testAFolderAskedForThatIsMissingIsNamedAndExitsWith2(self):
+        result = self.run_("--simulate", "--app-folder", "missing", "--tour", "pictures")
+        self.assertEqual((result.returncode, result.stdout), (2, ""))
+        self.assertEqual(result.stderr, "kdx-rds: --app-folder: there is no folder missing\n")
+        self.assertFalse((self.home / "missing").exists())
+
     def testAVisaLibraryThatCannotBeUsedIsNamed(self):
         result = self.run_("--visa-library", "/nowhere.so")
         self.assertEqual(result.returncode, 1)

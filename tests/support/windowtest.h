@@ -27,7 +27,8 @@ protected:
         session = std::make_unique<Session>(instrumentLink(), state, data, captions, clock, ask);
         tickers.setHeld(false);
         window = std::make_unique<HMenue>(Surroundings{*session, state, data, captions, clock, boxesOfWindow(), tickers,
-                                                       claim, QStringLiteral("scripted"), QString(), ask});
+                                                       claim, QStringLiteral("scripted"), QString(), ask, simulated,
+                                                       shipped, placeFile});
         m_listener = std::make_unique<TrafficListener>(session->instrument, [this](const Traffic& traffic) {
             if (heard) heard(traffic);
         });
@@ -70,7 +71,10 @@ protected:
     }
 
     ScriptedDialogs dialogs;
-    int ended = 0;  ///< how often the end of the program was asked for
+    bool simulated = false;           ///< what the next start tells of the instrument
+    std::filesystem::path shipped;    ///< the folder that the next start takes for the shipped one
+    std::filesystem::path placeFile;  ///< where it keeps its page and place; nowhere when empty
+    int ended = 0;                    ///< how often the end of the program was asked for
     TickerGroup tickers;
     std::unique_ptr<Session> session;
     FolderClaim claim{folder.data()};

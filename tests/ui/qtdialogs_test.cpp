@@ -4,11 +4,15 @@
 #include <gtest/gtest.h>
 
 #include <QApplication>
+#include <QFileDialog>
+#include <QFileInfo>
 #include <QInputDialog>
 #include <QLineEdit>
 #include <QMessageBox>
 #include <QPushButton>
+#include <QTemporaryFile>
 #include <QTimer>
+#include <QWindow>
 
 #include <functional>
 
@@ -135,6 +139,63 @@ TEST_F(QtDialogsTest, AnAnswerHasNoControlCharacters) {
         box.accept();
     });
     EXPECT_EQ(dialogs.input(QString(), QString(), QString()), QStringLiteral(" lab 7"));
+}
+
+TEST_F(QtDialogsTest, TheAboutBoxHasNoTitleAndDetailsToBeOpened) {
+    meet<QMessageBox>([](QMessageBox& box) {
+        EXPECT_EQ(box.windowTitle(), QString());
+        EXPECT_EQ(box.windowHandle()->title(), QStringLiteral(" ")) << "an empty one would become the program's name";
+        EXPECT_EQ(box.icon(), QMessageBox::Warning);
+        EXPECT_EQ(box.text(), QStringLiteral("Text"));
+        EXPECT_EQ(box.informativeText(), QStringLiteral("Made of"));
+        EXPECT_EQ(box.detailedText(), QStringLiteral("Tried"));
+        button(box, "&Details")->click();
+        QCoreApplication::processEvents();
+        EXPECT_EQ(button(box, "&Details")->text(), QStringLiteral("&Details"));
+        button(box, "OK")->click();
+    });
+    dialogs.about(QStringLiteral("Text"), QStringLiteral("Made of"), QStringLiteral("Tried"));
+    EXPECT_TRUE(met);
+}
+
+TEST_F(QtDialogsTest, AnAboutBoxWithoutDetailsHasOneButton) {
+    meet<QMessageBox>([](QMessageBox& box) {
+        EXPECT_EQ(box.buttons().size(), 1);
+        box.close();
+    });
+    dialogs.about(QStringLiteral("Text"), QStringLiteral("Made of"), QString());
+}
+
+TEST_F(QtDialogsTest, AFileThatIsThereIsOverwrittenAfterAQuestionOnly) {
+    QTemporaryFile file;
+    ASSERT_TRUE(file.open());
+    const auto choose = [&file](QFileDialog& box) {
+        box.selectFile(file.fileName());
+        static_cast<QDialog&>(box).accept();
+    };
+    meet<QFileDialog>([&](QFileDialog& first) {
+        meet<QMessageBox>([&](QMessageBox& question) {
+            EXPECT_EQ(question.text(), QStringLiteral("Overwrite %1?").arg(QFileInfo(file.fileName()).fileName()));
+            meet<QFileDialog>([&](QFileDialog& again) {
+                meet<QMessageBox>([](QMessageBox& second) { button(second, "&Yes")->click(); });
+                choose(again);
+            });
+            button(question, "&No")->click();
+        });
+        choose(first);
+    });
+    EXPECT_EQ(dialogs.fileToSave(QString(), QString(), QStringLiteral("All (*)")), file.fileName());
+}
+
+TEST_F(QtDialogsTest, AFileToOpenIsChosenInABox) {
+    QTemporaryFile file;
+    ASSERT_TRUE(file.open());
+    meet<QFileDialog>([&](QFileDialog& box) {
+        EXPECT_EQ(box.windowTitle(), QStringLiteral("Title"));
+        box.selectFile(file.fileName());
+        static_cast<QDialog&>(box).accept();
+    });
+    EXPECT_EQ(dialogs.fileToOpen(QStringLiteral("Title"), QStringLiteral("All (*)")), file.fileName());
 }
 
 TEST_F(QtDialogsTest, WithoutALanguageFileTheButtonsReadAsDesigned) {

@@ -1,6 +1,7 @@
 #include <gtest/gtest.h>
 
 #include <QMenu>
+#include <QMenuBar>
 #include <QMouseEvent>
 #include <QTabBar>
 
@@ -22,7 +23,31 @@ TEST_F(MenuTest, TheAboutBoxHasAnEmptyTitle) {
     EXPECT_EQ(dialogs.shown[0].text.toStdString(),
               "\nRDS/Stereo Remote Software for KDX-X4\n\nSupported IEEE-Interface: National Instruments\n\n"
               "VISA I/O standard\n\n");
-    EXPECT_EQ(dialogs.shown[0].preset, QStringLiteral("scripted"));  // how instruments are reached
+    EXPECT_TRUE(dialogs.shown[0].preset.contains(QStringLiteral("scripted")));  // how instruments are reached
+}
+
+TEST_F(MenuTest, TheAboutBoxTellsVersionLicenceLinkAndLibraries) {
+    dialogs.expectedMessages = 1;
+    action("Mnu_Info_Ueber")->trigger();
+    const QStringList lines = dialogs.shown[0].preset.split(QLatin1Char('\n'));
+    ASSERT_EQ(lines.size(), 4);
+    EXPECT_EQ(lines[0], QStringLiteral("KDX-RDS ") + QCoreApplication::applicationVersion());
+    EXPECT_EQ(lines[1].toStdString(), "Lizenz: MIT");
+    EXPECT_EQ(lines[2].toStdString(), "Verbindung: scripted");
+    EXPECT_EQ(lines[3].toStdString().find("Bibliotheken: Qt 6."), 0U) << lines[3].toStdString();
+}
+
+TEST_F(MenuTest, WithoutALanguageFileTheLanguageMenuIsStillThereToBeClicked) {
+    std::filesystem::remove(folder.data() / kLanguageFile);
+    start();
+    const auto* menu = window->findChild<QMenu*>(QStringLiteral("Mnu_Info"));
+    EXPECT_EQ(menu->title(), QString()) << "as described";
+    const QRect place = window->menuBar()->actionGeometry(menu->menuAction());
+    EXPECT_GE(place.width(), 10);
+    EXPECT_EQ(window->menuBar()->actionAt(place.center()), menu->menuAction());
+    folder.copyShipped();
+    action("Mnu_Info_Sprache_D")->trigger();
+    EXPECT_TRUE(menu->icon().isNull());
 }
 
 TEST_F(MenuTest, TheNoticeBoxSaysWhatTheProgramIsFor) {
@@ -59,7 +84,8 @@ TEST_F(MenuTest, TheTreeHasItsEntries) {
     };
     EXPECT_EQ(entriesOf("Mnu_Info"),
               (Lines{"Mnu_Info_Interface", "Mnu_Info_Ueber", "Mnu_Info_Hinweis", "Mnu_Info_Sprache",
-                     "Mnu_Info_RDS_RBDS", "Mnu_Info_RS232", "Mnu_TMC_Edit", "Mnu_Info_Log", "Mnu_Ansicht_OnAir"}));
+                     "Mnu_Info_RDS_RBDS", "Mnu_Info_RS232", "Mnu_TMC_Edit"}));
+    EXPECT_EQ(entriesOf("Mnu_Ansicht"), (Lines{"Mnu_Info_Log", "Mnu_Ansicht_OnAir", "", "Mnu_Ansicht_Lesen"}));
     EXPECT_EQ(entriesOf("Mnu_Info_Interface"), (Lines{"Mnu_Info_Interface_COM", "Mnu_Info_Interface_IEC"}));
     EXPECT_EQ(entriesOf("Mnu_Info_Sprache"),
               (Lines{"Mnu_Info_Sprache_D", "Mnu_Info_Sprache_E", "Mnu_Info_Sprache_US"}));

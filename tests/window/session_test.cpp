@@ -74,10 +74,10 @@ TEST_F(SessionTest, APositiveStatusOfTheOpenIsAFailureToo) {
     EXPECT_FALSE(state.InstrumentOnline);
 }
 
-TEST_F(SessionTest, TheAnswerBecomesTheTitleAsItWasRead) {
+TEST_F(SessionTest, TheAnswerBecomesTheTitleWithABlankForItsLineEnd) {
     useLan();
     openSession();
-    EXPECT_EQ(window->windowTitle().toStdString(), "KDX,TEST\n" + std::string(51, ' '));
+    EXPECT_EQ(window->windowTitle().toStdString(), "KDX,TEST" + std::string(52, ' '));
 }
 
 TEST_F(SessionTest, AFailedIdentificationGoesOn) {

@@ -217,7 +217,7 @@ INSTANTIATE_TEST_SUITE_P(Values, SettingsThatMakeNoSense,
 TEST_F(StartUpTest, AMissingDataFolderIsNamedAndTheWindowWorksWithoutIt) {
     std::filesystem::remove_all(folder.data());
     start();
-    EXPECT_EQ(text("QuietLine"), "Nicht gefunden: " + folder.data().string() +
+    EXPECT_EQ(text("QuietLine"), "Nicht gefunden / not found: " + (folder.data() / kLanguageFile).string() +
                                      "  -  Nicht gespeichert: RDS_Allg.INI  -  Nicht gespeichert: RDS_log.txt");
     expectToWork();
     EXPECT_FALSE(std::filesystem::exists(folder.data()));
@@ -228,9 +228,9 @@ TEST_F(StartUpTest, ADataFolderThatCannotBeReadIsToldAndTheWindowWorksWithoutIt)
     std::filesystem::permissions(folder.data(), std::filesystem::perms::none);
     const Unprivileged ordinary;
     start();
-    EXPECT_EQ(text("QuietLine"),
-              "Nicht gefunden: Sprachen.ini [deutsch]  -  Nicht lesbar: Datenset1.INI  -  "
-              "Nicht gespeichert: RDS_Allg.INI  -  Nicht gespeichert: RDS_log.txt");
+    EXPECT_EQ(text("QuietLine"), "Nicht gefunden / not found: " + (folder.data() / kLanguageFile).string() +
+                                     "  -  Nicht lesbar: Datenset1.INI  -  "
+                                     "Nicht gespeichert: RDS_Allg.INI  -  Nicht gespeichert: RDS_log.txt");
     expectToWork();
 }
 
@@ -273,7 +273,7 @@ TEST_F(StartUpTest, AMissingLanguageFileIsTold) {
     folder.copyShipped();
     std::filesystem::remove(folder.data() / kLanguageFile);
     start();
-    EXPECT_EQ(text("QuietLine"), "Nicht gefunden: Sprachen.ini [deutsch]");
+    EXPECT_EQ(text("QuietLine"), "Nicht gefunden / not found: " + (folder.data() / kLanguageFile).string());
     EXPECT_EQ(find<QTabWidget>("SSTab1")->tabText(0), QString());
     EXPECT_EQ(text("GTL_Taste"), "Local");  // the program's own texts stay as designed
 }
