@@ -15,6 +15,7 @@ namespace {
 constexpr const char* kLowestLevel = "0";
 constexpr const char* kHighestLevel = "120";
 constexpr double kValueFontScale = 1.75;
+constexpr QLatin1String kNothing("-");  // before anything was sent
 
 }  // namespace
 
@@ -40,7 +41,7 @@ void RfPage::createValue(Value& value, const char* name, const char* frame, cons
     value.frame = captioned<QGroupBox>(frame, title, this);
     value.label = wired<ClickableLabel>(name, &ClickableLabel::clicked, handler, value.frame);
     m_book.tip(value.label, {631, "Klicken, um einen neuen Wert einzugeben"});
-    value.label->setText(QStringLiteral("-"));
+    value.label->setText(kNothing);
     value.label->setAlignment(Qt::AlignCenter);
     value.label->setMargin(2 * kGap);
     QFont font = value.label->font();
@@ -66,6 +67,8 @@ void RfPage::label() {
     Page::label();
     for (const Value* value : values()) {
         value->label->setAccessibleName(value->frame->title() + QStringLiteral(": ") + value->label->text());
+        const Judgement judgement = judge(*value);
+        showState(*value->label, judgement.state, judgement.tip);
     }
 }
 
@@ -111,8 +114,14 @@ QString RfPage::checked(QString& answer, const std::string& lowest, const std::s
 
 void RfPage::showValue(const Value& value, const QString& text) {
     value.label->setText(text);
-    m_with.status.show(value.slot, text);
+    m_with.status.show(value.slot, text, judge(value));
     label();
+}
+
+Judgement RfPage::judge(const Value& value) const {
+    if (value.label->text() == kNothing) return {};
+    const QString why = whyRefused(m_with, value.setting.sendKey, value.label->text());
+    return {why.isEmpty() ? ValueState::InForce : ValueState::Refused, why};
 }
 
 void RfPage::showOutput(bool on) {

@@ -48,6 +48,7 @@ private:
     void enter(const Value& value);
     [[nodiscard]] QString checked(QString& answer, const std::string& lowest, const std::string& highest) const;
     void showValue(const Value& value, const QString& text);
+    [[nodiscard]] Judgement judge(const Value& value) const;
     void showOutput(bool on);
     [[nodiscard]] std::array<Value*, 3> values() {
         return {&Input_HF_Freq_Label, &Input_HF_Pegel_Label, &Input_AF_Freq_Label};

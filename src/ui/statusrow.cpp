@@ -2,6 +2,8 @@
 
 #include <QGridLayout>
 
+#include <algorithm>
+
 #include "settings/captions.h"
 #include "ui/controls.h"
 #include "ui/named.h"
@@ -54,7 +56,12 @@ StatusRow::StatusRow(QWidget* parent) : QWidget(parent) {
         value->setAutoFillBackground(true);
         value->setAccessibleName(QString::fromUtf8(pair.caption));
         const QString sample(pair.widest, pair.widest > 8 ? QLatin1Char('e') : QLatin1Char('0'));
-        value->setMinimumWidth(value->fontMetrics().horizontalAdvance(sample) + 6);
+        // The design caption, too, fits its field: it stands there until the first session.
+        const QFontMetrics letters = value->fontMetrics();
+        value->setMinimumWidth(std::max(letters.horizontalAdvance(sample), letters.horizontalAdvance(value->text())) +
+                               6);
+        showState(*value, ValueState::Unsent, {});
+        value->setProperty("zustand", QString());  // a caption is no value
         value->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Fixed);
         grid->addWidget(Status[pair.heading], 0, column);
         grid->addWidget(value, 1, column);
@@ -70,13 +77,14 @@ void StatusRow::label(const Captions& captions) {
     Status[15]->setText(toText(captions.text(222)));
 }
 
-void StatusRow::show(StatusSlot slot, const QString& text) {
+void StatusRow::show(StatusSlot slot, const QString& text, const Judgement& judgement) {
     at(slot)->setText(text);
     at(slot)->setToolTip(text);
+    showState(*at(slot), judgement.state, judgement.tip);
 }
 
-void StatusRow::show(StatusSlot slot, std::string_view bytes) {
-    show(slot, toText(bytes));
+void StatusRow::show(StatusSlot slot, std::string_view bytes, const Judgement& judgement) {
+    show(slot, toText(bytes), judgement);
 }
 
 QString StatusRow::text(StatusSlot slot) const {
