@@ -79,6 +79,11 @@ void showState(QWidget& control, ValueState state, const QString& tip) {
     control.update();
 }
 
+void showWarning(QWidget& control, const QString& tip) {
+    showTip(control, tip);
+    colour(control, tip.isEmpty() ? ValueState::InForce : ValueState::Refused);
+}
+
 QString whyRefused(const PageContext& with, const char* key, const QString& entry) {
     const auto say = [&](const Caption& caption) { return captionText(with.captions, caption); };
     const std::string_view name = key;
