@@ -3,6 +3,7 @@
 #include "ui/controls.h"
 #include "ui/plaintext.h"
 
+#include <QAbstractSpinBox>
 #include <QComboBox>
 #include <QEvent>
 #include <QFont>
@@ -47,9 +48,11 @@ Application::Application(int& argc, char** argv) : QApplication(argc, argv) {
     installEventFilter(this);
 }
 
-// The wheel scrolls what a combo box stands on: one notch too many must not change what is on the air.
+// The wheel scrolls what a combo box or number field stands on: one notch too many must not change what is on the air.
 bool Application::eventFilter(QObject* watched, QEvent* event) {
-    if (event->type() != QEvent::Wheel || qobject_cast<QComboBox*>(watched) == nullptr) return false;
+    if (event->type() != QEvent::Wheel) return false;
+    if (qobject_cast<QComboBox*>(watched) == nullptr && qobject_cast<QAbstractSpinBox*>(watched) == nullptr)
+        return false;
     event->ignore();
     return true;
 }
