@@ -13,6 +13,7 @@
 #include "settings/storedvalue.h"
 #include "settings/withoutcontrols.h"
 #include "ui/dialogs.h"
+#include "ui/entrycounter.h"
 #include "ui/statusrow.h"
 
 namespace kdx {
@@ -32,6 +33,7 @@ void RdsPage::label() {
     if (!m_programme.musicSpeech.empty()) showMusicSpeech();
     fillProgrammeTypes();
     for (SentEntry* entry : {PS_T, PI_T, RT_Text1}) entry->refresh();
+    for (EntryCounter* counter : {PS_Zaehler, PI_Zaehler, RT_Zaehler}) counter->count();
 }
 
 void RdsPage::fillProgrammeTypes() {

@@ -19,6 +19,7 @@
 namespace kdx {
 
 class DynamicPs;
+class EntryCounter;
 class TaFrame;
 
 /// The page "R D S": programme service name, identification and type, traffic flags, music/speech, decoder
@@ -70,6 +71,7 @@ private:
 
     QLabel* PS_Label = nullptr;
     SentEntry* PS_T = nullptr;
+    EntryCounter *PS_Zaehler = nullptr, *PI_Zaehler = nullptr, *RT_Zaehler = nullptr;
     QPushButton* PS_Taste = nullptr;
     QLabel* PI_Label = nullptr;
     SentEntry* PI_T = nullptr;

@@ -119,6 +119,27 @@ TEST_F(SentValuesTest, ALoadedDataSetIsNotInForceBeforeItIsSent) {
     EXPECT_EQ(stateOf("PS_T"), "");
 }
 
+TEST_F(SentValuesTest, EntriesAreCountedAndCheckedAsTheyAreTyped) {
+    const struct {
+        const char *entry, *counter, *typed, *count, *why;
+    } rows[] = {{"PS_T", "PS_Zaehler", "RADIO", "5/8", ""},
+                {"PS_T", "PS_Zaehler", "M\u00FCnchen \u20AC", "9/8", "H\u00F6chstens 8 Zeichen."},
+                {"PS_T", "PS_Zaehler", "A~", "2/8", "RDS kennt das Zeichen ~ nicht."},
+                {"PI_T", "PI_Zaehler", "D3C", "3/4", "Die PI muss aus vier hexadezimalen Ziffern bestehen."},
+                {"PI_T", "PI_Zaehler", "d3c2", "4/4", ""},
+                {"PI_T", "PI_Zaehler", "", "0/4", ""},
+                {"RT_Text1", "RT_Zaehler", "News", "4/64", ""},
+                {"RT_Text1", "RT_Zaehler", "A\"", "2/64", "Ein Anf\u00FChrungszeichen beendet den Text f\u00FCr den Coder."}};
+    for (const auto& row : rows) {
+        type(row.entry, row.typed);
+        EXPECT_EQ(text(row.counter), row.count);
+        EXPECT_EQ(tipOf(row.counter), row.why);
+        const QColor letters = find(row.counter)->palette().color(QPalette::WindowText);
+        EXPECT_EQ(letters.red() > 128, *row.why != 0) << row.typed;
+    }
+    EXPECT_EQ(sent(), Lines{});
+}
+
 TEST_F(SentValuesTest, TheTipFollowsTheLanguageAndKeepsWhatTheControlSaysOfItself) {
     setProfile(kSet1, "RDS", "RTB", "second");
     load();
