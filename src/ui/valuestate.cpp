@@ -104,7 +104,8 @@ QString whyRefused(const PageContext& with, const char* key, const QString& entr
             return say({852, "RDS kennt das Zeichen %1 nicht."}).arg(toText({&*missing, 1}));
         return say({853, "Höchstens %1 Zeichen."}).arg(name == "RT" ? kRadiotextLength : kPsLength);
     }
-    if (entry.contains(QLatin1Char(','))) return say({854, "Der Coder nimmt nur einen Punkt, kein Komma."});
+    const KeyFacts* const facts = factsOf(name);
+    if (facts != nullptr && facts->isNumber && entry.contains(QLatin1Char(','))) return say({854, "Der Coder nimmt nur einen Punkt, kein Komma."});
     return say({855, "Der Coder nimmt diesen Wert nicht an."});
 }
 
