@@ -10,8 +10,8 @@ inline void paintFocus(QWidget& control) {
     if (!control.hasFocus()) return;
     constexpr int kWidth = 2;
     QPainter painter(&control);
-    painter.setPen(QPen(control.palette().color(QPalette::Highlight), kWidth, Qt::SolidLine, Qt::SquareCap,
-                        Qt::MiterJoin));
+    painter.setPen(
+        QPen(control.palette().color(QPalette::Highlight), kWidth, Qt::SolidLine, Qt::SquareCap, Qt::MiterJoin));
     painter.drawRect(control.rect().adjusted(kWidth / 2, kWidth / 2, -kWidth / 2, -kWidth / 2));
 }
 

@@ -80,8 +80,7 @@ void showState(QWidget& control, ValueState state, const QString& tip) {
 }
 
 void showWarning(QWidget& control, const QString& tip) {
-    showTip(control, tip);
-    colour(control, tip.isEmpty() ? ValueState::InForce : ValueState::Refused);
+    showState(control, tip.isEmpty() ? ValueState::InForce : ValueState::Refused, tip);
 }
 
 QString whyRefused(const PageContext& with, const char* key, const QString& entry) {
@@ -105,7 +104,8 @@ QString whyRefused(const PageContext& with, const char* key, const QString& entr
         return say({853, "Höchstens %1 Zeichen."}).arg(name == "RT" ? kRadiotextLength : kPsLength);
     }
     const KeyFacts* const facts = factsOf(name);
-    if (facts != nullptr && facts->isNumber && entry.contains(QLatin1Char(','))) return say({854, "Der Coder nimmt nur einen Punkt, kein Komma."});
+    if (facts != nullptr && facts->isNumber && entry.contains(QLatin1Char(',')))
+        return say({854, "Der Coder nimmt nur einen Punkt, kein Komma."});
     return say({855, "Der Coder nimmt diesen Wert nicht an."});
 }
 

@@ -20,7 +20,7 @@ enum class ValueState {
 /// Shows the state by colours, in the control's tip before what that says of itself, and in its property "zustand".
 void showState(QWidget& control, ValueState state, const QString& tip);
 
-/// Shows a control that is no value itself, as a counter, in the colours of a refused one; with "" as any other.
+/// Shows by the looks of a refused value what is wrong with one before it is sent; with "" nothing is.
 void showWarning(QWidget& control, const QString& tip);
 
 /// Why the coder does not take the entry for the key, in the current language; "" when it does.

@@ -204,7 +204,9 @@ TEST_F(EditorTest, AnAddedFrequencyIsInView) {
     open();
     QApplication::processEvents();
     auto* shown = find<QListWidget>("AF_List1");
-    const auto inView = [&](int row) { return shown->viewport()->rect().contains(shown->visualItemRect(shown->item(row))); };
+    const auto inView = [&](int row) {
+        return shown->viewport()->rect().contains(shown->visualItemRect(shown->item(row)));
+    };
     ASSERT_FALSE(inView(shown->count() - 1));
     type("Text2", "99.9");
     click("Command1");

@@ -49,8 +49,8 @@ TEST_F(EonPageTest, TheReturnKeySendsTheEntryItIsPressedIn) {
     press("EON_PI_Text", Qt::Key_Return);
     type("EON_PS_Text", "RADIO 2");
     press("EON_PS_Text", Qt::Key_Return);
-    EXPECT_THAT(sent(), ElementsAre(query, direct("EON-DEL=D3C2"), direct("EON-PI=D3C2"),
-                                    direct("EON-PS=D3C2,RADIO 2 ")));
+    EXPECT_THAT(sent(),
+                ElementsAre(query, direct("EON-DEL=D3C2"), direct("EON-PI=D3C2"), direct("EON-PS=D3C2,RADIO 2 ")));
 }
 
 TEST_F(EonPageTest, AnEntryTellsWhetherTheCoderHasIt) {

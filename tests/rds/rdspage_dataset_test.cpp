@@ -72,7 +72,7 @@ TEST_F(StoredDataSet, IndicatorsFollowTheFlagsThatGoOut) {
     page.stepGoesOut({.key = "PS", .value = "OTHER"});
     EXPECT_EQ(status(StatusSlot::Ps), "OTHER");
     EXPECT_EQ(text("PS_T"), "ABCDEFGHIJ");  // what was typed stays
-    EXPECT_EQ(sent(), Lines{});  // sending is for whoever runs the sequence
+    EXPECT_EQ(sent(), Lines{});             // sending is for whoever runs the sequence
 }
 
 TEST_F(StoredDataSet, SwitchesTheClockOnOnceHoweverOftenItIsLoaded) {

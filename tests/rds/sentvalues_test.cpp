@@ -122,14 +122,15 @@ TEST_F(SentValuesTest, ALoadedDataSetIsNotInForceBeforeItIsSent) {
 TEST_F(SentValuesTest, EntriesAreCountedAndCheckedAsTheyAreTyped) {
     const struct {
         const char *entry, *counter, *typed, *count, *why;
-    } rows[] = {{"PS_T", "PS_Zaehler", "RADIO", "5/8", ""},
-                {"PS_T", "PS_Zaehler", "M\u00FCnchen \u20AC", "9/8", "H\u00F6chstens 8 Zeichen."},
-                {"PS_T", "PS_Zaehler", "A~", "2/8", "RDS kennt das Zeichen ~ nicht."},
-                {"PI_T", "PI_Zaehler", "D3C", "3/4", "Die PI muss aus vier hexadezimalen Ziffern bestehen."},
-                {"PI_T", "PI_Zaehler", "d3c2", "4/4", ""},
-                {"PI_T", "PI_Zaehler", "", "0/4", ""},
-                {"RT_Text1", "RT_Zaehler", "News", "4/64", ""},
-                {"RT_Text1", "RT_Zaehler", "A\"", "2/64", "Ein Anf\u00FChrungszeichen beendet den Text f\u00FCr den Coder."}};
+    } rows[] = {
+        {"PS_T", "PS_Zaehler", "RADIO", "5/8", ""},
+        {"PS_T", "PS_Zaehler", "M\u00FCnchen \u20AC", "9/8", "H\u00F6chstens 8 Zeichen."},
+        {"PS_T", "PS_Zaehler", "A~", "2/8", "RDS kennt das Zeichen ~ nicht."},
+        {"PI_T", "PI_Zaehler", "D3C", "3/4", "Die PI muss aus vier hexadezimalen Ziffern bestehen."},
+        {"PI_T", "PI_Zaehler", "d3c2", "4/4", ""},
+        {"PI_T", "PI_Zaehler", "", "0/4", ""},
+        {"RT_Text1", "RT_Zaehler", "News", "4/64", ""},
+        {"RT_Text1", "RT_Zaehler", "A\"", "2/64", "Ein Anf\u00FChrungszeichen beendet den Text f\u00FCr den Coder."}};
     for (const auto& row : rows) {
         type(row.entry, row.typed);
         EXPECT_EQ(text(row.counter), row.count);
