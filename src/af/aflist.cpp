@@ -1,8 +1,11 @@
 #include "af/aflist.h"
 
 #include <algorithm>
+#include <utility>
 
 #include "base/numbers.h"
+#include "base/split.h"
+#include "settings/storedvalue.h"
 
 namespace kdx {
 
@@ -54,6 +57,23 @@ bool isAlternativeFrequency(std::string_view text) {
     // The lower bound is not the tuned frequency's: lists are kept and sent with these bounds, both on purpose.
     const double megahertz = leadingNumber(text);
     return megahertz >= 87.5 && megahertz <= 108.0;
+}
+
+std::vector<std::string> pastedFrequencies(std::string_view text) {
+    std::vector<std::string> frequencies;
+    for (const std::string_view piece : split(text, ",")) {
+        auto number = decimalNumber(piece);
+        if (!number || !isAlternativeFrequency(*number)) return {};
+        frequencies.push_back(std::move(*number));
+    }
+    const bool maybeDecimal = frequencies.size() == 2 && text.find('.') == std::string_view::npos;
+    return maybeDecimal ? std::vector<std::string>() : frequencies;
+}
+
+void sortFrequencies(std::vector<std::string>& frequencies) {
+    std::stable_sort(frequencies.begin(), frequencies.end(), [](const std::string& left, const std::string& right) {
+        return leadingNumber(left) < leadingNumber(right);
+    });
 }
 
 std::string withOneDecimal(std::string_view tuned) {

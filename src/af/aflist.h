@@ -16,6 +16,9 @@ inline constexpr int kAfLists = 5;
 /// Most AFs that a list sent with method B may hold.
 inline constexpr std::size_t kMostAfsOfMethodB = 12;
 
+/// Most AFs of a list, which method A can have: a receiver counts no further.
+inline constexpr std::size_t kMostAfsOfMethodA = 25;
+
 /// Kinds of lists the editor works on: those of the own programme and those of the other network.
 inline constexpr const char* kAfKind = "AF";
 inline constexpr const char* kEonAfKind = "EON AF";
@@ -52,6 +55,13 @@ struct AfList {
 
 /// Whether the text's leading number is an allowed AF: 87.5 to 108.0 MHz, both included.
 [[nodiscard]] bool isAlternativeFrequency(std::string_view text);
+
+/// The frequencies of a list that was typed or pasted in one go, each an allowed AF; one or none when it is no such
+/// list. A single comma between whole numbers is none: it may be a decimal one.
+[[nodiscard]] std::vector<std::string> pastedFrequencies(std::string_view text);
+
+/// The frequencies from the lowest to the highest.
+void sortFrequencies(std::vector<std::string>& frequencies);
 
 /// The tuned frequency with one decimal, further ones cut off and not rounded. A text whose point is not its third or
 /// fourth character stays as it is.

@@ -1,5 +1,6 @@
 #include "af/aflistenform.h"
 
+#include "af/afcounter.h"
 #include "af/aflistset.h"
 #include "settings/profile.h"
 #include "settings/programstate.h"
@@ -7,6 +8,8 @@
 #include "ui/dialogs.h"
 #include "ui/layouts.h"
 #include "ui/text.h"
+
+#include <QKeyEvent>
 
 #include <memory>
 
@@ -41,18 +44,36 @@ void AF_Listenform::create() {
     m_book.tip(AF_OF_add, {662, "vor der ausgewählten Zeile"});
     Rem_Freq = clicked<QPushButton>("Rem_Freq", {658, "Löschen"}, m_change, &AF_Listenform::Rem_Freq_Click);
 
+    createOrder();
+
     Uebernahme_Knopf =
         clicked<QPushButton>("Uebernahme_Knopf", {659, "Über&nehmen"}, this, &AF_Listenform::Uebernahme_Knopf_Click);
     Ende_Knopf = clicked<QPushButton>("Ende_Knopf", {660, "&Schließen"}, this, &AF_Listenform::Ende_Knopf_Click);
     // The enter key in the text box appends and never stores or closes by accident.
-    for (QPushButton* button : {AF_OF_add, Rem_Freq, Uebernahme_Knopf, Ende_Knopf}) button->setAutoDefault(false);
+    for (QPushButton* button : {AF_OF_add, Rem_Freq, AF_Auf, AF_Ab, AF_Sortieren, Uebernahme_Knopf, Ende_Knopf})
+        button->setAutoDefault(false);
     Command1->setDefault(true);
+}
+
+void AF_Listenform::createOrder() {
+    AF_Auf = clicked<QPushButton>("AF_Auf", {860, "Nach oben"}, m_change, &AF_Listenform::AF_Auf_Click);
+    AF_Ab = clicked<QPushButton>("AF_Ab", {861, "Nach unten"}, m_change, &AF_Listenform::AF_Ab_Click);
+    AF_Sortieren = clicked<QPushButton>("AF_Sortieren", {862, "Sortieren"}, m_change,
+                                        &AF_Listenform::AF_Sortieren_Click);
+    m_hint = named<QLabel>("KommaHinweis", m_change);
+    m_hint->setWordWrap(true);
+    m_hint->setMinimumHeight(2 * m_hint->fontMetrics().lineSpacing());  // room for it, so that nothing moves
+    m_hint->setAlignment(Qt::AlignLeft | Qt::AlignTop);
+    AF_Zaehler = named<AfCounter>("AF_Zaehler", m_with, AF_List1, m_content);
+    connect(Text2, &QLineEdit::textChanged, this, &AF_Listenform::showHint);
+    AF_List1->installEventFilter(this);
 }
 
 void AF_Listenform::arrange() {
     layOut(m_choice, m_view.optionColumn());
-    layOut(m_content, m_view.contentColumn());
-    layOut(m_change, column({m_entryHeading, Text2, Command1, AF_OF_add, space(2 * kGap), Rem_Freq, kRoom}));
+    layOut(m_content, kdx::add(m_view.contentColumn(), {AF_Zaehler}));
+    layOut(m_change, column({m_entryHeading, Text2, m_hint, Command1, AF_OF_add, space(2 * kGap), Rem_Freq,
+                             space(2 * kGap), AF_Auf, AF_Ab, AF_Sortieren, kRoom}));
     auto* frames = row({m_choice, {m_content, 1}, m_change});
     layOut(this, column({{frames, 1}, row({kRoom, Uebernahme_Knopf, Ende_Knopf})}), 2 * kGap);
 }
@@ -61,6 +82,7 @@ void AF_Listenform::Form_Load() {
     m_book.label(m_with.captions);
     m_view.options().choose(0);
     AFList_Opt_Click(0);
+    AF_Zaehler->count();
     Text2->setFocus();
 }
 
@@ -87,12 +109,64 @@ void AF_Listenform::AF_TN_Click() {
 }
 
 void AF_Listenform::Command1_Click() {
-    if (const QString entry = checkedEntry(); !entry.isEmpty()) AF_List1->addItem(entry);
+    add(AF_List1->count(), checkedEntries());
 }
 
 void AF_Listenform::AF_OF_add_Click() {
-    if (selectedRow() < 0) return;
-    if (const QString entry = checkedEntry(); !entry.isEmpty()) AF_List1->insertItem(selectedRow(), entry);
+    if (selectedRow() >= 0) add(selectedRow(), checkedEntries());
+}
+
+void AF_Listenform::add(int row, const QStringList& entries) {
+    if (entries.isEmpty()) return;
+    AF_List1->insertItems(row, entries);
+    AF_List1->scrollToItem(AF_List1->item(row + static_cast<int>(entries.size()) - 1));
+    // The next one replaces it: typed on behind it, two frequencies would become one.
+    Text2->setFocus();
+    Text2->selectAll();
+}
+
+void AF_Listenform::move(int rows) {
+    const int row = selectedRow();
+    if (row < 0 || row + rows < 0 || row + rows >= AF_List1->count()) return;
+    AF_List1->insertItem(row + rows, AF_List1->takeItem(row));
+    AF_List1->setCurrentRow(row + rows);
+}
+
+void AF_Listenform::AF_Sortieren_Click() {
+    std::vector<std::string> frequencies = shownList().frequencies;
+    sortFrequencies(frequencies);
+    AF_List1->clear();
+    for (const std::string& frequency : frequencies) AF_List1->addItem(toText(frequency));
+}
+
+bool AF_Listenform::eventFilter(QObject* watched, QEvent* event) {
+    if (event->type() == QEvent::KeyPress && static_cast<QKeyEvent*>(event)->matches(QKeySequence::Delete)) {
+        Rem_Freq_Click();
+        return true;
+    }
+    return QDialog::eventFilter(watched, event);
+}
+
+AfList AF_Listenform::shownList() const {
+    AfList list{toBytes(AF_TN->text()), {}};
+    for (int row = 0; row < AF_List1->count(); ++row) {
+        list.frequencies.push_back(toBytes(AF_List1->item(row)->text()));
+    }
+    return list;
+}
+
+void AF_Listenform::showHint() {
+    const QString entry = Text2->text();
+    const std::string bytes = toBytes(entry);
+    const std::size_t frequencies = pastedFrequencies(bytes).size();
+    const bool isPoint = m_with.state.corrections.decimalComma && decimalNumber(bytes).has_value();
+    QString hint;
+    if (frequencies > 1 && !isPoint) {
+        hint = caption({866, "%1 Frequenzen"}).arg(frequencies);
+    } else if (entry.contains(QLatin1Char(',')) && !isPoint) {
+        hint = caption({867, "Ein Komma trennt: Dezimalstellen stehen nach einem Punkt."});
+    }
+    m_hint->setText(hint);
 }
 
 void AF_Listenform::Rem_Freq_Click() {
@@ -109,11 +183,7 @@ void AF_Listenform::Rem_Freq_Click() {
 }
 
 void AF_Listenform::Uebernahme_Knopf_Click() {
-    AfList list{toBytes(AF_TN->text()), {}};
-    for (int row = 0; row < AF_List1->count(); ++row) {
-        list.frequencies.push_back(toBytes(AF_List1->item(row)->text()));
-    }
-    m_with.profile.write(place(m_view.options().chosen()), joined(list));
+    m_with.profile.write(place(m_view.options().chosen()), joined(shownList()));
     accept();
 }
 
@@ -126,13 +196,20 @@ int AF_Listenform::selectedRow() const {
     return selected.isEmpty() ? -1 : AF_List1->row(selected.first());
 }
 
-QString AF_Listenform::checkedEntry() {
+QStringList AF_Listenform::checkedEntries() {
+    // A whole list, as it is pasted, is one entry a frequency: it is stored as it would be in one.
+    if (const auto frequencies = pastedFrequencies(toBytes(Text2->text()));
+        frequencies.size() > 1 && !(m_with.state.corrections.decimalComma && decimalNumber(toBytes(Text2->text())))) {
+        QStringList entries;
+        for (const std::string& frequency : frequencies) entries.append(toText(frequency));
+        return entries;
+    }
     // Taken as typed unless that is corrected, a decimal comma included: "90,1" reads as 90 and becomes two entries of
     // the stored list.
     QString entry = Text2->text();
     if (takeNumber(entry) && isAlternativeFrequency(toBytes(entry))) {
         if (entry != Text2->text()) Text2->setText(entry);
-        return entry;
+        return {entry};
     }
     refuse(164);
     return {};

@@ -11,6 +11,7 @@
 
 namespace kdx {
 
+class AfCounter;
 struct Place;
 
 /// The editor of the five AF lists of the current data set: the own programme's or, when ProgramState::afEditorKind is
@@ -20,8 +21,13 @@ class AF_Listenform : public QDialog, public Form {
 public:
     AF_Listenform(const PageContext& with, QWidget* parent);
 
+protected:
+    /// The delete key in the list asks as `Rem_Freq` does.
+    bool eventFilter(QObject* watched, QEvent* event) override;
+
 private:
     void create();
+    void createOrder();
     void arrange();
     void Form_Load();
     void AFList_Opt_Click(int index);
@@ -29,6 +35,9 @@ private:
     void Command1_Click();
     void AF_OF_add_Click();
     void Rem_Freq_Click();
+    void AF_Auf_Click() { move(-1); }
+    void AF_Ab_Click() { move(1); }
+    void AF_Sortieren_Click();
     void Uebernahme_Knopf_Click();
     void Ende_Knopf_Click() { reject(); }
 
@@ -36,9 +45,14 @@ private:
     [[nodiscard]] const Place& place(int index) const;
     /// Number of the selected row, -1 when none is selected.
     [[nodiscard]] int selectedRow() const;
-    /// What `Text2` reads when it is an allowed AF; else says so and gives an empty text.
-    [[nodiscard]] QString checkedEntry();
+    /// What `Text2` reads when it is an allowed AF, or a list of such; else says so and gives nothing.
+    [[nodiscard]] QStringList checkedEntries();
     [[nodiscard]] bool takeNumber(QString& text) const;
+    /// Puts the entries before the row, shows them and makes ready for the next one.
+    void add(int row, const QStringList& entries);
+    void move(int rows);
+    [[nodiscard]] AfList shownList() const;
+    void showHint();
     void refuse(int reason);
 
     AfListView m_view;                // AFList_Opt, AF_TN, AF_List1
@@ -48,6 +62,9 @@ private:
     QPushButton* Command1 = nullptr;   // appends it
     QPushButton* AF_OF_add = nullptr;  // inserts it before the selected row
     QPushButton* Rem_Freq = nullptr;
+    QPushButton *AF_Auf = nullptr, *AF_Ab = nullptr, *AF_Sortieren = nullptr;
+    AfCounter* AF_Zaehler = nullptr;
+    QLabel* m_hint = nullptr;      // what a comma in the entry does
     QPushButton* Uebernahme_Knopf = nullptr;
     QPushButton* Ende_Knopf = nullptr;
 

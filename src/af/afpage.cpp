@@ -1,5 +1,6 @@
 #include "af/afpage.h"
 
+#include "af/afcounter.h"
 #include "af/aflistenform.h"
 #include "af/settings.h"
 #include "settings/programstate.h"
@@ -25,6 +26,7 @@ void AfPage::create() {
     AF_Bearbeiten = clicked<QPushButton>("AF_Bearbeiten", {72}, m_choice, &AfPage::AF_Bearbeiten_Click);
     m_view.createContent(named<QLabel>("AF_TN", m_shown), {443, "Sendefrequenz [MHz]"}, "AF_List1", {444, "AF [MHz]"},
                          m_book);
+    AF_Zaehler = named<AfCounter>("AF_Zaehler", m_with, m_view.list(), m_shown);
 
     createOptions(AFMethod_opt, "AFMethod_opt", {{75}, {76}}, m_transmission, &AfPage::AFMethod_opt_Click);
     Taste_AF_Senden = clicked<QPushButton>("Taste_AF_Senden", {73}, m_transmission, &AfPage::Taste_AF_Senden_Click);
@@ -32,11 +34,16 @@ void AfPage::create() {
 
 void AfPage::arrange() {
     layOut(m_choice, add(m_view.optionColumn(), {AF_Bearbeiten}));
-    layOut(m_shown, m_view.contentColumn());
+    layOut(m_shown, add(m_view.contentColumn(), {AF_Zaehler}));
     layOut(m_transmission, add(column(AFMethod_opt), {kRoom, Taste_AF_Senden}));
     // Three equal columns in the order of the work: choose a list, look at it, send them all.
     layOut(Frame2, row({{m_choice, 1}, {m_shown, 1}, {m_transmission, 1}}));
     layOut(this, column({Frame2}), kPageMargin);
+}
+
+void AfPage::label() {
+    Page::label();
+    AF_Zaehler->count();
 }
 
 void AfPage::load() {

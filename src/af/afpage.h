@@ -11,6 +11,8 @@
 
 namespace kdx {
 
+class AfCounter;
+
 /// The page "AF Liste": shows one of the five lists of alternative frequencies and sends them all.
 class AfPage : public Page {
     Q_OBJECT
@@ -18,6 +20,7 @@ public:
     /// @param lists those of the data set at work.
     AfPage(const PageContext& with, AfListSet& lists, QWidget* parent);
 
+    void label() override;
     /// Chooses and shows the list that the data set names.
     void load() override;
     void showDataSet() override { AfPage::load(); }
@@ -43,6 +46,7 @@ private:
 
     QGroupBox* Frame2 = nullptr;
     AfListView m_view;  // AFList_Opt, AF_TN, AF_List1
+    AfCounter* AF_Zaehler = nullptr;
     OptionArray<2> AFMethod_opt;
     QPushButton* Taste_AF_Senden = nullptr;
     QPushButton* AF_Bearbeiten = nullptr;

@@ -12,6 +12,7 @@
 #include "ui/dialogs.h"
 #include "ui/layouts.h"
 #include "ui/pictureswitch.h"
+#include "ui/sententry.h"
 #include "ui/statusrow.h"
 #include "ui/text.h"
 
@@ -24,9 +25,10 @@ namespace {
 constexpr int kAnnouncementMs = 1000;
 
 /// Sets a text box without running its change handler.
-void setQuietly(QLineEdit* box, const std::string& bytes) {
+void setQuietly(SentEntry* box, const std::string& bytes) {
     const QSignalBlocker quiet(box);
     box->setText(toText(bytes));
+    box->refresh();
 }
 
 }  // namespace
@@ -46,15 +48,18 @@ void EonPage::create() {
 void EonPage::createProgramme() {
     m_programme = captioned<QGroupBox>("", {480, "Anderes Programm"}, this);
 
-    EON_PI_Text = wired<QLineEdit>("EON_PI_Text", &QLineEdit::textChanged, &EonPage::EON_PI_Text_Change, m_programme);
+    EON_PI_Text = wired<SentEntry>("EON_PI_Text", &QLineEdit::textChanged, &EonPage::EON_PI_Text_Change, m_with, setting::kEonPi.sendKey, m_programme);
     EON_PI_Label = heading("EON_PI_Label", {481, "EON PI"}, EON_PI_Text);
     EON_PI_Taste = clicked<QPushButton>("EON_PI_Taste", {86}, m_programme, &EonPage::EON_PI_Taste_Click);
     m_book.spokenAs(EON_PI_Taste, EON_PI_Label);  // of three of the same text, heard with what it stands at
 
-    EON_PS_Text = wired<QLineEdit>("EON_PS_Text", &QLineEdit::textChanged, &EonPage::EON_PS_Text_Change, m_programme);
+    EON_PS_Text = wired<SentEntry>("EON_PS_Text", &QLineEdit::textChanged, &EonPage::EON_PS_Text_Change, m_with, setting::kEonPs.sendKey, m_programme);
     EON_PS_LABEL = heading("EON_PS_LABEL", {482, "EON PS"}, EON_PS_Text);
     EON_PS_Taste = clicked<QPushButton>("EON_PS_Taste", {86}, m_programme, &EonPage::EON_PS_Taste_Click);
     m_book.spokenAs(EON_PS_Taste, EON_PS_LABEL);
+
+    connect(EON_PI_Text, &QLineEdit::returnPressed, EON_PI_Taste, &QPushButton::click);
+    connect(EON_PS_Text, &QLineEdit::returnPressed, EON_PS_Taste, &QPushButton::click);
 
     EON_PTY_Combo =
         wired<QComboBox>("EON_PTY_Combo", &QComboBox::currentIndexChanged, &EonPage::EON_PTY_Combo_Change, m_programme);
@@ -101,6 +106,7 @@ void EonPage::arrange() {
 void EonPage::label() {
     Page::label();
     showStoredProgrammeType();
+    for (SentEntry* entry : {EON_PI_Text, EON_PS_Text}) entry->refresh();
 }
 
 void EonPage::showStoredProgrammeType() {
@@ -149,6 +155,7 @@ void EonPage::EON_PI_Taste_Click() {
     const auto& [label, key] = setting::kHeldNetworks;
     m_with.params.SendParam(setting::kEonRemoval, firstNetwork(m_with.instrument.X4_Abfrage(label, key)));
     m_with.params.SendParam(setting::kEonPi.sendKey, m_network.pi);
+    noteSent(setting::kEonPi.sendKey, m_network.pi);
 }
 
 void EonPage::EON_PS_Text_Change() {
@@ -159,6 +166,21 @@ void EonPage::EON_PS_Taste_Click() {
     m_network.ps = withoutControls(m_network.ps);
     storeText(setting::kEonPs, m_network.ps);
     m_with.params.SendParam(setting::kEonPs.sendKey, m_network.ps);
+    noteSent(setting::kEonPs.sendKey, m_network.ps);
+}
+
+void EonPage::stepGoesOut(const Step& step) {
+    noteSent(step.key, step.value);
+}
+
+void EonPage::noteSent(const std::string& key, const std::string& value) {
+    if (m_with.instrument.LastVisaStatus < 0) return;
+    if (key == setting::kEonPi.sendKey) {
+        EON_PI_Text->wentOut(value);
+        EON_PS_Text->forget();  // the network is a new one to the coder: it has no name there
+    } else if (key == setting::kEonPs.sendKey) {
+        EON_PS_Text->wentOut(value);
+    }
 }
 
 void EonPage::EON_PTY_Combo_Change() {

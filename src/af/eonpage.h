@@ -6,7 +6,6 @@
 #include <QCheckBox>
 #include <QComboBox>
 #include <QGroupBox>
-#include <QLineEdit>
 #include <QPushButton>
 
 #include <functional>
@@ -15,6 +14,7 @@
 namespace kdx {
 
 class PictureSwitch;
+class SentEntry;
 struct OtherNetwork;
 
 /// The page "E O N": describes one other network to the coder. Its PI, which leads every EON command, is the
@@ -31,6 +31,8 @@ public:
     void load() override;
     /// An announcement of the network left behind ends.
     void showDataSet() override;
+    /// What goes out is what the coder has.
+    void stepGoesOut(const Step& step) override;
 
     /// Replaces how the list editor is opened; the call returns when the editor has closed. By default the editor's
     /// window is shown, modal over this one.
@@ -53,6 +55,7 @@ private:
     void EON_AF_Bearbeiten_Click();
     void EON_AFB_Senden_Click();
     void holdPi(const std::string& pi);
+    void noteSent(const std::string& key, const std::string& value);
     [[nodiscard]] bool mayAnnounce();
     void showStoredProgrammeType();
 
@@ -62,10 +65,10 @@ private:
 
     QGroupBox* m_programme = nullptr;
     QLabel* EON_PI_Label = nullptr;
-    QLineEdit* EON_PI_Text = nullptr;
+    SentEntry* EON_PI_Text = nullptr;
     QPushButton* EON_PI_Taste = nullptr;
     QLabel* EON_PS_LABEL = nullptr;
-    QLineEdit* EON_PS_Text = nullptr;
+    SentEntry* EON_PS_Text = nullptr;
     QPushButton* EON_PS_Taste = nullptr;
     QLabel* EON_PTY_LAbel = nullptr;
     QComboBox* EON_PTY_Combo = nullptr;

@@ -1,10 +1,15 @@
 #include "groups/grouppage.h"
 
+#include "groups/sequenceedit.h"
 #include "groups/settings.h"
+#include "link/instrument.h"
 #include "settings/programstate.h"
 #include "ui/dialogs.h"
 #include "ui/layouts.h"
 #include "ui/text.h"
+#include "ui/valuestate.h"
+
+#include <algorithm>
 
 namespace kdx {
 
@@ -27,6 +32,15 @@ void GroupPage::create() {
     m_note = captioned<QLabel>("SequenceNote", {460, "Eine gespeicherte Folge wird nur bis zum 254. Zeichen gelesen."},
                                this);
     newList = clicked<QPushButton>("newList", {156}, this, &GroupPage::newList_Click);
+    Gruppe_Zurueck =
+        clicked<QPushButton>("Gruppe_Zurueck", {871, "Letzte entfernen"}, this, &GroupPage::Gruppe_Zurueck_Click);
+    Gruppe_Vor = clicked<QPushButton>("Gruppe_Vor", {872, "< früher"}, this, &GroupPage::Gruppe_Vor_Click);
+    Gruppe_Nach = clicked<QPushButton>("Gruppe_Nach", {873, "später >"}, this, &GroupPage::Gruppe_Nach_Click);
+    for (QPushButton* button : {Gruppe_Vor, Gruppe_Nach})
+        m_book.tip(button, {874, "Verschiebt die markierte Gruppe; ein Klick auf eine Gruppe markiert sie."});
+    connect(Label10, &SequenceLabel::clickedAt, this, &GroupPage::choose);
+    Gruppe_Anteile = named<QLabel>("Gruppe_Anteile", this);
+    Gruppe_Anteile->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Preferred);  // shows what fits; the tip has all
     GS_Senden = clicked<QPushButton>("GS_Senden", {82}, this, &GroupPage::GS_Senden_Click);
 }
 
@@ -53,9 +67,12 @@ void GroupPage::arrange() {
     page->setRowMinimumHeight(below, 2 * kGap);
     page->addWidget(m_sequenceView, below + 1, 0, 1, kColumns);
     page->setRowStretch(below + 1, 7);  // as high as three and a half rows of buttons
-    page->addWidget(m_note, below + 2, 0, 1, kColumns);
-    page->addWidget(newList, below + 3, 0);
-    page->addWidget(GS_Senden, below + 3, kColumns - 1);
+    page->addWidget(Gruppe_Anteile, below + 2, 0, 1, kColumns);
+    page->addWidget(m_note, below + 3, 0, 1, kColumns);
+    page->addWidget(newList, below + 4, 0);
+    page->addWidget(Gruppe_Zurueck, below + 4, 1);
+    page->addLayout(row({{Gruppe_Vor, 1}, {Gruppe_Nach, 1}}), below + 4, 2);
+    page->addWidget(GS_Senden, below + 4, kColumns - 1);
     layOut(this, page, 2 * kGap);
 }
 
@@ -67,7 +84,7 @@ void GroupPage::label() {
 void GroupPage::load() {
     countAnew();
     m_with.state.storedGroupSequence = m_sequence.groups;
-    showSequence();
+    choose(-1);
 }
 
 void GroupPage::opened() {
@@ -80,13 +97,50 @@ void GroupPage::Gruppe_Click(int number) {
     m_sequence.composed = true;
     countUp(m_with.state.groupCount);
     if (number == kTmcGroup) countUp(m_with.state.group8ACount);
+    choose(-1);
+}
+
+void GroupPage::Gruppe_Zurueck_Click() {
+    std::vector<std::string> groups = groupsOf(m_sequence.groups);
+    if (groups.empty()) return;
+    std::int16_t& tmc = m_with.state.group8ACount;
+    if (groups.back() + "," == groupText(kTmcGroup) && tmc > 0) --tmc;
+    if (m_with.state.groupCount > 0) --m_with.state.groupCount;
+    groups.pop_back();
+    m_sequence.groups = sequenceOf(groups);
+    m_sequence.composed = true;
+    choose(-1);
+}
+
+void GroupPage::move(int places) {
+    std::vector<std::string> groups = groupsOf(m_sequence.groups);
+    const std::size_t to = moveGroup(groups, m_chosen, places);
+    if (to == m_chosen) return;
+    m_chosen = to;
+    m_sequence.groups = sequenceOf(groups);
+    m_sequence.composed = true;
     showSequence();
+}
+
+void GroupPage::choose(int character) {
+    const std::size_t groups = groupsOf(m_sequence.groups).size();
+    m_chosen = groups == 0 ? 0 : groups - 1;
+    const auto at = character - heading().size();
+    if (at >= 0 && at < std::ssize(m_sequence.groups)) {
+        const auto begin = m_sequence.groups.begin();
+        m_chosen = std::min(m_chosen, static_cast<std::size_t>(std::count(begin, begin + at, ',')));
+    }
+    showSequence();
+}
+
+QString GroupPage::heading() const {
+    return caption({83}) + QLatin1Char(':');
 }
 
 void GroupPage::newList_Click() {
     m_sequence.startAnew();
     countAnew();
-    showSequence();
+    choose(-1);
 }
 
 void GroupPage::countAnew() {
@@ -109,11 +163,16 @@ void GroupPage::Gruppenfolge() {
     Steps steps;
     m_sequence.appendSteps(steps);
     send(steps);
+    if (m_with.instrument.LastVisaStatus < 0) m_sent.reset();
+    showSequence();
 }
 
 void GroupPage::stepGoesOut(const Step& step) {
     constexpr const Setting& kSequence = setting::kGroupSequence;
-    if (step.key != kSequence.sendKey || !m_sequence.isToBeStored(m_with.profile)) return;
+    if (step.key != kSequence.sendKey) return;
+    if (m_with.state.InstrumentOnline && m_with.instrument.LastVisaStatus >= 0) m_sent = step.value;
+    showSequence();
+    if (!m_sequence.isToBeStored(m_with.profile)) return;
     m_with.profile.write(kSequence.place, step.value + ",");
 }
 
@@ -123,12 +182,46 @@ void GroupPage::showStored() {
     m_sequence.load(m_with.profile,
                     m_with.state.dataSetChosen ? setting::kGroupSequence.place : setting::kShownGroupSequence);
     m_with.state.storedGroupSequence = m_sequence.groups;
-    showSequence();
+    choose(-1);
 }
 
 void GroupPage::showSequence() {
-    Label10->setText(caption({83}) + QLatin1Char(':') + toText(m_sequence.groups));
+    Label10->setText(heading() + toText(m_sequence.groups));
     m_note->setVisible(m_sequence.exceedsReading());
+    const std::vector<std::string> groups = groupsOf(m_sequence.groups);
+    const bool chosen = m_chosen < groups.size() && sequenceOf(groups) == m_sequence.groups;
+    if (chosen) {
+        const auto before = sequenceOf({groups.begin(), groups.begin() + static_cast<std::ptrdiff_t>(m_chosen)});
+        Label10->mark(static_cast<int>(heading().size() + std::ssize(before)),
+                      static_cast<int>(groups[m_chosen].size()));
+    } else {
+        Label10->mark(0, 0);
+    }
+    Gruppe_Zurueck->setEnabled(!groups.empty());
+    Gruppe_Vor->setEnabled(chosen && m_chosen > 0);
+    Gruppe_Nach->setEnabled(chosen && m_chosen + 1 < groups.size());
+    showShares(groups);
+    const Judgement judgement = judge();
+    showState(*Label10, judgement.state, judgement.tip);
+}
+
+void GroupPage::showShares(const std::vector<std::string>& groups) {
+    QStringList shares;
+    for (const auto& [group, count] : groupCounts(groups)) {
+        const double percent = 100.0 * static_cast<double>(count) / static_cast<double>(groups.size());
+        shares.append(QStringLiteral("%1 %2 %").arg(toText(group)).arg(qRound(percent)));
+    }
+    const QString text = shares.join(QStringLiteral(", "));
+    Gruppe_Anteile->setText(text.isEmpty() ? text : caption({875, "Anteile: %1"}).arg(text));
+    Gruppe_Anteile->setToolTip(Gruppe_Anteile->text());
+}
+
+Judgement GroupPage::judge() const {
+    if (m_sequence.groups.empty()) return {};
+    const std::string value = sequenceToSend(m_sequence.groups);
+    if (m_sent != value) return {ValueState::Unsent, caption({857, "Noch nicht gesendet."})};
+    const QString why = whyRefused(m_with, setting::kGroupSequence.sendKey, toText(value));
+    return {why.isEmpty() ? ValueState::InForce : ValueState::Refused, why};
 }
 
 }  // namespace kdx

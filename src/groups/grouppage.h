@@ -3,11 +3,15 @@
 #include "groups/groupsequence.h"
 #include "groups/sequencelabel.h"
 #include "ui/page.h"
+#include "ui/valuestate.h"
 
 #include <QPushButton>
 #include <QScrollArea>
 
 #include <array>
+#include <optional>
+#include <string>
+#include <vector>
 
 namespace kdx {
 
@@ -32,20 +36,34 @@ private:
     void arrange();
     void Gruppe_Click(int number);  // Gruppe0_Click to Gruppe15_Click
     void newList_Click();
+    void Gruppe_Zurueck_Click();
+    void Gruppe_Vor_Click() { move(-1); }
+    void Gruppe_Nach_Click() { move(1); }
     void GS_Senden_Click();
     void Gruppenfolge();
     void countAnew();
     void showStored();
     void showSequence();
+    void showShares(const std::vector<std::string>& groups);
+    [[nodiscard]] QString heading() const;
+    void move(int places);
+    /// The group at that character of the label is the one to be moved; the last one where there is none.
+    void choose(int character);
+    [[nodiscard]] Judgement judge() const;
 
     GroupSequence& m_sequence;
 
     std::array<QPushButton*, kGroups> Gruppe{};  // sixteen buttons of their own: Gruppe0 to Gruppe15
     QPushButton* newList = nullptr;
+    QPushButton* Gruppe_Zurueck = nullptr;  // removes the last group
+    QPushButton *Gruppe_Vor = nullptr, *Gruppe_Nach = nullptr;
     QPushButton* GS_Senden = nullptr;
     SequenceLabel* Label10 = nullptr;  // heading and sequence
     QScrollArea* m_sequenceView = nullptr;
-    QLabel* m_note = nullptr;  // that a sequence is longer than can be read back
+    QLabel* Gruppe_Anteile = nullptr;   // share of each group
+    std::size_t m_chosen = 0;           // the group that is moved
+    std::optional<std::string> m_sent;  // what the coder has
+    QLabel* m_note = nullptr;           // that a sequence is longer than can be read back
 };
 
 }  // namespace kdx

@@ -111,6 +111,7 @@ std::string DynamicPs::nextStep() {
 void DynamicPs::restoreTypedPs() {
     m_with.status.show(StatusSlot::Ps, m_typedPs());
     m_with.params.SendParam(setting::kPs.sendKey, toBytes(m_with.status.text(StatusSlot::Ps)));
+    emit typedPsSent();
 }
 
 }  // namespace kdx

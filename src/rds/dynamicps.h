@@ -31,6 +31,10 @@ public:
     PictureSwitch* Taste_PS_Auto = nullptr;
     QCheckBox* PS_dyn_Check = nullptr;
 
+signals:
+    /// The typed PS went out again.
+    void typedPsSent();
+
 private:
     void Taste_PS_Auto_Click();
     void PS_Timer_Timer();

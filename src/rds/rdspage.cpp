@@ -4,6 +4,7 @@
 
 #include "base/clock.h"
 #include "coder/sendparam.h"
+#include "link/instrument.h"
 #include "rds/dynamicps.h"
 #include "rds/settings.h"
 #include "rds/taframe.h"
@@ -12,6 +13,7 @@
 #include "settings/storedvalue.h"
 #include "settings/withoutcontrols.h"
 #include "ui/dialogs.h"
+#include "ui/entrycounter.h"
 #include "ui/statusrow.h"
 
 namespace kdx {
@@ -30,6 +32,8 @@ void RdsPage::label() {
     if (m_shownTrafficProgramme) showTrafficProgramme(*m_shownTrafficProgramme);
     if (!m_programme.musicSpeech.empty()) showMusicSpeech();
     fillProgrammeTypes();
+    for (SentEntry* entry : {PS_T, PI_T, RT_Text1}) entry->refresh();
+    for (EntryCounter* counter : {PS_Zaehler, PI_Zaehler, RT_Zaehler}) counter->count();
 }
 
 void RdsPage::fillProgrammeTypes() {
@@ -41,7 +45,8 @@ void RdsPage::fillProgrammeTypes() {
 
 void RdsPage::showProgrammeType() {
     PTY_Combo1->setCurrentIndex(storedEntry(m_programme.pty, kProgrammeTypes));
-    if (PTY_Combo1->currentIndex() >= 0) m_with.status.show(StatusSlot::Pty, PTY_Combo1->currentText());
+    if (PTY_Combo1->currentIndex() < 0) return;
+    m_with.status.show(StatusSlot::Pty, PTY_Combo1->currentText(), judgement(m_sentPty, m_programme.pty));
 }
 
 void RdsPage::load() {
@@ -60,9 +65,10 @@ void RdsPage::showDataSet() {
 
 void RdsPage::showProgramme() {
     PS_T->setText(toText(m_with.profile.read(setting::kPs.place)));  // whole, also what is too long to be sent
-    m_with.status.show(StatusSlot::Ps, m_programme.ps);
+    showValue(StatusSlot::Ps, PS_T, m_programme.ps);
+    m_dynamicPs->showStopped();
     PI_T->setText(toText(m_programme.pi));
-    m_with.status.show(StatusSlot::Pi, m_programme.pi);
+    showValue(StatusSlot::Pi, PI_T, m_programme.pi);
     RT_Text1->setText(toText(m_programme.radiotext));
     // The second text has no entry of its own.
     const std::string second = m_with.profile.read(setting::kSecondRadiotext);
@@ -77,6 +83,39 @@ void RdsPage::showProgramme() {
 void RdsPage::stepGoesOut(const Step& step) {
     if (step.key == setting::kTrafficProgramme) setTrafficProgramme(step.value == "1");
     m_ta->stepGoesOut(step);
+    if (step.key == setting::kPs.sendKey) {
+        noteSent(PS_T, step.value);
+        showValue(StatusSlot::Ps, PS_T, step.value);
+    } else if (step.key == setting::kPi.sendKey) {
+        noteSent(PI_T, step.value);
+        showValue(StatusSlot::Pi, PI_T, step.value);
+    } else if (step.key == setting::kRadiotext.sendKey) {
+        noteSent(RT_Text1, step.value);
+    } else if (step.key == setting::kMusicSpeech.sendKey && !step.value.empty()) {
+        noteSent(m_sentMusicSpeech, step.value);
+        showMusicSpeech();
+    } else if (step.key == setting::kPty.sendKey) {
+        noteSent(m_sentPty, step.value);
+        showProgrammeType();
+    }
+}
+
+/// What went out over a link that works is what the instrument has.
+void RdsPage::noteSent(SentEntry* entry, const std::string& value) {
+    if (m_with.instrument.LastVisaStatus >= 0) entry->wentOut(value);
+}
+
+void RdsPage::noteSent(std::string& what, const std::string& value) {
+    if (m_with.instrument.LastVisaStatus >= 0 && m_with.state.InstrumentOnline) what = value;
+}
+
+void RdsPage::showValue(StatusSlot slot, const SentEntry* entry, const std::string& value) {
+    m_with.status.show(slot, value, entry->judge(value));
+}
+
+Judgement RdsPage::judgement(const std::string& sent, const std::string& value) const {
+    if (sent == value) return {};
+    return {ValueState::Unsent, caption({857, "Noch nicht gesendet."})};
 }
 
 // What a data set holds goes out as it stands with the whole set; the button beside an entry sends what could be typed
@@ -85,20 +124,23 @@ void RdsPage::PS_Taste_Click() {
     m_programme.ps = withoutControls(toBytes(PS_T->text())).substr(0, kPsLength);
     m_with.params.SendParam(setting::kPs.sendKey, std::string(m_programme.ps));
     storeText(setting::kPs, m_programme.ps);
-    m_with.status.show(StatusSlot::Ps, m_programme.ps);
+    noteSent(PS_T, m_programme.ps);
+    showValue(StatusSlot::Ps, PS_T, m_programme.ps);
 }
 
 void RdsPage::Command3_Click() {
     m_programme.pi = withoutControls(m_programme.pi);
     m_with.params.SendParam(setting::kPi.sendKey, m_programme.pi);  // which gives it its four characters
     m_with.profile.write(setting::kPi.place, withoutControls(toBytes(PI_T->text())));
-    m_with.status.show(StatusSlot::Pi, PI_T->text());
+    noteSent(PI_T, m_programme.pi);
+    showValue(StatusSlot::Pi, PI_T, toBytes(PI_T->text()));
 }
 
 void RdsPage::PTY_Combo1_Click() {
     m_programme.pty = std::to_string(PTY_Combo1->currentIndex());
     sendAndStore(setting::kPty, m_programme.pty);
-    m_with.status.show(StatusSlot::Pty, PTY_Combo1->currentText());
+    noteSent(m_sentPty, m_programme.pty);
+    showProgrammeType();
 }
 
 void RdsPage::Check1_Click() {
@@ -109,8 +151,9 @@ void RdsPage::Check1_Click() {
 
 void RdsPage::MS_opt_Click(int index) {
     m_programme.musicSpeech = index == 0 ? "M" : "S";
-    showMusicSpeech();
     sendAndStore(setting::kMusicSpeech, m_programme.musicSpeech);
+    noteSent(m_sentMusicSpeech, m_programme.musicSpeech);
+    showMusicSpeech();
 }
 
 void RdsPage::DI_Opt_Click(int index) {
@@ -122,11 +165,13 @@ void RdsPage::RT_Taste1_Click() {
     m_programme.radiotext = withoutControls(m_programme.radiotext);
     storeText(setting::kRadiotext, m_programme.radiotext);
     m_with.params.SendParam(setting::kRadiotext.sendKey, m_programme.radiotext);
+    noteSent(RT_Text1, m_programme.radiotext);
 }
 
 void RdsPage::RT_clear1_Click() {
     m_with.params.SendParam(setting::kRadiotext.sendKey, "   ");
     RT_Text1->clear();
+    noteSent(RT_Text1, {});
 }
 
 void RdsPage::Zeit_Taste_Click() {
@@ -151,7 +196,8 @@ void RdsPage::Uhr_Zeit_DblClick() {
 }
 
 void RdsPage::showMusicSpeech() {
-    m_with.status.show(StatusSlot::MusicSpeech, caption({m_programme.musicSpeech == "M" ? 56 : 57}));
+    m_with.status.show(StatusSlot::MusicSpeech, caption({m_programme.musicSpeech == "M" ? 56 : 57}),
+                       judgement(m_sentMusicSpeech, m_programme.musicSpeech));
 }
 
 void RdsPage::setTrafficProgramme(bool on) {

@@ -12,11 +12,14 @@
 #include "ui/clickablelabel.h"
 #include "ui/page.h"
 #include "ui/pictureswitch.h"
+#include "ui/sententry.h"
+#include "ui/statusrow.h"
 #include "ui/text.h"
 
 namespace kdx {
 
 class DynamicPs;
+class EntryCounter;
 class TaFrame;
 
 /// The page "R D S": programme service name, identification and type, traffic flags, music/speech, decoder
@@ -37,7 +40,7 @@ public:
 private:
     void create();
     void createService();
-    QPushButton* sendButton(const char* name, const char* what, QLineEdit* entry, void (RdsPage::*handler)());
+    QPushButton* sendButton(const char* name, const char* what, SentEntry* entry, void (RdsPage::*handler)());
     void arrange();
 
     void PS_Taste_Click();
@@ -58,6 +61,10 @@ private:
     void fillProgrammeTypes();
     void showProgrammeType();
     void showMusicSpeech();
+    void noteSent(SentEntry* entry, const std::string& value);
+    void noteSent(std::string& what, const std::string& value);
+    void showValue(StatusSlot slot, const SentEntry* entry, const std::string& value);
+    [[nodiscard]] Judgement judgement(const std::string& sent, const std::string& value) const;
     void setTrafficProgramme(bool on);
     void showTrafficProgramme(bool on);
     void showClock(const QString& text);
@@ -65,10 +72,11 @@ private:
     Programme& m_programme;
 
     QLabel* PS_Label = nullptr;
-    QLineEdit* PS_T = nullptr;
+    SentEntry* PS_T = nullptr;
+    EntryCounter *PS_Zaehler = nullptr, *PI_Zaehler = nullptr, *RT_Zaehler = nullptr;
     QPushButton* PS_Taste = nullptr;
     QLabel* PI_Label = nullptr;
-    QLineEdit* PI_T = nullptr;
+    SentEntry* PI_T = nullptr;
     QPushButton* Command3 = nullptr;  // sends the PI
     QLabel* Label1 = nullptr;         // heading of the programme type list
     QComboBox* PTY_Combo1 = nullptr;
@@ -85,10 +93,12 @@ private:
     QGroupBox* DI_Frame = nullptr;
     OptionArray<16> DI_Opt;
     QGroupBox* RT_Frame = nullptr;
-    QLineEdit* RT_Text1 = nullptr;
+    SentEntry* RT_Text1 = nullptr;
     QPushButton* RT_Taste1 = nullptr;
     QPushButton* RT_clear1 = nullptr;
 
+    std::string m_sentMusicSpeech;  ///< what the instrument has; "" at first
+    std::string m_sentPty;
     bool m_loaded = false;
     bool m_clockOn = false;
     bool m_clockShowsWord = true;                 ///< `Uhr_Zeit` shows the off word, not a time

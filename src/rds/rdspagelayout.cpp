@@ -3,8 +3,10 @@
 
 #include "rds/dynamicps.h"
 #include "rds/rdspage.h"
+#include "rds/settings.h"
 #include "rds/taframe.h"
 #include "settings/withoutcontrols.h"
+#include "ui/entrycounter.h"
 #include "ui/layouts.h"
 
 namespace kdx {
@@ -45,28 +47,34 @@ void RdsPage::create() {
     for (std::size_t i = 8; i < DI_Opt.size(); ++i) DI_Opt[i]->setText(QString::number(i));  // have no name
 
     RT_Frame = captioned<QGroupBox>("RT_Frame", {49}, this);
-    RT_Text1 = wired<QLineEdit>("RT_Text1", &QLineEdit::textChanged, &RdsPage::RT_Text1_Change, RT_Frame);
+    RT_Text1 = wired<SentEntry>("RT_Text1", &QLineEdit::textChanged, &RdsPage::RT_Text1_Change, m_with,
+                                setting::kRadiotext.sendKey, RT_Frame);
     m_book.spokenAs(RT_Text1, RT_Frame);
+    RT_Zaehler =
+        named<EntryCounter>("RT_Zaehler", m_with, setting::kRadiotext.sendKey, kRadiotextLength, RT_Text1, RT_Frame);
     RT_Taste1 = sendButton("RT_Taste1", " RT", RT_Text1, &RdsPage::RT_Taste1_Click);
     RT_clear1 = clicked<QPushButton>("RT_clear1", {52}, RT_Frame, &RdsPage::RT_clear1_Click);
 }
 
 void RdsPage::createService() {
-    PS_T = named<QLineEdit>("PS_T", this);
+    PS_T = named<SentEntry>("PS_T", m_with, setting::kPs.sendKey, this);
     connect(PS_T, &QLineEdit::textChanged, this,
             [this](const QString& text) { m_programme.psField = withoutControls(toBytes(text)); });
     PS_Label = heading("PS_Label", {393, "PS"}, PS_T);
+    PS_Zaehler = named<EntryCounter>("PS_Zaehler", m_with, setting::kPs.sendKey, kPsLength, PS_T, this);
     PS_Taste = sendButton("PS_Taste", " PS", PS_T, &RdsPage::PS_Taste_Click);
-    PI_T = wired<QLineEdit>("PI_T", &QLineEdit::textChanged, &RdsPage::PI_T_Change, this);
+    PI_T = wired<SentEntry>("PI_T", &QLineEdit::textChanged, &RdsPage::PI_T_Change, m_with, setting::kPi.sendKey, this);
     PI_Label = heading("PI_Label", {394, "PI"}, PI_T);
+    PI_Zaehler = named<EntryCounter>("PI_Zaehler", m_with, setting::kPi.sendKey, kPiLength, PI_T, this);
     Command3 = sendButton("Command3", " PI", PI_T, &RdsPage::Command3_Click);
     PTY_Combo1 = wired<QComboBox>("PTY_Combo1", &QComboBox::activated, &RdsPage::PTY_Combo1_Click, this);
     Label1 = heading("Label1", {395, "PTY"}, PTY_Combo1);
     m_dynamicPs = new DynamicPs(
         m_with, m_programme, [this] { return toBytes(PS_T->text()); }, this);
+    connect(m_dynamicPs, &DynamicPs::typedPsSent, this, [this] { noteSent(PS_T, toBytes(PS_T->text())); });
 }
 
-QPushButton* RdsPage::sendButton(const char* name, const char* what, QLineEdit* entry, void (RdsPage::*handler)()) {
+QPushButton* RdsPage::sendButton(const char* name, const char* what, SentEntry* entry, void (RdsPage::*handler)()) {
     constexpr int kSend = 53;
     auto* button = clicked<QPushButton>(name, {kSend}, entry->parentWidget(), handler);
     m_book.spoken(button, {kSend, "", QString::fromLatin1(what)});
@@ -76,15 +84,15 @@ QPushButton* RdsPage::sendButton(const char* name, const char* what, QLineEdit* 
 
 void RdsPage::arrange() {
     auto* dynamic = row({m_dynamicPs->Taste_PS_Auto, m_dynamicPs->PS_dyn_Check, kRoom});
-    auto* service = grid({{PS_Label, PS_T, PS_Taste},
-                          {PI_Label, PI_T, Command3},
+    auto* service = grid({{PS_Label, row({{PS_T, 1}, PS_Zaehler}), PS_Taste},
+                          {PI_Label, row({{PI_T, 1}, PI_Zaehler}), Command3},
                           {Label1, {PTY_Combo1, 2}},
                           {m_dynamicPs->PS_A_Label, dynamic, Check1}});
     service->setColumnStretch(1, 1);
 
     layOut(MS_Frame, row(MS_opt));
     layOut(Time_Frame, row({Zeit_Taste, {Uhr_Zeit, 1}}));
-    layOut(RT_Frame, row({{RT_Text1, 1}, RT_Taste1, RT_clear1}));
+    layOut(RT_Frame, row({{RT_Text1, 1}, RT_Zaehler, RT_Taste1, RT_clear1}));
 
     auto* decoder = grid({});
     decoder->setHorizontalSpacing(8);

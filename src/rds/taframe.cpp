@@ -9,6 +9,7 @@
 #include "ui/dialogs.h"
 #include "ui/layouts.h"
 #include "ui/statusrow.h"
+#include "ui/valuescrollbar.h"
 
 namespace kdx {
 
@@ -44,11 +45,9 @@ void TaFrame::create() {
 /// A scroll bar for seconds that acts where it comes to rest, not on the way.
 QScrollBar* TaFrame::createTime(const char* name, int shortest, int longest, void (TaFrame::*shown)(int),
                                 void (TaFrame::*handler)()) {
-    auto* bar = named<QScrollBar>(name, Qt::Horizontal, Frame1);
+    auto* bar = named<ValueScrollBar>(name, Frame1);
     bar->setRange(shortest, longest);
     bar->setPageStep(10);
-    bar->setTracking(false);
-    bar->setFocusPolicy(Qt::StrongFocus);
     bar->setMinimumWidth(100);
     connect(bar, &QScrollBar::sliderMoved, this, shown);
     connect(bar, &QScrollBar::valueChanged, this, handler);

@@ -13,19 +13,22 @@ class QLabel;
 
 namespace kdx {
 
+class KilohertzField;
+
 /// A setting of the multiplex and its value there.
 struct Adjustment {
     const Setting& setting;
     std::string& value;
 };
 
-/// A deviation with the scroll bar that sets it and the label that shows it.
+/// A deviation with the scroll bar and the number field that set it and the label that shows it.
 struct DeviationBar : Adjustment {
     DeviationBar(const Deviation& of, std::string& kept) : Adjustment{of.setting, kept}, deviation(of) {}
 
     const Deviation& deviation;
     SettingScrollBar* scroll = nullptr;
     QLabel* label = nullptr;
+    KilohertzField* number = nullptr;
 };
 
 /// A flag with the button that turns it over.

@@ -1,9 +1,13 @@
 #include "stereo/rfpage.h"
 
+#include <cmath>
+
+#include "base/numbers.h"
 #include "coder/sendparam.h"
 #include "settings/programstate.h"
 #include "settings/storedvalue.h"
 #include "stereo/carrier.h"
+#include "stereo/steppedlabel.h"
 #include "ui/dialogs.h"
 #include "ui/layouts.h"
 #include "ui/text.h"
@@ -15,6 +19,7 @@ namespace {
 constexpr const char* kLowestLevel = "0";
 constexpr const char* kHighestLevel = "120";
 constexpr double kValueFontScale = 1.75;
+constexpr QLatin1String kNothing("-");  // before anything was sent
 
 }  // namespace
 
@@ -38,9 +43,11 @@ void RfPage::create() {
 void RfPage::createValue(Value& value, const char* name, const char* frame, const Caption& title,
                          void (RfPage::*handler)()) {
     value.frame = captioned<QGroupBox>(frame, title, this);
-    value.label = wired<ClickableLabel>(name, &ClickableLabel::clicked, handler, value.frame);
+    value.label = wired<SteppedLabel>(name, &ClickableLabel::clicked, handler, value.frame);
+    connect(static_cast<SteppedLabel*>(value.label), &SteppedLabel::stepped, this,
+            [this, &value](int steps) { step(value, steps); });
     m_book.tip(value.label, {631, "Klicken, um einen neuen Wert einzugeben"});
-    value.label->setText(QStringLiteral("-"));
+    value.label->setText(kNothing);
     value.label->setAlignment(Qt::AlignCenter);
     value.label->setMargin(2 * kGap);
     QFont font = value.label->font();
@@ -65,7 +72,13 @@ void RfPage::arrange() {
 void RfPage::label() {
     Page::label();
     for (const Value* value : values()) {
+        value->label->setToolTip(value->label->toolTip() + QLatin1Char('\n') +
+                                 caption({870, "Die Pfeiltasten ändern ihn um %1, mit der Umschalttaste um %2."})
+                                     .arg(value->step)
+                                     .arg(10 * value->step));
         value->label->setAccessibleName(value->frame->title() + QStringLiteral(": ") + value->label->text());
+        const Judgement judgement = judge(*value);
+        showState(*value->label, judgement.state, judgement.tip);
     }
 }
 
@@ -83,8 +96,8 @@ void RfPage::HfOnOffState_Click() {
 }
 
 void RfPage::enter(const Value& value) {
-    const std::string lowest = value.lowest != nullptr ? m_with.profile.read(*value.lowest) : kLowestLevel;
-    const std::string highest = value.highest != nullptr ? m_with.profile.read(*value.highest) : kHighestLevel;
+    const std::string lowest = this->lowest(value);
+    const std::string highest = this->highest(value);
     QString answer = toText(m_with.profile.read(value.setting.place));
     QString why;
     do {
@@ -93,10 +106,32 @@ void RfPage::enter(const Value& value) {
         if (answer.isEmpty()) return;
         if (m_with.state.corrections.decimalComma) why = checked(answer, lowest, highest);
     } while (!why.isEmpty() || !liesBetween(toBytes(answer), lowest, highest));
-    showValue(value, answer);
-    m_with.params.SendParam(value.setting.sendKey, toBytes(answer));
+    take(value, answer);
+}
+
+void RfPage::take(const Value& value, const QString& number) {
+    showValue(value, number);
+    m_with.params.SendParam(value.setting.sendKey, toBytes(number));
     // What is not kept is gone with the next opening, which sends what data set 1 holds.
-    if (m_with.state.corrections.rfValues) m_with.profile.write(value.setting.place, toBytes(answer));
+    if (m_with.state.corrections.rfValues) m_with.profile.write(value.setting.place, toBytes(number));
+}
+
+/// Goes from the value that is shown, or else from the one that is kept. A step beyond the limits is none.
+void RfPage::step(const Value& value, int steps) {
+    const bool nothing = value.label->text() == kNothing;
+    const std::string from = nothing ? m_with.profile.read(value.setting.place) : toBytes(value.label->text());
+    constexpr double kFinest = 1e6;  // what the sum of two decimal numbers has below that is no digit of theirs
+    const double sum = std::round((leadingNumber(from) + steps * value.step) * kFinest) / kFinest;
+    const std::string number = shortestDecimal(sum);
+    if (liesBetween(number, lowest(value), highest(value))) take(value, toText(number));
+}
+
+std::string RfPage::lowest(const Value& value) const {
+    return value.lowest != nullptr ? m_with.profile.read(*value.lowest) : kLowestLevel;
+}
+
+std::string RfPage::highest(const Value& value) const {
+    return value.highest != nullptr ? m_with.profile.read(*value.highest) : kHighestLevel;
 }
 
 /// Makes the answer the number that it is. @returns why it is refused, to follow the question; "" when it is not.
@@ -111,8 +146,14 @@ QString RfPage::checked(QString& answer, const std::string& lowest, const std::s
 
 void RfPage::showValue(const Value& value, const QString& text) {
     value.label->setText(text);
-    m_with.status.show(value.slot, text);
+    m_with.status.show(value.slot, text, judge(value));
     label();
+}
+
+Judgement RfPage::judge(const Value& value) const {
+    if (value.label->text() == kNothing) return {};
+    const QString why = whyRefused(m_with, value.setting.sendKey, value.label->text());
+    return {why.isEmpty() ? ValueState::InForce : ValueState::Refused, why};
 }
 
 void RfPage::showOutput(bool on) {

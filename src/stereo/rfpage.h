@@ -28,7 +28,8 @@ private:
     /// One value of the generator: where it comes from, goes to and is shown.
     struct Value {
         const Setting& setting;
-        int prompt;  ///< caption number of the box's text; the title has the next one
+        double step;  ///< of an arrow key, in the value's unit
+        int prompt;   ///< caption number of the box's text; the title has the next one
         StatusSlot slot;
         const Place* lowest = nullptr;  ///< where the limits are kept; nullptr for fixed ones
         const Place* highest = nullptr;
@@ -46,8 +47,13 @@ private:
                      void (RfPage::*handler)());
     void arrange();
     void enter(const Value& value);
+    void step(const Value& value, int steps);
+    void take(const Value& value, const QString& number);
+    [[nodiscard]] std::string lowest(const Value& value) const;
+    [[nodiscard]] std::string highest(const Value& value) const;
     [[nodiscard]] QString checked(QString& answer, const std::string& lowest, const std::string& highest) const;
     void showValue(const Value& value, const QString& text);
+    [[nodiscard]] Judgement judge(const Value& value) const;
     void showOutput(bool on);
     [[nodiscard]] std::array<Value*, 3> values() {
         return {&Input_HF_Freq_Label, &Input_HF_Pegel_Label, &Input_AF_Freq_Label};
@@ -55,10 +61,10 @@ private:
 
     Carrier& m_carrier;
 
-    Value Input_HF_Freq_Label{setting::kRfFrequency, 210, StatusSlot::RfFrequency, &setting::kRfLowest,
+    Value Input_HF_Freq_Label{setting::kRfFrequency, 0.1, 210, StatusSlot::RfFrequency, &setting::kRfLowest,
                               &setting::kRfHighest};
-    Value Input_HF_Pegel_Label{setting::kRfLevel, 216, StatusSlot::RfLevel};
-    Value Input_AF_Freq_Label{setting::kAudioFrequency, 213, StatusSlot::AudioFrequency, &setting::kAudioLowest,
+    Value Input_HF_Pegel_Label{setting::kRfLevel, 1, 216, StatusSlot::RfLevel};
+    Value Input_AF_Freq_Label{setting::kAudioFrequency, 0.1, 213, StatusSlot::AudioFrequency, &setting::kAudioLowest,
                               &setting::kAudioHighest};
     QGroupBox* m_outputFrame = nullptr;
     PictureSwitch* HfOnOffState = nullptr;

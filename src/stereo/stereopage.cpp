@@ -5,6 +5,7 @@
 #include "coder/sendparam.h"
 #include "settings/programstate.h"
 #include "settings/storedvalue.h"
+#include "stereo/numberfield.h"
 #include "ui/text.h"
 
 namespace kdx {
@@ -76,10 +77,12 @@ void StereoPage::turn(const FlagSwitch& flag, bool on) {
 
 void StereoPage::showDeviation(const DeviationBar& bar, int tensOfHertz) {
     bar.label->setText(caption({21}) + QLatin1Char(' ') + toText(deviationText(bar.deviation, tensOfHertz)));
+    showQuietly(bar.number, tensOfHertz);
 }
 
 void StereoPage::showPilotPhase(int degrees) {
     HScroll1_Label->setText(caption({340, "Phase"}) + QStringLiteral(" %1 °").arg(degrees));
+    showQuietly(HScroll1_Zahl, degrees);
 }
 
 std::array<DeviationBar*, 4> StereoPage::deviations() {

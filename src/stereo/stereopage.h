@@ -9,6 +9,7 @@
 
 class QGroupBox;
 class QPushButton;
+class QSpinBox;
 
 namespace kdx {
 
@@ -59,8 +60,8 @@ private:
     void createFm();
     void createStereo();
     void createSubcarriers();
-    void createDeviation(DeviationBar& bar, const char* scroll, const char* label, const Caption& spoken,
-                         QWidget* frame, void (StereoPage::*handler)());
+    void createDeviation(DeviationBar& bar, const char* scroll, const char* label, const char* number,
+                         const Caption& spoken, QWidget* frame, void (StereoPage::*handler)());
     void createSwitch(FlagSwitch& flag, const char* name, const Caption& spoken, QWidget* frame,
                       void (StereoPage::*handler)());
     void arrange();
@@ -88,6 +89,7 @@ private:
     FlagSwitch Ari_OnOff{{setting::kAri, m_multiplex.ari}};
 
     SettingScrollBar* HScroll1 = nullptr;  // pilot phase in degrees
+    QSpinBox* HScroll1_Zahl = nullptr;
     SettingScrollBar* RDS_Phase_Scroll = nullptr;
     QLabel *HScroll1_Label = nullptr, *RDS_Phase_Label = nullptr;
     QPushButton* Btn_SetRdsStereo = nullptr;

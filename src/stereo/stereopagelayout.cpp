@@ -6,6 +6,7 @@
 #include <QPushButton>
 
 #include "settings/storedvalue.h"
+#include "stereo/numberfield.h"
 #include "ui/layouts.h"
 
 namespace kdx {
@@ -18,6 +19,11 @@ constexpr int kHighestRdsPhase = 359;
 template <std::size_t Count>
 QBoxLayout* stack(const Choice<Count>& choice) {
     return add(column(choice.options), {kRoom});
+}
+
+/// Puts a value and the field to enter it into a line of their own.
+QBoxLayout* line(QLabel* value, QWidget* number) {
+    return row({{value, 1}, number});
 }
 
 /// Puts a heading and its switch into a line of their own.
@@ -39,7 +45,7 @@ void StereoPage::create() {
 
 void StereoPage::createFm() {
     FM_Frame = captioned<QGroupBox>("FM_Frame", {341, "FM"}, this);
-    createDeviation(FM_Hub_Scroll, "FM_Hub_Scroll", "FM_Hub_Label2", {348, "Gesamthub"}, FM_Frame,
+    createDeviation(FM_Hub_Scroll, "FM_Hub_Scroll", "FM_Hub_Label2", "FM_Hub_Zahl", {348, "Gesamthub"}, FM_Frame,
                     &StereoPage::FM_Hub_Scroll_Change);
     FM_Sorce_Frame = captioned<QGroupBox>("FM_Sorce_Frame", {20}, FM_Frame);
     createOptions(FM_Source_Opt.options, "FM_Source_Opt", {{22}, {23}, {24}, {25}}, FM_Sorce_Frame,
@@ -60,13 +66,16 @@ void StereoPage::createStereo() {
         Frame_stereo, &StereoPage::Stereo_Opt_Click);
     m_pilotHeading = captioned<QLabel>("", {344, "Pilotton"}, Frame_stereo);
     createSwitch(Pilot_OnOff, "Pilot_OnOff", {354, "Pilotton ein / aus"}, Frame_stereo, &StereoPage::Pilot_OnOff_Click);
-    createDeviation(Pilot_Hub_Scroll, "Pilot_Hub_Scroll", "Pilot_hub_Label", {349, "Pilottonhub"}, Frame_stereo,
-                    &StereoPage::Pilot_Hub_Scroll_Change);
+    createDeviation(Pilot_Hub_Scroll, "Pilot_Hub_Scroll", "Pilot_hub_Label", "Pilot_Hub_Zahl", {349, "Pilottonhub"},
+                    Frame_stereo, &StereoPage::Pilot_Hub_Scroll_Change);
     HScroll1_Label = named<QLabel>("HScroll1_Label", Frame_stereo);
+    HScroll1_Zahl = named<QSpinBox>("HScroll1_Zahl", Frame_stereo);
     HScroll1 = named<SettingScrollBar>("HScroll1", Frame_stereo);
     HScroll1->setScale(kLowestPilotPhase, kHighestPilotPhase, 1);
     setQuietly(HScroll1, storedPosition(m_multiplex.pilotPhase, kLowestPilotPhase, kHighestPilotPhase));
     m_book.describe(HScroll1, {350, "Pilottonphase"});
+    tie(m_with, HScroll1_Zahl, HScroll1);
+    m_book.describe(HScroll1_Zahl, {350, "Pilottonphase"});
     connect(HScroll1, &QScrollBar::sliderMoved, this, &StereoPage::showPilotPhase);
     connect(HScroll1, &QScrollBar::valueChanged, this, &StereoPage::HScroll1_Change);
 }
@@ -74,7 +83,7 @@ void StereoPage::createStereo() {
 void StereoPage::createSubcarriers() {
     RDS_Frame = captioned<QGroupBox>("RDS_Frame", {342, "R D S"}, this);
     createSwitch(RDS_OnOff, "RDS_OnOff", {355, "RDS-Träger ein / aus"}, RDS_Frame, &StereoPage::RDS_OnOff_Click);
-    createDeviation(RDS_Hub_Scroll, "RDS_Hub_Scroll", "RDS_Hub_Label", {351, "RDS-Hub"}, RDS_Frame,
+    createDeviation(RDS_Hub_Scroll, "RDS_Hub_Scroll", "RDS_Hub_Label", "RDS_Hub_Zahl", {351, "RDS-Hub"}, RDS_Frame,
                     &StereoPage::RDS_Hub_Scroll_Change);
     // No command sets the RDS phase: the control has its range and no handler.
     RDS_Phase_Label = named<QLabel>("RDS_Phase_Label", RDS_Frame);
@@ -84,7 +93,7 @@ void StereoPage::createSubcarriers() {
 
     Ari_Frame = captioned<QGroupBox>("Ari_Frame", {343, "A R I"}, this);
     createSwitch(Ari_OnOff, "Ari_OnOff", {356, "ARI ein / aus"}, Ari_Frame, &StereoPage::Ari_OnOff_Click);
-    createDeviation(Ari_hub_Scroll, "Ari_hub_Scroll", "Ari_Label", {353, "ARI-Hub"}, Ari_Frame,
+    createDeviation(Ari_hub_Scroll, "Ari_hub_Scroll", "Ari_Label", "Ari_hub_Zahl", {353, "ARI-Hub"}, Ari_Frame,
                     &StereoPage::Ari_hub_Scroll_Change);
     createOptions(ARI_Mode_Opt.options, "ARI_Mode_Opt", {{193}, {366, "DK"}, {367, "BK"}, {368, "DK + BK"}}, Ari_Frame,
                   &StereoPage::ARI_Mode_Opt_Click);
@@ -93,12 +102,15 @@ void StereoPage::createSubcarriers() {
                   Ari_Frame, &StereoPage::BK_Opt_Click);
 }
 
-void StereoPage::createDeviation(DeviationBar& bar, const char* scroll, const char* label, const Caption& spoken,
-                                 QWidget* frame, void (StereoPage::*handler)()) {
+void StereoPage::createDeviation(DeviationBar& bar, const char* scroll, const char* label, const char* number,
+                                 const Caption& spoken, QWidget* frame, void (StereoPage::*handler)()) {
     bar.label = named<QLabel>(label, frame);
+    bar.number = named<KilohertzField>(number, frame);
     bar.scroll = named<SettingScrollBar>(scroll, frame);
     bar.scroll->setScale(0, bar.deviation.highest, bar.deviation.step);
     m_book.describe(bar.scroll, spoken);
+    tie(m_with, bar.number, bar.scroll);
+    m_book.describe(bar.number, spoken);
     connect(bar.scroll, &QScrollBar::sliderMoved, this,
             [this, &bar](int tensOfHertz) { showDeviation(bar, tensOfHertz); });
     connect(bar.scroll, &QScrollBar::valueChanged, this, handler);
@@ -125,21 +137,25 @@ void StereoPage::arrangeFrames() {
     layOut(FM_Sorce_Frame, stack(FM_Source_Opt));
     layOut(FM_Imp_Frame, stack(FM_Imp_Opt));
     layOut(Pre_Frame, stack(Pre_opt));
-    auto* fm = grid(
-        {{{FM_Hub_Scroll.label, 2}}, {{FM_Hub_Scroll.scroll, 2}}, {{FM_Sorce_Frame, 2}}, {FM_Imp_Frame, Pre_Frame}});
+    auto* fm = grid({{{line(FM_Hub_Scroll.label, FM_Hub_Scroll.number), 2}},
+                     {{FM_Hub_Scroll.scroll, 2}},
+                     {{FM_Sorce_Frame, 2}},
+                     {FM_Imp_Frame, Pre_Frame}});
     fm->setRowStretch(4, 1);
     layOut(FM_Frame, fm);
 
-    layOut(Frame_stereo, add(stack(Stereo_Opt), {line(m_pilotHeading, Pilot_OnOff), Pilot_Hub_Scroll.label,
-                                                 Pilot_Hub_Scroll.scroll, HScroll1_Label, HScroll1}));
+    layOut(Frame_stereo, add(stack(Stereo_Opt),
+                             {line(m_pilotHeading, Pilot_OnOff), line(Pilot_Hub_Scroll.label, Pilot_Hub_Scroll.number),
+                              Pilot_Hub_Scroll.scroll, line(HScroll1_Label, HScroll1_Zahl), HScroll1}));
     layOut(RDS_Frame,
-           column({line(RDS_Hub_Scroll.label, RDS_OnOff), RDS_Hub_Scroll.scroll, RDS_Phase_Label, RDS_Phase_Scroll}));
+           column({line(RDS_Hub_Scroll.label, RDS_OnOff), row({{RDS_Hub_Scroll.scroll, 1}, RDS_Hub_Scroll.number}),
+                   RDS_Phase_Label, RDS_Phase_Scroll}));
 
     // Six columns: the modes take three each, the areas two.
     const auto& mode = ARI_Mode_Opt.options;
     const auto& area = BK_Opt.options;
     auto* ari = grid({{{line(Ari_hub_Scroll.label, Ari_OnOff), 6}},
-                      {{Ari_hub_Scroll.scroll, 6}},
+                      {{row({{Ari_hub_Scroll.scroll, 1}, Ari_hub_Scroll.number}), 6}},
                       {{mode[0], 3}, {mode[1], 3}},
                       {{mode[2], 3}, {mode[3], 3}},
                       {{m_areaHeading, 6}},

@@ -51,6 +51,14 @@ GroupBits BitDisplay::message() const {
     return {bits(T), bits(F), bits(Dp), bits(D), bits(U), bits(Extent), bits(Event), bits(Location)};
 }
 
+QStringList BitDisplay::notChosen() const {
+    QStringList headings;
+    for (std::size_t field = 0; field < kFields; ++field) {
+        if (m_bits.at(field)->text() == QLatin1String("-")) headings.append(m_headings.at(field)->text());
+    }
+    return headings;
+}
+
 void BitDisplay::showFields(bool shown) {
     for (QLabel* heading : m_headings) heading->setVisible(shown);
     for (QLabel* bits : m_bits) bits->setVisible(shown);

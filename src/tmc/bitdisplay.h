@@ -2,6 +2,7 @@
 
 #include "tmc/groupcode.h"
 
+#include <QStringList>
 #include <QWidget>
 
 #include <array>
@@ -26,6 +27,8 @@ public:
     /// The field holds the number's last bits, as many as it has.
     void set(Field field, double number);
     [[nodiscard]] GroupBits message() const;
+    /// Headings of the fields that nobody has chosen.
+    [[nodiscard]] QStringList notChosen() const;
     /// Shows or hides all fields; the message stays.
     void showFields(bool shown);
 

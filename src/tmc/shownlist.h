@@ -25,6 +25,8 @@ public:
     /// @throws std::runtime_error naming the file, in the current language, when it is missing or cannot be read; the
     /// list is empty then.
     void load(const PageContext& with, const char* fileName);
+    /// The entry as its file has it.
+    [[nodiscard]] std::string line(int row) const { return std::string(m_entries.line(static_cast<std::size_t>(row))); }
     /// The row of the first entry that reads so; -1 when none does.
     [[nodiscard]] int rowOf(const QString& text) const;
 

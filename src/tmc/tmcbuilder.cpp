@@ -7,6 +7,7 @@
 #include "tmc/shownlist.h"
 #include "ui/layouts.h"
 #include "ui/text.h"
+#include "ui/valuestate.h"
 
 #include <QAbstractItemView>
 
@@ -96,6 +97,8 @@ void TmcBuilder::createCode() {
                                       QStringLiteral("<"), this);
     TMCInfoOnOff->setFixedWidth(fontMetrics().horizontalAdvance(QStringLiteral("<")) + 18);
     m_book.describe(TMCInfoOnOff, {572, "Bitanzeige ein / aus"});
+    m_bitsHeading = captioned<QLabel>("", {887, "Bits"}, this);
+    m_bitsHeading->setBuddy(TMCInfoOnOff);
     m_bits = new BitDisplay(m_book, this);
     connect(m_bits, &BitDisplay::changed, this, &TmcBuilder::TMCGruppe8Maker);
 
@@ -120,7 +123,8 @@ void TmcBuilder::arrange() {
     fields->setSpacing(2 * kGap);
 
     auto* code = grid({{{m_codeHeading, 1, Qt::AlignHCenter}}, {TMC_Gr8_Label}});
-    auto* bits = row({{TMCInfoOnOff, 0, Qt::AlignBottom}, space(kGap), m_bits, kRoom, code});
+    auto* bits = row(
+        {{TMCInfoOnOff, 0, Qt::AlignBottom}, {m_bitsHeading, 0, Qt::AlignBottom}, space(kGap), m_bits, kRoom, code});
     layOut(this, column({lists, fields, bits}), 0);
 }
 
@@ -188,6 +192,10 @@ void TmcBuilder::TMCGruppe8Maker() {
     // While fields are not chosen the code lacks bits, and is sent all the same.
     const bool corrected = m_with.state.corrections.trafficFields;
     TMC_Gr8_Label->setText(toText(kdx::groupCode(corrected ? withZeros(bits) : bits)));
+    const QStringList missing = corrected ? QStringList() : m_bits->notChosen();
+    showWarning(*TMC_Gr8_Label, missing.isEmpty()
+                                    ? QString()
+                                    : caption({886, "Noch nicht gewählt: %1"}).arg(missing.join(QStringLiteral(", "))));
 }
 
 }  // namespace kdx

@@ -68,6 +68,7 @@ private:
     QComboBox* DurationCombo = nullptr;
     QCheckBox *TMC_Div = nullptr, *TMC_F_Check = nullptr, *TMC_T_Check = nullptr;
     QPushButton* TMCInfoOnOff = nullptr;
+    QLabel* m_bitsHeading = nullptr;
     BitDisplay* m_bits = nullptr;
     QLabel* m_codeHeading = nullptr;
     ValueLabel* TMC_Gr8_Label = nullptr;

@@ -1,6 +1,7 @@
 #include "tmc/tmclist.h"
 
 #include <algorithm>
+#include <functional>
 #include <utility>
 
 #include "base/numbers.h"
@@ -35,8 +36,12 @@ TmcList::TmcList(std::string bytes) : m_bytes(std::move(bytes)) {
 }
 
 std::string TmcList::operator[](std::size_t index) const {
+    return shownEntry(line(index)).value();
+}
+
+std::string_view TmcList::line(std::size_t index) const {
     const Line& line = m_lines.at(index);
-    return shownEntry(std::string_view(m_bytes).substr(line.begin, line.length)).value();
+    return std::string_view(m_bytes).substr(line.begin, line.length);
 }
 
 std::optional<TmcList> loadTmcList(const std::filesystem::path& file) {
@@ -68,6 +73,51 @@ bool appendLine(const std::filesystem::path& file, std::string_view text, std::s
 bool appendToTmcList(const std::filesystem::path& file, std::string_view text, std::string_view code) {
     bool appended = false;
     return underFolderLock(file.parent_path(), [&] { appended = appendLine(file, text, code); }) && appended;
+}
+
+namespace {
+
+/// Changes the line of that number among those with a semicolon, its line end included.
+bool changeLine(const std::filesystem::path& file, std::size_t index, std::string_view expected,
+                const std::function<std::string(std::string_view lineEnd)>& changed) {
+    std::optional<std::string> content = readToChange(file);
+    if (!content) return false;
+    const std::string_view bytes = *content;
+    std::size_t number = 0;
+    for (std::size_t begin = 0; begin < bytes.size();) {
+        const std::size_t newline = bytes.find('\n', begin);
+        const std::size_t next = newline == std::string_view::npos ? bytes.size() : newline + 1;
+        std::string_view line = bytes.substr(begin, next - begin);
+        while (line.ends_with('\n') || line.ends_with('\r')) line.remove_suffix(1);
+        if (line.find(';') != std::string_view::npos && number++ == index) {
+            if (line != expected) return false;
+            const std::string lineEnd(bytes.substr(begin + line.size(), next - begin - line.size()));
+            return replaceFile(file, content->replace(begin, next - begin, changed(lineEnd)));
+        }
+        begin = next;
+    }
+    return false;
+}
+
+}  // namespace
+
+bool changeInTmcList(const std::filesystem::path& file, std::size_t index, std::string_view line, std::string_view text,
+                     std::string_view code) {
+    bool changed = false;
+    const auto change = [&] {
+        changed = changeLine(file, index, line, [&](std::string_view lineEnd) {
+            return std::string(text).append(";").append(code).append(lineEnd);
+        });
+    };
+    return underFolderLock(file.parent_path(), change) && changed;
+}
+
+bool removeFromTmcList(const std::filesystem::path& file, std::size_t index, std::string_view line) {
+    bool removed = false;
+    const auto remove = [&] {
+        removed = changeLine(file, index, line, [](std::string_view) { return std::string(); });
+    };
+    return underFolderLock(file.parent_path(), remove) && removed;
 }
 
 }  // namespace kdx

@@ -27,6 +27,8 @@ public:
     [[nodiscard]] std::size_t size() const { return m_lines.size(); }
     /// As the lists show it.
     [[nodiscard]] std::string operator[](std::size_t index) const;
+    /// As it stands in the file, without its line end.
+    [[nodiscard]] std::string_view line(std::size_t index) const;
 
 private:
     struct Line {
@@ -44,5 +46,12 @@ private:
 /// step, so it is whole whatever happens, and no other program changes it meanwhile. False on any failure, and then the
 /// file is as it was.
 [[nodiscard]] bool appendToTmcList(const std::filesystem::path& file, std::string_view text, std::string_view code);
+
+/// Puts the line text, semicolon, code in the place of a line of the file; the others stay as they are.
+/// @param line as it was read: false, too, when the file has another line there by now.
+[[nodiscard]] bool changeInTmcList(const std::filesystem::path& file, std::size_t index, std::string_view line,
+                                   std::string_view text, std::string_view code);
+/// Takes a line out of the file, with its line end; likewise.
+[[nodiscard]] bool removeFromTmcList(const std::filesystem::path& file, std::size_t index, std::string_view line);
 
 }  // namespace kdx

@@ -7,8 +7,11 @@
 #include "ui/layouts.h"
 #include "ui/text.h"
 
+#include <QItemSelectionModel>
 #include <QShowEvent>
 #include <QStyle>
+
+#include <algorithm>
 
 namespace kdx {
 
@@ -25,7 +28,8 @@ TMC_Listedit::TMC_Listedit(const PageContext& with, QWidget* parent) : QDialog(p
     auto* lists = row({arrangeList(Label1, List1, Event_Input_TXT, Event_Input_Nr, Event_Hinzu),
                        arrangeList(Label2, List2, Loc_INput_TXT1, Loc_Input_Nr, Loc_Hinzu)});
     lists->setSpacing(3 * kGap);
-    auto* whole = column({{lists, 1}, row({kRoom, m_codeNote, space(2 * kGap), Zuruek_Knopf})});
+    auto* whole = column(
+        {{lists, 1}, row({Eintrag_Aendern, Eintrag_Loeschen, kRoom, m_codeNote, space(2 * kGap), Zuruek_Knopf})});
     whole->setSpacing(2 * kGap);
     layOut(this, whole, 2 * kGap);
     label();
@@ -53,7 +57,75 @@ void TMC_Listedit::create() {
     Loc_Hinzu = clicked<QPushButton>("Loc_Hinzu", add, this, &TMC_Listedit::Loc_Hinzu_Click);
 
     Zuruek_Knopf = clicked<QPushButton>("Zuruek_Knopf", {616, "Exit"}, this, &TMC_Listedit::Zuruek_Knopf_Click);
-    for (QPushButton* button : {Event_Hinzu, Loc_Hinzu, Zuruek_Knopf}) button->setAutoDefault(false);
+    Eintrag_Aendern =
+        clicked<QPushButton>("Eintrag_Aendern", {876, "Eintrag ändern"}, this, &TMC_Listedit::Eintrag_Aendern_Click);
+    Eintrag_Loeschen =
+        clicked<QPushButton>("Eintrag_Loeschen", {877, "Eintrag löschen"}, this, &TMC_Listedit::Eintrag_Loeschen_Click);
+    for (QPushButton* button : {Event_Hinzu, Loc_Hinzu, Eintrag_Aendern, Eintrag_Loeschen, Zuruek_Knopf})
+        button->setAutoDefault(false);
+    for (QListView* list : {List1, List2}) {
+        connect(list->selectionModel(), &QItemSelectionModel::selectionChanged, this,
+                [this, list] { chooseOnlyIn(list); });
+    }
+    chooseOnlyIn(List1);
+}
+
+TMC_Listedit::Chosen TMC_Listedit::chosen() const {
+    for (const Chosen& where : {Chosen{List1, m_events, kEventList, Event_Input_TXT, Event_Input_Nr},
+                                Chosen{List2, m_locations, kLocationList, Loc_INput_TXT1, Loc_Input_Nr}}) {
+        const auto rows = where.list->selectionModel()->selectedRows();
+        if (rows.isEmpty()) continue;
+        Chosen found = where;
+        found.row = rows.front().row();
+        return found;
+    }
+    return {};
+}
+
+/// One entry of both lists at most is chosen: the buttons mean that one.
+void TMC_Listedit::chooseOnlyIn(QListView* list) {
+    QListView* const other = list == List1 ? List2 : List1;
+    if (list->selectionModel()->hasSelection() && other->selectionModel()->hasSelection()) other->clearSelection();
+    const bool any = chosen().row >= 0;
+    Eintrag_Aendern->setEnabled(any);
+    Eintrag_Loeschen->setEnabled(any);
+}
+
+void TMC_Listedit::Eintrag_Aendern_Click() {
+    const Chosen where = chosen();
+    if (where.row < 0) return;
+    const std::string line = where.entries->line(where.row);
+    const std::size_t semicolon = line.find(';');
+    const QString title = caption({617, "Eingabe"});
+    const QString text = m_with.dialogs.input(where.text->accessibleName(), title, toText(line.substr(0, semicolon)));
+    if (text.isEmpty()) return;
+    const QString code = m_with.dialogs.input(where.code->accessibleName(), title, toText(line.substr(semicolon + 1)));
+    if (code.isEmpty()) return;
+    showChange(where, !m_with.data.isReadOnly() &&
+                          changeInTmcList(m_with.data.file(where.fileName), static_cast<std::size_t>(where.row), line,
+                                          toBytes(text), toBytes(code)));
+}
+
+void TMC_Listedit::Eintrag_Loeschen_Click() {
+    const Chosen where = chosen();
+    if (where.row < 0) return;
+    const std::string line = where.entries->line(where.row);
+    if (!m_with.dialogs.confirm(windowTitle(), caption({878, "Diesen Eintrag löschen: %1?"}).arg(toText(line)))) return;
+    showChange(where, !m_with.data.isReadOnly() && removeFromTmcList(m_with.data.file(where.fileName),
+                                                                     static_cast<std::size_t>(where.row), line));
+}
+
+void TMC_Listedit::showChange(const Chosen& where, bool changed) {
+    if (!changed) tellUnsaved(where.fileName);
+    where.entries->load(m_with, where.fileName);
+    const int last = where.entries->rowCount() - 1;
+    where.list->setCurrentIndex(where.entries->index(std::min(where.row, last), 0));
+    chooseOnlyIn(where.list);
+}
+
+void TMC_Listedit::tellUnsaved(const char* fileName) {
+    const QString failure = caption({624, "%1 kann nicht gespeichert werden."});
+    m_with.dialogs.message(Dialogs::Icon::Exclamation, windowTitle(), failure.arg(QLatin1String(fileName)));
 }
 
 QListView* TMC_Listedit::createList(const char* name, ShownList* entries) {
@@ -127,8 +199,7 @@ bool TMC_Listedit::append(QListView* list, ShownList* entries, const QLabel* tex
                           const char* fileName) {
     if (m_with.data.isReadOnly() ||
         !appendToTmcList(m_with.data.file(fileName), toBytes(text->text()), toBytes(code->text()))) {
-        const QString failure = caption({624, "%1 kann nicht gespeichert werden."});
-        m_with.dialogs.message(Dialogs::Icon::Exclamation, windowTitle(), failure.arg(QLatin1String(fileName)));
+        tellUnsaved(fileName);
         return false;
     }
     entries->load(m_with, fileName);

@@ -49,8 +49,22 @@ private:
     void Loc_INput_TXT1_Click() { ask(Loc_INput_TXT1); }
     void Event_Hinzu_Click() { take(Event_Input_TXT, Event_Input_Nr, &TMC_Listedit::Event_anhaengen); }
     void Loc_Hinzu_Click() { take(Loc_INput_TXT1, Loc_Input_Nr, &TMC_Listedit::Location_Anhaengen); }
+    void Eintrag_Aendern_Click();
+    void Eintrag_Loeschen_Click();
     void Zuruek_Knopf_Click() { close(); }
 
+    /// The list with the chosen entry, and what it is made of; no row where none is chosen.
+    struct Chosen {
+        QListView* list = nullptr;
+        ShownList* entries = nullptr;
+        const char* fileName = nullptr;
+        const QLabel *text = nullptr, *code = nullptr;
+        int row = -1;
+    };
+    [[nodiscard]] Chosen chosen() const;
+    void chooseOnlyIn(QListView* list);
+    void showChange(const Chosen& where, bool changed);
+    void tellUnsaved(const char* fileName);
     void ask(QLabel* label);
     bool append(QListView* list, ShownList* entries, const QLabel* text, const QLabel* code, const char* fileName);
     /// Appends a whole entry and makes room for the next one; what cannot be stored stays to be tried again.
@@ -69,6 +83,7 @@ private:
     ClickableLabel* Loc_Input_Nr = nullptr;
     QPushButton* Loc_Hinzu = nullptr;
     QLabel* m_codeNote = nullptr;  // the end of the location table
+    QPushButton *Eintrag_Aendern = nullptr, *Eintrag_Loeschen = nullptr;
     QPushButton* Zuruek_Knopf = nullptr;
 };
 

@@ -22,6 +22,7 @@ void TmcPage::label() {
 
 void TmcPage::load() {
     m_builder->load();
+    m_transmission->load();
     reloadLists();
 }
 

@@ -1,10 +1,13 @@
 #include "tmc/tmctransmission.h"
 
+#include "settings/datafolder.h"
 #include "settings/programstate.h"
 #include "settings/storedvalue.h"
 #include "tmc/groupcode.h"
 #include "tmc/messagedelegate.h"
+#include "tmc/messagefile.h"
 #include "tmc/messagelist.h"
+#include "tmc/runline.h"
 #include "tmc/settings.h"
 #include "tmc/tmcbuilder.h"
 #include "ui/dialogs.h"
@@ -13,6 +16,7 @@
 
 #include <memory>
 #include <stdexcept>
+#include <utility>
 
 namespace kdx {
 
@@ -49,19 +53,40 @@ void TmcTransmission::createSending() {
     TMC_Senden_Taste = clicked<QPushButton>("TMC_Senden_Taste", {53}, this, &TmcTransmission::TMC_Senden_Taste_Click);
     Stop_Timer = clicked<QPushButton>("Stop_Timer", {584, "stop"}, this, &TmcTransmission::Stop_Timer_Click);
     TMC_Sende_Timer = timer("TMC_Sende_Timer", 0, &TmcTransmission::TMC_Sende_Timer_Timer);
+    TMC_Lauf = named<RunLine>("TMC_Lauf", m_with, this);
+}
+
+void TmcTransmission::label() {
+    Page::label();
+    TMC_Lauf->label();
 }
 
 void TmcTransmission::arrange() {
     auto* messages = row({{TMC_List, 1}, column({TMC_Gr8_apply, TMC_Gr8_Remove, kRoom})});
     auto* sending = row({optSingleMessage, space(kGap), optMultiMessage, kRoom, lblCycleTime, txtCycleTime, kRoom,
                          TMC_Senden_Taste, Stop_Timer});
-    layOut(this, column({{messages, 1}, sending}), 0);
+    layOut(this, column({{messages, 1}, TMC_Lauf, sending}), 0);
 }
 
 void TmcTransmission::TMC_Gr8_apply_Click() {
     const std::string entry =
         messageEntry(toBytes(m_builder.locationText()), toBytes(m_builder.eventText()), toBytes(m_builder.groupCode()));
     TMC_List->addItem(toText(entry));
+    keepMessages();
+}
+
+void TmcTransmission::load() {
+    if (std::exchange(m_loaded, true)) return;  // another data set is no reason to lose what is being sent
+    for (const std::string& entry : loadMessages(m_with.data.file(kMessageFile))) TMC_List->addItem(toText(entry));
+}
+
+void TmcTransmission::keepMessages() {
+    std::vector<std::string> entries;
+    for (int row = 0; row < TMC_List->count(); ++row) entries.push_back(toBytes(TMC_List->item(row)->text()));
+    const bool kept = storeMessages(m_with.data.file(kMessageFile), entries);
+    if (kept || std::exchange(m_lossTold, true)) return;
+    m_with.dialogs.message(Dialogs::Icon::Exclamation, caption({585, "Meldungen"}),
+                           caption({624, "%1 kann nicht gespeichert werden."}).arg(QLatin1String(kMessageFile)));
 }
 
 void TmcTransmission::TMC_Gr8_Remove_Click() {
@@ -74,6 +99,7 @@ void TmcTransmission::TMC_Gr8_Remove_Click() {
     const std::unique_ptr<QListWidgetItem> removed(TMC_List->takeItem(TMC_List->row(selected.front())));
     TMC_List->setCurrentRow(-1);  // the next removal asks for a choice again instead of taking a neighbour
     m_sendPosition = 0;
+    keepMessages();
 }
 
 void TmcTransmission::TMC_Senden_Taste_Click() {
@@ -81,6 +107,7 @@ void TmcTransmission::TMC_Senden_Taste_Click() {
     if (TMC_List->selectedItems().isEmpty()) TMC_List->setCurrentRow(0);
     allowChanges(false);
     TMC_Sende_Timer->setEnabled(true);
+    TMC_Lauf->begin(TMC_Sende_Timer->period(), optSingleMessage->isChecked());
 }
 
 bool TmcTransmission::setInterval() {
@@ -91,7 +118,7 @@ bool TmcTransmission::setInterval() {
         return true;
     } catch (const std::out_of_range&) {
         m_with.dialogs.message(Dialogs::Icon::Exclamation, caption({588, "Wechselzeit"}),
-                               caption({589, "Die Wechselzeit muss zwischen 0 und 65.535 Sekunden liegen."}));
+                               caption({589, "Die Wechselzeit muss zwischen 0 und 65,535 Sekunden liegen."}));
         return false;
     }
 }
@@ -104,12 +131,14 @@ void TmcTransmission::TMC_Sende_Timer_Timer() {
     const bool multi = optMultiMessage->isChecked();
     if (multi) TMC_List->setCurrentRow(m_sendPosition);
     const QListWidgetItem* message = TMC_List->currentItem();
-    sendAndStore(setting::kTrafficMessage,
-                 sentMessage(codeOfMessage(toBytes(message != nullptr ? message->text() : QString()))));
+    const std::string code = codeOfMessage(toBytes(message != nullptr ? message->text() : QString()));
+    sendAndStore(setting::kTrafficMessage, sentMessage(code));
+    TMC_Lauf->sent(code, TMC_List->currentRow() + 1, TMC_List->count());
     if (!multi) Stop_Timer_Click();
 }
 
 void TmcTransmission::Stop_Timer_Click() {
+    if (TMC_Sende_Timer->isEnabled()) TMC_Lauf->end();
     TMC_Sende_Timer->setEnabled(false);
     allowChanges(true);
 }

@@ -9,6 +9,7 @@
 
 namespace kdx {
 
+class RunLine;
 class TmcBuilder;
 
 /// Lower part of the TMC page: the list of messages and its transmission, one at a tick of `TMC_Sende_Timer`, each with
@@ -18,6 +19,10 @@ class TmcTransmission : public Page {
 public:
     /// @param builder composes the message that is added to the list.
     TmcTransmission(const PageContext& with, const TmcBuilder& builder, QWidget* parent);
+
+    void label() override;
+    /// The first time fills the list with the messages that were kept.
+    void load() override;
 
 private:
     void create();
@@ -32,12 +37,15 @@ private:
     void optMultiMessage_Click() { allowCycleTime(true); }
     void optSingleMessage_Click() { allowCycleTime(false); }
 
+    void keepMessages();
     [[nodiscard]] bool setInterval();
     void allowChanges(bool allowed);
     void allowCycleTime(bool allowed);
 
     const TmcBuilder& m_builder;
     int m_sendPosition = 0;
+    bool m_loaded = false;
+    bool m_lossTold = false;      ///< that the list cannot be kept
     bool m_otherVariant = false;  ///< which announcement comes next
 
     QListWidget* TMC_List = nullptr;
@@ -47,6 +55,7 @@ private:
     QLineEdit* txtCycleTime = nullptr;
     QPushButton *TMC_Senden_Taste = nullptr, *Stop_Timer = nullptr;
     Ticker* TMC_Sende_Timer = nullptr;
+    RunLine* TMC_Lauf = nullptr;
 };
 
 }  // namespace kdx

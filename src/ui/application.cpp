@@ -3,6 +3,8 @@
 #include "ui/controls.h"
 #include "ui/plaintext.h"
 
+#include <QAbstractSpinBox>
+#include <QComboBox>
 #include <QEvent>
 #include <QFont>
 #include <QStyleFactory>
@@ -43,6 +45,16 @@ Application::Application(int& argc, char** argv) : QApplication(argc, argv) {
     font.setFamilies(arialFamilies());
     font.setPointSizeF(8.25);
     setFont(font);
+    installEventFilter(this);
+}
+
+// The wheel scrolls what a combo box or number field stands on: one notch too many must not change what is on the air.
+bool Application::eventFilter(QObject* watched, QEvent* event) {
+    if (event->type() != QEvent::Wheel) return false;
+    if (qobject_cast<QComboBox*>(watched) == nullptr && qobject_cast<QAbstractSpinBox*>(watched) == nullptr)
+        return false;
+    event->ignore();
+    return true;
 }
 
 void Application::onFailure(std::function<void(const QString&, const QString&)> report) {

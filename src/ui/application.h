@@ -28,6 +28,7 @@ public:
 
 protected:
     bool event(QEvent* event) override;
+    bool eventFilter(QObject* watched, QEvent* event) override;
 
 private:
     void report(const QString& doing, const QString& error) const;

@@ -4,6 +4,8 @@
 #include <QLabel>
 #include <QMouseEvent>
 
+#include "ui/focusframe.h"
+
 namespace kdx {
 
 /// A label that can be clicked, double-clicked and, by the space or enter key, reached without the mouse.
@@ -34,6 +36,10 @@ protected:
         } else {
             QLabel::keyPressEvent(event);
         }
+    }
+    void paintEvent(QPaintEvent* event) override {
+        QLabel::paintEvent(event);
+        paintFocus(*this);
     }
     void focusInEvent(QFocusEvent* event) override {
         setFrameShadow(QFrame::Raised);

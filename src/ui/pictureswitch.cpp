@@ -3,11 +3,10 @@
 #include <QBuffer>
 #include <QImageReader>
 #include <QPainter>
-#include <QStyle>
-#include <QStyleOptionFocusRect>
 
 #include "settings/datafolder.h"
 #include "settings/profilefile.h"
+#include "ui/focusframe.h"
 
 #include <algorithm>
 #include <filesystem>
@@ -92,11 +91,8 @@ void PictureSwitch::paintEvent(QPaintEvent* /*event*/) {
     } else {
         painter.drawPixmap(place, m_picture);
     }
-    if (hasFocus()) {
-        QStyleOptionFocusRect option;
-        option.initFrom(this);
-        style()->drawPrimitive(QStyle::PE_FrameFocusRect, &option, &painter, this);
-    }
+    painter.end();
+    paintFocus(*this);
 }
 
 }  // namespace kdx

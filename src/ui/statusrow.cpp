@@ -2,6 +2,8 @@
 
 #include <QGridLayout>
 
+#include <algorithm>
+
 #include "settings/captions.h"
 #include "ui/controls.h"
 #include "ui/named.h"
@@ -49,6 +51,8 @@ StatusRow::StatusRow(QWidget* parent) : QWidget(parent) {
         Status[pair.value] = element<QLabel>("Status", pair.value, QString::fromUtf8(pair.design), this);
         Status[pair.value]->setAccessibleName(QString::fromUtf8(pair.caption));
         addPair(column, Status[pair.heading], Status[pair.value], pair.widest);
+        showState(*Status[pair.value], ValueState::Unsent, {});
+        Status[pair.value]->setProperty("zustand", QString());  // a caption is no value
         column += 2;
     }
 }
@@ -61,7 +65,9 @@ void StatusRow::addPair(int column, QLabel* heading, QLabel* value, int widest) 
     value->setFrameStyle(QFrame::Panel | QFrame::Sunken);
     value->setAutoFillBackground(true);
     const QString sample(widest, widest > 8 ? QLatin1Char('e') : QLatin1Char('0'));
-    value->setMinimumWidth(value->fontMetrics().horizontalAdvance(sample) + 6);
+    // The design caption, too, fits its field: it stands there until the first session.
+    const QFontMetrics letters = value->fontMetrics();
+    value->setMinimumWidth(std::max(letters.horizontalAdvance(sample), letters.horizontalAdvance(value->text())) + 6);
     value->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Fixed);
     auto* grid = static_cast<QGridLayout*>(layout());
     grid->addWidget(heading, 0, column);
@@ -84,13 +90,14 @@ void StatusRow::label(const Captions& captions) {
     Status[15]->setText(toText(captions.text(222)));
 }
 
-void StatusRow::show(StatusSlot slot, const QString& text) {
+void StatusRow::show(StatusSlot slot, const QString& text, const Judgement& judgement) {
     at(slot)->setText(text);
     at(slot)->setToolTip(text);
+    showState(*at(slot), judgement.state, judgement.tip);
 }
 
-void StatusRow::show(StatusSlot slot, std::string_view bytes) {
-    show(slot, toText(bytes));
+void StatusRow::show(StatusSlot slot, std::string_view bytes, const Judgement& judgement) {
+    show(slot, toText(bytes), judgement);
 }
 
 QString StatusRow::text(StatusSlot slot) const {

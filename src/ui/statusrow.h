@@ -6,6 +6,8 @@
 #include <array>
 #include <string_view>
 
+#include "ui/valuestate.h"
+
 namespace kdx {
 
 class Captions;
@@ -42,8 +44,9 @@ public:
     void label(const Captions& captions);
 
     using QWidget::show;
-    void show(StatusSlot slot, const QString& text);
-    void show(StatusSlot slot, std::string_view bytes);
+    /// Shows a value; one that is not said to be otherwise is in force.
+    void show(StatusSlot slot, const QString& text, const Judgement& judgement = {});
+    void show(StatusSlot slot, std::string_view bytes, const Judgement& judgement = {});
     /// What the indicator reads: other handlers decide by it.
     [[nodiscard]] QString text(StatusSlot slot) const;
     /// Light green while an announcement runs, else the look of a button face.

@@ -43,6 +43,37 @@ TEST_F(EonPageTest, SendingThePiFirstDeletesTheOneTheCoderReports) {
     EXPECT_THAT(sent(), ElementsAre(query, direct("EON-DEL=D3C2"), direct("EON-PI=D3C4")));
 }
 
+TEST_F(EonPageTest, TheReturnKeySendsTheEntryItIsPressedIn) {
+    load();
+    visa.answersTo[query] = "\" D3C2,\"\n";
+    press("EON_PI_Text", Qt::Key_Return);
+    type("EON_PS_Text", "RADIO 2");
+    press("EON_PS_Text", Qt::Key_Return);
+    EXPECT_THAT(sent(),
+                ElementsAre(query, direct("EON-DEL=D3C2"), direct("EON-PI=D3C2"), direct("EON-PS=D3C2,RADIO 2 ")));
+}
+
+TEST_F(EonPageTest, AnEntryTellsWhetherTheCoderHasIt) {
+    load();
+    const auto stateOf = [this](const char* name) { return find(name)->property("zustand").toString().toStdString(); };
+    EXPECT_EQ(stateOf("EON_PI_Text"), "ungesendet");
+    visa.answersTo[query] = "\" D3C2,\"\n";
+    click("EON_PI_Taste");
+    EXPECT_EQ(stateOf("EON_PI_Text"), "");
+    click("EON_PS_Taste");
+    EXPECT_EQ(stateOf("EON_PS_Text"), "");
+    type("EON_PS_Text", "A^B");
+    EXPECT_EQ(stateOf("EON_PS_Text"), "ungesendet");
+    click("EON_PS_Taste");
+    EXPECT_EQ(stateOf("EON_PS_Text"), "abgelehnt");
+    type("EON_PI_Text", "D3");
+    page->stepGoesOut(parameter("EON_PI", "D3"));
+    EXPECT_EQ(stateOf("EON_PI_Text"), "abgelehnt");
+    EXPECT_EQ(stateOf("EON_PS_Text"), "ungesendet") << "the new network has no name yet";
+    page->stepGoesOut(parameter("EON_PS", "A^B"));
+    EXPECT_EQ(stateOf("EON_PS_Text"), "abgelehnt");
+}
+
 TEST_F(EonPageTest, SendingThePiDeletesItEvenWhenTheCoderHoldsTheSame) {
     load();
     visa.answersTo[query] = "\" D3C2,\"\n";

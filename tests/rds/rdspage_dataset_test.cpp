@@ -69,9 +69,10 @@ TEST_F(StoredDataSet, IndicatorsFollowTheFlagsThatGoOut) {
     page.stepGoesOut({.key = "TP", .value = "1"});
     EXPECT_EQ(status(StatusSlot::Tp), "ein");
     EXPECT_TRUE(enabled("TA_Check"));
-    page.stepGoesOut({.key = "PS", .value = "OTHER"});  // shows nothing
-    EXPECT_EQ(status(StatusSlot::Ps), "ABCDEFGH");
-    EXPECT_EQ(sent(), Lines{});  // sending is for whoever runs the sequence
+    page.stepGoesOut({.key = "PS", .value = "OTHER"});
+    EXPECT_EQ(status(StatusSlot::Ps), "OTHER");
+    EXPECT_EQ(text("PS_T"), "ABCDEFGHIJ");  // what was typed stays
+    EXPECT_EQ(sent(), Lines{});             // sending is for whoever runs the sequence
 }
 
 TEST_F(StoredDataSet, SwitchesTheClockOnOnceHoweverOftenItIsLoaded) {

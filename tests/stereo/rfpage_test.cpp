@@ -63,6 +63,39 @@ TEST_F(RfPageTest, ShowsDashesAndTheOutputOffAtFirst) {
     EXPECT_EQ(find<QGroupBox>("RF_Level_Frame")->title(), toText(captions.text(218)));
 }
 
+TEST_F(RfPageTest, TheArrowKeysStepTheValueThatIsShown) {
+    sendSequence();
+    sent();
+    press("Input_HF_Freq_Label", Qt::Key_Up);
+    press("Input_HF_Pegel_Label", Qt::Key_Down);
+    press("Input_AF_Freq_Label", Qt::Key_Right);
+    EXPECT_EQ(sent(), (Lines{"FREQ 98.6MHZ", ":POW 79DBUV", ":STEREO:AUDIO:FREQ 1.1KHZ"}));
+    EXPECT_EQ(text("Input_HF_Freq_Label"), "98.6");
+    EXPECT_EQ(status(StatusSlot::RfLevel), "79");
+    EXPECT_EQ(profile(kSet1, "VRN", "HF_Frequenz"), "98.5");  // entered values are not kept
+    for (const auto& [name, key] : {std::pair{"Input_HF_Freq_Label", Qt::Key_Left},
+                                    {"Input_HF_Pegel_Label", Qt::Key_Up},
+                                    {"Input_AF_Freq_Label", Qt::Key_Up}}) {
+        QKeyEvent event(QEvent::KeyPress, key, Qt::ShiftModifier);
+        QApplication::sendEvent(find(name), &event);
+    }
+    EXPECT_EQ(sent(), (Lines{"FREQ 97.6MHZ", ":POW 89DBUV", ":STEREO:AUDIO:FREQ 2.1KHZ"}));
+}
+
+TEST_F(RfPageTest, AStepStaysWithinTheLimitsAndStartsFromWhatIsKept) {
+    press("Input_HF_Freq_Label", Qt::Key_Up);  // nothing was sent yet
+    EXPECT_EQ(sent(), Lines{"FREQ 98.6MHZ"});
+    setProfile(kSet1, "VRN", "FM_Olim", "98.7");
+    press("Input_HF_Freq_Label", Qt::Key_Up);
+    EXPECT_EQ(sent(), Lines{});
+    EXPECT_EQ(text("Input_HF_Freq_Label"), "98.6");
+    setProfile(kSet1, "VRN", "FM_Olim", "110");
+    state.corrections.rfValues = true;  // then they are kept
+    press("Input_HF_Freq_Label", Qt::Key_Up);
+    EXPECT_EQ(sent(), Lines{"FREQ 98.7MHZ"});
+    EXPECT_EQ(profile(kSet1, "VRN", "HF_Frequenz"), "98.7");
+}
+
 TEST_F(RfPageTest, AFrequencyIsAskedForShownAndSent) {
     answer({"101.2"});
     clickLabel("Input_HF_Freq_Label");

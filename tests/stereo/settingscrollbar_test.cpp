@@ -53,6 +53,15 @@ protected:
         mouse(QEvent::MouseButtonRelease, where);
     }
 
+    /// Turns the wheel over the bar by a notch. False when the bar passes it on.
+    bool wheel(int notch) {
+        const QPoint middle = bar->rect().center();
+        QWheelEvent event(middle, bar->mapToGlobal(middle), {}, {0, notch}, Qt::NoButton, Qt::NoModifier,
+                          Qt::NoScrollPhase, false);
+        QApplication::sendEvent(bar, &event);
+        return event.isAccepted();
+    }
+
     QScrollBar* bar = nullptr;
 };
 
@@ -118,16 +127,47 @@ TEST_F(SettingScrollBarTest, EachKeyIsOneCommand) {
     EXPECT_NE(bar->focusPolicy() & Qt::TabFocus, 0);
 }
 
-TEST_F(SettingScrollBarTest, EachNotchOfTheWheelIsOneCommand) {
-    const QPoint middle = bar->rect().center();
+TEST_F(SettingScrollBarTest, EachNotchOfTheWheelOverAClickedBarIsOneCommand) {
+    clickPart(QStyle::SC_ScrollBarAddLine);
+    sent();
     for (const int notch : {120, -120, -120}) {
         const int before = bar->value();
-        QWheelEvent event(middle, bar->mapToGlobal(middle), {}, {0, notch}, Qt::NoButton, Qt::NoModifier,
-                          Qt::NoScrollPhase, false);
-        QApplication::sendEvent(bar, &event);
+        EXPECT_TRUE(wheel(notch));
         EXPECT_EQ(std::abs(bar->value() - before), 10);
         EXPECT_EQ(sent(), Lines{":STEREO:DEVIATION " + std::to_string(bar->value() * 10) + "HZ"});
     }
+}
+
+TEST_F(SettingScrollBarTest, TheWheelPassesABarThatNobodyClicked) {
+    EXPECT_FALSE(wheel(120));
+    root().activateWindow();
+    QApplication::processEvents();
+    bar->setFocus(Qt::TabFocusReason);
+    EXPECT_FALSE(wheel(-120));
+    EXPECT_EQ(bar->value(), 4000);
+    clickPart(QStyle::SC_ScrollBarAddLine);
+    EXPECT_TRUE(wheel(120));
+    find("Pilot_Hub_Scroll")->setFocus(Qt::TabFocusReason);  // another control is worked with
+    sent();
+    EXPECT_FALSE(wheel(120));
+    EXPECT_TRUE(sent().empty());
+}
+
+TEST_F(SettingScrollBarTest, ADragSnapsToTheSmallStep) {
+    const QPoint start = at(QStyle::SC_ScrollBarSlider);
+    std::vector<int> followed;
+    QObject::connect(bar, &QScrollBar::sliderMoved, &page, [&](int position) { followed.push_back(position); });
+    mouse(QEvent::MouseButtonPress, start);
+    for (int pixels = 1; pixels <= 30; ++pixels) mouse(QEvent::MouseMove, start + QPoint(pixels, 0));
+    EXPECT_FALSE(followed.empty());
+    for (const int position : followed) EXPECT_EQ(position % 10, 0);
+    mouse(QEvent::MouseButtonRelease, start + QPoint(30, 0));
+    EXPECT_EQ(bar->value() % 10, 0);
+    EXPECT_EQ(sent(), Lines{":STEREO:DEVIATION " + std::to_string(bar->value() * 10) + "HZ"});
+    mouse(QEvent::MouseButtonPress, at(QStyle::SC_ScrollBarSlider));
+    mouse(QEvent::MouseMove, QPoint(bar->width() - 1, bar->height() / 2));
+    mouse(QEvent::MouseButtonRelease, QPoint(bar->width() - 1, bar->height() / 2));
+    EXPECT_EQ(bar->value(), bar->maximum());
 }
 
 // The arrow is still held when its step fails: without care every repetition would open one more box.

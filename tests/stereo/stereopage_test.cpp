@@ -301,16 +301,19 @@ TEST_F(StereoPageTest, NoLanguageTakesTheMnemonicsOfTheTestMode) {
 
 TEST_F(StereoPageTest, TheTabKeyFollowsTheColumns) {
     Lines order;
-    for (const QWidget* at = find("FM_Hub_Scroll");;) {
-        if ((at->focusPolicy() & Qt::TabFocus) != 0 && !at->objectName().startsWith(QStringLiteral("RDS_Phase"))) {
+    for (const QWidget* at = find("FM_Hub_Zahl");;) {
+        const bool reached = (at->focusPolicy() & Qt::TabFocus) != 0 && at->focusProxy() == nullptr &&
+                             at->objectName() != QStringLiteral("qt_spinbox_lineedit");
+        if (reached && !at->objectName().startsWith(QStringLiteral("RDS_Phase"))) {
             const std::string name = at->objectName().toStdString();
             if (qobject_cast<const QRadioButton*>(at) == nullptr) order.push_back(name);
         }
         at = at->nextInFocusChain();
-        if (at == find("FM_Hub_Scroll")) break;
+        if (at == find("FM_Hub_Zahl")) break;
     }
-    EXPECT_EQ(order, (Lines{"FM_Hub_Scroll", "Pilot_OnOff", "Pilot_Hub_Scroll", "HScroll1", "RDS_OnOff",
-                            "RDS_Hub_Scroll", "Ari_OnOff", "Ari_hub_Scroll", "Taste_DATA_MODE", "Btn_SetRdsStereo"}));
+    EXPECT_EQ(order, (Lines{"FM_Hub_Zahl", "FM_Hub_Scroll", "Pilot_OnOff", "Pilot_Hub_Zahl", "Pilot_Hub_Scroll",
+                            "HScroll1_Zahl", "HScroll1", "RDS_OnOff", "RDS_Hub_Zahl", "RDS_Hub_Scroll", "Ari_OnOff",
+                            "Ari_hub_Zahl", "Ari_hub_Scroll", "Taste_DATA_MODE", "Btn_SetRdsStereo"}));
 }
 
 }  // namespace

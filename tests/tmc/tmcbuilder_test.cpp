@@ -11,6 +11,23 @@ using TmcBuilderTest = TmcPageTest;
 constexpr std::array kBitLabels = {"TMCBL3_T", "TMCBL3_F",      "TMCBL3_DP",    "TMCBL3_D",
                                    "TMCBL3_U", "TMCBL3_Extent", "TMCBL3_Event", "TMCBL3_Local"};
 
+TEST_F(TmcBuilderTest, TheCodeIsMarkedWhileAFieldIsNotChosen) {
+    const auto tip = [this] { return find("TMC_Gr8_Label")->toolTip().toStdString(); };
+    EXPECT_EQ(tip(), "Noch nicht gew\u00E4hlt: T, F, DP, D, U, Extent, Event, Location");
+    EXPECT_EQ(find("TMC_Gr8_Label")->property("zustand").toString().toStdString(), "abgelehnt");
+    click("TMC_Div");
+    EXPECT_EQ(tip(), "Noch nicht gew\u00E4hlt: T, F, DP, U, Extent, Event, Location");
+    composeMessage();
+    EXPECT_EQ(tip(), "");
+    EXPECT_EQ(find("TMC_Gr8_Label")->property("zustand").toString().toStdString(), "");
+}
+
+TEST_F(TmcBuilderTest, FieldsThatCountAsZeroAreNotMissed) {
+    state.corrections.trafficFields = true;
+    click("TMC_Div");
+    EXPECT_EQ(find("TMC_Gr8_Label")->toolTip(), QString());
+}
+
 TEST_F(TmcBuilderTest, NothingIsComposedAtTheStart) {
     for (const char* label : kBitLabels) EXPECT_EQ(text(label), "-") << label;
     EXPECT_EQ(find<QComboBox>("TMC_Event_Combo")->currentIndex(), -1);

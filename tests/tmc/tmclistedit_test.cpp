@@ -47,6 +47,51 @@ protected:
     std::unique_ptr<TMC_Listedit> editor;
 };
 
+TEST_F(TmcListeditTest, AnEntryCanBeChanged) {
+    EXPECT_FALSE(enabled("Eintrag_Aendern"));
+    find<QListView>("List1")->setCurrentIndex(find<QListView>("List1")->model()->index(0, 0));
+    dialogs.inputs = {QStringLiteral("Stau, lang"), QStringLiteral("00102")};
+    click("Eintrag_Aendern");
+    EXPECT_EQ(dialogs.shown.at(0).preset, QStringLiteral("Stau"));
+    EXPECT_EQ(dialogs.shown.at(1).preset, QStringLiteral("00101"));
+    EXPECT_EQ(folder.read("Event.txt"), "Stau, lang;00102\r\nUnfall;00201\r\n");
+    EXPECT_EQ(entries("List1"), (Lines{entry("Stau, lang", "00102"), entry("Unfall", "00201")}));
+    dialogs.inputs = {QString()};  // cancelled
+    click("Eintrag_Aendern");
+    dialogs.inputs = {QStringLiteral("x"), QString()};
+    click("Eintrag_Aendern");
+    EXPECT_EQ(folder.read("Event.txt"), "Stau, lang;00102\r\nUnfall;00201\r\n");
+}
+
+TEST_F(TmcListeditTest, AnEntryCanBeDeletedAfterAQuestion) {
+    auto* events = find<QListView>("List1");
+    auto* locations = find<QListView>("List2");
+    events->setCurrentIndex(events->model()->index(1, 0));
+    dialogs.confirmations = {false, true};
+    click("Eintrag_Loeschen");
+    EXPECT_EQ(folder.read("Event.txt"), "Stau;00101\r\nUnfall;00201\r\n");
+    click("Eintrag_Loeschen");
+    EXPECT_EQ(folder.read("Event.txt"), "Stau;00101\r\n");
+    EXPECT_EQ(entries("List1"), Lines{entry("Stau", "00101")});
+    locations->setCurrentIndex(locations->model()->index(0, 0));
+    EXPECT_FALSE(events->selectionModel()->hasSelection()) << "the buttons mean one entry";
+    dialogs.confirmations = {true};
+    click("Eintrag_Loeschen");
+    EXPECT_EQ(folder.read("Location.txt"), "");
+    EXPECT_FALSE(enabled("Eintrag_Loeschen"));
+}
+
+TEST_F(TmcListeditTest, AnEntryThatAnotherProgramChangedIsNotTouched) {
+    auto* events = find<QListView>("List1");
+    events->setCurrentIndex(events->model()->index(0, 0));
+    folder.write("Event.txt", "Anders;00300\r\n");
+    dialogs.confirmations = {true};
+    dialogs.expectedMessages = 1;
+    click("Eintrag_Loeschen");
+    EXPECT_EQ(folder.read("Event.txt"), "Anders;00300\r\n");
+    EXPECT_EQ(entries("List1"), Lines{entry("Anders", "00300")});
+}
+
 TEST_F(TmcListeditTest, OpeningShowsBothLists) {
     EXPECT_EQ(entries("List1"), (Lines{entry("Stau", "00101"), entry("Unfall", "00201")}));
     EXPECT_EQ(entries("List2"), Lines{entry("Musterstadt", "12345")});

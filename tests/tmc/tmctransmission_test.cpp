@@ -1,3 +1,5 @@
+#include "base/clock.h"
+#include "support/listrows.h"
 #include "tmcpagetest.h"
 #include "ui/ticker.h"
 
@@ -56,6 +58,79 @@ TEST_F(TmcTransmissionTest, AnEntryWithLongTextsStillEndsInItsCode) {
     click("TMC_Gr8_apply");
     click("TMC_Senden_Taste");
     EXPECT_EQ(messagesSent(1), Lines{message("0810013039")});
+}
+
+TEST_F(TmcTransmissionTest, TheMessagesAreKeptOverARestart) {
+    addMessages(3);
+    list().setCurrentRow(1);
+    click("TMC_Gr8_Remove");
+    const Lines before = rowsOf(list());
+    page = std::make_unique<TmcPage>(context, nullptr);
+    page->label();
+    page->load();
+    EXPECT_EQ(rowsOf(list()), before);
+    EXPECT_EQ(before.size(), 2U);
+    page->load();  // another data set
+    EXPECT_EQ(rowsOf(list()), before);
+    EXPECT_EQ(folder.read("TMC_Liste.txt"), before[0] + "\r\n" + before[1] + "\r\n");
+}
+
+TEST_F(TmcTransmissionTest, WhatIsNoMessageInTheKeptListIsPassedOver) {
+    addMessages(1);
+    const Lines before = rowsOf(list());
+    folder.write("TMC_Liste.txt", "\r\nnonsense\r\n" + before[0] + "\n" + std::string(5000, 'x'));
+    page = std::make_unique<TmcPage>(context, nullptr);
+    page->load();
+    EXPECT_EQ(rowsOf(list()), before);
+}
+
+TEST_F(TmcTransmissionTest, AListThatCannotBeKeptIsToldOnce) {
+    std::filesystem::create_directory(folder.data() / "TMC_Liste.txt");
+    dialogs.expectedMessages = 1;
+    addMessages(2);
+    EXPECT_EQ(list().count(), 2);
+    EXPECT_EQ(dialogs.shown.at(0).text, QStringLiteral("TMC_Liste.txt kann nicht gespeichert werden."));
+}
+
+TEST_F(TmcTransmissionTest, ALineTellsWhatIsBeingSent) {
+    EXPECT_EQ(text("TMC_Lauf"), "Es wird nichts gesendet.");
+    addMessages(3);
+    type("txtCycleTime", "2.5");
+    click("optMultiMessage");
+    click("TMC_Senden_Taste");
+    const std::string since = timeText(clock);
+    EXPECT_EQ(text("TMC_Lauf"), "Sendet alle 2,5 s eine Meldung, seit " + since + ", bis zum Anhalten.");
+    messagesSent(1);
+    clock.advance(std::chrono::minutes(2));
+    messagesSent(1);
+    EXPECT_EQ(text("TMC_Lauf"),
+              "Sendet " + code(2) + " (3 von 3) alle 2,5 s, 2-mal seit " + since + ", bis zum Anhalten.");
+    useLanguage("english");
+    page->label();
+    EXPECT_EQ(text("TMC_Lauf"),
+              "Sends " + code(2) + " (3 of 3) every 2.5 s, 2 times since " + since + ", until stopped.");
+    click("Stop_Timer");
+    EXPECT_EQ(text("TMC_Lauf"), "Sent: 2 times from " + since + " to " + timeText(clock) + ", last " + code(2) + ".");
+}
+
+TEST_F(TmcTransmissionTest, TheLineSaysWhenNothingWillEverBeSent) {
+    addMessages(1);
+    click("optMultiMessage");
+    for (const char* never : {"0", "abc"}) {
+        type("txtCycleTime", never);
+        click("TMC_Senden_Taste");
+        EXPECT_FALSE(tick("TMC_Sende_Timer"));
+        EXPECT_EQ(text("TMC_Lauf"), "Wechselzeit 0: Es wird nichts gesendet, bis eine andere gilt.");
+    }
+}
+
+TEST_F(TmcTransmissionTest, ASingleMessageIsToldBeforeAndAfter) {
+    addMessages(1);
+    click("TMC_Senden_Taste");
+    EXPECT_EQ(text("TMC_Lauf"), "Sendet eine Meldung nach 1 s.");
+    messagesSent(1);
+    EXPECT_EQ(text("TMC_Lauf"),
+              "Gesendet: 1-mal von " + timeText(clock) + " bis " + timeText(clock) + ", zuletzt " + code(0) + ".");
 }
 
 TEST_F(TmcTransmissionTest, RemovingTakesTheSelectedEntry) {
@@ -266,7 +341,7 @@ TEST_F(TmcTransmissionTest, AChangeTimeOutsideTheTimersRangeIsToldAndStartsNothi
         click("TMC_Senden_Taste");
         ASSERT_EQ(dialogs.shown.size(), 1U) << time;
         EXPECT_EQ(dialogs.shown[0].title.toStdString(), "Wechselzeit");
-        EXPECT_EQ(dialogs.shown[0].text.toStdString(), "Die Wechselzeit muss zwischen 0 und 65.535 Sekunden liegen.");
+        EXPECT_EQ(dialogs.shown[0].text.toStdString(), "Die Wechselzeit muss zwischen 0 und 65,535 Sekunden liegen.");
         EXPECT_EQ(text("txtCycleTime"), time);
         EXPECT_FALSE(timer().isEnabled()) << time;
         EXPECT_TRUE(enabled("TMC_Gr8_apply")) << time;

@@ -52,6 +52,21 @@ TEST_F(StatusRowTest, TheAnnouncementTurnsLightGreenAndBack) {
     EXPECT_EQ(ta->palette().color(QPalette::Window), row.palette().color(QPalette::Button));
 }
 
+TEST_F(StatusRowTest, DesignCaptionsAreGreyAndFitTheirFields) {
+    row.resize(row.minimumSizeHint().width(), 40);
+    row.show();
+    const QColor grey = row.palette().color(QPalette::Disabled, QPalette::WindowText);
+    for (const std::size_t slot : {17, 13, 14, 2, 3, 10, 0, 1, 4}) {
+        const auto* value = row.findChild<QLabel*>(QStringLiteral("Status_%1").arg(slot));
+        EXPECT_EQ(value->palette().color(QPalette::WindowText), grey) << slot;
+        EXPECT_EQ(value->property("zustand").toString(), QString()) << slot;
+        EXPECT_GE(value->width(), value->minimumSizeHint().width()) << slot;
+    }
+    row.show(StatusSlot::Pi, std::string_view("D3C2"));
+    const auto* pi = row.findChild<QLabel*>(QStringLiteral("Status_2"));
+    EXPECT_EQ(pi->palette().color(QPalette::WindowText), row.palette().color(QPalette::WindowText));
+}
+
 TEST_F(StatusRowTest, UsesArial) {
     for (const QLabel* label : row.findChildren<QLabel*>(QRegularExpression(QStringLiteral("^Status_")))) {
         EXPECT_EQ(label->font().families().front(), QStringLiteral("Arial"));

@@ -1,0 +1,79 @@
+#include "stereo/numberfield.h"
+
+#include <QLineEdit>
+
+#include <cmath>
+
+#include "ui/caption.h"
+#include "ui/valuestate.h"
+
+namespace kdx {
+
+namespace {
+
+/// A line among labels, no larger than its widest number: the columns have no room to spare.
+void keepSmall(QAbstractSpinBox* field, const QString& widest) {
+    constexpr int kFrame = 10;
+    field->setFixedSize(field->fontMetrics().horizontalAdvance(widest) + kFrame, field->fontMetrics().height() + 4);
+}
+
+constexpr double kPerKilohertz = 100;  // tens of hertz
+
+void prepare(const PageContext& with, QAbstractSpinBox* field) {
+    field->setLocale(QLocale::c());                        // a point, as everywhere in the window
+    field->setButtonSymbols(QAbstractSpinBox::NoButtons);  // the bar has its own
+    field->setAlignment(Qt::AlignRight);
+    auto* entry = field->findChild<QLineEdit*>();
+    QObject::connect(entry, &QLineEdit::textEdited, field, [&with = with.captions, field] {
+        showState(*field, ValueState::Unsent, captionText(with, {857, "Noch nicht gesendet."}));
+    });
+    QObject::connect(field, &QAbstractSpinBox::editingFinished, field,
+                     [field] { showState(*field, ValueState::InForce, {}); });
+}
+
+}  // namespace
+
+KilohertzField::KilohertzField(QWidget* parent) : QDoubleSpinBox(parent) {
+    setDecimals(2);
+    setKeyboardTracking(false);  // one command a number, not one a key
+    setSuffix(QStringLiteral(" kHz"));
+}
+
+QValidator::State KilohertzField::validate(QString& text, int& at) const {
+    text.replace(QLatin1Char(','), QLatin1Char('.'));
+    return QDoubleSpinBox::validate(text, at);
+}
+
+void tie(const PageContext& with, KilohertzField* field, SettingScrollBar* bar) {
+    prepare(with, field);
+    field->setRange(bar->minimum() / kPerKilohertz, bar->maximum() / kPerKilohertz);
+    field->setSingleStep(bar->singleStep() / kPerKilohertz);
+    keepSmall(field, QString::number(field->maximum(), 'f', field->decimals()) + field->suffix());
+    QObject::connect(field, &QDoubleSpinBox::valueChanged, bar, [bar](double kilohertz) {
+        bar->setValue(static_cast<int>(std::lround(kilohertz * kPerKilohertz)));
+    });
+}
+
+void tie(const PageContext& with, QSpinBox* field, SettingScrollBar* bar) {
+    prepare(with, field);
+    field->setKeyboardTracking(false);
+    field->setSuffix(QStringLiteral(" °"));
+    field->setRange(bar->minimum(), bar->maximum());
+    field->setSingleStep(bar->singleStep());
+    keepSmall(field, QString::number(field->minimum()) + field->suffix());
+    QObject::connect(field, &QSpinBox::valueChanged, bar, &QScrollBar::setValue);
+}
+
+void showQuietly(KilohertzField* field, int tensOfHertz) {
+    const QSignalBlocker quiet(field);
+    field->setValue(tensOfHertz / kPerKilohertz);
+    showState(*field, ValueState::InForce, {});
+}
+
+void showQuietly(QSpinBox* field, int degrees) {
+    const QSignalBlocker quiet(field);
+    field->setValue(degrees);
+    showState(*field, ValueState::InForce, {});
+}
+
+}  // namespace kdx

@@ -1,0 +1,18 @@
+#pragma once
+
+#include <filesystem>
+#include <string>
+#include <vector>
+
+namespace kdx {
+
+/// File of the data folder that keeps the message list.
+inline constexpr const char* kMessageFile = "TMC_Liste.txt";
+
+/// The entries of the file, a line each; lines that are none are passed over, and so is a missing file.
+[[nodiscard]] std::vector<std::string> loadMessages(const std::filesystem::path& file);
+
+/// Puts the entries in the file's place. False when it cannot be written; it is then as it was.
+[[nodiscard]] bool storeMessages(const std::filesystem::path& file, const std::vector<std::string>& entries);
+
+}  // namespace kdx

@@ -1,0 +1,72 @@
+#include "ui/sententry.h"
+
+#include <QPainter>
+
+#include "base/numbers.h"
+#include "coder/fieldsizes.h"
+#include "link/instrument.h"
+#include "settings/programstate.h"
+#include "settings/withoutcontrols.h"
+#include "ui/caption.h"
+#include "ui/text.h"
+
+namespace kdx {
+
+SentEntry::SentEntry(const PageContext& with, const char* key, QWidget* parent)
+    : QLineEdit(parent), m_with(with), m_key(key) {
+    connect(this, &QLineEdit::textChanged, this, &SentEntry::refresh);
+}
+
+void SentEntry::wentOut(std::string_view value) {
+    if (!m_with.state.InstrumentOnline || m_with.instrument.isSequenceStopped()) return;
+    m_inForce = sentForm(value);
+    refresh();
+}
+
+void SentEntry::forget() {
+    m_inForce.reset();
+    refresh();
+}
+
+void SentEntry::refresh() {
+    const Judgement judgement = judge(text());
+    showState(*this, judgement.state, judgement.tip);
+}
+
+QString SentEntry::toShown(std::string_view value) {
+    return toText(value);
+}
+
+Judgement SentEntry::judge(const QString& entry) const {
+    const std::string form = sentForm(toBytes(entry));
+    // Of nothing there is nothing to be sent.
+    if (m_inForce ? form != *m_inForce : !entry.isEmpty())
+        return {ValueState::Unsent, captionText(m_with.captions, {857, "Noch nicht gesendet."})};
+    const QString why = m_inForce ? whyRefused(m_with, m_key, entry) : QString();
+    return {why.isEmpty() ? ValueState::InForce : ValueState::Refused, why};
+}
+
+std::string SentEntry::sentForm(std::string_view value) const {
+    const std::string_view key = m_key;
+    const std::string plain = withoutControls(value);
+    if (key == "PS" || key == "EON_PS") return padRight(plain, kPsLength);
+    if (key == "PI" || key == "EON_PI") return padRight(plain, kPiLength);
+    return plain;
+}
+
+void SentEntry::paintEvent(QPaintEvent* event) {
+    QLineEdit::paintEvent(event);
+    if (!isEnabled() || judge(text()).state != ValueState::Unsent) return;
+    constexpr int kSide = 6;
+    const QString note = captionText(m_with.captions, {856, "noch nicht gesendet"});
+    const int free = width() - fontMetrics().horizontalAdvance(text()) - 3 * kSide;
+    if (fontMetrics().horizontalAdvance(note) > free) return;  // the colour and the tip tell it still
+    QPainter painter(this);
+    QFont slanted = font();
+    slanted.setItalic(true);
+    painter.setFont(slanted);
+    painter.setPen(QColor(0x80, 0x60, 0));
+    painter.drawText(rect().adjusted(kSide, 0, -kSide, 0), Qt::AlignRight | Qt::AlignVCenter, note);
+}
+
+}  // namespace kdx

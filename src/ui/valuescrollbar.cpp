@@ -1,0 +1,68 @@
+#include "ui/valuescrollbar.h"
+
+#include <QApplication>
+#include <QFocusEvent>
+#include <QSignalBlocker>
+#include <QWheelEvent>
+
+#include "ui/focusframe.h"
+
+namespace kdx {
+
+ValueScrollBar::ValueScrollBar(QWidget* parent) : QScrollBar(Qt::Horizontal, parent) {
+    setTracking(false);
+    setFocusPolicy(Qt::StrongFocus);
+}
+
+void ValueScrollBar::mousePressEvent(QMouseEvent* event) {
+    m_clicked = true;
+    QScrollBar::mousePressEvent(event);
+}
+
+void ValueScrollBar::mouseMoveEvent(QMouseEvent* event) {
+    if (!isSliderDown()) return QScrollBar::mouseMoveEvent(event);
+    const int before = sliderPosition();
+    int dragged = before;
+    {
+        const QSignalBlocker quiet(this);  // the places between two steps are nobody's concern
+        QScrollBar::mouseMoveEvent(event);
+        dragged = sliderPosition();
+        setSliderPosition(before);
+    }
+    setSliderPosition(onStep(dragged));
+}
+
+int ValueScrollBar::onStep(int position) const {
+    if (position == maximum()) return position;
+    const int step = singleStep();
+    return minimum() + (position - minimum() + step / 2) / step * step;
+}
+
+void ValueScrollBar::wheelEvent(QWheelEvent* event) {
+    if (m_clicked) return QScrollBar::wheelEvent(event);
+    event->ignore();
+}
+
+void ValueScrollBar::focusInEvent(QFocusEvent* event) {
+    if (event->reason() == Qt::MouseFocusReason) m_clicked = true;
+    QScrollBar::focusInEvent(event);
+    update();
+}
+
+void ValueScrollBar::focusOutEvent(QFocusEvent* event) {
+    m_clicked = false;
+    QScrollBar::focusOutEvent(event);
+    update();
+}
+
+void ValueScrollBar::paintEvent(QPaintEvent* event) {
+    QScrollBar::paintEvent(event);
+    paintFocus(*this);
+}
+
+void ValueScrollBar::timerEvent(QTimerEvent* event) {
+    if (QApplication::activeModalWidget() != nullptr) setRepeatAction(SliderNoAction);
+    QScrollBar::timerEvent(event);
+}
+
+}  // namespace kdx

@@ -1,0 +1,112 @@
+#include "ui/valuestate.h"
+
+#include <QLabel>
+#include <QPalette>
+#include <QVariant>
+#include <QWidget>
+
+#include <string_view>
+
+#include "coder/fieldsizes.h"
+#include "coder/keyfacts.h"
+#include "coder/rdscharacters.h"
+#include "settings/programstate.h"
+#include "ui/caption.h"
+#include "ui/pagecontext.h"
+#include "ui/text.h"
+
+namespace kdx {
+
+namespace {
+
+// What the tip was made of: whoever captions the control anew replaces the tip, and that is its own from then on.
+constexpr const char* kOwnTip = "ownTip";
+constexpr const char* kShownTip = "shownTip";
+
+const char* nameOf(ValueState state) {
+    switch (state) {
+        case ValueState::Unsent:
+            return "ungesendet";
+        case ValueState::Refused:
+            return "abgelehnt";
+        case ValueState::InForce:
+            break;
+    }
+    return "";
+}
+
+/// Text and ground together, so that they go with each other whatever the theme. Controls that cannot be used keep the
+/// look of those.
+void colour(QWidget& control, ValueState state) {
+    QPalette palette;
+    palette.setResolveMask(0);  // nothing of its own: what it has from its parents
+    const bool label = qobject_cast<QLabel*>(&control) != nullptr;
+    if (state == ValueState::Unsent && label) {
+        const QColor grey = palette.color(QPalette::Disabled, QPalette::WindowText);
+        palette.setColor(QPalette::WindowText, grey);
+    } else if (state != ValueState::InForce) {
+        const bool refused = state == ValueState::Refused;
+        const QColor letters = refused ? QColor(0xB0, 0, 0x10) : QColor(Qt::black);
+        const QColor ground = refused ? QColor(0xFF, 0xE4, 0xE1) : QColor(0xFF, 0xF8, 0xD0);
+        for (const auto group : {QPalette::Active, QPalette::Inactive}) {
+            palette.setColor(group, label ? QPalette::WindowText : QPalette::Text, letters);
+            palette.setColor(group, label ? QPalette::Window : QPalette::Base, ground);
+        }
+    }
+    control.setPalette(palette);
+}
+
+void showTip(QWidget& control, const QString& tip) {
+    QString own = control.toolTip();
+    if (own == control.property(kShownTip).toString()) own = control.property(kOwnTip).toString();
+    const QString shown = tip.isEmpty() || own.isEmpty() ? tip + own : tip + QLatin1Char('\n') + own;
+    control.setProperty(kOwnTip, own);
+    control.setProperty(kShownTip, shown);
+    control.setToolTip(shown);
+    control.setAccessibleDescription(tip);
+}
+
+bool isCarriedText(std::string_view key) {
+    return key == "PS" || key == "EON_PS" || key == "RT";
+}
+
+}  // namespace
+
+void showState(QWidget& control, ValueState state, const QString& tip) {
+    showTip(control, tip);
+    control.setProperty("zustand", QString::fromLatin1(nameOf(state)));
+    colour(control, state);
+    control.update();
+}
+
+void showWarning(QWidget& control, const QString& tip) {
+    showState(control, tip.isEmpty() ? ValueState::InForce : ValueState::Refused, tip);
+}
+
+QString whyRefused(const PageContext& with, const char* key, const QString& entry) {
+    const auto say = [&](const Caption& caption) { return captionText(with.captions, caption); };
+    const std::string_view name = key;
+    const std::string bytes = toBytes(entry);
+    if (isCarriedText(name)) {
+        const QString kept = toText(bytes);  // what the code page lacks has become a question mark
+        for (qsizetype at = 0; at < entry.size() && at < kept.size(); ++at) {
+            if (kept[at] != entry[at]) return say({852, "RDS kennt das Zeichen %1 nicht."}).arg(entry[at]);
+        }
+    }
+    const Corrections& corrections = with.state.corrections;
+    if (!wrongValue(name, bytes, corrections)) return {};
+    if (name == "PI" || name == "EON_PI") return say({850, "Die PI muss aus vier hexadezimalen Ziffern bestehen."});
+    if (isCarriedText(name)) {
+        if (!corrections.quotes && entry.contains(QLatin1Char('"')))
+            return say({851, "Ein Anführungszeichen beendet den Text für den Coder."});
+        if (const auto missing = withoutRdsCode(bytes))
+            return say({852, "RDS kennt das Zeichen %1 nicht."}).arg(toText({&*missing, 1}));
+        return say({853, "Höchstens %1 Zeichen."}).arg(name == "RT" ? kRadiotextLength : kPsLength);
+    }
+    const KeyFacts* const facts = factsOf(name);
+    if (facts != nullptr && facts->isNumber && entry.contains(QLatin1Char(',')))
+        return say({854, "Der Coder nimmt nur einen Punkt, kein Komma."});
+    return say({855, "Der Coder nimmt diesen Wert nicht an."});
+}
+
+}  // namespace kdx

@@ -1,0 +1,35 @@
+#pragma once
+
+#include <QString>
+
+#include <string>
+
+class QWidget;
+
+namespace kdx {
+
+struct PageContext;
+
+/// Whether a value that is shown is the one that the instrument has.
+enum class ValueState {
+    InForce,
+    Unsent,   ///< typed or loaded, and not sent since
+    Refused,  ///< sent, but the coder does not take it
+};
+
+/// Shows the state by colours, in the control's tip before what that says of itself, and in its property "zustand".
+void showState(QWidget& control, ValueState state, const QString& tip);
+
+/// Shows by the looks of a refused value what is wrong with one before it is sent; with "" nothing is.
+void showWarning(QWidget& control, const QString& tip);
+
+/// Why the coder does not take the entry for the key, in the current language; "" when it does.
+[[nodiscard]] QString whyRefused(const PageContext& with, const char* key, const QString& entry);
+
+/// A value with what is to be said about it.
+struct Judgement {
+    ValueState state = ValueState::InForce;
+    QString tip = {};
+};
+
+}  // namespace kdx
