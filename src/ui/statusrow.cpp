@@ -18,14 +18,15 @@ struct Pair {
     const char* caption;
     std::size_t value;
     const char* design;
-    int widest;  ///< characters of the widest value: its share of the row
+    int widest;         ///< characters of the widest value: its share of the row
+    char letter = '0';  ///< one as wide as those of the value
 };
 
 // From left to right on the screen.
 constexpr std::array kPairs = {
     Pair{16, "RF [MHz]", 17, "--", 8}, Pair{12, "RF [dBµV]", 13, "--", 6}, Pair{15, "AF [kHz]", 14, "--", 6},
-    Pair{7, "PI", 2, "Label1", 4},     Pair{6, "PS", 3, "Label1", 8},      Pair{11, "TP", 10, "Label1", 3},
-    Pair{9, "TA", 0, "TA", 3},         Pair{8, "M / S", 1, "Label1", 7},   Pair{5, "PTY", 4, "Label1", 16},
+    Pair{7, "PI", 2, "Label1", 4},     Pair{6, "PS", 3, "Label1", 8, 'M'}, Pair{11, "TP", 10, "Label1", 3},
+    Pair{9, "TA", 0, "TA", 3},         Pair{8, "M / S", 1, "Label1", 7},   Pair{5, "PTY", 4, "Label1", 16, 'e'},
 };
 
 QFont arial(const QFont& base) {
@@ -55,7 +56,7 @@ StatusRow::StatusRow(QWidget* parent) : QWidget(parent) {
         value->setFrameStyle(QFrame::Panel | QFrame::Sunken);
         value->setAutoFillBackground(true);
         value->setAccessibleName(QString::fromUtf8(pair.caption));
-        const QString sample(pair.widest, pair.widest > 8 ? QLatin1Char('e') : QLatin1Char('0'));
+        const QString sample(pair.widest, QLatin1Char(pair.letter));
         // The design caption, too, fits its field: it stands there until the first session.
         const QFontMetrics letters = value->fontMetrics();
         value->setMinimumWidth(std::max(letters.horizontalAdvance(sample), letters.horizontalAdvance(value->text())) +

@@ -11,13 +11,13 @@
 
 class QGroupBox;
 class QPushButton;
-class QTabWidget;
 
 namespace kdx {
 
 class ConnectionBar;
 class MainMenu;
 class Page;
+class PageTabs;
 class ProgressLine;
 class StatusRow;
 class Views;
@@ -69,7 +69,7 @@ private:
     ConnectionBar* m_connection = nullptr;
     QGroupBox* Frame7 = nullptr;  // the parameter controls
     QPushButton* GTL_Taste = nullptr;
-    QTabWidget* SSTab1 = nullptr;
+    PageTabs* SSTab1 = nullptr;
     std::vector<Page*> m_pages;
     ProgressLine* m_lowerEdge = nullptr;  // progress, and what the user should know
     QString m_startNotice;                // what start-up could not read
