@@ -169,7 +169,6 @@ void EonPage::stepGoesOut(const Step& step) {
 }
 
 void EonPage::noteSent(const std::string& key, const std::string& value) {
-    if (m_with.instrument.LastVisaStatus < 0) return;
     if (key == setting::kEonPi.sendKey) {
         EON_PI_Text->wentOut(value);
         EON_PS_Text->forget();  // the network is a new one to the coder: it has no name there
