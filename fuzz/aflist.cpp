@@ -27,5 +27,9 @@ int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     demand(pairs.has_value() == (count <= kMostAfsOfMethodB), "method B has room for so many");
     demand(!pairs || afCount(*pairs) == 1 + 2 * count, "method B sends pairs");
     demand(withOneDecimal(list).size() <= std::max<std::size_t>(list.size(), 5), "a tuned frequency grows by no more");
+    for (const std::string& frequency : pastedFrequencies(list)) {
+        demand(isAlternativeFrequency(frequency), "what is pasted is allowed");
+        demand(frequency.find(',') == std::string::npos, "a frequency is one entry");
+    }
     return 0;
 }

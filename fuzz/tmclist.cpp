@@ -1,9 +1,11 @@
-// Event and location lists: every line with a semicolon is an entry, and adding one leaves the others as they were.
+// Event and location lists: every line with a semicolon is an entry, and adding, changing or deleting one leaves the
+// others as they were. The kept message list comes back as it was kept.
 #include "harness.h"
 
 #include "settings/withoutcontrols.h"
 #include "support/tempfolder.h"
 #include "tmc/groupcode.h"
+#include "tmc/messagefile.h"
 #include "tmc/tmclist.h"
 
 #include <algorithm>
@@ -46,5 +48,20 @@ int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     auto expected = entries;
     expected.push_back(kdx::shownEntry(text + ";" + code).value());
     demand(entriesOf(file) == expected, "the added entry comes last and the others stay");
+
+    const std::size_t at = expected.size() / 2;
+    const std::string line(kdx::loadTmcList(file)->line(at));
+    demand(kdx::changeInTmcList(file, at, line, text, code), "an entry can be changed");
+    expected[at] = kdx::shownEntry(text + ";" + code).value();
+    demand(entriesOf(file) == expected, "the changed entry stands in its place and the others stay");
+    const std::string changed(kdx::loadTmcList(file)->line(at));
+    demand(kdx::removeFromTmcList(file, at, changed), "an entry can be deleted");
+    expected.erase(expected.begin() + static_cast<std::ptrdiff_t>(at));
+    demand(entriesOf(file) == expected, "the others stay");
+
+    folder.write("TMC_Liste.txt", bytes);
+    const auto messages = kdx::loadMessages(folder.data() / "TMC_Liste.txt");
+    demand(kdx::storeMessages(folder.data() / "TMC_Liste.txt", messages), "messages can be kept");
+    demand(kdx::loadMessages(folder.data() / "TMC_Liste.txt") == messages, "kept messages come back");
     return 0;
 }

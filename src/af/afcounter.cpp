@@ -24,8 +24,8 @@ void AfCounter::count() {
     setText(say({863, "%1 von %2 (A), %3 (B)"}).arg(count).arg(kMostAfsOfMethodA).arg(kMostAfsOfMethodB));
     setToolTip(count > kMostAfsOfMethodB ? say({865, "Mit Methode B kann diese Liste nicht gesendet werden."})
                                          : QString());
-    showWarning(*this, count > kMostAfsOfMethodA ? say({864, "Mehr Frequenzen, als eine Liste haben kann."})
-                                                 : QString());
+    showWarning(*this,
+                count > kMostAfsOfMethodA ? say({864, "Mehr Frequenzen, als eine Liste haben kann."}) : QString());
 }
 
 }  // namespace kdx

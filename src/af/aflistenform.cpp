@@ -58,8 +58,8 @@ void AF_Listenform::create() {
 void AF_Listenform::createOrder() {
     AF_Auf = clicked<QPushButton>("AF_Auf", {860, "Nach oben"}, m_change, &AF_Listenform::AF_Auf_Click);
     AF_Ab = clicked<QPushButton>("AF_Ab", {861, "Nach unten"}, m_change, &AF_Listenform::AF_Ab_Click);
-    AF_Sortieren = clicked<QPushButton>("AF_Sortieren", {862, "Sortieren"}, m_change,
-                                        &AF_Listenform::AF_Sortieren_Click);
+    AF_Sortieren =
+        clicked<QPushButton>("AF_Sortieren", {862, "Sortieren"}, m_change, &AF_Listenform::AF_Sortieren_Click);
     m_hint = named<QLabel>("KommaHinweis", m_change);
     m_hint->setWordWrap(true);
     m_hint->setMinimumHeight(2 * m_hint->fontMetrics().lineSpacing());  // room for it, so that nothing moves

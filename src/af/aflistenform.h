@@ -64,7 +64,7 @@ private:
     QPushButton* Rem_Freq = nullptr;
     QPushButton *AF_Auf = nullptr, *AF_Ab = nullptr, *AF_Sortieren = nullptr;
     AfCounter* AF_Zaehler = nullptr;
-    QLabel* m_hint = nullptr;      // what a comma in the entry does
+    QLabel* m_hint = nullptr;  // what a comma in the entry does
     QPushButton* Uebernahme_Knopf = nullptr;
     QPushButton* Ende_Knopf = nullptr;
 

@@ -48,12 +48,14 @@ void EonPage::create() {
 void EonPage::createProgramme() {
     m_programme = captioned<QGroupBox>("", {480, "Anderes Programm"}, this);
 
-    EON_PI_Text = wired<SentEntry>("EON_PI_Text", &QLineEdit::textChanged, &EonPage::EON_PI_Text_Change, m_with, setting::kEonPi.sendKey, m_programme);
+    EON_PI_Text = wired<SentEntry>("EON_PI_Text", &QLineEdit::textChanged, &EonPage::EON_PI_Text_Change, m_with,
+                                   setting::kEonPi.sendKey, m_programme);
     EON_PI_Label = heading("EON_PI_Label", {481, "EON PI"}, EON_PI_Text);
     EON_PI_Taste = clicked<QPushButton>("EON_PI_Taste", {86}, m_programme, &EonPage::EON_PI_Taste_Click);
     m_book.spokenAs(EON_PI_Taste, EON_PI_Label);  // of three of the same text, heard with what it stands at
 
-    EON_PS_Text = wired<SentEntry>("EON_PS_Text", &QLineEdit::textChanged, &EonPage::EON_PS_Text_Change, m_with, setting::kEonPs.sendKey, m_programme);
+    EON_PS_Text = wired<SentEntry>("EON_PS_Text", &QLineEdit::textChanged, &EonPage::EON_PS_Text_Change, m_with,
+                                   setting::kEonPs.sendKey, m_programme);
     EON_PS_LABEL = heading("EON_PS_LABEL", {482, "EON PS"}, EON_PS_Text);
     EON_PS_Taste = clicked<QPushButton>("EON_PS_Taste", {86}, m_programme, &EonPage::EON_PS_Taste_Click);
     m_book.spokenAs(EON_PS_Taste, EON_PS_LABEL);
@@ -174,7 +176,6 @@ void EonPage::stepGoesOut(const Step& step) {
 }
 
 void EonPage::noteSent(const std::string& key, const std::string& value) {
-    if (m_with.instrument.LastVisaStatus < 0) return;
     if (key == setting::kEonPi.sendKey) {
         EON_PI_Text->wentOut(value);
         EON_PS_Text->forget();  // the network is a new one to the coder: it has no name there

@@ -2,12 +2,10 @@
 
 #include "groups/sequenceedit.h"
 #include "groups/settings.h"
-#include "link/instrument.h"
 #include "settings/programstate.h"
 #include "ui/dialogs.h"
 #include "ui/layouts.h"
 #include "ui/text.h"
-#include "ui/valuestate.h"
 
 #include <algorithm>
 
@@ -163,14 +161,14 @@ void GroupPage::Gruppenfolge() {
     Steps steps;
     m_sequence.appendSteps(steps);
     send(steps);
-    if (m_with.instrument.LastVisaStatus < 0) m_sent.reset();
+    if (!linkWorks(m_with)) m_sent.forget();
     showSequence();
 }
 
 void GroupPage::stepGoesOut(const Step& step) {
     constexpr const Setting& kSequence = setting::kGroupSequence;
     if (step.key != kSequence.sendKey) return;
-    if (m_with.state.InstrumentOnline && m_with.instrument.LastVisaStatus >= 0) m_sent = step.value;
+    m_sent.wentOut(step.value);
     showSequence();
     if (!m_sequence.isToBeStored(m_with.profile)) return;
     m_with.profile.write(kSequence.place, step.value + ",");
@@ -201,7 +199,7 @@ void GroupPage::showSequence() {
     Gruppe_Vor->setEnabled(chosen && m_chosen > 0);
     Gruppe_Nach->setEnabled(chosen && m_chosen + 1 < groups.size());
     showShares(groups);
-    const Judgement judgement = judge();
+    const Judgement judgement = groups.empty() ? Judgement{} : m_sent.judge(sequenceToSend(m_sequence.groups));
     showState(*Label10, judgement.state, judgement.tip);
 }
 
@@ -214,14 +212,6 @@ void GroupPage::showShares(const std::vector<std::string>& groups) {
     const QString text = shares.join(QStringLiteral(", "));
     Gruppe_Anteile->setText(text.isEmpty() ? text : caption({875, "Anteile: %1"}).arg(text));
     Gruppe_Anteile->setToolTip(Gruppe_Anteile->text());
-}
-
-Judgement GroupPage::judge() const {
-    if (m_sequence.groups.empty()) return {};
-    const std::string value = sequenceToSend(m_sequence.groups);
-    if (m_sent != value) return {ValueState::Unsent, caption({857, "Noch nicht gesendet."})};
-    const QString why = whyRefused(m_with, setting::kGroupSequence.sendKey, toText(value));
-    return {why.isEmpty() ? ValueState::InForce : ValueState::Refused, why};
 }
 
 }  // namespace kdx

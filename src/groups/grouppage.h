@@ -2,14 +2,14 @@
 
 #include "groups/groupsequence.h"
 #include "groups/sequencelabel.h"
+#include "groups/settings.h"
 #include "ui/page.h"
-#include "ui/valuestate.h"
+#include "ui/sentvalue.h"
 
 #include <QPushButton>
 #include <QScrollArea>
 
 #include <array>
-#include <optional>
 #include <string>
 #include <vector>
 
@@ -49,7 +49,6 @@ private:
     void move(int places);
     /// The group at that character of the label is the one to be moved; the last one where there is none.
     void choose(int character);
-    [[nodiscard]] Judgement judge() const;
 
     GroupSequence& m_sequence;
 
@@ -60,10 +59,10 @@ private:
     QPushButton* GS_Senden = nullptr;
     SequenceLabel* Label10 = nullptr;  // heading and sequence
     QScrollArea* m_sequenceView = nullptr;
-    QLabel* Gruppe_Anteile = nullptr;   // share of each group
-    std::size_t m_chosen = 0;           // the group that is moved
-    std::optional<std::string> m_sent;  // what the coder has
-    QLabel* m_note = nullptr;           // that a sequence is longer than can be read back
+    QLabel* Gruppe_Anteile = nullptr;  // share of each group
+    std::size_t m_chosen = 0;          // the group that is moved
+    SentValue m_sent{m_with, setting::kGroupSequence.sendKey};
+    QLabel* m_note = nullptr;  // that a sequence is longer than can be read back
 };
 
 }  // namespace kdx

@@ -11,6 +11,7 @@
 #include "coder/sendparam.h"
 #include "rds/programme.h"
 #include "rds/settings.h"
+#include "ui/sentvalue.h"
 #include "ui/statusrow.h"
 #include "ui/text.h"
 
@@ -104,12 +105,18 @@ std::string DynamicPs::nextStep() {
             ps = nextTogglePs(m_record, m_typedPs());
             break;
     }
-    m_with.status.show(StatusSlot::Ps, ps);
+    show(toText(ps));
     return ps;
 }
 
+void DynamicPs::show(const QString& ps) {
+    const bool arrives = linkWorks(m_with);  // the steps go on without a session, too
+    m_with.status.show(StatusSlot::Ps, ps,
+                       arrives ? Judgement{} : Judgement{ValueState::Unsent, caption({857, "Noch nicht gesendet."})});
+}
+
 void DynamicPs::restoreTypedPs() {
-    m_with.status.show(StatusSlot::Ps, m_typedPs());
+    show(toText(m_typedPs()));
     m_with.params.SendParam(setting::kPs.sendKey, toBytes(m_with.status.text(StatusSlot::Ps)));
     emit typedPsSent();
 }

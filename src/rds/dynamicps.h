@@ -40,6 +40,7 @@ private:
     void PS_Timer_Timer();
 
     [[nodiscard]] std::string nextStep();
+    void show(const QString& ps);
     void restoreTypedPs();
 
     Ticker* PS_Timer = nullptr;

@@ -4,7 +4,6 @@
 
 #include "base/clock.h"
 #include "coder/sendparam.h"
-#include "link/instrument.h"
 #include "rds/dynamicps.h"
 #include "rds/settings.h"
 #include "rds/taframe.h"
@@ -46,7 +45,7 @@ void RdsPage::fillProgrammeTypes() {
 void RdsPage::showProgrammeType() {
     PTY_Combo1->setCurrentIndex(storedEntry(m_programme.pty, kProgrammeTypes));
     if (PTY_Combo1->currentIndex() < 0) return;
-    m_with.status.show(StatusSlot::Pty, PTY_Combo1->currentText(), judgement(m_sentPty, m_programme.pty));
+    m_with.status.show(StatusSlot::Pty, PTY_Combo1->currentText(), m_sentPty.judge(m_programme.pty));
 }
 
 void RdsPage::load() {
@@ -84,38 +83,24 @@ void RdsPage::stepGoesOut(const Step& step) {
     if (step.key == setting::kTrafficProgramme) setTrafficProgramme(step.value == "1");
     m_ta->stepGoesOut(step);
     if (step.key == setting::kPs.sendKey) {
-        noteSent(PS_T, step.value);
+        PS_T->wentOut(step.value);
         showValue(StatusSlot::Ps, PS_T, step.value);
     } else if (step.key == setting::kPi.sendKey) {
-        noteSent(PI_T, step.value);
+        PI_T->wentOut(step.value);
         showValue(StatusSlot::Pi, PI_T, step.value);
     } else if (step.key == setting::kRadiotext.sendKey) {
-        noteSent(RT_Text1, step.value);
+        RT_Text1->wentOut(step.value);
     } else if (step.key == setting::kMusicSpeech.sendKey && !step.value.empty()) {
-        noteSent(m_sentMusicSpeech, step.value);
+        m_sentMusicSpeech.wentOut(step.value);
         showMusicSpeech();
     } else if (step.key == setting::kPty.sendKey) {
-        noteSent(m_sentPty, step.value);
+        m_sentPty.wentOut(step.value);
         showProgrammeType();
     }
 }
 
-/// What went out over a link that works is what the instrument has.
-void RdsPage::noteSent(SentEntry* entry, const std::string& value) {
-    if (m_with.instrument.LastVisaStatus >= 0) entry->wentOut(value);
-}
-
-void RdsPage::noteSent(std::string& what, const std::string& value) {
-    if (m_with.instrument.LastVisaStatus >= 0 && m_with.state.InstrumentOnline) what = value;
-}
-
 void RdsPage::showValue(StatusSlot slot, const SentEntry* entry, const std::string& value) {
     m_with.status.show(slot, value, entry->judge(value));
-}
-
-Judgement RdsPage::judgement(const std::string& sent, const std::string& value) const {
-    if (sent == value) return {};
-    return {ValueState::Unsent, caption({857, "Noch nicht gesendet."})};
 }
 
 // What a data set holds goes out as it stands with the whole set; the button beside an entry sends what could be typed
@@ -124,7 +109,7 @@ void RdsPage::PS_Taste_Click() {
     m_programme.ps = withoutControls(toBytes(PS_T->text())).substr(0, kPsLength);
     m_with.params.SendParam(setting::kPs.sendKey, std::string(m_programme.ps));
     storeText(setting::kPs, m_programme.ps);
-    noteSent(PS_T, m_programme.ps);
+    PS_T->wentOut(m_programme.ps);
     showValue(StatusSlot::Ps, PS_T, m_programme.ps);
 }
 
@@ -132,14 +117,14 @@ void RdsPage::Command3_Click() {
     m_programme.pi = withoutControls(m_programme.pi);
     m_with.params.SendParam(setting::kPi.sendKey, m_programme.pi);  // which gives it its four characters
     m_with.profile.write(setting::kPi.place, withoutControls(toBytes(PI_T->text())));
-    noteSent(PI_T, m_programme.pi);
+    PI_T->wentOut(m_programme.pi);
     showValue(StatusSlot::Pi, PI_T, toBytes(PI_T->text()));
 }
 
 void RdsPage::PTY_Combo1_Click() {
     m_programme.pty = std::to_string(PTY_Combo1->currentIndex());
     sendAndStore(setting::kPty, m_programme.pty);
-    noteSent(m_sentPty, m_programme.pty);
+    m_sentPty.wentOut(m_programme.pty);
     showProgrammeType();
 }
 
@@ -152,7 +137,7 @@ void RdsPage::Check1_Click() {
 void RdsPage::MS_opt_Click(int index) {
     m_programme.musicSpeech = index == 0 ? "M" : "S";
     sendAndStore(setting::kMusicSpeech, m_programme.musicSpeech);
-    noteSent(m_sentMusicSpeech, m_programme.musicSpeech);
+    m_sentMusicSpeech.wentOut(m_programme.musicSpeech);
     showMusicSpeech();
 }
 
@@ -165,13 +150,13 @@ void RdsPage::RT_Taste1_Click() {
     m_programme.radiotext = withoutControls(m_programme.radiotext);
     storeText(setting::kRadiotext, m_programme.radiotext);
     m_with.params.SendParam(setting::kRadiotext.sendKey, m_programme.radiotext);
-    noteSent(RT_Text1, m_programme.radiotext);
+    RT_Text1->wentOut(m_programme.radiotext);
 }
 
 void RdsPage::RT_clear1_Click() {
     m_with.params.SendParam(setting::kRadiotext.sendKey, "   ");
     RT_Text1->clear();
-    noteSent(RT_Text1, {});
+    RT_Text1->wentOut({});
 }
 
 void RdsPage::Zeit_Taste_Click() {
@@ -197,7 +182,7 @@ void RdsPage::Uhr_Zeit_DblClick() {
 
 void RdsPage::showMusicSpeech() {
     m_with.status.show(StatusSlot::MusicSpeech, caption({m_programme.musicSpeech == "M" ? 56 : 57}),
-                       judgement(m_sentMusicSpeech, m_programme.musicSpeech));
+                       m_sentMusicSpeech.judge(m_programme.musicSpeech));
 }
 
 void RdsPage::setTrafficProgramme(bool on) {

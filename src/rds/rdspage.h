@@ -61,21 +61,17 @@ private:
     void fillProgrammeTypes();
     void showProgrammeType();
     void showMusicSpeech();
-    void noteSent(SentEntry* entry, const std::string& value);
-    void noteSent(std::string& what, const std::string& value);
     void showValue(StatusSlot slot, const SentEntry* entry, const std::string& value);
-    [[nodiscard]] Judgement judgement(const std::string& sent, const std::string& value) const;
     void setTrafficProgramme(bool on);
     void showTrafficProgramme(bool on);
     void showClock(const QString& text);
 
     Programme& m_programme;
 
-    QLabel* PS_Label = nullptr;
+    QLabel *PS_Label = nullptr, *PI_Label = nullptr;
     SentEntry* PS_T = nullptr;
     EntryCounter *PS_Zaehler = nullptr, *PI_Zaehler = nullptr, *RT_Zaehler = nullptr;
     QPushButton* PS_Taste = nullptr;
-    QLabel* PI_Label = nullptr;
     SentEntry* PI_T = nullptr;
     QPushButton* Command3 = nullptr;  // sends the PI
     QLabel* Label1 = nullptr;         // heading of the programme type list
@@ -94,13 +90,10 @@ private:
     OptionArray<16> DI_Opt;
     QGroupBox* RT_Frame = nullptr;
     SentEntry* RT_Text1 = nullptr;
-    QPushButton* RT_Taste1 = nullptr;
-    QPushButton* RT_clear1 = nullptr;
+    QPushButton *RT_Taste1 = nullptr, *RT_clear1 = nullptr;
 
-    std::string m_sentMusicSpeech;  ///< what the instrument has; "" at first
-    std::string m_sentPty;
-    bool m_loaded = false;
-    bool m_clockOn = false;
+    SentValue m_sentMusicSpeech, m_sentPty;
+    bool m_loaded = false, m_clockOn = false;
     bool m_clockShowsWord = true;                 ///< `Uhr_Zeit` shows the off word, not a time
     std::optional<bool> m_shownTrafficProgramme;  ///< what the TP indicator says; nothing at first
 };

@@ -12,7 +12,10 @@
 namespace kdx {
 
 RdsPage::RdsPage(const PageContext& with, Programme& programme, QWidget* parent)
-    : Page(with, parent), m_programme(programme) {
+    : Page(with, parent),
+      m_programme(programme),
+      m_sentMusicSpeech(with, setting::kMusicSpeech.sendKey),
+      m_sentPty(with, setting::kPty.sendKey) {
     create();
     arrange();
 }
@@ -71,7 +74,10 @@ void RdsPage::createService() {
     Label1 = heading("Label1", {395, "PTY"}, PTY_Combo1);
     m_dynamicPs = new DynamicPs(
         m_with, m_programme, [this] { return toBytes(PS_T->text()); }, this);
-    connect(m_dynamicPs, &DynamicPs::typedPsSent, this, [this] { noteSent(PS_T, toBytes(PS_T->text())); });
+    connect(m_dynamicPs, &DynamicPs::typedPsSent, this, [this] {
+        PS_T->wentOut(toBytes(PS_T->text()));
+        showValue(StatusSlot::Ps, PS_T, toBytes(PS_T->text()));
+    });
 }
 
 QPushButton* RdsPage::sendButton(const char* name, const char* what, SentEntry* entry, void (RdsPage::*handler)()) {

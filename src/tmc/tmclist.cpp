@@ -88,7 +88,8 @@ bool changeLine(const std::filesystem::path& file, std::size_t index, std::strin
         const std::size_t newline = bytes.find('\n', begin);
         const std::size_t next = newline == std::string_view::npos ? bytes.size() : newline + 1;
         std::string_view line = bytes.substr(begin, next - begin);
-        while (line.ends_with('\n') || line.ends_with('\r')) line.remove_suffix(1);
+        if (line.ends_with('\n')) line.remove_suffix(1);
+        if (line.ends_with('\r')) line.remove_suffix(1);
         if (line.find(';') != std::string_view::npos && number++ == index) {
             if (line != expected) return false;
             const std::string lineEnd(bytes.substr(begin + line.size(), next - begin - line.size()));

@@ -36,6 +36,12 @@ QString nameOf(const QObject& object) {
 
 }  // namespace
 
+double letterSize(double desktop) {
+    constexpr double kUsual = 9;  // what a desktop has that says nothing of it
+    constexpr double kDesigned = 8.25;
+    return desktop > kUsual ? desktop : kDesigned;
+}
+
 Application::Application(int& argc, char** argv) : QApplication(argc, argv) {
     setApplicationName(QStringLiteral("KDX-RDS"));
     setApplicationVersion(QStringLiteral(KDX_VERSION));
@@ -43,7 +49,7 @@ Application::Application(int& argc, char** argv) : QApplication(argc, argv) {
     setStyle(QStyleFactory::create(QStringLiteral("Fusion")));
     QFont font = QApplication::font();
     font.setFamilies(arialFamilies());
-    font.setPointSizeF(8.25);
+    font.setPointSizeF(letterSize(font.pointSizeF()));
     setFont(font);
     installEventFilter(this);
 }

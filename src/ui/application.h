@@ -7,6 +7,9 @@
 
 namespace kdx {
 
+/// The program's letters in points: the designed ones, or larger where the desktop has them larger than usual.
+[[nodiscard]] double letterSize(double desktop);
+
 /// The application, with what holds for every control and every handler.
 class Application : public QApplication {
 public:

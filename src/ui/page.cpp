@@ -2,6 +2,8 @@
 
 #include <QComboBox>
 
+#include <algorithm>
+
 #include "coder/sendparam.h"
 #include "settings/captions.h"
 #include "settings/profile.h"
@@ -10,6 +12,13 @@
 #include "ui/text.h"
 
 namespace kdx {
+
+void Page::resizeEvent(QResizeEvent* event) {
+    QWidget::resizeEvent(event);
+    constexpr int kWidest = 90;  // lines of the font
+    const int spare = std::max(0, width() - kWidest * fontMetrics().height());
+    setContentsMargins(spare / 2, 0, spare - spare / 2, 0);
+}
 
 void Page::send(const Steps& steps) {
     for (const Step& step : steps) {

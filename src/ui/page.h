@@ -32,6 +32,8 @@ public:
     virtual void stepGoesOut(const Step& /*step*/) {}
 
 protected:
+    /// However wide the window is, the controls stay together.
+    void resizeEvent(QResizeEvent* event) override;
     /// Sends steps at once, each for itself and without a sequence around them.
     void send(const Steps& steps);
     void sendAndStore(const Setting& setting, const std::string& value);

@@ -4,8 +4,6 @@
 
 #include "base/numbers.h"
 #include "coder/fieldsizes.h"
-#include "link/instrument.h"
-#include "settings/programstate.h"
 #include "settings/withoutcontrols.h"
 #include "ui/caption.h"
 #include "ui/text.h"
@@ -13,18 +11,17 @@
 namespace kdx {
 
 SentEntry::SentEntry(const PageContext& with, const char* key, QWidget* parent)
-    : QLineEdit(parent), m_with(with), m_key(key) {
+    : QLineEdit(parent), m_with(with), m_key(key), m_sent(with, key) {
     connect(this, &QLineEdit::textChanged, this, &SentEntry::refresh);
 }
 
 void SentEntry::wentOut(std::string_view value) {
-    if (!m_with.state.InstrumentOnline || m_with.instrument.isSequenceStopped()) return;
-    m_inForce = sentForm(value);
+    m_sent.wentOut(sentForm(value));
     refresh();
 }
 
 void SentEntry::forget() {
-    m_inForce.reset();
+    m_sent.forget();
     refresh();
 }
 
@@ -38,12 +35,8 @@ QString SentEntry::toShown(std::string_view value) {
 }
 
 Judgement SentEntry::judge(const QString& entry) const {
-    const std::string form = sentForm(toBytes(entry));
-    // Of nothing there is nothing to be sent.
-    if (m_inForce ? form != *m_inForce : !entry.isEmpty())
-        return {ValueState::Unsent, captionText(m_with.captions, {857, "Noch nicht gesendet."})};
-    const QString why = m_inForce ? whyRefused(m_with, m_key, entry) : QString();
-    return {why.isEmpty() ? ValueState::InForce : ValueState::Refused, why};
+    if (entry.isEmpty() && !m_sent.isKnown()) return {};  // of nothing there is nothing to be sent
+    return m_sent.judge(sentForm(toBytes(entry)), entry);
 }
 
 std::string SentEntry::sentForm(std::string_view value) const {

@@ -2,12 +2,10 @@
 
 #include <QLineEdit>
 
-#include <optional>
 #include <string>
 #include <string_view>
 
-#include "ui/pagecontext.h"
-#include "ui/valuestate.h"
+#include "ui/sentvalue.h"
 
 namespace kdx {
 
@@ -19,7 +17,7 @@ public:
     /// @param key under which it is sent.
     SentEntry(const PageContext& with, const char* key, QWidget* parent);
 
-    /// The value has gone out under the key; whether it arrived says the link.
+    /// The value goes out under the key.
     void wentOut(std::string_view value);
     /// What went out has not arrived, or is meant for somebody else.
     void forget();
@@ -38,7 +36,7 @@ private:
 
     PageContext m_with;
     const char* m_key;
-    std::optional<std::string> m_inForce;  ///< in the form in which it is sent
+    SentValue m_sent;  ///< in the form in which it is sent
 };
 
 }  // namespace kdx

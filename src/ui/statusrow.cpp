@@ -18,14 +18,15 @@ struct Pair {
     const char* caption;
     std::size_t value;
     const char* design;
-    int widest;  ///< characters of the widest value: its share of the row
+    int widest;         ///< characters of the widest value: its share of the row
+    char letter = '0';  ///< one as wide as those of the value
 };
 
 // From left to right on the screen.
 constexpr std::array kPairs = {
     Pair{16, "RF [MHz]", 17, "--", 8}, Pair{12, "RF [dBµV]", 13, "--", 6}, Pair{15, "AF [kHz]", 14, "--", 6},
-    Pair{7, "PI", 2, "Label1", 4},     Pair{6, "PS", 3, "Label1", 8},      Pair{11, "TP", 10, "Label1", 3},
-    Pair{9, "TA", 0, "TA", 3},         Pair{8, "M / S", 1, "Label1", 7},   Pair{5, "PTY", 4, "Label1", 16},
+    Pair{7, "PI", 2, "Label1", 4},     Pair{6, "PS", 3, "Label1", 8, 'M'}, Pair{11, "TP", 10, "Label1", 3},
+    Pair{9, "TA", 0, "TA", 3},         Pair{8, "M / S", 1, "Label1", 7},   Pair{5, "PTY", 4, "Label1", 16, 'e'},
 };
 
 constexpr int kFirstPair = 2;  // the columns between the pairs are free for further ones
@@ -50,21 +51,21 @@ StatusRow::StatusRow(QWidget* parent) : QWidget(parent) {
         Status[pair.heading] = element<QLabel>("Status", pair.heading, QString::fromUtf8(pair.caption), this);
         Status[pair.value] = element<QLabel>("Status", pair.value, QString::fromUtf8(pair.design), this);
         Status[pair.value]->setAccessibleName(QString::fromUtf8(pair.caption));
-        addPair(column, Status[pair.heading], Status[pair.value], pair.widest);
+        addPair(column, Status[pair.heading], Status[pair.value], pair.widest, pair.letter);
         showState(*Status[pair.value], ValueState::Unsent, {});
         Status[pair.value]->setProperty("zustand", QString());  // a caption is no value
         column += 2;
     }
 }
 
-void StatusRow::addPair(int column, QLabel* heading, QLabel* value, int widest) {
+void StatusRow::addPair(int column, QLabel* heading, QLabel* value, int widest, char letter) {
     for (QLabel* label : {heading, value}) {
         label->setFont(arial(font()));
         label->setAlignment(Qt::AlignCenter);
     }
     value->setFrameStyle(QFrame::Panel | QFrame::Sunken);
     value->setAutoFillBackground(true);
-    const QString sample(widest, widest > 8 ? QLatin1Char('e') : QLatin1Char('0'));
+    const QString sample(widest, QLatin1Char(letter));
     // The design caption, too, fits its field: it stands there until the first session.
     const QFontMetrics letters = value->fontMetrics();
     value->setMinimumWidth(std::max(letters.horizontalAdvance(sample), letters.horizontalAdvance(value->text())) + 6);
@@ -76,7 +77,7 @@ void StatusRow::addPair(int column, QLabel* heading, QLabel* value, int widest) 
 }
 
 void StatusRow::add(Place place, QLabel* heading, QLabel* value, int widest) {
-    addPair(place == Place::Front ? kFirstPair - 1 : kFirstPair + 3, heading, value, widest);
+    addPair(place == Place::Front ? kFirstPair - 1 : kFirstPair + 3, heading, value, widest, '0');
 }
 
 void StatusRow::addMark(QWidget* mark) {

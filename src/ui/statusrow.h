@@ -55,7 +55,7 @@ public:
 private:
     [[nodiscard]] QLabel* at(StatusSlot slot) const { return Status.at(static_cast<std::size_t>(slot)); }
 
-    void addPair(int column, QLabel* heading, QLabel* value, int widest);
+    void addPair(int column, QLabel* heading, QLabel* value, int widest, char letter);
 
     QLabel* Gen1_Label = nullptr;
     std::array<QLabel*, kSlots> Status{};

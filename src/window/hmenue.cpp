@@ -35,6 +35,7 @@
 #include "window/pagetabs.h"
 #include "window/progressline.h"
 #include "window/views.h"
+#include "window/windowsize.h"
 
 namespace kdx {
 
@@ -44,7 +45,6 @@ constexpr int kGroupPage = 3;
 constexpr int kQueryPage = 5;
 constexpr int kFirstTabCaption = 10;
 constexpr std::chrono::seconds kRetryInterval{10};  // until what could not be saved is tried again
-constexpr QSize kDesignSize{640, 480};              // pixels at 96 dpi
 
 }  // namespace
 
@@ -102,8 +102,6 @@ void HMenue::createPages() {
     connect(GTL_Taste, &QPushButton::clicked, this, &HMenue::GTL_Taste_Click);
     GTL_Taste->setFixedWidth(GTL_Taste->fontMetrics().horizontalAdvance(QStringLiteral("Local")) + 28);
     SSTab1->setCornerWidget(corner);
-    SSTab1->tabBar()->setUsesScrollButtons(false);
-    SSTab1->tabBar()->setExpanding(true);
 
     m_pages = makePages(m_context, m_s.session.station, *this);
     for (Page* page : m_pages) SSTab1->addTab(page, QString());
@@ -174,9 +172,7 @@ void HMenue::startUp() {
     // The two blanks before the slash and at the end belong to the title.
     m_s.state.ProgramTitle = "KDX-RDS V 1.0  / Mar. 2009  ";
     setWindowTitle(toText(m_s.state.ProgramTitle));
-    // Stated, not left to the layouts: they would still know sizes from before captions were set and parts hidden.
-    setMinimumSize(kDesignSize);
-    resize(kDesignSize);
+    fitToFont(*this, *SSTab1);
     m_s.state.InterfaceKind = profile.read(setting::kInterface);
     m_connection->Schnittstellen_Toggle();
     m_s.state.InstrumentOnline = false;

@@ -11,7 +11,6 @@
 
 class QGroupBox;
 class QPushButton;
-class QTabWidget;
 
 namespace kdx {
 
@@ -19,6 +18,7 @@ class ConnectionBar;
 class Desktop;
 class MainMenu;
 class Page;
+class PageTabs;
 class ProgressLine;
 class StatusRow;
 class Views;
@@ -72,7 +72,7 @@ private:
     ConnectionBar* m_connection = nullptr;
     QGroupBox* Frame7 = nullptr;  // the parameter controls
     QPushButton* GTL_Taste = nullptr;
-    QTabWidget* SSTab1 = nullptr;
+    PageTabs* SSTab1 = nullptr;
     std::vector<Page*> m_pages;
     ProgressLine* m_lowerEdge = nullptr;  // progress, and what the user should know
     QString m_startNotice;                // what start-up could not read

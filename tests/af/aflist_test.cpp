@@ -149,5 +149,23 @@ INSTANTIATE_TEST_SUITE_P(Texts, TunedFrequency,
                                            Decimal{"9.8e1", "9.8e1"}, Decimal{".98e2", ".98e2"}, Decimal{"087", "087."},
                                            Decimal{"", ".00"}));
 
+TEST(PastedFrequencies, TakesAWholeListOfAllowedOnes) {
+    using List = std::vector<std::string>;
+    EXPECT_EQ(pastedFrequencies("90.1,94.3"), (List{"90.1", "94.3"}));
+    EXPECT_EQ(pastedFrequencies(" 90.1, 94.3 ,108"), (List{"90.1", "94.3", "108"}));
+    EXPECT_EQ(pastedFrequencies("90,88,99"), (List{"90", "88", "99"}));
+    EXPECT_EQ(pastedFrequencies("90,88"), List{}) << "may be a decimal comma";
+    EXPECT_EQ(pastedFrequencies("90.1,12"), List{});
+    EXPECT_EQ(pastedFrequencies("90.1,"), List{});
+    EXPECT_EQ(pastedFrequencies("90.1,x"), List{});
+    EXPECT_LE(pastedFrequencies("90.1").size(), 1U);
+}
+
+TEST(SortFrequencies, GoesByTheNumberAndKeepsEqualOnesInOrder) {
+    std::vector<std::string> frequencies{"100.1", "90.10", "90.1", "88"};
+    sortFrequencies(frequencies);
+    EXPECT_EQ(frequencies, (std::vector<std::string>{"88", "90.10", "90.1", "100.1"}));
+}
+
 }  // namespace
 }  // namespace kdx

@@ -1,58 +1,12 @@
-#include "af/aflistenform.h"
-
-#include <gtest/gtest.h>
-
+#include "aflistenformtest.h"
 #include "support/layoutcheck.h"
-#include "support/listrows.h"
-#include "support/pagetest.h"
-
-#include <QClipboard>
-#include <QKeyEvent>
-#include <QListWidget>
-#include <QMouseEvent>
-
-#include <optional>
 
 namespace kdx {
 namespace {
 
+using test::EditorTest;
 using test::kSet1;
 using test::Lines;
-
-class EditorTest : public test::PageTest {
-protected:
-    EditorTest() {
-        state.afEditorKind = "AF";
-        setList("AF_LISTE1", "87.6,90.1,94.3");
-    }
-    QWidget& root() override { return *editor; }
-
-    void setList(const char* key, const std::string& list) { setProfile(kSet1, "RDS", key, list); }
-    void open() {
-        editor.emplace(context, nullptr);
-        editor->show();
-    }
-    void selectRow(int row) { find<QListWidget>("AF_List1")->setCurrentRow(row); }
-    Lines rows() { return test::rowsOf(*find<QListWidget>("AF_List1")); }
-    void clickTuned() {
-        auto* label = find<QLabel>("AF_TN");
-        QMouseEvent release(QEvent::MouseButtonRelease, QPointF(1, 1), label->mapToGlobal(QPointF(1, 1)),
-                            Qt::LeftButton, Qt::NoButton, Qt::NoModifier);
-        QApplication::sendEvent(label, &release);
-    }
-    void pressEnter(const char* name) {
-        QKeyEvent press(QEvent::KeyPress, Qt::Key_Return, Qt::NoModifier);
-        QApplication::sendEvent(find(name), &press);
-    }
-    void expectRefusal(std::size_t box, int caption) {
-        ASSERT_GT(dialogs.shown.size(), box);
-        EXPECT_EQ(dialogs.shown[box].icon, Dialogs::Icon::Exclamation);
-        EXPECT_EQ(dialogs.shown[box].title, toText(captions.text(161)));
-        EXPECT_EQ(dialogs.shown[box].text, toText(captions.text(caption)));
-    }
-
-    std::optional<AF_Listenform> editor;
-};
 
 TEST_F(EditorTest, OpensOnListOne) {
     setProfile(kSet1, "RDS", "AF_LISTE", "3");
@@ -184,102 +138,6 @@ TEST_F(EditorTest, AppendingTakesTheTextAsTyped) {
         click("Command1");
     }
     EXPECT_EQ(rows(), Lines({"90.1", "94.3", "87.5", "108.0", "99", "88.123"}));
-}
-
-TEST_F(EditorTest, AfterAddingTheNextFrequencyReplacesTheEntry) {
-    open();
-    auto* entry = find<QLineEdit>("Text2");
-    for (const char* typed : {"90.1", "89.3"}) {
-        entry->insert(QString::fromLatin1(typed));  // as the keyboard does: in place of what is selected
-        pressEnter("Text2");
-        EXPECT_EQ(entry->selectedText().toStdString(), typed);
-    }
-    EXPECT_EQ(rows(), Lines({"90.1", "94.3", "90.1", "89.3"}));
-}
-
-TEST_F(EditorTest, AnAddedFrequencyIsInView) {
-    std::string list = "87.6";
-    for (int i = 0; i < 60; ++i) list += ",90.1";
-    setList("AF_LISTE1", list);
-    open();
-    QApplication::processEvents();
-    auto* shown = find<QListWidget>("AF_List1");
-    const auto inView = [&](int row) {
-        return shown->viewport()->rect().contains(shown->visualItemRect(shown->item(row)));
-    };
-    ASSERT_FALSE(inView(shown->count() - 1));
-    type("Text2", "99.9");
-    click("Command1");
-    EXPECT_TRUE(inView(shown->count() - 1));
-    selectRow(1);
-    shown->scrollToBottom();
-    click("AF_OF_add");
-    EXPECT_TRUE(inView(1));
-}
-
-TEST_F(EditorTest, APastedListBecomesItsFrequencies) {
-    open();
-    QApplication::clipboard()->setText(QStringLiteral("99.9, 101.5,87.7"));
-    find<QLineEdit>("Text2")->clear();
-    find<QLineEdit>("Text2")->paste();
-    EXPECT_EQ(text("KommaHinweis"), "3 Frequenzen");
-    pressEnter("Text2");
-    EXPECT_EQ(rows(), Lines({"90.1", "94.3", "99.9", "101.5", "87.7"}));
-    selectRow(0);
-    click("AF_OF_add");
-    EXPECT_EQ(rows(), Lines({"99.9", "101.5", "87.7", "90.1", "94.3", "99.9", "101.5", "87.7"}));
-}
-
-TEST_F(EditorTest, ACommaThatSeparatesIsToldAsItIsTyped) {
-    open();
-    type("Text2", "90.1");
-    EXPECT_EQ(text("KommaHinweis"), "");
-    type("Text2", "90,1");
-    EXPECT_EQ(text("KommaHinweis"), "Ein Komma trennt: Dezimalstellen stehen nach einem Punkt.");
-    state.corrections.decimalComma = true;  // then it is a point
-    type("Text2", "90,2");
-    EXPECT_EQ(text("KommaHinweis"), "");
-}
-
-TEST_F(EditorTest, CountsTheFrequencies) {
-    open();
-    EXPECT_EQ(text("AF_Zaehler"), "2 von 25 (A), 12 (B)");
-    for (int i = 3; i <= 26; ++i) {
-        type("Text2", "99.9");
-        click("Command1");
-        EXPECT_EQ(text("AF_Zaehler"), std::to_string(i) + " von 25 (A), 12 (B)");
-        EXPECT_EQ(find("AF_Zaehler")->toolTip().contains(QStringLiteral("Methode B")), i > 12) << i;
-        EXPECT_EQ(find("AF_Zaehler")->toolTip().contains(QStringLiteral("Mehr Frequenzen")), i > 25) << i;
-    }
-}
-
-TEST_F(EditorTest, TheOrderCanBeChanged) {
-    setList("AF_LISTE1", "87.6,100.1,90.1,94.3");
-    open();
-    selectRow(0);
-    click("AF_Ab");
-    EXPECT_EQ(rows(), Lines({"90.1", "100.1", "94.3"}));
-    click("AF_Ab");
-    click("AF_Ab");  // stands at the end
-    EXPECT_EQ(rows(), Lines({"90.1", "94.3", "100.1"}));
-    click("AF_Auf");
-    EXPECT_EQ(rows(), Lines({"90.1", "100.1", "94.3"}));
-    EXPECT_EQ(find<QListWidget>("AF_List1")->currentRow(), 1);
-    click("AF_Sortieren");
-    EXPECT_EQ(rows(), Lines({"90.1", "94.3", "100.1"}));
-    click("Uebernahme_Knopf");
-    EXPECT_EQ(profile(kSet1, "RDS", "AF_LISTE1"), "87.6,90.1,94.3,100.1");
-}
-
-TEST_F(EditorTest, TheDeleteKeyAsksAsTheButtonDoes) {
-    dialogs.confirmations = {false, true};
-    open();
-    selectRow(0);
-    press("AF_List1", Qt::Key_Delete);
-    EXPECT_EQ(rows(), Lines({"90.1", "94.3"}));
-    press("AF_List1", Qt::Key_Delete);
-    EXPECT_EQ(rows(), Lines{"94.3"});
-    EXPECT_EQ(dialogs.shown.at(0).title, QStringLiteral("Change List?"));
 }
 
 TEST_F(EditorTest, TheEnterKeyAppends) {

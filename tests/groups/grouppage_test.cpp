@@ -1,44 +1,20 @@
-#include "groups/grouppage.h"
-
-#include <gtest/gtest.h>
-
-#include <QMouseEvent>
+#include "grouppagetest.h"
 
 #include "support/layoutcheck.h"
-#include "support/pagetest.h"
 
 namespace kdx {
 namespace {
 
 using test::direct;
+using test::GroupPageTest;
 using test::kSet1;
 using test::Lines;
-using test::parameter;
 
 std::string repeated(const std::string& text, int times) {
     std::string all;
     for (int i = 0; i < times; ++i) all += text;
     return all;
 }
-
-class GroupPageTest : public test::PageTest {
-protected:
-    GroupPageTest() { page.label(); }
-    QWidget& root() override { return page; }
-
-    void press(std::initializer_list<int> groups) {
-        for (const int number : groups) click(("Gruppe" + std::to_string(number)).c_str());
-    }
-
-    /// Start-up: the data set at work is read, then shown.
-    void load() {
-        part.load(settings);
-        page.load();
-    }
-
-    GroupSequence part;
-    GroupPage page{context, part, nullptr};
-};
 
 TEST_F(GroupPageTest, EveryButtonAppendsItsGroup) {
     for (int number = 0; number < 16; ++number) press({number});
@@ -47,73 +23,6 @@ TEST_F(GroupPageTest, EveryButtonAppendsItsGroup) {
     EXPECT_EQ(state.group8ACount, 1);
     EXPECT_EQ(sent(), Lines{});
     EXPECT_EQ(profile(kSet1, "RDS", "GR_FOLGE"), "");
-}
-
-TEST_F(GroupPageTest, TheLastGroupCanBeRemoved) {
-    press({0, 2, 8});
-    EXPECT_EQ(state.group8ACount, 1);
-    click("Gruppe_Zurueck");
-    EXPECT_EQ(text("Label10"), "Gruppenfolge:0A,2A,");
-    EXPECT_EQ(state.groupCount, 2);
-    EXPECT_EQ(state.group8ACount, 0);
-    click("Gruppe_Zurueck");
-    click("Gruppe_Zurueck");
-    EXPECT_EQ(text("Label10"), "Gruppenfolge:");
-    EXPECT_FALSE(enabled("Gruppe_Zurueck"));
-    press({1});
-    click("GS_Senden");
-    EXPECT_EQ(sent(), Lines{direct("GS=1A")});
-}
-
-TEST_F(GroupPageTest, TheMarkedGroupMoves) {
-    press({0, 2, 10});
-    EXPECT_FALSE(enabled("Gruppe_Nach"));
-    click("Gruppe_Vor");
-    EXPECT_EQ(text("Label10"), "Gruppenfolge:0A,10A,2A,");
-    click("Gruppe_Vor");
-    EXPECT_EQ(text("Label10"), "Gruppenfolge:10A,0A,2A,");
-    EXPECT_FALSE(enabled("Gruppe_Vor"));
-    click("Gruppe_Nach");
-    EXPECT_EQ(text("Label10"), "Gruppenfolge:0A,10A,2A,");
-    click("GS_Senden");
-    EXPECT_EQ(sent(), Lines{direct("GS=0A,10A,2A")});
-}
-
-TEST_F(GroupPageTest, AClickOnAGroupMarksIt) {
-    press({0, 2, 10});
-    page.resize(600, 330);
-    page.show();
-    QApplication::processEvents();
-    auto* label = find<QLabel>("Label10");
-    const int x = label->fontMetrics().horizontalAdvance(QStringLiteral("Gruppenfolge:0A,2"));
-    const QPointF at(x, label->margin() + label->fontMetrics().height() / 2.0);
-    QMouseEvent event(QEvent::MouseButtonPress, at, label->mapToGlobal(at), Qt::LeftButton, Qt::LeftButton, {});
-    QApplication::sendEvent(label, &event);
-    click("Gruppe_Vor");
-    EXPECT_EQ(text("Label10"), "Gruppenfolge:2A,0A,10A,");
-}
-
-TEST_F(GroupPageTest, TheShareOfEachGroupIsShown) {
-    press({0, 0, 2, 8});
-    EXPECT_EQ(text("Gruppe_Anteile"), "Anteile: 0A 50 %, 2A 25 %, 8A 25 %");
-    click("newList");
-    EXPECT_EQ(text("Gruppe_Anteile"), "");
-}
-
-TEST_F(GroupPageTest, AComposedSequenceIsMarkedUntilItIsSent) {
-    const auto stateOf = [this] { return find("Label10")->property("zustand").toString().toStdString(); };
-    EXPECT_EQ(stateOf(), "");
-    press({0});
-    EXPECT_EQ(stateOf(), "ungesendet");
-    click("GS_Senden");
-    EXPECT_EQ(stateOf(), "");
-    press({2});
-    EXPECT_EQ(stateOf(), "ungesendet");
-    page.stepGoesOut(parameter("GROUPSEQ", "0A,2A"));  // with the whole data set
-    EXPECT_EQ(stateOf(), "");
-    for (int i = 0; i < 255; ++i) press({0});
-    click("GS_Senden");
-    EXPECT_EQ(stateOf(), "abgelehnt") << "more than the coder takes";
 }
 
 TEST_F(GroupPageTest, TheControlsBearTheirTexts) {

@@ -158,6 +158,15 @@ TEST_F(SentValuesTest, TheEndOfTheDynamicPsSendsTheTypedName) {
     click("Taste_PS_Auto");
     click("Taste_PS_Auto");
     EXPECT_EQ(stateOf("PS_T"), "");
+    EXPECT_EQ(statusState(3), "");
+}
+
+TEST_F(SentValuesTest, WhatTheDynamicPsShowsWithoutASessionIsNotInForce) {
+    state.InstrumentOnline = false;
+    type("PS_T", "RADIO");
+    tick("PS_Timer");  // its first tick comes by itself
+    EXPECT_EQ(status(StatusSlot::Ps), "RADIO");
+    EXPECT_EQ(statusState(3), "ungesendet");
 }
 
 }  // namespace

@@ -144,5 +144,27 @@ TEST_F(TmcListTest, AppendingFailsWhereTheNameIsAFolder) {
     EXPECT_TRUE(fs::is_directory(file()));
 }
 
+TEST_F(TmcListTest, AnEntryIsChangedInItsPlaceAndTheOthersStayByteForByte) {
+    write("no entry\n\nStau;00101\r\nUnfall;00201\nNebel;00301");
+    EXPECT_TRUE(changeInTmcList(file(), 0, "Stau;00101", "Stau, lang", "00102"));
+    EXPECT_TRUE(changeInTmcList(file(), 2, "Nebel;00301", "Schnee", "00302"));
+    EXPECT_EQ(content(), "no entry\n\nStau, lang;00102\r\nUnfall;00201\nSchnee;00302");
+    EXPECT_TRUE(removeFromTmcList(file(), 1, "Unfall;00201"));
+    EXPECT_EQ(content(), "no entry\n\nStau, lang;00102\r\nSchnee;00302");
+    EXPECT_TRUE(removeFromTmcList(file(), 1, "Schnee;00302"));
+    EXPECT_EQ(content(), "no entry\n\nStau, lang;00102\r\n");
+}
+
+TEST_F(TmcListTest, AnEntryThatIsNoLongerThereIsNotChanged) {
+    write("Stau;00101\r\n");
+    EXPECT_FALSE(changeInTmcList(file(), 0, "Unfall;00201", "x", "1"));
+    EXPECT_FALSE(changeInTmcList(file(), 1, "Stau;00101", "x", "1"));
+    EXPECT_FALSE(removeFromTmcList(file(), 0, "Unfall;00201"));
+    EXPECT_EQ(content(), "Stau;00101\r\n");
+    fs::remove(file());
+    EXPECT_FALSE(removeFromTmcList(file(), 0, "Stau;00101"));
+    EXPECT_FALSE(fs::exists(file()));
+}
+
 }  // namespace
 }  // namespace kdx

@@ -11,6 +11,13 @@
 namespace kdx {
 namespace {
 
+TEST(LetterSizeTest, IsTheDesktopsWhereThatIsLargerThanUsual) {
+    EXPECT_EQ(letterSize(9), 8.25);
+    EXPECT_EQ(letterSize(-1), 8.25);  // a font in pixels
+    EXPECT_EQ(letterSize(10), 10);
+    EXPECT_EQ(letterSize(12), 12);
+}
+
 TEST(ApplicationTest, AnExceptionThatLeavesAHandlerIsToldAndTheProgramGoesOn) {
     auto& application = dynamic_cast<Application&>(*QCoreApplication::instance());
     QString doing;

@@ -5,6 +5,8 @@
 #include <QGroupBox>
 #include <QTabBar>
 
+#include <cstdlib>
+
 #include "support/windowtest.h"
 
 namespace kdx::test {
@@ -26,6 +28,15 @@ protected:
             showPage(page);
             QCoreApplication::processEvents();
             look(page);
+        }
+    }
+
+    /// For a look at the window: KDX_SHOTS names the folder.
+    void savePicture(const std::string& name) {
+        if (const char* folderName = std::getenv("KDX_SHOTS")) {
+            const auto file = QString::fromLocal8Bit(folderName) + QLatin1Char('/') + QString::fromStdString(name) +
+                              QStringLiteral("_%1pt.png").arg(QApplication::font().pointSizeF());
+            EXPECT_TRUE(window->grab().save(QString(file).replace(QLatin1Char(' '), QLatin1Char('_'))));
         }
     }
 
@@ -143,6 +154,56 @@ TEST_F(LayoutTest, TheControlsOfAllPagesBearTheSystemsNames) {
     }
     for (const char* timer : {"Timer1", "PS_Timer", "TA_Timer", "TA_Rep_Timer", "EON_TA_Zeit", "TMC_Sende_Timer"}) {
         EXPECT_NE(window->findChild<QTimer*>(QString::fromLatin1(timer)), nullptr) << timer;
+    }
+}
+
+/// The window with another font than the one it was designed with, in points.
+class FontTest : public LayoutTest, public ::testing::WithParamInterface<int> {
+protected:
+    FontTest() {
+        QFont font = m_before;
+        font.setPointSizeF(GetParam());
+        QApplication::setFont(font);
+    }
+    ~FontTest() override {
+        end();
+        QApplication::setFont(m_before);
+    }
+
+private:
+    QFont m_before = QApplication::font();
+};
+
+TEST_P(FontTest, NothingIsCutOffOrOutOfReachAtTheLeastSize) {
+    for (const char* language : kLanguages) {
+        walk(language, [&](int index) {
+            window->resize(1, 1);  // as small as it becomes
+            QCoreApplication::processEvents();
+            const auto where = std::string(language) + " page " + std::to_string(index);
+            expectNothingCutOff(*window, where);
+            const QWidget* page = find<QTabWidget>("SSTab1")->widget(index);
+            EXPECT_LE(page->minimumSizeHint().width(), page->width()) << where;
+            EXPECT_LE(page->minimumSizeHint().height(), page->height()) << where;
+            const auto* bar = find<QTabWidget>("SSTab1")->tabBar();
+            EXPECT_TRUE(bar->usesScrollButtons() || bar->sizeHint().width() <= bar->width()) << where;
+            savePicture(where);
+        });
+    }
+}
+
+INSTANTIATE_TEST_SUITE_P(Points, FontTest, ::testing::Values(8, 10, 12),
+                         [](const auto& tested) { return std::to_string(tested.param); });
+
+TEST_F(LayoutTest, AMaximisedPageKeepsItsControlsTogether) {
+    startShipped();
+    openSession();
+    window->resize(3000, 1500);
+    for (int page = 0; page < 9; ++page) {
+        showPage(page);
+        QCoreApplication::processEvents();
+        for (const QWidget* control : find<QTabWidget>("SSTab1")->widget(page)->findChildren<QWidget*>()) {
+            EXPECT_LE(control->width(), 1300) << control->objectName().toStdString();
+        }
     }
 }
 

@@ -1,0 +1,28 @@
+#include "ui/sentvalue.h"
+
+#include "link/instrument.h"
+#include "settings/programstate.h"
+#include "ui/caption.h"
+#include "ui/text.h"
+
+namespace kdx {
+
+bool linkWorks(const PageContext& with) {
+    return with.state.InstrumentOnline && !with.instrument.isSequenceStopped() && with.instrument.LastVisaStatus >= 0;
+}
+
+void SentValue::wentOut(const std::string& value) {
+    if (linkWorks(m_with)) m_inForce = value;
+}
+
+Judgement SentValue::judge(const std::string& value, const QString& entry) const {
+    if (m_inForce != value) return {ValueState::Unsent, captionText(m_with.captions, {857, "Noch nicht gesendet."})};
+    const QString why = whyRefused(m_with, m_key, entry);
+    return {why.isEmpty() ? ValueState::InForce : ValueState::Refused, why};
+}
+
+Judgement SentValue::judge(const std::string& value) const {
+    return judge(value, toText(value));
+}
+
+}  // namespace kdx
