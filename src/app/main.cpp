@@ -68,6 +68,11 @@ private:
     }
 };
 
+bool isFolder(const std::filesystem::path& folder) {
+    std::error_code error;
+    return std::filesystem::is_directory(folder, error);
+}
+
 /// Where the window's page and place are kept: what concerns this user's desktop is none of the instrument's settings.
 std::filesystem::path placeFile() {
     const QString folder = QStandardPaths::writableLocation(QStandardPaths::GenericConfigLocation);
@@ -104,8 +109,7 @@ int main(int argc, char** argv) {
         std::fprintf(stderr, "kdx-rds: %s\n", link.description.c_str());
         return EXIT_FAILURE;
     }
-    std::error_code error;
-    if (options.appFolder && !std::filesystem::is_directory(*options.appFolder, error)) {
+    if (options.appFolder && !isFolder(*options.appFolder)) {
         std::fprintf(stderr, "kdx-rds: --app-folder: there is no folder %s\n",
                      kdx::shownPath(*options.appFolder).c_str());
         return kUsageError;
