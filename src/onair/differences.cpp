@@ -14,8 +14,8 @@ namespace kdx {
 
 namespace {
 
-using Row = Difference::Row;
-using Why = Difference::Why;
+using Row = AirDifference::Row;
+using Why = AirDifference::Why;
 
 std::string withoutBlanksBehind(std::string_view text) {
     return std::string(text.substr(0, text.find_last_not_of(' ') + 1));
@@ -28,25 +28,25 @@ std::string padded(std::string_view text, std::size_t length) {
 }
 
 /// How a text that was entered differs from the one that the coder sends.
-std::optional<Difference> ofText(Row row, const std::string& entry, std::string_view sent, std::size_t length) {
+std::optional<AirDifference> ofText(Row row, const std::string& entry, std::string_view sent, std::size_t length) {
     const std::string_view sendable = std::string_view(entry).substr(0, length);
-    if (withoutBlanksBehind(sendable) != withoutBlanksBehind(sent)) return Difference{row, Why::Other, entry};
+    if (withoutBlanksBehind(sendable) != withoutBlanksBehind(sent)) return AirDifference{row, Why::Other, entry};
     if (const auto character = withoutRdsCode(sendable))
-        return Difference{row, Why::NoPlace, std::string(1, *character)};
-    if (entry.size() > length) return Difference{row, Why::Cut, entry};
+        return AirDifference{row, Why::NoPlace, std::string(1, *character)};
+    if (entry.size() > length) return AirDifference{row, Why::Cut, entry};
     return std::nullopt;
 }
 
-std::optional<Difference> ofPs(const std::string& entry, std::string_view sent) {
+std::optional<AirDifference> ofPs(const std::string& entry, std::string_view sent) {
     auto difference = ofText(Row::Ps, entry, sent, kPsLength);
     if (difference || entry.size() == kPsLength) return difference;
-    return Difference{Row::Ps, Why::Padded, entry};
+    return AirDifference{Row::Ps, Why::Padded, entry};
 }
 
 /// How a choice that was made differs; one that was not made does not.
-std::optional<Difference> ofChoice(Row row, const std::string& entry, const std::string& sent) {
+std::optional<AirDifference> ofChoice(Row row, const std::string& entry, const std::string& sent) {
     if (entry.empty() || entry == sent) return std::nullopt;
-    return Difference{row, Why::Other, entry};
+    return AirDifference{row, Why::Other, entry};
 }
 
 std::string flag(bool on) {
@@ -58,21 +58,21 @@ public:
     explicit Rows(const air::Shadow& shadow) : m_shadow(shadow) {}
 
     /// @param setting the coder's name of it, by which commands are refused; @param entry what they were to set.
-    void add(std::string_view setting, const std::string& entry, std::optional<Difference> difference) {
+    void add(std::string_view setting, const std::string& entry, std::optional<AirDifference> difference) {
         if (difference && difference->why == Why::Other && m_shadow.isRefused(setting))
-            difference = Difference{difference->row, Why::Refused, entry};
+            difference = AirDifference{difference->row, Why::Refused, entry};
         if (difference) m_rows.push_back(*std::move(difference));
     }
-    std::vector<Difference> take() { return std::move(m_rows); }
+    std::vector<AirDifference> take() { return std::move(m_rows); }
 
 private:
     const air::Shadow& m_shadow;
-    std::vector<Difference> m_rows;
+    std::vector<AirDifference> m_rows;
 };
 
 }  // namespace
 
-std::vector<Difference> differences(const air::Shadow& shadow, const Station& station) {
+std::vector<AirDifference> differences(const air::Shadow& shadow, const Station& station) {
     const sim::Setup& sent = shadow.transmission().settings;
     const Programme& entered = station.programme;
     Rows rows(shadow);

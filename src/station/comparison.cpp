@@ -2,45 +2,11 @@
 
 #include <algorithm>
 #include <iterator>
-#include <set>
-#include <string>
 
-#include "coder/sendparam.h"
 #include "station/rehearsal.h"
-#include "station/station.h"
+#include "station/sentvalues.h"
 
 namespace kdx {
-
-namespace {
-
-/// Which values sending a data set sets, whatever it sets them to.
-class SentValues {
-public:
-    explicit SentValues(const Profile& source) {
-        Station station;
-        station.load(source);
-        for (const Step& step : openingSteps(station, readCorrections(source))) {
-            std::string value = step.value;
-            if (!composeCommand(step.key, value, {}).value_or("").empty()) m_keys.insert(step.key);
-        }
-    }
-
-    [[nodiscard]] bool hold(const std::string& key, const std::string& network) const {
-        // All other networks are removed, and what is added begins anew. The first AF list makes all others go.
-        if (!network.empty()) return true;
-        if (key.starts_with("AF")) return isSent("AF1");
-        if (key == "RT_N") return isSent("RT");
-        if (key == "FM" || key == "AM") return isSent(key + "_AUS");
-        return isSent(key);
-    }
-
-private:
-    [[nodiscard]] bool isSent(const std::string& key) const { return m_keys.count(key) != 0; }
-
-    std::set<std::string> m_keys;
-};
-
-}  // namespace
 
 Comparison compared(DataFolder& data, const Captions& captions, const Profile& source, const Readout& present) {
     Rehearsal rehearsal(data, captions);
