@@ -24,6 +24,8 @@ public:
     virtual QString fileToSave(const QString& /*title*/, const QString& /*preset*/, const QString& /*kind*/) {
         return {};
     }
+    /// Asks for a file to read; else the same.
+    virtual QString fileToOpen(const QString& /*title*/, const QString& /*kind*/) { return {}; }
 };
 
 }  // namespace kdx

@@ -21,6 +21,7 @@ public:
     bool confirm(const QString& title, const QString& text) override;
     QString input(const QString& prompt, const QString& title, const QString& preset) override;
     QString fileToSave(const QString& title, const QString& preset, const QString& kind) override;
+    QString fileToOpen(const QString& title, const QString& kind) override;
 
 private:
     const Captions& m_captions;

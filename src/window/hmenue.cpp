@@ -14,6 +14,7 @@
 
 #include "base/codepage.h"
 #include "base/numbers.h"
+#include "link/commandsequence.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
 #include "settings/generalsettings.h"
@@ -55,7 +56,12 @@ HMenue::HMenue(const Surroundings& surroundings)
                                                                   m_s.clock,           m_s.tickers} {
     setObjectName(QStringLiteral("HMenue"));
     setWindowIcon(QIcon(QStringLiteral(":/kdx-rds-64.png")));
-    m_views = std::make_unique<Views>(m_context, m_s.session.station, this);
+    m_views = std::make_unique<Views>(m_context, m_s.session, this, [this] {
+        m_s.session.load();
+        const CommandSequence silent(m_s.session.instrument);  // what is shown anew is no setting that goes out
+        m_s.session.instrument.stopSequence();
+        loadPages();
+    });
     m_connection = new ConnectionBar(m_context, this);
     connect(m_connection, &ConnectionBar::openRequested, this, &HMenue::INIT_Taste_Click);
     // Every setting was stored when it changed: nothing is left to do at the end.
@@ -82,6 +88,7 @@ HMenue::HMenue(const Surroundings& surroundings)
 }
 
 HMenue::~HMenue() {
+    m_views->endScenario();
     m_s.session.transmitter.setWatcher(nullptr);
     m_s.session.instrument.onFailure(nullptr);
     m_s.data.onUnsavedFileChanged(nullptr);
@@ -131,6 +138,8 @@ void HMenue::createMenu() {
     connect(m_menu, &MainMenu::listEditorRequested, this, &HMenue::Mnu_TMC_Edit_Click);
     connect(m_menu, &MainMenu::logRequested, this, [this] { m_views->openLog(); });
     connect(m_menu, &MainMenu::onAirRequested, this, [this] { m_views->openOnAir(); });
+    connect(m_menu, &MainMenu::compareRequested, this, [this] { m_views->openCompare(); });
+    connect(m_menu, &MainMenu::scenarioRequested, this, [this] { m_views->openScenario(); });
 }
 
 void HMenue::arrange() {
@@ -227,6 +236,7 @@ void HMenue::SetRdsStereo() {
 }
 
 void HMenue::GTL_Taste_Click() {
+    m_views->endScenario();
     m_s.session.close();
     // Only the switched-off pages and the resting timers keep commands away from the closed handle.
     showSessionOpen(false);
@@ -260,9 +270,11 @@ void HMenue::showSessionOpen(bool open) {
     Frame7->setEnabled(open);
     m_connection->showSessionOpen(open);
     m_menu->showSessionOpen(open);
+    m_views->showSessionOpen(open);
 }
 
 bool HMenue::showInterfaceError(const std::string& text, bool sequenceRuns) {
+    if (m_views->takesFailure()) return true;
     // While the box waits, timers would send more to the same broken link and pile up more boxes.
     m_s.tickers.setHeld(true);
     const QString title = QStringLiteral("Interface Error");

@@ -44,6 +44,8 @@ MainMenu::MainMenu(const PageContext& with, const QString& linkDescription, QMai
     Mnu_TMC_Edit = entry("Mnu_TMC_Edit", Mnu_Info, &MainMenu::listEditorRequested);
     Mnu_Info_Log = entry("Mnu_Info_Log", Mnu_Info, &MainMenu::logRequested);
     Mnu_Ansicht_OnAir = entry("Mnu_Ansicht_OnAir", Mnu_Info, &MainMenu::onAirRequested);
+    Mnu_Ansicht_Vergleich = entry("Mnu_Ansicht_Vergleich", Mnu_Info, &MainMenu::compareRequested);
+    Mnu_Ansicht_Ablauf = entry("Mnu_Ansicht_Ablauf", Mnu_Info, &MainMenu::scenarioRequested);
     for (QAction* choice : {Mnu_Info_Sprache_D, Mnu_Info_Sprache_E, Mnu_Info_Sprache_US, Mnu_Info_RDS_RBDS}) {
         choice->setCheckable(true);
     }
@@ -66,6 +68,8 @@ void MainMenu::label() {
     Mnu_TMC_Edit->setText(text({304, "TMC Edit"}));
     Mnu_Info_Log->setText(text({680, "Log"}));
     Mnu_Ansicht_OnAir->setText(text({720, "Auf Sendung"}));
+    Mnu_Ansicht_Vergleich->setText(text({957, "Vergleich"}));
+    Mnu_Ansicht_Ablauf->setText(text({974, "Ablauf"}));
     Mnu_Info_Sprache_D->setChecked(m_with.state.language == "deutsch");
     Mnu_Info_Sprache_E->setChecked(m_with.state.language == "english");
     Mnu_Info_Sprache_US->setChecked(m_with.state.language == "english US");

@@ -32,6 +32,8 @@ signals:
     void listEditorRequested();
     void logRequested();
     void onAirRequested();
+    void compareRequested();
+    void scenarioRequested();
 
 private:
     void Mnu_Info_Interface_IEC_Click();
@@ -62,6 +64,8 @@ private:
     QAction* Mnu_TMC_Edit = nullptr;
     QAction* Mnu_Info_Log = nullptr;  // opens the live view of the commands
     QAction* Mnu_Ansicht_OnAir = nullptr;
+    QAction* Mnu_Ansicht_Vergleich = nullptr;
+    QAction* Mnu_Ansicht_Ablauf = nullptr;
 };
 
 }  // namespace kdx

@@ -68,6 +68,8 @@ public:
         return file;
     }
 
+    QString fileToOpen(const QString& title, const QString& kind) override { return fileToSave(title, {}, kind); }
+
     ~ScriptedDialogs() override {
         EXPECT_EQ(expectedMessages, 0) << "a box that was expected did not show";
         EXPECT_TRUE(inputs.empty()) << "an input box that was expected did not show";
