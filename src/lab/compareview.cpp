@@ -186,7 +186,9 @@ void CompareView::show(const QString& also) {
 void CompareView::showRow(int row, const SettingSideBySide& setting) {
     const QString network = setting.network.empty() ? QString() : QLatin1String("  ") + toText(setting.network);
     const auto shown = [](const std::optional<std::string>& value) {
-        return value ? toText(printableLine(*value, '\xB7')) : QStringLiteral("\u2013");
+        if (!value) return QStringLiteral("\u2013");
+        const bool list = value->starts_with("N,") || value->starts_with("+,");  // how it is sent is no part of it
+        return toText(printableLine(list ? value->substr(2) : *value, '\xB7'));
     };
     const bool silent = !setting.instrument && !m_present.empty() && setting.network.empty();
     const QStringList cells{settingName(setting.key, m_with.captions) + network +

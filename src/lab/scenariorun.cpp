@@ -73,11 +73,8 @@ std::string ScenarioRun::begin(const scenario::Scenario& scenario, const std::fi
 void ScenarioRun::sendDataSet(int number) {
     const Station shown = m_session.station;
     const auto back = qScopeGuard([&] {
-        const Carrier carrier = m_session.station.carrier;
         m_session.load();
         m_session.station = shown;
-        m_session.station.carrier.outputOn = carrier.outputOn;  // the switch shows what is in force
-        m_session.station.carrier.everOpened = carrier.everOpened;
     });
     m_session.station = Station();
     m_session.load(Profile::ofFile(m_with.data, dataSetFile(std::to_string(number))));

@@ -35,6 +35,8 @@ public:
     bool takesFailure();
 
     [[nodiscard]] bool isRunning() const { return m_runner != nullptr; }
+    /// Whether what goes out right now is the run's.
+    [[nodiscard]] bool isAtWork() const { return m_inside; }
     [[nodiscard]] bool isHeld() const { return m_clock.isHeld(); }
     /// Whether a step waits for a person, or would end at a word of one.
     [[nodiscard]] bool asks() const { return m_asks; }

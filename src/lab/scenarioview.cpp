@@ -106,6 +106,10 @@ bool ScenarioView::isRunning() const {
     return m_run->isRunning();
 }
 
+bool ScenarioView::isAtWork() const {
+    return m_run->isAtWork();
+}
+
 void ScenarioView::stop() {
     m_run->stop();
 }

@@ -26,6 +26,8 @@ public:
     void label();
     void showSessionOpen(bool open);
     [[nodiscard]] bool isRunning() const;
+    /// Whether what goes out right now is the scenario's, which the window does not show as its own.
+    [[nodiscard]] bool isAtWork() const;
     /// Ends a run after its running command; what stood before comes back.
     void stop();
     /// Ends a run at once, as the session is to be closed.

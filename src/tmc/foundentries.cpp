@@ -16,6 +16,10 @@ void FoundEntries::search(const QAbstractItemModel& entries, const QString& text
                                        [&](const QString& word) { return entry.contains(word, Qt::CaseInsensitive); });
         if (found) m_rows.push_back(row);
     }
+    // What begins so is more likely meant than what has it somewhere within a word.
+    std::stable_partition(m_rows.begin(), m_rows.end(), [&](int row) {
+        return entries.index(row, 0).data().toString().startsWith(words.front(), Qt::CaseInsensitive);
+    });
     endResetModel();
 }
 

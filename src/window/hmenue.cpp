@@ -247,6 +247,7 @@ void HMenue::stepGoesOut(const Step& step, std::size_t number, std::size_t total
     if (number > 0) {
         m_lowerEdge->showProgress(captionText(m_s.captions, {324, "Sende Befehl %1 von %2"}), number, total);
     }
+    if (m_views->scenarioSends()) return;  // the pages show what the window has
     // A refused step shows a box: no timer may change meanwhile what the steps after it were made of.
     if (step.kind == Step::Kind::Refused) m_s.tickers.setHeld(true);
     for (Page* page : m_pages) page->stepGoesOut(step);

@@ -57,6 +57,7 @@ LogView::LogView(TrafficLog& log, const PageContext& with, QWidget* parent)
     Log_Liste->setSelectionBehavior(QAbstractItemView::SelectRows);
     Log_Liste->setShowGrid(false);
     Log_Liste->setWordWrap(false);
+    Log_Liste->setVerticalScrollMode(QAbstractItemView::ScrollPerPixel);
     Log_Liste->verticalHeader()->hide();
     Log_Liste->verticalHeader()->setDefaultSectionSize(fontMetrics().height() + 2);
     Log_Liste->verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
@@ -65,10 +66,15 @@ LogView::LogView(TrafficLog& log, const PageContext& with, QWidget* parent)
     Log_Liste->setColumnWidth(TrafficLog::Time, letter * 14);
     Log_Liste->setColumnWidth(TrafficLog::Direction, letter * 10);
     Log_Liste->setColumnWidth(TrafficLog::Status, letter * 16);
-    connect(m_filtered, &QAbstractItemModel::rowsInserted, this, [this](const QModelIndex&, int first, int last) {
-        fit(first, last);
-        followEnd();
+    connect(m_filtered, &QAbstractItemModel::rowsInserted, this,
+            [this](const QModelIndex&, int first, int last) { fit(first, last); });
+    // The end stays in view until the user looks further up.
+    QScrollBar* bar = Log_Liste->verticalScrollBar();
+    connect(bar, &QScrollBar::rangeChanged, this, [this, bar] {
+        if (m_follows) bar->setValue(bar->maximum());
     });
+    connect(bar, &QScrollBar::valueChanged, this,
+            [this, bar] { m_follows = bar->value() >= bar->maximum() - bar->singleStep(); });
     // What is wrapped needs other heights when its column gets another width.
     connect(Log_Liste->horizontalHeader(), &QHeaderView::sectionResized, this,
             [this] { fit(0, m_filtered->rowCount() - 1); });
@@ -116,7 +122,6 @@ void LogView::Log_Umbruch_Click(bool wrapped) {
     const int line = Log_Liste->verticalHeader()->defaultSectionSize();
     for (int row = 0; !wrapped && row < m_filtered->rowCount(); ++row) Log_Liste->setRowHeight(row, line);
     fit(0, m_filtered->rowCount() - 1);
-    followEnd();
 }
 
 /// Only these rows: to measure all of them at every command would take its time.
@@ -156,13 +161,8 @@ QString LogView::text(QList<int> rows) const {
 
 void LogView::showEvent(QShowEvent* event) {
     QDialog::showEvent(event);
+    m_follows = true;
     Log_Liste->scrollToBottom();
-}
-
-void LogView::followEnd() {
-    // Only while the user looks at the end: reading further up must not be disturbed.
-    const QScrollBar* bar = Log_Liste->verticalScrollBar();
-    if (bar->value() >= bar->maximum() - 1) Log_Liste->scrollToBottom();
 }
 
 }  // namespace kdx

@@ -28,7 +28,6 @@ private:
     void Log_Umbruch_Click(bool wrapped);
     void Log_Sichern_Click();
     void copy();
-    void followEnd();
     void fit(int first, int last);
     /// The lines, of all that is shown unless given.
     [[nodiscard]] QString text(QList<int> rows = {}) const;
@@ -44,6 +43,7 @@ private:
     QPushButton* m_copy = nullptr;
     QPushButton* m_clear = nullptr;
     QPushButton* m_close = nullptr;
+    bool m_follows = true;
 };
 
 }  // namespace kdx

@@ -1,8 +1,7 @@
 #include "window/trafficlog.h"
 
 #include <QBrush>
-#include <QGuiApplication>
-#include <QPalette>
+#include <QColor>
 #include <QTime>
 
 #include <utility>
@@ -16,6 +15,8 @@
 namespace kdx {
 
 namespace {
+
+constexpr QColor kUnsentColour(0x75, 0x75, 0x75);  // to be read on light and dark
 
 /// A tip is as wide as its longest line.
 QString inLines(const QString& text) {
@@ -141,7 +142,7 @@ QVariant TrafficLog::data(const QModelIndex& index, int role) const {
             return inLines(cell(line, Text));
         case Qt::ForegroundRole:
             if (line.status < 0 || endsItsTextEarly(line.text)) return QBrush(Qt::red);
-            if (line.kind == Kind::Unsent) return QGuiApplication::palette().brush(QPalette::Disabled, QPalette::Text);
+            if (line.kind == Kind::Unsent) return QBrush(kUnsentColour);
             return {};
         default:
             return {};

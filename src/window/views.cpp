@@ -77,6 +77,10 @@ void Views::showSessionOpen(bool open) {
     if (m_scenarioView != nullptr) m_scenarioView->showSessionOpen(open);
 }
 
+bool Views::scenarioSends() const {
+    return m_scenarioView != nullptr && m_scenarioView->isAtWork();
+}
+
 void Views::endScenario() {
     if (m_scenarioView != nullptr) m_scenarioView->finish();
 }

@@ -35,6 +35,8 @@ public:
     void showSessionOpen(bool open);
     /// Null before it was first opened.
     [[nodiscard]] ScenarioView* scenario() const { return m_scenarioView.get(); }
+    /// Whether what goes out right now is a scenario's.
+    [[nodiscard]] bool scenarioSends() const;
     /// The session is to be closed: a scenario that runs brings back what stood before.
     void endScenario();
     /// A command failed. @returns whether nobody need be told any more.

@@ -154,6 +154,12 @@ TEST_F(CompareViewTest, ShowsTheGeneratorsValueThatTheWindowShows) {
     EXPECT_EQ(cells("HF-Frequenz [MHz]"), "99.1|98.5|99.1|!");
 }
 
+TEST_F(CompareViewTest, ShowsListsWithoutTheWayTheyAreSent) {
+    openView();
+    const std::string list = profile(kSet1, "RDS", "AF_LISTE2");
+    EXPECT_EQ(cells("AF Liste 2"), list + "|" + list + "|–|");
+}
+
 TEST_F(CompareViewTest, HidesWhatIsTheSameWhenOnlyDifferencesAreWanted) {
     openView();
     send(direct("PS=FREMD"));

@@ -171,6 +171,7 @@ TEST_F(ScenarioViewTest, ADataSetGoesOutFirstAndTheWindowKeepsWhatItShows) {
     EXPECT_EQ(value("PS"), "DREI");
     EXPECT_EQ(value("HF:PEGEL:STATE"), "ON");  // as of a program that was just started
     EXPECT_EQ(text("PS_T"), "MESSTURM");
+    EXPECT_EQ(text("Status_3"), "MESSTURM");
     EXPECT_EQ(session->station.programme.ps, "MESSTURM");
     EXPECT_EQ(state.CurrentDataSet, "1");
     type("PS_T", "EIGEN");

@@ -39,6 +39,14 @@ TEST_F(SearchComboTest, FindsEntriesByAnyPartOfTheirWords) {
     EXPECT_EQ(found(), Lines{});
 }
 
+TEST_F(SearchComboTest, WhatBeginsWithTheTextComesFirst) {
+    folder.write("Event.txt", "Restaurant offen;00001\r\nStau;00101\r\n");
+    page->reloadLists();
+    find<QComboBox>("TMC_Event_Combo")->showPopup();
+    type("TMC_Event_Combo_Suche", "stau");
+    EXPECT_EQ(found(), (Lines{"Stau", "Restaurant"}));
+}
+
 TEST_F(SearchComboTest, FindsEntriesByTheirCodes) {
     find<QComboBox>("TMC_Event_Combo")->showPopup();
     type("TMC_Event_Combo_Suche", "1015");

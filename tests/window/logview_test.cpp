@@ -5,6 +5,7 @@
 #include <QClipboard>
 #include <QGuiApplication>
 #include <QPushButton>
+#include <QScrollBar>
 #include <QTableView>
 
 #include "support/layoutcheck.h"
@@ -154,6 +155,22 @@ TEST_F(LogViewTest, ATipHasTheWholeTextAndItIsWrappedOnDemand) {
     EXPECT_GT(table->rowHeight(1), 2 * line);
     click("Log_Umbruch");
     EXPECT_EQ(table->rowHeight(0), line);
+}
+
+TEST_F(LogViewTest, WrappingKeepsTheEndInView) {
+    open();
+    for (int i = 0; i < 60; ++i)
+        session->params.SendParam("GROUPSEQ", std::string("0A,2A,0A,2A,0A,2A,0A,2A,0A,2A,0A,2A,0A,2A,0A,2A,0A,"));
+    click("Log_Umbruch");
+    session->params.SendParam("TA", std::string("1"));
+    QCoreApplication::processEvents();
+    EXPECT_EQ(table->verticalScrollBar()->value(), table->verticalScrollBar()->maximum());
+    EXPECT_GT(table->verticalScrollBar()->maximum(), 0);
+    // Who reads further up is not disturbed.
+    table->verticalScrollBar()->setValue(20);
+    session->params.SendParam("TA", std::string("0"));
+    QCoreApplication::processEvents();
+    EXPECT_EQ(table->verticalScrollBar()->value(), 20);
 }
 
 TEST_F(LogViewTest, SavesTheLinesThatAreShown) {
