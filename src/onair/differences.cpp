@@ -15,8 +15,8 @@ namespace kdx {
 
 namespace {
 
-using Row = Difference::Row;
-using Why = Difference::Why;
+using Row = AirDifference::Row;
+using Why = AirDifference::Why;
 
 std::string withoutBlanksBehind(std::string_view text) {
     return std::string(text.substr(0, text.find_last_not_of(' ') + 1));
@@ -29,25 +29,25 @@ std::string padded(std::string_view text, std::size_t length) {
 }
 
 /// How a text that was entered differs from the one that the coder sends.
-std::optional<Difference> ofText(Row row, const std::string& entry, std::string_view sent, std::size_t length) {
+std::optional<AirDifference> ofText(Row row, const std::string& entry, std::string_view sent, std::size_t length) {
     const std::string_view sendable = std::string_view(entry).substr(0, length);
-    if (withoutBlanksBehind(sendable) != withoutBlanksBehind(sent)) return Difference{row, Why::Other, entry};
+    if (withoutBlanksBehind(sendable) != withoutBlanksBehind(sent)) return AirDifference{row, Why::Other, entry};
     if (const auto character = withoutRdsCode(sendable))
-        return Difference{row, Why::NoPlace, std::string(1, *character)};
-    if (entry.size() > length) return Difference{row, Why::Cut, entry};
+        return AirDifference{row, Why::NoPlace, std::string(1, *character)};
+    if (entry.size() > length) return AirDifference{row, Why::Cut, entry};
     return std::nullopt;
 }
 
-std::optional<Difference> ofPs(const std::string& entry, std::string_view sent) {
+std::optional<AirDifference> ofPs(const std::string& entry, std::string_view sent) {
     auto difference = ofText(Row::Ps, entry, sent, kPsLength);
     if (difference || entry.size() == kPsLength) return difference;
-    return Difference{Row::Ps, Why::Padded, entry};
+    return AirDifference{Row::Ps, Why::Padded, entry};
 }
 
 /// How a choice that was made differs; one that was not made does not.
-std::optional<Difference> ofChoice(Row row, const std::string& entry, const std::string& sent) {
+std::optional<AirDifference> ofChoice(Row row, const std::string& entry, const std::string& sent) {
     if (entry.empty() || entry == sent) return std::nullopt;
-    return Difference{row, Why::Other, entry};
+    return AirDifference{row, Why::Other, entry};
 }
 
 std::string flag(bool on) {
@@ -55,15 +55,15 @@ std::string flag(bool on) {
 }
 
 /// How the radiotext that was entered differs from what the groups of the sequence carry of it.
-std::optional<Difference> ofRadiotext(const std::string& entry, const sim::Setup& sent) {
+std::optional<AirDifference> ofRadiotext(const std::string& entry, const sim::Setup& sent) {
     if (auto difference = ofText(Row::Radiotext, entry, sent.radiotext, kRadiotextLength)) return difference;
     const auto ring = air::groupRing(sent.groupSequence);
     const auto has = [&ring](air::GroupType type) { return std::ranges::find(ring, type) != ring.end(); };
     if (entry.empty() || has(air::GroupType::Radiotext2A)) return std::nullopt;
-    if (!has(air::GroupType::Radiotext2B)) return Difference{Row::Radiotext, Why::Other, entry};
+    if (!has(air::GroupType::Radiotext2B)) return AirDifference{Row::Radiotext, Why::Other, entry};
     constexpr std::size_t kShortRadiotext = 32;  // of groups 2B
     if (entry.size() <= kShortRadiotext) return std::nullopt;
-    return Difference{Row::Radiotext, Why::Cut, entry};
+    return AirDifference{Row::Radiotext, Why::Cut, entry};
 }
 
 class Rows {
@@ -72,23 +72,23 @@ public:
 
     /// @param setting the coder's name of it, by which commands are refused; @param entry what they were to set, of
     /// which no more than the length goes out.
-    void add(std::string_view setting, const std::string& entry, std::optional<Difference> difference,
+    void add(std::string_view setting, const std::string& entry, std::optional<AirDifference> difference,
              std::size_t length = std::string_view::npos) {
         const std::string_view goesOut = std::string_view(entry).substr(0, length);
         if (difference && difference->why == Why::Other && m_shadow.isRefused(setting, goesOut))
-            difference = Difference{difference->row, Why::Refused, entry};
+            difference = AirDifference{difference->row, Why::Refused, entry};
         if (difference) m_rows.push_back(*std::move(difference));
     }
-    std::vector<Difference> take() { return std::move(m_rows); }
+    std::vector<AirDifference> take() { return std::move(m_rows); }
 
 private:
     const air::Shadow& m_shadow;
-    std::vector<Difference> m_rows;
+    std::vector<AirDifference> m_rows;
 };
 
 }  // namespace
 
-std::vector<Difference> differences(const air::Shadow& shadow, const Station& station) {
+std::vector<AirDifference> differences(const air::Shadow& shadow, const Station& station) {
     const sim::Setup& sent = shadow.transmission().settings;
     const Programme& entered = station.programme;
     Rows rows(shadow);

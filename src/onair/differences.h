@@ -11,7 +11,7 @@ class Shadow;
 }
 
 /// Something that the radio shows otherwise than the entry field or the panel says.
-struct Difference {
+struct AirDifference {
     enum class Row { Pi, Ps, Radiotext, Pty, Tp, Ta, MusicSpeech, DecoderInfo, StereoMode };
     enum class Why {
         Other,    ///< nothing of the following
@@ -26,6 +26,6 @@ struct Difference {
 };
 
 /// At most one a row, the one that matters most; none of what a radio that hears nothing does not show.
-[[nodiscard]] std::vector<Difference> differences(const air::Shadow& shadow, const Station& station);
+[[nodiscard]] std::vector<AirDifference> differences(const air::Shadow& shadow, const Station& station);
 
 }  // namespace kdx

@@ -17,7 +17,7 @@ namespace kdx {
 
 namespace {
 
-/// As Difference::Row counts, and the clock behind.
+/// As AirDifference::Row counts, and the clock behind.
 enum Row { Pi, Ps, Radiotext, Pty, Tp, Ta, MusicSpeech, DecoderInfo, StereoMode, ClockTime };
 
 struct RowCaption {
@@ -112,7 +112,7 @@ void RadioFace::label() {
 void RadioFace::show(const air::Shadow& shadow, const Station& station) {
     showValues(shadow);
     std::array<QString, kRows> reasons;
-    for (const Difference& difference : differences(shadow, station))
+    for (const AirDifference& difference : differences(shadow, station))
         reasons.at(static_cast<std::size_t>(difference.row)) = reasonOf(difference);
     for (std::size_t i = 0; i < kRows; ++i) mark(m_rows.at(i), reasons.at(i));
 }
@@ -141,25 +141,25 @@ void RadioFace::showValues(const air::Shadow& shadow) {
     showText(m_rows[ClockTime].value, radio.clock ? clockText(*radio.clock) : QString());
 }
 
-QString RadioFace::reasonOf(const Difference& difference) const {
+QString RadioFace::reasonOf(const AirDifference& difference) const {
     const QString entry = QLatin1Char('"') + toText(difference.entry) + QLatin1Char('"');
     switch (difference.why) {
-        case Difference::Why::Refused: {
+        case AirDifference::Why::Refused: {
             const QString why = caption({791, "Der Coder nimmt %1 nicht an"}).arg(entry);
             return difference.entry.find('"') == std::string::npos
                        ? why
                        : withRemedy(why, &Corrections::quotes, m_with.captions, m_with.state);
         }
-        case Difference::Why::Cut:
+        case AirDifference::Why::Cut:
             return caption({792, "Für die Anzeige gekürzt; eingegeben ist %1"}).arg(entry);
-        case Difference::Why::Padded:
+        case AirDifference::Why::Padded:
             return caption({793, "Mit Leerzeichen aufgefüllt; eingegeben ist %1"}).arg(entry);
-        case Difference::Why::NoPlace:
+        case AirDifference::Why::NoPlace:
             return caption({794, "RDS kennt das Zeichen %1 nicht: das Radio zeigt ein Leerzeichen"}).arg(entry);
-        case Difference::Why::Other:
+        case AirDifference::Why::Other:
             break;
     }
-    if (difference.row == Difference::Row::StereoMode && !difference.entry.empty()) {
+    if (difference.row == AirDifference::Row::StereoMode && !difference.entry.empty()) {
         const auto mode = difference.entry.front() - '0';
         if (mode >= 0 && mode < static_cast<int>(std::size(kStereoModes))) {
             const QString why = caption({795, "Im Fenster heißt diese Einstellung %1"})

@@ -12,7 +12,7 @@ class QLabel;
 
 namespace kdx {
 
-struct Difference;
+struct AirDifference;
 struct Station;
 namespace air {
 class Shadow;
@@ -38,7 +38,7 @@ private:
     void arrange();
     void showValues(const air::Shadow& shadow);
     void mark(Row& row, const QString& why) const;
-    [[nodiscard]] QString reasonOf(const Difference& difference) const;
+    [[nodiscard]] QString reasonOf(const AirDifference& difference) const;
     [[nodiscard]] QString caption(const Caption& caption) const;
 
     PageContext m_with;

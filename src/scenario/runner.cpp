@@ -1,6 +1,7 @@
 #include "scenario/runner.h"
 
 #include <algorithm>
+#include <exception>
 #include <utility>
 
 #include "af/settings.h"
@@ -20,6 +21,7 @@ namespace {
 constexpr std::chrono::milliseconds kCommandPause{kCommandPauseMs};
 constexpr int kRestoringTries = 5;  // an instrument that keeps silent for some seconds answers again
 constexpr std::chrono::seconds kBetweenTries{1};
+constexpr std::chrono::nanoseconds kOthersTurn{0};      // who has other things to do may do them between two commands
 constexpr std::chrono::milliseconds kLongestSleep{50};  // who stops a run or presses Return need not wait longer
 
 using Kind = Action::Kind;
@@ -54,41 +56,68 @@ auto Runner::silently(Asks asks) {
 }
 
 Outcome Runner::run(const Scenario& scenario, RunOptions options) {
-    m_options = std::move(options);
-    const bool restores = scenario.restore && m_with.restorer != nullptr;
-    const bool begins = !restores || silently([&] { return m_with.restorer->remember(); });
-    if (begins) {
-        try {
-            play(scenario);
-        } catch (...) {
-            if (restores) bringBack();
-            throw;
-        }
-        if (restores) bringBack();
+    start(scenario, std::move(options));
+    while (const auto pause = goOn()) {
+        if (pause->count() > 0) m_with.clock.sleep(*pause);
     }
-    m_with.watcher.ended(m_outcome);
     return m_outcome;
 }
 
-void Runner::play(const Scenario& scenario) {
+void Runner::start(const Scenario& scenario, RunOptions options) {
+    m_options = std::move(options);
+    m_whole.emplace(whole(scenario));
+    m_whole->beginIn(m_pauses);
+}
+
+std::optional<std::chrono::nanoseconds> Runner::goOn() {
+    const auto pause = m_pauses.goOn();
+    if (!pause) (void)m_whole->result();
+    return pause;
+}
+
+Runner::Course Runner::whole(const Scenario& scenario) {
+    const bool restores = scenario.restore && m_with.restorer != nullptr;
+    const bool begins = !restores || silently([&] { return m_with.restorer->remember(); });
+    if (begins) {
+        std::exception_ptr failure;  // nothing can be waited for while it is caught
+        try {
+            (void)co_await play(scenario);
+        } catch (...) {
+            failure = std::current_exception();
+        }
+        if (restores) (void)co_await bringBack();
+        if (failure) std::rethrow_exception(failure);
+    }
+    m_with.watcher.ended(m_outcome);
+    co_return Flow::Ends;
+}
+
+Runner::Course Runner::play(const Scenario& scenario) {
     m_place = kOpening;
     if (scenario.dataSet) {
         m_wholeSent = true;
-        m_with.session.sendOpening();
+        if (m_with.sendDataSet) {
+            m_with.sendDataSet();
+        } else {
+            m_with.session.sendOpening();
+        }
     }
     m_place.clear();
     m_schedule.goOnFromNow();
-    m_outcome.complete = goesOn() && list(scenario.actions) != Flow::Ends && goesOn();
+    Flow flow = Flow::Ends;
+    if (goesOn()) flow = co_await list(scenario.actions);
+    m_outcome.complete = flow != Flow::Ends && goesOn();
+    co_return flow;
 }
 
-void Runner::bringBack() {
+Runner::Course Runner::bringBack() {
     m_with.attendant.finishes();
     const std::set<std::string> sent = std::exchange(m_sent, {});
     m_place = kRestoring;
     m_setting = {};
     m_outcome.restored = bringBackOnce();
     for (int left = kRestoringTries - 1; left > 0 && !m_outcome.restored; --left) {
-        m_with.clock.sleep(kBetweenTries);
+        co_await m_pauses.pause(kBetweenTries);
         m_outcome.restored = bringBackOnce();
     }
     if (!m_outcome.restored) m_outcome.changed.assign(sent.begin(), sent.end());
@@ -98,6 +127,7 @@ void Runner::bringBack() {
                             });
         if (wasSet) m_outcome.untold.push_back(key);
     }
+    co_return Flow::Ends;
 }
 
 bool Runner::bringBackOnce() {
@@ -114,7 +144,7 @@ bool Runner::bringBackOnce() {
     return allSent && changed;
 }
 
-Runner::Flow Runner::list(const std::vector<Action>& actions) {
+Runner::Course Runner::list(const std::vector<Action>& actions) {
     std::size_t begin = 1;
     if (m_options.from) {
         const auto& parts = m_options.from->parts;
@@ -126,44 +156,42 @@ Runner::Flow Runner::list(const std::vector<Action>& actions) {
     Flow flow = Flow::Next;
     for (std::size_t step = begin; step <= actions.size() && flow == Flow::Next; ++step) {
         m_number.parts.back() = {step, 0};
-        flow = one(actions[step - 1]);
+        flow = co_await one(actions[step - 1]);
         if (flow == Flow::Next) flow = unlessReached();
     }
     m_number.parts.pop_back();
-    return flow;
+    co_return flow;
 }
 
-Runner::Flow Runner::one(const Action& action) {
-    if (!goesOn()) return Flow::Ends;
+Runner::Course Runner::one(const Action& action) {
+    co_await m_pauses.pause(kOthersTurn);
+    if (!goesOn()) co_return Flow::Ends;
     const bool asks = action.kind == Kind::Pause || action.untilReturn;
     if (asks && !m_options.nobodyThere) m_with.attendant.forgetsTyped();
     m_with.watcher.begins(m_number.text(), action);
     switch (action.kind) {
         case Kind::Send:
-            for (const auto& [key, value] : action.settings) {
-                if (send(key, value) == Flow::Ends) return Flow::Ends;
-            }
-            return Flow::Next;
+            co_return co_await sendAll(action);
         case Kind::Wait:
             m_schedule.wait(action.time);
-            return waitUntil(m_schedule.due());
+            co_return co_await waitUntil(m_schedule.due());
         case Kind::Expect:
-            return expect(action);
+            co_return co_await expect(action);
         case Kind::Sweep:
         case Kind::Repeat:
-            return loop(action);
+            co_return co_await loop(action);
         case Kind::TrafficMessage:
-            return message(action.text);
+            co_return message(action.text);
         case Kind::Pause:
-            return pause(action);
+            co_return co_await pause(action);
         case Kind::Note:
             tell({{}, {}, kNoteRow, action.text, {}, {}, {}});
-            return afterCommand();
+            co_return afterCommand();
     }
-    return Flow::Next;
+    co_return Flow::Next;
 }
 
-Runner::Flow Runner::loop(const Action& action) {
+Runner::Course Runner::loop(const Action& action) {
     std::size_t first = 1;
     if (m_options.from) {
         const auto& parts = m_options.from->parts;
@@ -175,7 +203,7 @@ Runner::Flow Runner::loop(const Action& action) {
     if (action.kind == Kind::Sweep && late) m_schedule.goOnFromNow();
     const bool listens = action.untilReturn && !m_options.nobodyThere;
     if (listens) ++m_listening;
-    const Flow flow = passes(action, first);
+    const Flow flow = co_await passes(action, first);
     if (listens) --m_listening;
     if (action.untilReturn && (flow == Flow::Next || flow == Flow::Returned)) {
         // What was reached when the person pressed Return is what the loop was for.
@@ -190,31 +218,40 @@ Runner::Flow Runner::loop(const Action& action) {
               {}});
     }
     m_number.parts.back().pass = 0;
-    if (flow != Flow::Returned || !listens) return flow;
+    if (flow != Flow::Returned || !listens) co_return flow;
     m_schedule.goOnFromNow();
-    return afterCommand();
+    co_return afterCommand();
 }
 
-Runner::Flow Runner::passes(const Action& action, std::size_t first) {
+Runner::Course Runner::passes(const Action& action, std::size_t first) {
     for (std::size_t number = first; number <= passesOf(action); ++number) {
         m_number.parts.back().pass = number;
-        if (!goesOn()) return Flow::Ends;
-        Flow flow = pass(action);
+        if (!goesOn()) co_return Flow::Ends;
+        Flow flow = co_await pass(action);
         if (flow == Flow::Next) flow = unlessReached();
-        if (flow != Flow::Next) return flow;
+        if (flow != Flow::Next) co_return flow;
     }
-    return Flow::Next;
+    co_return Flow::Next;
 }
 
 /// A sweep's point lasts `time` at least, its steps included.
-Runner::Flow Runner::pass(const Action& action) {
+Runner::Course Runner::pass(const Action& action) {
     const Schedule::Time begin = m_schedule.due();
     if (action.kind == Kind::Sweep && send(action.key, action.points[m_number.parts.back().pass - 1]) == Flow::Ends)
-        return Flow::Ends;
-    const Flow flow = action.actions.empty() ? Flow::Next : list(action.actions);
-    if (flow != Flow::Next) return flow;
+        co_return Flow::Ends;
+    Flow flow = Flow::Next;
+    if (!action.actions.empty()) flow = co_await list(action.actions);
+    if (flow != Flow::Next) co_return flow;
     m_schedule.waitUntil(begin + action.time);
-    return waitUntil(m_schedule.due());
+    co_return co_await waitUntil(m_schedule.due());
+}
+
+Runner::Course Runner::sendAll(const Action& action) {
+    for (const auto& [key, value] : action.settings) {
+        if (send(key, value) == Flow::Ends) co_return Flow::Ends;
+        co_await m_pauses.pause(kOthersTurn);
+    }
+    co_return afterCommand();
 }
 
 Runner::Flow Runner::send(const std::string& key, const std::string& value) {
@@ -232,24 +269,24 @@ Runner::Flow Runner::message(const std::string& code) {
     return send(setting::kTrafficMessage.sendKey, sentMessage(code));
 }
 
-Runner::Flow Runner::expect(const Action& action) {
+Runner::Course Runner::expect(const Action& action) {
     const Schedule::Time begin = m_with.clock.steadyNow();
     bool waited = false;
     for (const Action::Expectation& expectation : action.expected) {
         Row row{{}, {}, expectation.name, shown(expectation.values), {}, {}, {}};
-        const Flow flow = askUntilMet(expectation, begin + action.time, row, waited);
+        const Flow flow = co_await askUntilMet(expectation, begin + action.time, row, waited);
         const bool cutOff = row.status == kNotMet && m_with.clock.steadyNow() < begin + action.time;
         if (cutOff) row.status = kCutOff;  // stopped: it might have been met yet
         tell(row);
         if (row.status == kNotMet) ++m_outcome.unmet;
-        if (flow != Flow::Next) return flow;
+        if (flow != Flow::Next) co_return flow;
     }
     if (waited) m_schedule.goOnFromNow();
-    return afterCommand();
+    co_return afterCommand();
 }
 
-Runner::Flow Runner::askUntilMet(const Action::Expectation& expectation, Schedule::Time deadline, Row& row,
-                                 bool& waited) {
+Runner::Course Runner::askUntilMet(const Action::Expectation& expectation, Schedule::Time deadline, Row& row,
+                                   bool& waited) {
     for (;;) {
         const Schedule::Time asked = m_with.clock.steadyNow();
         const auto question = questionOf(expectation.name, m_with.state.eonIdentifier).value();
@@ -260,38 +297,39 @@ Runner::Flow Runner::askUntilMet(const Action::Expectation& expectation, Schedul
         const bool met =
             std::equal(answers.begin(), answers.end(), expectation.values.begin(), expectation.values.end(), isAnswer);
         row.status = met ? kMet : kNotMet;
-        if (!goesOn()) return Flow::Ends;
-        if (met || m_with.clock.steadyNow() >= deadline) return Flow::Next;
+        if (!goesOn()) co_return Flow::Ends;
+        if (met || m_with.clock.steadyNow() >= deadline) co_return Flow::Next;
         waited = true;
-        if (const Flow flow = waitUntil(std::min(asked + kPollInterval, deadline)); flow != Flow::Next) return flow;
+        const Flow flow = co_await waitUntil(std::min(asked + kPollInterval, deadline));
+        if (flow != Flow::Next) co_return flow;
     }
 }
 
-Runner::Flow Runner::pause(const Action& action) {
+Runner::Course Runner::pause(const Action& action) {
     Row row{{}, {}, kPauseRow, action.text, {}, kGoesOn, {}};
     Flow flow = Flow::Next;
     if (!m_options.nobodyThere) {
         auto pressed = Attendant::Return::NotYet;
         while (pressed == Attendant::Return::NotYet && goesOn()) {
             pressed = m_with.attendant.pressed();
-            if (pressed == Attendant::Return::NotYet) m_with.clock.sleep(kLongestSleep);
+            if (pressed == Attendant::Return::NotYet) co_await m_pauses.pause(kLongestSleep);
         }
         row.status = pressed == Attendant::Return::Pressed ? kReturn : kNoReturn;
         if (pressed != Attendant::Return::Pressed) flow = Flow::Ends;
         m_schedule.goOnFromNow();
     }
     tell(row);
-    return flow == Flow::Next ? afterCommand() : flow;
+    co_return flow == Flow::Next ? afterCommand() : flow;
 }
 
-Runner::Flow Runner::waitUntil(Schedule::Time time) {
+Runner::Course Runner::waitUntil(Schedule::Time time) {
     for (bool told = false;; told = true) {
-        if (!goesOn()) return Flow::Ends;
-        if (m_listening > 0 && m_with.attendant.pressed() == Attendant::Return::Pressed) return Flow::Returned;
+        if (!goesOn()) co_return Flow::Ends;
+        if (m_listening > 0 && m_with.attendant.pressed() == Attendant::Return::Pressed) co_return Flow::Returned;
         const auto left = time - m_with.clock.steadyNow();
-        if (left.count() <= 0) return Flow::Next;
+        if (left.count() <= 0) co_return Flow::Next;
         if (!told) m_with.watcher.waits(left);
-        m_with.clock.sleep(std::min<std::chrono::nanoseconds>(left, kLongestSleep));
+        co_await m_pauses.pause(std::min<std::chrono::nanoseconds>(left, kLongestSleep));
     }
 }
 

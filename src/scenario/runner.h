@@ -7,34 +7,11 @@
 #include <vector>
 
 #include "link/traffic.h"
-#include "scenario/attendance.h"
+#include "scenario/part.h"
+#include "scenario/runoptions.h"
 #include "scenario/schedule.h"
-#include "scenario/stepnumber.h"
-
-namespace kdx {
-struct ProgramState;
-struct Session;
-}  // namespace kdx
 
 namespace kdx::scenario {
-
-/// What a run works with; everything is lent.
-struct Surroundings {
-    Session& session;  ///< open, the scenario's data set loaded
-    ProgramState& state;
-    Clock& clock;
-    Attendant& attendant;
-    Watcher& watcher;
-    Restorer* restorer = nullptr;
-    const Report* report = nullptr;  ///< begun
-};
-
-/// Which part of a scenario is run, and how.
-struct RunOptions {
-    std::optional<StepNumber> from;   ///< begins with it; steps of the scenario
-    std::optional<StepNumber> until;  ///< ends after it, the first time
-    bool nobodyThere = false;         ///< pauses go on by themselves, nothing waits for Return
-};
 
 /// Takes a scenario to the instrument.
 class Runner : private TrafficWatcher {
@@ -44,8 +21,16 @@ public:
     Runner(const Runner&) = delete;
     Runner& operator=(const Runner&) = delete;
 
-    /// Runs the scenario once. What is to be restored is restored however the run ends, by an exception too.
+    /// Runs the scenario once and sleeps through its pauses. What is to be restored is restored however the run ends,
+    /// by an exception too.
     Outcome run(const Scenario& scenario, RunOptions options);
+
+    /// The same in pieces, for who has other things to do in the pauses: begins it. @param scenario lent.
+    void start(const Scenario& scenario, RunOptions options);
+    /// Goes on to the next pause. @returns how long it lasts; nothing when the run has ended.
+    [[nodiscard]] std::optional<std::chrono::nanoseconds> goOn();
+    /// How the run went that has ended.
+    [[nodiscard]] const Outcome& outcome() const { return m_outcome; }
 
 private:
     /// What comes after a step.
@@ -56,23 +41,27 @@ private:
         Ends,      ///< stopped, or failed
     };
 
-    void play(const Scenario& scenario);
-    void bringBack();
+    using Course = Part<Flow>;
+
+    Course whole(const Scenario& scenario);
+    Course play(const Scenario& scenario);
+    Course bringBack();
     /// @returns whether all could be asked and sent.
     bool bringBackOnce();
     template <typename Asks>
     auto silently(Asks asks);
-    Flow list(const std::vector<Action>& actions);
-    Flow one(const Action& action);
-    Flow loop(const Action& action);
-    Flow passes(const Action& action, std::size_t first);
-    Flow pass(const Action& action);
+    Course list(const std::vector<Action>& actions);
+    Course one(const Action& action);
+    Course loop(const Action& action);
+    Course passes(const Action& action, std::size_t first);
+    Course pass(const Action& action);
     Flow send(const std::string& key, const std::string& value);
+    Course sendAll(const Action& action);
     Flow message(const std::string& code);
-    Flow expect(const Action& action);
-    Flow pause(const Action& action);
-    Flow waitUntil(Schedule::Time time);
-    Flow askUntilMet(const Action::Expectation& expectation, Schedule::Time deadline, Row& row, bool& waited);
+    Course expect(const Action& action);
+    Course pause(const Action& action);
+    Course waitUntil(Schedule::Time time);
+    Course askUntilMet(const Action::Expectation& expectation, Schedule::Time deadline, Row& row, bool& waited);
     Flow afterCommand() { return goesOn() ? Flow::Next : Flow::Ends; }
     [[nodiscard]] bool goesOn() { return !m_outcome.reportLost && m_with.attendant.goesOn(); }
     [[nodiscard]] Flow unlessReached() const {
@@ -92,7 +81,9 @@ private:
     bool m_wholeSent = false;                       ///< a data set, with all its keys
     std::optional<std::string> m_questions;         ///< while an expectation asks: what it has asked
     int m_listening = 0;                            ///< loops that end with a person's Return
-    bool m_otherVariant = false;                    ///< of the announcement before a traffic message
+    Pauses m_pauses;
+    std::optional<Course> m_whole;
+    bool m_otherVariant = false;  ///< of the announcement before a traffic message
 };
 
 }  // namespace kdx::scenario

@@ -14,7 +14,8 @@ std::chrono::steady_clock::time_point HastyClock::steadyNow() const {
 }
 
 Rehearsal::Rehearsal(DataFolder& data, const Captions& captions)
-    : m_session(m_visa, m_state, data, captions, m_clock, [this] { m_session.transmitter.stop(); }) {
+    : m_captions(captions),
+      m_session(m_visa, m_state, data, captions, m_clock, [this] { m_session.transmitter.stop(); }) {
     m_session.instrument.addWatcher(*this);
     m_session.readCorrections();
 }
@@ -28,9 +29,20 @@ void Rehearsal::become(const Readout& other) {
 
 void Rehearsal::apply(const Profile& source) {
     m_session.load(source);
+    play([this] { m_session.sendOpening(); });
+}
+
+void Rehearsal::apply(Station entered) {
+    const Corrections& corrections = m_state.corrections;
+    m_state.eonIdentifier = entered.otherNetwork.pi;  // leads every command about the network
+    if (corrections.eonType) entered.otherNetwork.pty = programmeTypeNumber(entered.otherNetwork.pty, m_captions);
+    play([&] { m_session.transmitter.run(openingSteps(entered, corrections)); });
+}
+
+void Rehearsal::play(const std::function<void()>& opening) {
     open();
     m_applies = true;
-    m_session.sendOpening();
+    opening();
     m_applies = false;
     m_session.close();
 }

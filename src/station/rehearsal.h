@@ -1,5 +1,6 @@
 #pragma once
 
+#include <functional>
 #include <string>
 #include <vector>
 
@@ -37,6 +38,8 @@ public:
     void become(const Readout& other);
     /// Opens the session, sends what belongs to the opening, closes it.
     void apply(const Profile& source);
+    /// The same with what the window has.
+    void apply(Station entered);
     /// What it has now.
     [[nodiscard]] Readout readOut();
 
@@ -46,7 +49,9 @@ public:
 private:
     void passed(const Traffic& traffic) override;
     void open();
+    void play(const std::function<void()>& opening);
 
+    const Captions& m_captions;
     HastyClock m_clock;
     sim::VirtualInstrument m_instrument{m_clock};
     sim::SimVisa m_visa{m_instrument};

@@ -4,11 +4,6 @@
 #include "ui/caption.h"
 #include "ui/text.h"
 
-#include <QComboBox>
-#include <QListView>
-#include <QProxyStyle>
-#include <QStyleFactory>
-
 #include <stdexcept>
 #include <string>
 #include <utility>
@@ -43,26 +38,6 @@ QVariant ShownList::data(const QModelIndex& index, int role) const {
     // A combo box shows the text it would edit.
     if (!index.isValid() || (role != Qt::DisplayRole && role != Qt::EditRole)) return {};
     return toText(m_entries[static_cast<std::size_t>(index.row())]);
-}
-
-void openAsScrolledList(QComboBox& combo) {
-    class Style final : public QProxyStyle {
-    public:
-        Style() : QProxyStyle(QStyleFactory::create(QStringLiteral("Fusion"))) {}
-        int styleHint(StyleHint hint, const QStyleOption* option, const QWidget* widget,
-                      QStyleHintReturn* returned) const override {
-            return hint == SH_ComboBox_Popup ? 0 : QProxyStyle::styleHint(hint, option, widget, returned);
-        }
-    };
-    constexpr int kEntries = 20;
-    auto* style = new Style;
-    style->setParent(&combo);
-    combo.setStyle(style);
-    combo.setMaxVisibleItems(kEntries);
-    if (auto* list = qobject_cast<QListView*>(combo.view())) {
-        list->setUniformItemSizes(true);  // else every entry is measured too before the first is shown
-        list->setVerticalScrollBarPolicy(Qt::ScrollBarAsNeeded);
-    }
 }
 
 QFont fixedPitch(const QString& family) {

@@ -10,8 +10,6 @@
 #include <functional>
 #include <initializer_list>
 
-class QComboBox;
-
 namespace kdx {
 
 /// The fixed-pitch font of that name, or a twin with the same widths: the codes of the entries line up in it.
@@ -37,10 +35,6 @@ private:
     TmcList m_entries;
     QFont m_font = fixedPitch(QStringLiteral("Courier New"));
 };
-
-/// Makes the combo box open with a scrolled list of some entries. As a menu of all of them, which is the style's way,
-/// it would ask every entry of a long list for its height first.
-void openAsScrolledList(QComboBox& combo);
 
 /// Takes every step even when an earlier one failed: one missing list must not cost the other.
 /// @throws std::runtime_error with all that went wrong, a line each.

@@ -9,8 +9,6 @@
 #include "ui/text.h"
 #include "ui/valuestate.h"
 
-#include <QAbstractItemView>
-
 namespace kdx {
 
 namespace {
@@ -58,11 +56,11 @@ void TmcBuilder::create() {
 
 void TmcBuilder::createLists() {
     TMC_Event_Combo =
-        wired<QComboBox>("TMC_Event_Combo", &QComboBox::activated, &TmcBuilder::TMC_Event_Combo_Click, this);
+        wired<SearchCombo>("TMC_Event_Combo", &QComboBox::activated, &TmcBuilder::TMC_Event_Combo_Click, this);
     Label3 = heading("Label3", {205}, TMC_Event_Combo);
     TMC_Event_Hex_Label = named<ValueLabel>("TMC_Event_Hex_Label", this);
     m_book.tip(TMC_Event_Hex_Label, {562, "Eventnummer, hexadezimal"});
-    TMC_Loc_Combo = wired<QComboBox>("TMC_Loc_Combo", &QComboBox::activated, &TmcBuilder::TMC_Loc_Combo_Click, this);
+    TMC_Loc_Combo = wired<SearchCombo>("TMC_Loc_Combo", &QComboBox::activated, &TmcBuilder::TMC_Loc_Combo_Click, this);
     Label4 = heading("Label4", {206}, TMC_Loc_Combo);
     TMC_Local_Hex_Label = named<ValueLabel>("TMC_Local_Hex_Label", this);
     m_book.tip(TMC_Local_Hex_Label, {563, "Locationnummer, hexadezimal"});
@@ -70,11 +68,10 @@ void TmcBuilder::createLists() {
     TMC_Event_Combo->setModel(m_events);
     m_locations = new ShownList(this);
     TMC_Loc_Combo->setModel(m_locations);
-    for (QComboBox* combo : {TMC_Event_Combo, TMC_Loc_Combo}) {
+    for (SearchCombo* combo : {TMC_Event_Combo, TMC_Loc_Combo}) {
         combo->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
         combo->setMinimumContentsLength(20);
-        openAsScrolledList(*combo);
-        combo->view()->setFont(fixedPitch(QStringLiteral("Courier New")));
+        combo->nameParts();
     }
     for (ValueLabel* number : {TMC_Event_Hex_Label, TMC_Local_Hex_Label}) number->makeRoomFor(kHexDigits);
 }
@@ -132,6 +129,8 @@ void TmcBuilder::label() {
     Page::label();
     TMC_Event_Combo->setPlaceholderText(caption({560, "Eventauswahl"}));
     TMC_Loc_Combo->setPlaceholderText(caption({561, "Locationauswahl"}));
+    for (SearchCombo* combo : {TMC_Event_Combo, TMC_Loc_Combo})
+        combo->label(m_with.captions, {996, "Suchen: Teil des Wortes oder Code"});
     TMCGruppe8Maker();
 }
 

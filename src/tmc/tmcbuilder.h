@@ -1,6 +1,7 @@
 #pragma once
 
 #include "tmc/bitdisplay.h"
+#include "tmc/searchcombo.h"
 #include "tmc/valuelabel.h"
 #include "ui/page.h"
 
@@ -56,7 +57,7 @@ private:
     void showDuration();
 
     QLabel *Label3 = nullptr, *Label4 = nullptr;  // headings of the events and the locations
-    QComboBox *TMC_Event_Combo = nullptr, *TMC_Loc_Combo = nullptr;
+    SearchCombo *TMC_Event_Combo = nullptr, *TMC_Loc_Combo = nullptr;
     ShownList *m_events = nullptr, *m_locations = nullptr;
     ValueLabel *TMC_Event_Hex_Label = nullptr, *TMC_Local_Hex_Label = nullptr;
     QGroupBox* TMC_Frame1 = nullptr;

@@ -127,4 +127,13 @@ QString QtDialogs::fileToOpen(const QString& title, const QString& kind) {
     return box.exec() == QDialog::Accepted ? box.selectedFiles().value(0) : QString();
 }
 
+QString QtDialogs::fileToOpen(const QString& title, const QString& kind) {
+    if (m_ending()) return {};
+    QFileDialog box(QApplication::activeWindow(), title, {}, kind);
+    box.setFileMode(QFileDialog::ExistingFile);
+    box.setLabelText(QFileDialog::Accept, toText(m_captions.own(317, "OK")));
+    box.setLabelText(QFileDialog::Reject, toText(m_captions.own(318, "Abbrechen")));
+    return box.exec() == QDialog::Accepted ? box.selectedFiles().value(0) : QString();
+}
+
 }  // namespace kdx

@@ -137,6 +137,10 @@ void Desktop::createMenus(MainMenu& info, Views& views) {
     connect(Mnu_Info_Log, &QAction::triggered, this, [&views] { views.openLog(); });
     Mnu_Ansicht_OnAir = entry("Mnu_Ansicht_OnAir", Mnu_Ansicht);
     connect(Mnu_Ansicht_OnAir, &QAction::triggered, this, [&views] { views.openOnAir(); });
+    Mnu_Ansicht_Vergleich = entry("Mnu_Ansicht_Vergleich", Mnu_Ansicht);
+    connect(Mnu_Ansicht_Vergleich, &QAction::triggered, this, [&views] { views.openCompare(); });
+    Mnu_Ansicht_Ablauf = entry("Mnu_Ansicht_Ablauf", Mnu_Ansicht);
+    connect(Mnu_Ansicht_Ablauf, &QAction::triggered, this, [&views] { views.openScenario(); });
     Mnu_Ansicht->addSeparator();
     Mnu_Ansicht_Lesen = entry("Mnu_Ansicht_Lesen", Mnu_Ansicht, Qt::Key_F5);
     connect(Mnu_Ansicht_Lesen, &QAction::triggered, this, &Desktop::readAllRequested);
@@ -193,6 +197,8 @@ void Desktop::label() {
     Mnu_Ansicht->setTitle(text({907, "Ansi&cht"}));
     Mnu_Info_Log->setText(text({680, "Log"}));
     Mnu_Ansicht_OnAir->setText(text({720, "Auf Sendung"}));
+    Mnu_Ansicht_Vergleich->setText(text({957, "Vergleich"}));
+    Mnu_Ansicht_Ablauf->setText(text({974, "Ablauf"}));
     Mnu_Ansicht_Lesen->setText(text({910, "Alles &zurücklesen"}));
     Mnu_Einstellungen->setText(text({908, "Einstellun&gen..."}));
     Mnu_Hilfe->setTitle(text({909, "Hil&fe"}));

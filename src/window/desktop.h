@@ -71,6 +71,8 @@ private:
     QMenu* Mnu_Ansicht = nullptr;
     QAction* Mnu_Info_Log = nullptr;  // the live view of the commands
     QAction* Mnu_Ansicht_OnAir = nullptr;
+    QAction* Mnu_Ansicht_Vergleich = nullptr;
+    QAction* Mnu_Ansicht_Ablauf = nullptr;
     QAction* Mnu_Ansicht_Lesen = nullptr;  // asks everything back
     QAction* Mnu_Einstellungen = nullptr;
     SettingsDialog* m_settings = nullptr;  // made when it is first opened

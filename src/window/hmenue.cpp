@@ -14,6 +14,7 @@
 
 #include "base/codepage.h"
 #include "base/numbers.h"
+#include "link/commandsequence.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
 #include "settings/generalsettings.h"
@@ -56,7 +57,12 @@ HMenue::HMenue(const Surroundings& surroundings)
                                                                   m_s.clock,           m_s.tickers} {
     setObjectName(QStringLiteral("HMenue"));
     setWindowIcon(QIcon(QStringLiteral(":/kdx-rds-64.png")));
-    m_views = std::make_unique<Views>(m_context, m_s.session.station, this);
+    m_views = std::make_unique<Views>(m_context, m_s.session, this, [this] {
+        m_s.session.load();
+        const CommandSequence silent(m_s.session.instrument);  // what is shown anew is no setting that goes out
+        m_s.session.instrument.stopSequence();
+        loadPages();
+    });
     m_connection = new ConnectionBar(m_context, this);
     connect(m_connection, &ConnectionBar::openRequested, this, &HMenue::INIT_Taste_Click);
     // Every setting was stored when it changed: nothing is left to do at the end.
@@ -83,6 +89,7 @@ HMenue::HMenue(const Surroundings& surroundings)
 }
 
 HMenue::~HMenue() {
+    m_views->endScenario();
     m_s.session.transmitter.setWatcher(nullptr);
     m_s.session.instrument.onFailure(nullptr);
     m_s.data.onUnsavedFileChanged(nullptr);
@@ -238,6 +245,7 @@ void HMenue::SetRdsStereo() {
 }
 
 void HMenue::GTL_Taste_Click() {
+    m_views->endScenario();
     m_s.session.close();
     // Only the switched-off pages and the resting timers keep commands away from the closed handle.
     showSessionOpen(false);
@@ -249,6 +257,7 @@ void HMenue::stepGoesOut(const Step& step, std::size_t number, std::size_t total
     if (number > 0) {
         m_lowerEdge->showProgress(captionText(m_s.captions, {324, "Sende Befehl %1 von %2"}), number, total);
     }
+    if (m_views->scenarioSends()) return;  // the pages show what the window has
     // A refused step shows a box: no timer may change meanwhile what the steps after it were made of.
     if (step.kind == Step::Kind::Refused) m_s.tickers.setHeld(true);
     for (Page* page : m_pages) page->stepGoesOut(step);
@@ -273,9 +282,11 @@ void HMenue::showSessionOpen(bool open) {
     m_connection->showSessionOpen(open);
     m_menu->showSessionOpen(open);
     m_desktop->showSessionOpen(open);
+    m_views->showSessionOpen(open);
 }
 
 bool HMenue::showInterfaceError(const std::string& text, bool sequenceRuns) {
+    if (m_views->takesFailure()) return true;
     // While the box waits, timers would send more to the same broken link and pile up more boxes.
     m_s.tickers.setHeld(true);
     const QString title = QStringLiteral("Interface Error");

@@ -1,101 +1,168 @@
 #include "window/logview.h"
 
 #include <QClipboard>
+#include <QDir>
 #include <QGuiApplication>
 #include <QHeaderView>
 #include <QLineEdit>
 #include <QPushButton>
+#include <QSaveFile>
 #include <QScrollBar>
 #include <QShortcut>
 #include <QSortFilterProxyModel>
+#include <QStyledItemDelegate>
 #include <QTableView>
 
 #include <algorithm>
 
-#include "settings/captions.h"
+#include "ui/caption.h"
+#include "ui/dialogs.h"
 #include "ui/layouts.h"
 #include "ui/named.h"
-#include "ui/text.h"
 #include "window/trafficlog.h"
 
 namespace kdx {
 
-LogView::LogView(TrafficLog& log, const Captions& captions, QWidget* parent) : QDialog(parent), m_log(log) {
+namespace {
+
+/// Lets a text be wrapped behind its commas too: lists of frequencies and groups have no blanks.
+class WrappingDelegate final : public QStyledItemDelegate {
+public:
+    using QStyledItemDelegate::QStyledItemDelegate;
+    [[nodiscard]] QString displayText(const QVariant& value, const QLocale& locale) const override {
+        const QString text = QStyledItemDelegate::displayText(value, locale);
+        return QString(text).replace(QLatin1Char(','), QStringLiteral(",\u200B"));
+    }
+};
+
+}  // namespace
+
+LogView::LogView(TrafficLog& log, const PageContext& with, QWidget* parent)
+    : QDialog(parent), m_log(log), m_with(with) {
     setObjectName(QStringLiteral("LogView"));
-    m_filter = named<QLineEdit>("LogFilter", this);
-    m_filter->setClearButtonEnabled(true);
+    Log_Filter = named<QLineEdit>("Log_Filter", this);
+    Log_Filter->setClearButtonEnabled(true);
     m_filtered = new QSortFilterProxyModel(this);
     m_filtered->setSourceModel(&log);
     m_filtered->setFilterKeyColumn(-1);
     m_filtered->setFilterCaseSensitivity(Qt::CaseInsensitive);
-    connect(m_filter, &QLineEdit::textChanged, m_filtered, &QSortFilterProxyModel::setFilterFixedString);
+    connect(Log_Filter, &QLineEdit::textChanged, m_filtered, &QSortFilterProxyModel::setFilterFixedString);
 
-    m_table = named<QTableView>("LogTable", this);
-    m_table->setModel(m_filtered);
+    Log_Liste = named<QTableView>("Log_Liste", this);
+    Log_Liste->setModel(m_filtered);
+    Log_Liste->setItemDelegateForColumn(TrafficLog::Text, new WrappingDelegate(this));
     QFont fixed = font();
     fixed.setFamilies({QStringLiteral("Courier New"), QStringLiteral("Liberation Mono")});  // keys stay aligned
-    m_table->setFont(fixed);
-    m_table->setSelectionBehavior(QAbstractItemView::SelectRows);
-    m_table->setShowGrid(false);
-    m_table->setWordWrap(false);
-    m_table->verticalHeader()->hide();
-    m_table->verticalHeader()->setDefaultSectionSize(fontMetrics().height() + 2);
-    m_table->verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
-    m_table->horizontalHeader()->setSectionResizeMode(TrafficLog::Text, QHeaderView::Stretch);
-    const int letter = m_table->fontMetrics().horizontalAdvance(QLatin1Char('0'));
-    m_table->setColumnWidth(TrafficLog::Time, letter * 14);
-    m_table->setColumnWidth(TrafficLog::Direction, letter * 10);
-    m_table->setColumnWidth(TrafficLog::Status, letter * 13);
-    connect(m_filtered, &QAbstractItemModel::rowsInserted, this, &LogView::followEnd);
+    Log_Liste->setFont(fixed);
+    Log_Liste->setSelectionBehavior(QAbstractItemView::SelectRows);
+    Log_Liste->setShowGrid(false);
+    Log_Liste->setWordWrap(false);
+    Log_Liste->setVerticalScrollMode(QAbstractItemView::ScrollPerPixel);
+    Log_Liste->verticalHeader()->hide();
+    Log_Liste->verticalHeader()->setDefaultSectionSize(fontMetrics().height() + 2);
+    Log_Liste->verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
+    Log_Liste->horizontalHeader()->setSectionResizeMode(TrafficLog::Text, QHeaderView::Stretch);
+    const int letter = Log_Liste->fontMetrics().horizontalAdvance(QLatin1Char('0'));
+    Log_Liste->setColumnWidth(TrafficLog::Time, letter * 14);
+    Log_Liste->setColumnWidth(TrafficLog::Direction, letter * 10);
+    Log_Liste->setColumnWidth(TrafficLog::Status, letter * 16);
+    connect(m_filtered, &QAbstractItemModel::rowsInserted, this,
+            [this](const QModelIndex&, int first, int last) { fit(first, last); });
+    // The end stays in view until the user looks further up.
+    QScrollBar* bar = Log_Liste->verticalScrollBar();
+    connect(bar, &QScrollBar::rangeChanged, this, [this, bar] {
+        if (m_follows) bar->setValue(bar->maximum());
+    });
+    connect(bar, &QScrollBar::valueChanged, this,
+            [this, bar] { m_follows = bar->value() >= bar->maximum() - bar->singleStep(); });
+    // What is wrapped needs other heights when its column gets another width.
+    connect(Log_Liste->horizontalHeader(), &QHeaderView::sectionResized, this,
+            [this] { fit(0, m_filtered->rowCount() - 1); });
 
-    m_copy = named<QPushButton>("LogCopy", this);
-    connect(m_copy, &QPushButton::clicked, this, &LogView::copy);
-    const auto* copyKey = new QShortcut(QKeySequence::Copy, m_table);
+    const auto button = [this](const char* name, auto signal, auto* receiver, auto handler) {
+        auto* made = named<QPushButton>(name, this);
+        made->setAutoDefault(false);
+        connect(made, signal, receiver, handler);
+        return made;
+    };
+    Log_Pause = button("Log_Pause", &QPushButton::toggled, &log, &TrafficLog::setHeld);
+    Log_Umbruch = button("Log_Umbruch", &QPushButton::toggled, this, &LogView::Log_Umbruch_Click);
+    for (QPushButton* sticky : {Log_Pause, Log_Umbruch}) sticky->setCheckable(true);
+    Log_Sichern = button("Log_Sichern", &QPushButton::clicked, this, &LogView::Log_Sichern_Click);
+    m_copy = button("LogCopy", &QPushButton::clicked, this, &LogView::copy);
+    const auto* copyKey = new QShortcut(QKeySequence::Copy, Log_Liste);
     connect(copyKey, &QShortcut::activated, this, &LogView::copy);
-    m_clear = named<QPushButton>("LogClear", this);
-    connect(m_clear, &QPushButton::clicked, &log, &TrafficLog::clear);
-    m_close = named<QPushButton>("LogClose", this);
-    connect(m_close, &QPushButton::clicked, this, &QDialog::close);
-    for (QPushButton* button : {m_copy, m_clear, m_close}) button->setAutoDefault(false);
+    m_clear = button("LogClear", &QPushButton::clicked, &log, &TrafficLog::clear);
+    m_close = button("LogClose", &QPushButton::clicked, this, &QDialog::close);
 
-    layOut(this, column({{m_table, 1}, row({{m_filter, 1}, m_copy, m_clear, m_close})}), 6);
-    resize(700, 360);
-    label(captions);
+    layOut(
+        this,
+        column({{Log_Liste, 1}, row({{Log_Filter, 1}, Log_Pause, Log_Umbruch, Log_Sichern, m_copy, m_clear, m_close})}),
+        6);
+    resize(letter * 110, fontMetrics().height() * 26);
+    label();
 }
 
-void LogView::label(const Captions& captions) {
-    setWindowTitle(toText(captions.own(680, "Log")));
-    m_filter->setPlaceholderText(toText(captions.own(685, "Filter")));
-    m_filter->setAccessibleName(m_filter->placeholderText());
-    m_table->setAccessibleName(windowTitle());
-    m_copy->setText(toText(captions.own(686, "&Kopieren")));
-    m_clear->setText(toText(captions.own(687, "&Leeren")));
-    m_close->setText(toText(captions.own(688, "&Schließen")));
+void LogView::label() {
+    const auto text = [this](const Caption& caption) { return captionText(m_with.captions, caption); };
+    setWindowTitle(text({680, "Log"}));
+    Log_Filter->setPlaceholderText(text({685, "Filter"}));
+    Log_Filter->setAccessibleName(Log_Filter->placeholderText());
+    Log_Liste->setAccessibleName(windowTitle());
+    Log_Pause->setText(text({977, "&Pause"}));
+    Log_Umbruch->setText(text({997, "&Umbruch"}));
+    Log_Sichern->setText(text({973, "S&ichern..."}));
+    m_copy->setText(text({686, "&Kopieren"}));
+    m_clear->setText(text({687, "&Leeren"}));
+    m_close->setText(text({688, "&Schließen"}));
+}
+
+void LogView::Log_Umbruch_Click(bool wrapped) {
+    Log_Liste->setWordWrap(wrapped);
+    const int line = Log_Liste->verticalHeader()->defaultSectionSize();
+    for (int row = 0; !wrapped && row < m_filtered->rowCount(); ++row) Log_Liste->setRowHeight(row, line);
+    fit(0, m_filtered->rowCount() - 1);
+}
+
+/// Only these rows: to measure all of them at every command would take its time.
+void LogView::fit(int first, int last) {
+    if (!Log_Liste->wordWrap()) return;
+    for (int row = first; row <= last; ++row) Log_Liste->resizeRowToContents(row);
+}
+
+void LogView::Log_Sichern_Click() {
+    const auto caption = [this](const Caption& one) { return captionText(m_with.captions, one); };
+    const QByteArray lines = text().toUtf8();  // what was there at the click
+    const QString name = m_with.dialogs.fileToSave(windowTitle(), QDir::home().filePath(QStringLiteral("log.txt")),
+                                                   caption({998, "Text (*.txt)"}));
+    if (name.isEmpty()) return;
+    QSaveFile file(name);
+    if (file.open(QIODevice::WriteOnly) && file.write(lines) == lines.size() && file.commit()) return;
+    m_with.dialogs.message(Dialogs::Icon::Critical, caption({313, "Fehler"}),
+                           caption({624, "%1 kann nicht gespeichert werden."}).arg(name));
 }
 
 void LogView::copy() {
     QList<int> rows;
-    for (const QModelIndex& index : m_table->selectionModel()->selectedRows()) rows << index.row();
-    if (rows.isEmpty()) {
-        for (int row = 0; row < m_filtered->rowCount(); ++row) rows << row;  // nothing selected: all that is shown
-    }
+    for (const QModelIndex& index : Log_Liste->selectionModel()->selectedRows()) rows << index.row();
+    QGuiApplication::clipboard()->setText(text(rows));
+}
+
+QString LogView::text(QList<int> rows) const {
+    const bool all = rows.isEmpty();
+    for (int row = 0; all && row < m_filtered->rowCount(); ++row) rows << row;
     std::sort(rows.begin(), rows.end());
     QString text;
     for (const int row : rows) {
         text += m_log.line(m_filtered->mapToSource(m_filtered->index(row, 0)).row()) + QLatin1Char('\n');
     }
-    QGuiApplication::clipboard()->setText(text);
+    return text;
 }
 
 void LogView::showEvent(QShowEvent* event) {
     QDialog::showEvent(event);
-    m_table->scrollToBottom();
-}
-
-void LogView::followEnd() {
-    // Only while the user looks at the end: reading further up must not be disturbed.
-    const QScrollBar* bar = m_table->verticalScrollBar();
-    if (bar->value() >= bar->maximum() - 1) m_table->scrollToBottom();
+    m_follows = true;
+    Log_Liste->scrollToBottom();
 }
 
 }  // namespace kdx

@@ -2,6 +2,8 @@
 
 #include <QDialog>
 
+#include "ui/pagecontext.h"
+
 class QLineEdit;
 class QPushButton;
 class QSortFilterProxyModel;
@@ -9,31 +11,39 @@ class QTableView;
 
 namespace kdx {
 
-class Captions;
 class TrafficLog;
 
-/// The live view of the commands: each line as it is written, read or logged, with a filter and copying. Stays open
-/// beside the main window.
+/// The live view of the commands: each line as it is written, read or logged, with a filter, a pause, copying and
+/// saving. Stays open beside the main window.
 class LogView : public QDialog {
     Q_OBJECT
 public:
-    LogView(TrafficLog& log, const Captions& captions, QWidget* parent);
-    void label(const Captions& captions);
+    LogView(TrafficLog& log, const PageContext& with, QWidget* parent);
+    void label();
 
 protected:
     void showEvent(QShowEvent* event) override;
 
 private:
+    void Log_Umbruch_Click(bool wrapped);
+    void Log_Sichern_Click();
     void copy();
-    void followEnd();
+    void fit(int first, int last);
+    /// The lines, of all that is shown unless given.
+    [[nodiscard]] QString text(QList<int> rows = {}) const;
 
     TrafficLog& m_log;
-    QLineEdit* m_filter = nullptr;
-    QTableView* m_table = nullptr;
+    PageContext m_with;
+    QLineEdit* Log_Filter = nullptr;
+    QTableView* Log_Liste = nullptr;
     QSortFilterProxyModel* m_filtered = nullptr;
+    QPushButton* Log_Pause = nullptr;
+    QPushButton* Log_Umbruch = nullptr;
+    QPushButton* Log_Sichern = nullptr;
     QPushButton* m_copy = nullptr;
     QPushButton* m_clear = nullptr;
     QPushButton* m_close = nullptr;
+    bool m_follows = true;
 };
 
 }  // namespace kdx

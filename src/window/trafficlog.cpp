@@ -1,7 +1,10 @@
 #include "window/trafficlog.h"
 
 #include <QBrush>
+#include <QColor>
 #include <QTime>
+
+#include <utility>
 
 #include "base/clock.h"
 #include "base/printable.h"
@@ -10,6 +13,20 @@
 #include "ui/text.h"
 
 namespace kdx {
+
+namespace {
+
+constexpr QColor kUnsentColour(0x75, 0x75, 0x75);  // to be read on light and dark
+
+/// A tip is as wide as its longest line.
+QString inLines(const QString& text) {
+    constexpr qsizetype kLetters = 100;
+    QStringList lines;
+    for (qsizetype at = 0; at < text.size(); at += kLetters) lines += text.mid(at, kLetters);
+    return lines.join(QLatin1Char('\n'));
+}
+
+}  // namespace
 
 TrafficLog::TrafficLog(Instrument& instrument, const Clock& clock, QObject* parent)
     : QAbstractTableModel(parent), m_instrument(instrument), m_clock(clock) {
@@ -21,6 +38,34 @@ TrafficLog::~TrafficLog() {
 }
 
 void TrafficLog::passed(const Traffic& traffic) {
+    const Kind kind = traffic.kind == Traffic::Kind::Written ? Kind::Written
+                      : traffic.kind == Traffic::Kind::Read  ? Kind::Read
+                                                             : Kind::Logged;
+    take({now(), kind, traffic.text, traffic.status});
+}
+
+void TrafficLog::composed(const std::string& command) {
+    take({now(), Kind::Unsent, command});
+}
+
+int TrafficLog::now() const {
+    return static_cast<int>(m_clock.secondsSinceMidnight() * 1000);
+}
+
+void TrafficLog::take(const Line& line) {
+    if (!m_held) return add(line);
+    m_waiting.push_back(line);
+    if (m_waiting.size() > 2 * kMostLines) m_waiting.pop_front();  // each line of the table may have come in two parts
+}
+
+void TrafficLog::add(const Line& line) {
+    if (!m_lines.empty() && tellsTheLast(line)) {
+        if (line.kind == Kind::Logged) return;
+        const auto last = static_cast<int>(m_lines.size()) - 1;
+        m_lines.back() = line;
+        emit dataChanged(index(last, 0), index(last, ColumnCount - 1));
+        return;
+    }
     if (m_lines.size() == kMostLines) {
         beginRemoveRows({}, 0, 0);
         m_lines.pop_front();
@@ -28,20 +73,47 @@ void TrafficLog::passed(const Traffic& traffic) {
     }
     const auto row = static_cast<int>(m_lines.size());
     beginInsertRows({}, row, row);
-    m_lines.push_back(
-        {static_cast<int>(m_clock.secondsSinceMidnight() * 1000), traffic.kind, traffic.text, traffic.status});
+    m_lines.push_back(line);
     endInsertRows();
+}
+
+/// Whether it is about the same command, question or answer as the last line: each is logged as well.
+bool TrafficLog::tellsTheLast(const Line& line) const {
+    const Line& last = m_lines.back();
+    const auto quoted = [](const std::string& text) { return '"' + text + '"'; };
+    switch (line.kind) {
+        case Kind::Unsent:
+            return last.kind == Kind::Logged && last.text.ends_with("= " + quoted(line.text));
+        case Kind::Written:
+            return last.kind == Kind::Unsent && last.text == line.text;
+        case Kind::Read:
+            return false;
+        case Kind::Logged:
+            break;
+    }
+    if (last.kind == Kind::Read) return line.text.find("= Answer ") != std::string::npos;
+    if (last.kind != Kind::Written) return false;
+    if (line.text.ends_with("= " + last.text)) return true;
+    return last.text.ends_with('?') && line.text.ends_with(quoted(last.text.substr(0, last.text.size() - 1)));
+}
+
+void TrafficLog::setHeld(bool held) {
+    m_held = held;
+    if (held) return;
+    for (const Line& line : std::exchange(m_waiting, {})) add(line);
 }
 
 void TrafficLog::clear() {
     beginResetModel();
     m_lines.clear();
+    m_waiting.clear();
     endResetModel();
 }
 
 void TrafficLog::label(const Captions& captions) {
     m_headings = {toText(captions.own(681, "Zeit")), toText(captions.own(682, "Richtung")),
                   toText(captions.own(683, "Text")), toText(captions.own(684, "Status"))};
+    m_unsent = toText(captions.own(995, "nicht gesendet"));
     emit headerDataChanged(Qt::Horizontal, 0, ColumnCount - 1);
 }
 
@@ -63,9 +135,18 @@ int TrafficLog::columnCount(const QModelIndex& parent) const {
 QVariant TrafficLog::data(const QModelIndex& index, int role) const {
     if (!index.isValid()) return {};
     const Line& line = m_lines.at(static_cast<std::size_t>(index.row()));
-    if (role == Qt::DisplayRole) return cell(line, index.column());
-    if (role == Qt::ForegroundRole && (line.status < 0 || endsItsTextEarly(line.text))) return QBrush(Qt::red);
-    return {};
+    switch (role) {
+        case Qt::DisplayRole:
+            return cell(line, index.column());
+        case Qt::ToolTipRole:
+            return inLines(cell(line, Text));
+        case Qt::ForegroundRole:
+            if (line.status < 0 || endsItsTextEarly(line.text)) return QBrush(Qt::red);
+            if (line.kind == Kind::Unsent) return QBrush(kUnsentColour);
+            return {};
+        default:
+            return {};
+    }
 }
 
 QVariant TrafficLog::headerData(int section, Qt::Orientation orientation, int role) const {
@@ -79,18 +160,20 @@ QString TrafficLog::cell(const Line& line, int column) const {
             return QTime::fromMSecsSinceStartOfDay(line.milliseconds).toString(QStringLiteral("HH:mm:ss.zzz"));
         case Direction:
             switch (line.kind) {
-                case Traffic::Kind::Written:
+                case Kind::Written:
+                case Kind::Unsent:
                     return QStringLiteral("->");
-                case Traffic::Kind::Read:
+                case Kind::Read:
                     return QStringLiteral("<-");
-                case Traffic::Kind::Logged:
+                case Kind::Logged:
                     return QStringLiteral("log");
             }
             return {};
         case Text:
             return toText(printableLine(line.text, '\xB7'));
         default:
-            return line.kind == Traffic::Kind::Logged ? QString() : QString::number(line.status);
+            if (line.kind == Kind::Unsent) return m_unsent;
+            return line.kind == Kind::Logged ? QString() : QString::number(line.status);
     }
 }
 

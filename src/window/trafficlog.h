@@ -3,6 +3,8 @@
 #include <QAbstractTableModel>
 
 #include <deque>
+#include <string>
+#include <vector>
 
 #include "link/instrument.h"
 
@@ -11,7 +13,8 @@ namespace kdx {
 class Captions;
 class Clock;
 
-/// The latest lines of what was written, read and logged, oldest first, as a table of time, direction, text and status.
+/// The latest of what was written, read and logged, oldest first, as a table of time, direction, text and status: a
+/// line a command, a question or an answer, and one for what was logged beside them.
 class TrafficLog : public QAbstractTableModel, public TrafficWatcher {
     Q_OBJECT
 public:
@@ -24,8 +27,12 @@ public:
     ~TrafficLog() override;
 
     void passed(const Traffic& traffic) override;
+    /// What was logged last is this command; it is written next when a session is open.
+    void composed(const std::string& command);
     void clear();
-    /// Headings in the current language.
+    /// While it is held nothing is added; what came meanwhile follows afterwards.
+    void setHeld(bool held);
+    /// Headings and words in the current language.
     void label(const Captions& captions);
 
     /// The line as text with tabs between its columns.
@@ -37,18 +44,26 @@ public:
     [[nodiscard]] QVariant headerData(int section, Qt::Orientation orientation, int role) const override;
 
 private:
+    enum class Kind { Written, Read, Logged, Unsent };
     struct Line {
         int milliseconds = 0;  ///< since midnight
-        Traffic::Kind kind = Traffic::Kind::Logged;
+        Kind kind = Kind::Logged;
         std::string text;
         VisaStatus status = 0;
     };
+    [[nodiscard]] int now() const;
+    void take(const Line& line);
+    void add(const Line& line);
+    [[nodiscard]] bool tellsTheLast(const Line& line) const;
     [[nodiscard]] QString cell(const Line& line, int column) const;
 
     Instrument& m_instrument;
     const Clock& m_clock;
     std::deque<Line> m_lines;
+    bool m_held = false;
+    std::deque<Line> m_waiting;
     QStringList m_headings{QString(), QString(), QString(), QString()};
+    QString m_unsent;
 };
 
 }  // namespace kdx

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <functional>
 #include <memory>
 
 #include "air/shadow.h"
@@ -9,16 +10,19 @@ class QWidget;
 
 namespace kdx {
 
+class CompareView;
 class LogView;
 class OnAirView;
-struct Station;
+class ScenarioView;
+struct Session;
 class TrafficLog;
 
 /// The windows that stay open beside the main one. Each is made when it is first opened; what they show is followed
 /// from the start of the program on.
 class Views {
 public:
-    Views(const PageContext& with, const Station& station, QWidget* window);
+    /// @param reload shows the data set anew when its files were changed.
+    Views(const PageContext& with, Session& session, QWidget* window, std::function<void()> reload);
     ~Views();
     Views(const Views&) = delete;
     Views& operator=(const Views&) = delete;
@@ -26,17 +30,31 @@ public:
     void label();
     void openLog();
     void openOnAir();
+    void openCompare();
+    void openScenario();
+    void showSessionOpen(bool open);
+    /// Null before it was first opened.
+    [[nodiscard]] ScenarioView* scenario() const { return m_scenarioView.get(); }
+    /// Whether what goes out right now is a scenario's.
+    [[nodiscard]] bool scenarioSends() const;
+    /// The session is to be closed: a scenario that runs brings back what stood before.
+    void endScenario();
+    /// A command failed. @returns whether nobody need be told any more.
+    bool takesFailure();
     /// The lists of events and locations were changed.
     void forgetTexts();
 
 private:
     PageContext m_with;
-    const Station& m_station;
+    Session& m_session;
     QWidget* m_window;
+    std::function<void()> m_reload;
     TrafficLog* m_trafficLog;
     air::Shadow m_shadow;
     LogView* m_logView = nullptr;
     std::unique_ptr<OnAirView> m_onAirView;  // goes before what it shows
+    std::unique_ptr<CompareView> m_compareView;
+    std::unique_ptr<ScenarioView> m_scenarioView;
 };
 
 }  // namespace kdx

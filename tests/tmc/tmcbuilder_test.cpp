@@ -45,7 +45,7 @@ TEST_F(TmcBuilderTest, ALongListOpensAsAScrolledListOfSomeEntries) {
     page->show();
     auto* combo = find<QComboBox>("TMC_Loc_Combo");
     combo->showPopup();
-    const QWidget* list = combo->view();
+    const auto* list = find("TMC_Loc_Combo_Treffer");
     EXPECT_TRUE(list->isVisible());
     EXPECT_GT(list->height(), 10 * list->fontMetrics().height());
     EXPECT_LT(list->height(), 30 * list->fontMetrics().height());

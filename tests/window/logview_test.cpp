@@ -5,8 +5,10 @@
 #include <QClipboard>
 #include <QGuiApplication>
 #include <QPushButton>
+#include <QScrollBar>
 #include <QTableView>
 
+#include "support/layoutcheck.h"
 #include "support/windowtest.h"
 #include "window/trafficlog.h"
 
@@ -22,7 +24,7 @@ protected:
         openSession();
         action("Mnu_Info_Log")->trigger();
         view = window->findChild<LogView*>(QStringLiteral("LogView"));
-        table = view->findChild<QTableView*>(QStringLiteral("LogTable"));
+        table = view->findChild<QTableView*>(QStringLiteral("Log_Liste"));
         view->findChild<QPushButton*>(QStringLiteral("LogClear"))->click();
     }
     std::string cell(int row, int column) const {
@@ -34,18 +36,15 @@ protected:
     QTableView* table = nullptr;
 };
 
-TEST_F(LogViewTest, ShowsEachLineAsItIsLoggedWithTimeDirectionAndStatus) {
+TEST_F(LogViewTest, ShowsALineACommandWithTimeDirectionAndStatus) {
     open();
     clock.set(3723.5);
     click("Store_Taste_2");
-    ASSERT_EQ(rows(), 2);
-    EXPECT_EQ(cell(0, TrafficLog::Direction), "log");
-    EXPECT_EQ(cell(0, TrafficLog::Text), "          STORE= \":STEREO:DIRECT \"STORE=3\"\"");
-    EXPECT_EQ(cell(0, TrafficLog::Time), "01:02:03.500");
-    EXPECT_EQ(cell(1, TrafficLog::Direction), "->");
-    EXPECT_EQ(cell(1, TrafficLog::Text), ":STEREO:DIRECT \"STORE=3\"");
-    EXPECT_EQ(cell(1, TrafficLog::Status), "0");
-    EXPECT_EQ(cell(1, TrafficLog::Time), "01:02:03.550");
+    ASSERT_EQ(rows(), 1);
+    EXPECT_EQ(cell(0, TrafficLog::Direction), "->");
+    EXPECT_EQ(cell(0, TrafficLog::Text), ":STEREO:DIRECT \"STORE=3\"");
+    EXPECT_EQ(cell(0, TrafficLog::Status), "0");
+    EXPECT_EQ(cell(0, TrafficLog::Time), "01:02:03.550");
     EXPECT_EQ(folder.read("RDS_log.txt"), "");
 }
 
@@ -55,9 +54,10 @@ TEST_F(LogViewTest, ShowsAnswersWithoutTheirControlCharacters) {
         "\"A\x01"
         "B\"\n";
     click("Command5");
-    ASSERT_EQ(rows(), 5);  // question, its log line, answer, two log lines
-    EXPECT_EQ(cell(2, TrafficLog::Direction), "<-");
-    EXPECT_EQ(cell(2, TrafficLog::Text),
+    ASSERT_EQ(rows(), 3);  // question, answer, and what was made of it
+    EXPECT_EQ(cell(0, TrafficLog::Text), ":STEREO:DIRECT? \"PS\"");
+    EXPECT_EQ(cell(1, TrafficLog::Direction), "<-");
+    EXPECT_EQ(cell(1, TrafficLog::Text),
               "\"A\xC2\xB7"
               "B\"");
 }
@@ -67,7 +67,7 @@ TEST_F(LogViewTest, AFailureShowsItsStatus) {
     visa.writeStatus = visa::kConnectionLost;
     dialogs.expectedMessages = 1;
     click("Store_Taste_2");
-    EXPECT_EQ(cell(1, TrafficLog::Status), "-1073807194");
+    EXPECT_EQ(cell(0, TrafficLog::Status), "-1073807194");
 }
 
 TEST_F(LogViewTest, FailuresAndTextsThatEndEarlyAreRed) {
@@ -80,23 +80,23 @@ TEST_F(LogViewTest, FailuresAndTextsThatEndEarlyAreRed) {
     click("PS_Taste");
     type("PS_T", "A\"B");
     click("PS_Taste");
-    ASSERT_EQ(rows(), 4);  // a log line before each command
-    EXPECT_FALSE(isRed(1));
-    EXPECT_TRUE(isRed(3));
+    ASSERT_EQ(rows(), 2);
+    EXPECT_FALSE(isRed(0));
+    EXPECT_TRUE(isRed(1));
     dialogs.expectedMessages = 1;
     visa.writeStatus = visa::kConnectionLost;
     type("PS_T", "RADIO");
     click("PS_Taste");
-    EXPECT_TRUE(isRed(5));
+    EXPECT_TRUE(isRed(2));
 }
 
 TEST_F(LogViewTest, TheFilterKeepsWhatContainsItsText) {
     open();
     click("Store_Taste_0");
     click("Store_Taste_1");
-    view->findChild<QLineEdit*>(QStringLiteral("LogFilter"))->setText(QStringLiteral("store=2"));
-    EXPECT_EQ(rows(), 2);
-    view->findChild<QLineEdit*>(QStringLiteral("LogFilter"))->setText(QStringLiteral("->"));
+    view->findChild<QLineEdit*>(QStringLiteral("Log_Filter"))->setText(QStringLiteral("store=2"));
+    EXPECT_EQ(rows(), 1);
+    view->findChild<QLineEdit*>(QStringLiteral("Log_Filter"))->setText(QStringLiteral("->"));
     EXPECT_EQ(rows(), 2);
 }
 
@@ -106,10 +106,110 @@ TEST_F(LogViewTest, CopiesTheSelectedLinesOrAllThatAreShown) {
     click("Store_Taste_0");
     click("Store_Taste_1");
     view->findChild<QPushButton*>(QStringLiteral("LogCopy"))->click();
-    EXPECT_EQ(QGuiApplication::clipboard()->text().count(QLatin1Char('\n')), 4);
-    table->selectRow(1);
+    EXPECT_EQ(QGuiApplication::clipboard()->text().count(QLatin1Char('\n')), 2);
+    table->selectRow(0);
     view->findChild<QPushButton*>(QStringLiteral("LogCopy"))->click();
     EXPECT_EQ(QGuiApplication::clipboard()->text().toStdString(), "01:02:03.550\t->\t:STEREO:DIRECT \"STORE=1\"\t0\n");
+}
+
+TEST_F(LogViewTest, CommandsComposedWithoutASessionAreMarkedAsNotSent) {
+    folder.copyShipped();
+    start();
+    action("Mnu_Info_Log")->trigger();
+    view = window->findChild<LogView*>(QStringLiteral("LogView"));
+    table = view->findChild<QTableView*>(QStringLiteral("Log_Liste"));
+    view->findChild<QPushButton*>(QStringLiteral("LogClear"))->click();
+    session->params.SendParam("TA", std::string("1"));
+    ASSERT_EQ(rows(), 1);
+    EXPECT_EQ(cell(0, TrafficLog::Direction), "->");
+    EXPECT_EQ(cell(0, TrafficLog::Text), direct("TA=1"));
+    EXPECT_EQ(cell(0, TrafficLog::Status), "nicht gesendet");
+    openSession();
+    session->params.SendParam("TA", std::string("0"));
+    EXPECT_EQ(cell(rows() - 1, TrafficLog::Status), "0");
+}
+
+TEST_F(LogViewTest, APauseHoldsTheListAndLosesNothing) {
+    open();
+    click("Log_Pause");
+    click("Store_Taste_0");
+    click("Store_Taste_1");
+    EXPECT_EQ(rows(), 0);
+    click("Log_Pause");
+    ASSERT_EQ(rows(), 2);
+    EXPECT_EQ(cell(1, TrafficLog::Text), direct("STORE=2"));
+}
+
+TEST_F(LogViewTest, ATipHasTheWholeTextAndItIsWrappedOnDemand) {
+    open();
+    std::string sequence;
+    for (int i = 0; i < 80; ++i) sequence += "0A,";
+    session->params.SendParam("GROUPSEQ", sequence);
+    const QString tip = table->model()->index(0, TrafficLog::Text).data(Qt::ToolTipRole).toString();
+    EXPECT_EQ(QString(tip).remove(QLatin1Char('\n')).toStdString(), cell(0, TrafficLog::Text));
+    EXPECT_TRUE(tip.contains(QLatin1Char('\n')));
+    const int line = table->rowHeight(0);
+    click("Log_Umbruch");
+    EXPECT_GT(table->rowHeight(0), 2 * line);
+    session->params.SendParam("GROUPSEQ", sequence);
+    EXPECT_GT(table->rowHeight(1), 2 * line);
+    click("Log_Umbruch");
+    EXPECT_EQ(table->rowHeight(0), line);
+}
+
+TEST_F(LogViewTest, WrappingKeepsTheEndInView) {
+    open();
+    for (int i = 0; i < 60; ++i)
+        session->params.SendParam("GROUPSEQ", std::string("0A,2A,0A,2A,0A,2A,0A,2A,0A,2A,0A,2A,0A,2A,0A,2A,0A,"));
+    click("Log_Umbruch");
+    session->params.SendParam("TA", std::string("1"));
+    QCoreApplication::processEvents();
+    EXPECT_EQ(table->verticalScrollBar()->value(), table->verticalScrollBar()->maximum());
+    EXPECT_GT(table->verticalScrollBar()->maximum(), 0);
+    // Who reads further up is not disturbed.
+    table->verticalScrollBar()->setValue(20);
+    session->params.SendParam("TA", std::string("0"));
+    QCoreApplication::processEvents();
+    EXPECT_EQ(table->verticalScrollBar()->value(), 20);
+}
+
+TEST_F(LogViewTest, SavesTheLinesThatAreShown) {
+    open();
+    clock.set(3723.5);
+    click("Store_Taste_0");
+    click("Store_Taste_1");
+    type("Log_Filter", "STORE=2");
+    const auto file = folder.path() / "log.txt";
+    dialogs.files = {QString::fromStdString(file.string()), QString()};
+    click("Log_Sichern");
+    EXPECT_EQ(folder.read("../log.txt"), "01:02:03.600\t->\t:STEREO:DIRECT \"STORE=2\"\t0\n");
+    click("Log_Sichern");  // cancelled
+}
+
+TEST_F(LogViewTest, ALogThatCannotBeSavedIsTold) {
+    open();
+    dialogs.files = {QString::fromStdString((folder.path() / "nowhere" / "log.txt").string())};
+    dialogs.expectedMessages = 1;
+    click("Log_Sichern");
+    EXPECT_EQ(dialogs.shown.back().icon, Dialogs::Icon::Critical);
+}
+
+TEST_F(LogViewTest, NothingIsCutOffAndEveryButtonHasAKeyOfItsOwn) {
+    for (const char* language : {"deutsch", "english", "english US"}) {
+        folder.copyShipped();
+        setGeneral("Sprache", "Sprache", language);
+        start();
+        action("Mnu_Info_Log")->trigger();
+        view = window->findChild<LogView*>(QStringLiteral("LogView"));
+        QCoreApplication::processEvents();
+        expectNothingCutOff(*view, language);
+        std::map<QString, QString> mnemonics;
+        for (const QAbstractButton* button : view->findChildren<QPushButton*>()) {
+            const QString key = QKeySequence::mnemonic(button->text()).toString();
+            EXPECT_FALSE(key.isEmpty()) << button->text().toStdString();
+            EXPECT_TRUE(mnemonics.emplace(key, button->text()).second) << language << ' ' << key.toStdString();
+        }
+    }
 }
 
 TEST_F(LogViewTest, KeepsSomeThousandsOfLinesAndForgetsTheOldest) {

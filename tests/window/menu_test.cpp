@@ -85,7 +85,8 @@ TEST_F(MenuTest, TheTreeHasItsEntries) {
     EXPECT_EQ(entriesOf("Mnu_Info"),
               (Lines{"Mnu_Info_Interface", "Mnu_Info_Ueber", "Mnu_Info_Hinweis", "Mnu_Info_Sprache",
                      "Mnu_Info_RDS_RBDS", "Mnu_Info_RS232", "Mnu_TMC_Edit"}));
-    EXPECT_EQ(entriesOf("Mnu_Ansicht"), (Lines{"Mnu_Info_Log", "Mnu_Ansicht_OnAir", "", "Mnu_Ansicht_Lesen"}));
+    EXPECT_EQ(entriesOf("Mnu_Ansicht"), (Lines{"Mnu_Info_Log", "Mnu_Ansicht_OnAir", "Mnu_Ansicht_Vergleich",
+                                               "Mnu_Ansicht_Ablauf", "", "Mnu_Ansicht_Lesen"}));
     EXPECT_EQ(entriesOf("Mnu_Info_Interface"), (Lines{"Mnu_Info_Interface_COM", "Mnu_Info_Interface_IEC"}));
     EXPECT_EQ(entriesOf("Mnu_Info_Sprache"),
               (Lines{"Mnu_Info_Sprache_D", "Mnu_Info_Sprache_E", "Mnu_Info_Sprache_US"}));

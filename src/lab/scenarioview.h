@@ -1,0 +1,74 @@
+#pragma once
+
+#include <QDialog>
+
+#include "lab/steptable.h"
+#include "scenario/scenario.h"
+#include "ui/caption.h"
+#include "ui/pagecontext.h"
+
+class QLabel;
+class QPushButton;
+
+namespace kdx {
+
+class ScenarioRun;
+struct Session;
+
+/// The view that opens a scenario, lists its steps and runs it, with the step that runs, what is left of it, and what
+/// came of each. Stays open beside the main window, which stays in use.
+class ScenarioView : public QDialog {
+    Q_OBJECT
+public:
+    ScenarioView(Session& session, const PageContext& with, QWidget* parent);
+    ~ScenarioView() override;
+
+    void label();
+    void showSessionOpen(bool open);
+    [[nodiscard]] bool isRunning() const;
+    /// Whether what goes out right now is the scenario's, which the window does not show as its own.
+    [[nodiscard]] bool isAtWork() const;
+    /// Ends a run after its running command; what stood before comes back.
+    void stop();
+    /// Ends a run at once, as the session is to be closed.
+    void finish();
+    /// A command failed. @returns whether nobody need be told any more.
+    bool takesFailure();
+
+signals:
+    void runningChanged(bool running);
+
+private:
+    void Ablauf_Oeffnen_Click();
+    void Ablauf_Start_Click();
+    void Ablauf_Pause_Click();
+    void Ablauf_Weiter_Click();
+    void arrange();
+    void open(const QString& file);
+    void showState();
+    void showEnd(const scenario::Outcome& outcome);
+    [[nodiscard]] QStringList problemsOf(const scenario::Scenario& scenario) const;
+    [[nodiscard]] QString caption(const Caption& caption) const { return captionText(m_with.captions, caption); }
+
+    Session& m_session;
+    PageContext m_with;
+    CaptionBook m_book;
+    ScenarioRun* m_run = nullptr;
+    StepTable m_steps;  // Ablauf_Liste
+    QLabel* Ablauf_Titel = nullptr;
+    QLabel* Ablauf_Stand = nullptr;
+    QPushButton* Ablauf_Oeffnen = nullptr;
+    QPushButton* Ablauf_Start = nullptr;
+    QPushButton* Ablauf_Pause = nullptr;
+    QPushButton* Ablauf_Stop = nullptr;
+    QPushButton* Ablauf_Weiter = nullptr;  // what Return is at the command line
+    QPushButton* Ablauf_Schliessen = nullptr;
+    QString m_file;
+    scenario::Scenario m_scenario;
+    std::string m_step;  // that runs
+    QString m_ended;     // how the last run ended
+    std::size_t m_unmet = 0;
+    bool m_sessionOpen = false, m_wasRunning = false;
+};
+
+}  // namespace kdx

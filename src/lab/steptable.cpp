@@ -1,0 +1,135 @@
+#include "lab/steptable.h"
+
+#include <QFont>
+
+#include "lab/viewtable.h"
+#include "ui/caption.h"
+
+namespace kdx {
+
+namespace {
+
+enum Column { Number, What, Result, ColumnCount };
+
+constexpr QChar kGood{u'\u2713'};
+constexpr QChar kBad{u'\u2717'};
+
+/// "4.2" of "4#3.2".
+std::string withoutPasses(const std::string& step) {
+    std::string plain;
+    bool pass = false;
+    for (const char letter : step) {
+        if (letter == '#') pass = true;
+        if (letter == '.') pass = false;
+        if (!pass) plain += letter;
+    }
+    return plain;
+}
+
+bool isGood(const std::string& status) {
+    return status.empty() || status == "0" || status == scenario::kMet || status == scenario::kReturn ||
+           status == scenario::kNoReturn || status == scenario::kGoesOn;
+}
+
+}  // namespace
+
+StepTable::StepTable(const char* name, const Captions& captions, QWidget* parent)
+    : m_captions(captions), m_table(newViewTable(name, ColumnCount, parent)) {
+    m_table->setSelectionMode(QAbstractItemView::NoSelection);
+}
+
+void StepTable::label() {
+    const auto text = [this](const Caption& caption) { return captionText(m_captions, caption); };
+    m_table->setHorizontalHeaderLabels({text({980, "Schritt"}), text({981, "Was"}), text({982, "Ergebnis"})});
+    m_table->setAccessibleName(text({974, "Ablauf"}));
+}
+
+void StepTable::show(const scenario::Scenario& scenario) {
+    m_table->setRowCount(0);
+    m_rows.clear();
+    m_passes.clear();
+    m_marked = -1;
+    if (scenario.dataSet) append(scenario::kOpening, 0, "data_set: " + std::to_string(*scenario.dataSet));
+    append(scenario.actions, {}, 0);
+    if (scenario.restore) append(scenario::kRestoring, 0, "restore: true");
+}
+
+void StepTable::append(const std::vector<scenario::Action>& actions, const std::string& within, int depth) {
+    for (std::size_t at = 0; at < actions.size(); ++at) {
+        const std::string step = within + std::to_string(at + 1);
+        append(step, depth, describe(actions[at]));
+        if (passesOf(actions[at]) > 0) m_passes[step] = passesOf(actions[at]);
+        append(actions[at].actions, step + ".", depth + 1);
+    }
+}
+
+void StepTable::append(const std::string& step, int depth, const std::string& what) {
+    const int row = m_table->rowCount();
+    m_rows[step] = row;
+    m_table->insertRow(row);
+    const bool numbered = step != scenario::kOpening && step != scenario::kRestoring;
+    showCell(m_table, row, Number, numbered ? QString::fromStdString(step) : QString(), false);
+    showCell(m_table, row, What, QString(4 * depth, QLatin1Char(' ')) + QString::fromStdString(what), false);
+    showCell(m_table, row, Result, {}, false);
+}
+
+int StepTable::rowOf(const std::string& step) const {
+    const auto found = m_rows.find(withoutPasses(step));
+    return found == m_rows.end() ? -1 : found->second;
+}
+
+void StepTable::clearResults() {
+    for (int row = 0; row < m_table->rowCount(); ++row) showCell(m_table, row, Result, {}, false);
+    mark({});
+}
+
+void StepTable::mark(const std::string& step) {
+    const auto setBold = [this](int row, bool bold) {
+        for (int column = 0; row >= 0 && column < ColumnCount; ++column) {
+            QFont font = m_table->font();
+            font.setBold(bold);
+            m_table->item(row, column)->setFont(font);
+        }
+    };
+    const int row = rowOf(step);
+    if (row != m_marked) {
+        setBold(m_marked, false);
+        setBold(row, true);
+        if (row >= 0) m_table->scrollToItem(m_table->item(row, Number));
+        m_marked = row;
+    }
+    // In which pass of what it stands within.
+    for (std::size_t at = step.find('#'); at != std::string::npos; at = step.find('#', at + 1)) {
+        const std::string around = withoutPasses(step.substr(0, at));
+        const int outer = rowOf(around);
+        const auto passes = m_passes.find(around);
+        if (outer < 0 || passes == m_passes.end()) continue;
+        const std::string pass = step.substr(at + 1, step.find('.', at) - at - 1);
+        showCell(m_table, outer, Result,
+                 QString::fromStdString(pass) + QLatin1Char('/') + QString::number(passes->second), false);
+    }
+}
+
+void StepTable::add(const scenario::Row& row) {
+    const int at = rowOf(row.step);
+    if (at < 0) return;
+    if (row.step.find('#') != std::string::npos || m_passes.count(withoutPasses(row.step)) != 0) mark(row.step);
+    const bool good = isGood(row.status);
+    if (good && m_table->item(at, Result)->text().startsWith(kBad)) return;  // what went wrong once stays to be seen
+    QString text = good ? kGood : kBad;
+    const bool unmet = row.status == scenario::kNotMet;
+    const QString answer = QString::fromStdString(row.answer);
+    if (unmet) {
+        text += QLatin1Char(' ') + captionText(m_captions, {987, "nicht erfüllt: %1"}).arg(answer);
+    } else if (!good) {
+        text += QLatin1Char(' ') + QString::fromStdString(row.status);
+    } else if (!answer.isEmpty()) {
+        text += QLatin1Char(' ') + answer;
+    } else if (m_passes.count(withoutPasses(row.step)) != 0) {
+        text = m_table->item(at, Result)->text().section(QLatin1Char(':'), 0, 0);
+        if (row.key != scenario::kRepeatRow) text += QLatin1String(": ") + QString::fromStdString(row.value);
+    }
+    showCell(m_table, at, Result, text, !good);
+}
+
+}  // namespace kdx

@@ -1,0 +1,143 @@
+#include "scenariotest.h"
+
+namespace kdx::test {
+namespace {
+
+/// A link that a test may cut.
+class CutVisa final : public Visa {
+public:
+    explicit CutVisa(Visa& visa) : m_visa(visa) {}
+
+    VisaStatus viOpenDefaultRM(VisaHandle& manager) override { return m_visa.viOpenDefaultRM(manager); }
+    VisaStatus viStatusDesc(VisaHandle object, VisaStatus status, std::string& description) override {
+        return m_visa.viStatusDesc(object, status, description);
+    }
+    VisaStatus viOpen(VisaHandle manager, const std::string& resource, std::uint32_t mode, std::uint32_t timeoutMs,
+                      VisaHandle& session) override {
+        return m_visa.viOpen(manager, resource, mode, timeoutMs, session);
+    }
+    VisaStatus viWrite(VisaHandle session, std::span<const char> bytes, std::int32_t& written) override {
+        return cut ? visa::kConnectionLost : m_visa.viWrite(session, bytes, written);
+    }
+    VisaStatus viRead(VisaHandle session, std::span<char> buffer, std::int32_t& count) override {
+        return cut ? visa::kConnectionLost : m_visa.viRead(session, buffer, count);
+    }
+    VisaStatus viClose(VisaHandle object) override { return m_visa.viClose(object); }
+
+    bool cut = false;
+
+private:
+    Visa& m_visa;
+};
+
+class ScenarioStopTest : public ScenarioTest {
+protected:
+    ~ScenarioStopTest() override { end(); }
+    Visa& instrumentLink() override { return cable; }
+
+    CutVisa cable{link};
+};
+
+TEST_F(ScenarioStopTest, StopBringsBackWhatStoodBefore) {
+    openView();
+    load("restore: true\nsteps: [send: {PS: EINS}, wait: 1 h, send: {PS: ZWEI}]");
+    click("Ablauf_Start");
+    pass(10s);
+    EXPECT_EQ(taken(), Lines{direct("PS=EINS    ")});
+    ASSERT_TRUE(enabled("Ablauf_Stop"));
+    click("Ablauf_Stop");
+    pass(200ms);
+    EXPECT_FALSE(view->isRunning());
+    EXPECT_EQ(taken(), Lines{direct("PS=MESSTURM")});
+    EXPECT_EQ(text("Ablauf_Stand"), "abgebrochen");
+    EXPECT_EQ(value("PS"), "MESSTURM");
+    EXPECT_EQ(result(3), "\u2713");  // the row of what comes back
+    EXPECT_FALSE(enabled("Ablauf_Stop"));
+    EXPECT_TRUE(enabled("Ablauf_Start"));
+}
+
+TEST_F(ScenarioStopTest, StopEndsARunThatIsHeld) {
+    openView();
+    load("steps: [wait: 1 h, send: {PS: ZWEI}]");
+    click("Ablauf_Start");
+    pass(1s);
+    click("Ablauf_Pause");
+    pass(1s);
+    click("Ablauf_Stop");
+    pass(200ms);
+    EXPECT_FALSE(view->isRunning());
+    EXPECT_FALSE(checked("Ablauf_Pause"));
+    EXPECT_EQ(taken(), Lines{});
+}
+
+TEST_F(ScenarioStopTest, LocalBringsBackWhatStoodBeforeAndThenCloses) {
+    openView();
+    load("restore: true\nsteps: [send: {PS: EINS}, wait: 1 h]");
+    click("Ablauf_Start");
+    pass(10s);
+    taken();
+    click("GTL_Taste");
+    EXPECT_FALSE(view->isRunning());
+    EXPECT_EQ(taken(), Lines{direct("PS=MESSTURM")});
+    EXPECT_FALSE(enabled("Ablauf_Start"));
+}
+
+TEST_F(ScenarioStopTest, TheEndOfTheProgramBringsBackWhatStoodBefore) {
+    openView();
+    load("restore: true\nsteps: [send: {PS: EINS}, wait: 1 h]");
+    click("Ablauf_Start");
+    pass(10s);
+    taken();
+    end();
+    EXPECT_EQ(taken(), Lines{direct("PS=MESSTURM")});
+}
+
+TEST_F(ScenarioStopTest, ALostLinkEndsTheRunWithOneBox) {
+    openView();
+    load("restore: true\nsteps: [send: {PS: EINS}, wait: 20 s, send: {PS: ZWEI}, wait: 5 s, send: {PS: DREI}]");
+    click("Ablauf_Start");
+    pass(10s);
+    cable.cut = true;
+    dialogs.expectedMessages = 1;
+    passAll();
+    EXPECT_EQ(dialogs.shown.back().title, QStringLiteral("Interface Error"));
+    EXPECT_TRUE(text("Ablauf_Stand").starts_with("abgebrochen; nicht wie zuvor: PS")) << text("Ablauf_Stand");
+    EXPECT_EQ(result(2), "\u2717 -1073807194");
+}
+
+TEST_F(ScenarioStopTest, TheEndOfTheProgramDoesNotWaitForAnInstrumentThatHasGone) {
+    openView();
+    load("restore: true\nsteps: [send: {PS: EINS}, wait: 1 h]");
+    click("Ablauf_Start");
+    pass(10s);
+    cable.cut = true;
+    dialogs.expectedMessages = 1;
+    clock.sleeps.clear();
+    end();
+    EXPECT_LT(clock.sleptMs(), 500);
+}
+
+TEST_F(ScenarioStopTest, ACommandOfTheWindowThatFailsDoesNotEndTheRun) {
+    openView();
+    load("steps: [wait: 1 h]");
+    click("Ablauf_Start");
+    pass(1s);
+    cable.cut = true;
+    dialogs.expectedMessages = 1;
+    click("PS_Taste");
+    cable.cut = false;
+    pass(1s);
+    EXPECT_TRUE(view->isRunning());
+}
+
+TEST_F(ScenarioStopTest, TheOtherNetworkOfTheWindowIsTheOldOneAfterwards) {
+    openView();
+    const std::string before = state.eonIdentifier;
+    load("steps: [send: {EON_PI: ABCD, EON_TA: 1}]");
+    click("Ablauf_Start");
+    passAll();
+    EXPECT_EQ(state.eonIdentifier, before);
+}
+
+}  // namespace
+}  // namespace kdx::test
