@@ -26,7 +26,7 @@ inline constexpr const char* kReadError = "Error";          ///< of ReadFromGen 
 class Instrument {
 public:
     /// Shows one failure: the text ("Fehler: " and the status) for a box titled "Interface Error". While a sequence
-    /// runs the user may want to stop it: true then.
+    /// runs the user may want to stop it: true then. What fails because the user has stopped the sequence is not shown.
     using InterfaceError = std::function<bool(const std::string& text, bool sequenceRuns)>;
 
     /// @param captions gives the texts 142 ("display"), 143 ("no answer") and 144 ("empty").
@@ -35,6 +35,8 @@ public:
 
     /// Who shows failures; without one they pass silently.
     void onFailure(InterfaceError interfaceError) { m_interfaceError = std::move(interfaceError); }
+    /// Who hears that a run of commands begins (true) and that the outermost one is over (false).
+    void onRun(std::function<void(bool begins)> run) { m_run = std::move(run); }
     void addWatcher(TrafficWatcher& watcher) { m_watchers.push_back(&watcher); }
     void removeWatcher(TrafficWatcher& watcher) { std::erase(m_watchers, &watcher); }
 
@@ -90,9 +92,11 @@ private:
     const Captions& m_captions;
     Clock& m_clock;
     InterfaceError m_interfaceError;
+    std::function<void(bool)> m_run;
     std::vector<TrafficWatcher*> m_watchers;
     bool m_open = false;
     int m_sequences = 0;
+    int m_runs = 0;  ///< those among them that are runs
     bool m_sequenceStopped = false;
 };
 
