@@ -1,6 +1,7 @@
 #pragma once
 
 #include "af/aflistview.h"
+#include "ui/automatics.h"
 #include "ui/page.h"
 
 #include <QCheckBox>
@@ -52,10 +53,12 @@ private:
     void EON_AFB_Senden_Click();
     void holdPi(const std::string& pi);
     [[nodiscard]] bool mayAnnounce();
+    void setAnnouncing(bool on);
     void showStoredProgrammeType();
 
     OtherNetwork& m_network;
     std::function<void()> m_openEditor;
+    Automatic m_announcing;
     bool m_switchingTa = false;  // the switch's handler is running, perhaps waiting for a box to be closed
 
     QGroupBox* m_programme = nullptr;

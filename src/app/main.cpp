@@ -11,6 +11,7 @@
 #include "app/options.h"
 #include "app/platform.h"
 #include "base/clock.h"
+#include "link/workervisa.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
 #include "settings/folderlock.h"
@@ -49,8 +50,8 @@ void endWhenAsked(kdx::Application& application) {
 /// not destroyed then.
 class EndsWithProgram {
 public:
-    explicit EndsWithProgram(kdx::Session& session) {
-        owned() = &session;
+    EndsWithProgram(kdx::Session& session, kdx::WorkerVisa& worker) : m_session(session), m_worker(worker) {
+        owned() = this;
         (void)std::atexit([] {
             if (owned() != nullptr) owned()->letGo();
         });
@@ -60,10 +61,17 @@ public:
     EndsWithProgram& operator=(const EndsWithProgram&) = delete;
 
 private:
-    static kdx::Session*& owned() {
-        static kdx::Session* session = nullptr;
-        return session;
+    void letGo() {
+        m_worker.setWaiter(nullptr);  // the window can show nothing any more
+        m_session.letGo();
     }
+    static EndsWithProgram*& owned() {
+        static EndsWithProgram* one = nullptr;
+        return one;
+    }
+
+    kdx::Session& m_session;
+    kdx::WorkerVisa& m_worker;
 };
 
 /// Tries a last time to save what could not be, while there is still somebody to tell.
@@ -86,7 +94,7 @@ int main(int argc, char** argv) {
         return EXIT_SUCCESS;
     }
     kdx::SystemClock clock;
-    const kdx::ChosenVisa link = kdx::chooseVisa(options, clock);
+    kdx::ChosenVisa link = kdx::chooseVisa(options, clock);
     if (options.version) {
         print("KDX-RDS " KDX_VERSION "\n" + link.description);
         return EXIT_SUCCESS;
@@ -120,11 +128,13 @@ int main(int argc, char** argv) {
                         kdx::toText(captions.own(314, "Bei \"%1\": %2")).arg(doing, error));
     });
     const auto end = [&application] { application.end(); };
-    kdx::Session session(*link.visa, state, data, captions, clock, end);
-    const EndsWithProgram letGo(session);
+    kdx::WorkerVisa worker(std::move(link.visa));
+    kdx::Session session(worker, state, data, captions, clock, end);
+    const EndsWithProgram letGo(session, worker);
     kdx::TickerGroup tickers;
     kdx::HMenue window({session, state, data, captions, clock, dialogs, tickers, claim,
-                        QString::fromStdString(link.description), QString::fromStdString(problem), end});
+                        QString::fromStdString(link.description), QString::fromStdString(problem), end, &worker,
+                        options.answerTime.value_or(std::chrono::seconds(2))});
     application.guarded(window.objectName(), [&] { window.startUp(); });
     if (options.tourFolder) {
         int result = EXIT_FAILURE;

@@ -1,6 +1,7 @@
 #include "rds/querypage.h"
 
 #include <array>
+#include <optional>
 #include <utility>
 
 #include "coder/readback.h"
@@ -81,7 +82,8 @@ void QueryPage::Fragen_Schalter(bool on) {
 
 void QueryPage::ask(const ReadBack& readBack) {
     if (!m_with.state.InstrumentOnline) return;
-    const CommandSequence sequence(m_with.instrument);
+    std::optional<CommandSequence> sequence;  // a single question is none
+    if (readBack.queries(m_with.state.eonIdentifier).size() > 1) sequence.emplace(m_with.instrument);
     // Kept here while they come: a box of a failed question lets another button be pressed.
     std::vector<std::string> answers = kdx::ask(m_with.instrument, readBack, m_with.state.eonIdentifier);
     m_answers = std::move(answers);

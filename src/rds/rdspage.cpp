@@ -13,6 +13,7 @@
 #include "settings/withoutcontrols.h"
 #include "ui/dialogs.h"
 #include "ui/statusrow.h"
+#include "ui/tick.h"
 
 namespace kdx {
 
@@ -130,6 +131,7 @@ void RdsPage::Timer1_Timer() {
     if (!m_clockOn) return;
     showClock(toText(timeText(m_with.clock)));
     m_clockShowsWord = false;
+    const Tick tick(m_with, caption({836, "Uhr"}), [this] { Zeit_Taste_Click(); });
     m_with.params.SendParam(setting::kClock, toBytes(Uhr_Zeit->text()));
 }
 

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "ui/automatics.h"
 #include "ui/page.h"
 
 #include <QLineEdit>
@@ -38,6 +39,7 @@ private:
 
     const TmcBuilder& m_builder;
     int m_sendPosition = 0;
+    Automatic m_cycling;
     bool m_otherVariant = false;  ///< which announcement comes next
 
     QListWidget* TMC_List = nullptr;

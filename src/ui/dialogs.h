@@ -12,9 +12,11 @@ public:
     virtual ~Dialogs() = default;
     /// Shows a text with an OK button, details in smaller print under it, and waits for it.
     virtual void message(Icon icon, const QString& title, const QString& text, const QString& details = {}) = 0;
-    /// Shows a failure as a critical box with an OK button and one that stops the running sequence; true for the
-    /// latter.
-    virtual bool messageOrStop(const QString& title, const QString& text) = 0;
+    /// Shows a failure with an OK button and one that stops what failed; true for the latter.
+    /// @param details in smaller print under the text. @param stop caption of the second button; by default it stops
+    /// the rest of a sequence.
+    virtual bool messageOrStop(const QString& title, const QString& text, const QString& details = {},
+                               const QString& stop = {}, Icon icon = Icon::Critical) = 0;
     /// Asks with Yes and No; true for Yes.
     virtual bool confirm(const QString& title, const QString& text) = 0;
     /// Asks for a text; an empty answer is given for Cancel too.
@@ -24,6 +26,8 @@ public:
     virtual QString fileToSave(const QString& /*title*/, const QString& /*preset*/, const QString& /*kind*/) {
         return {};
     }
+    /// Whether somebody is there to answer: not when the program is ending.
+    [[nodiscard]] virtual bool canAsk() const { return true; }
 };
 
 }  // namespace kdx

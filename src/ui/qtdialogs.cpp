@@ -3,6 +3,7 @@
 #include <QApplication>
 #include <QFileDialog>
 #include <QInputDialog>
+#include <QMainWindow>
 #include <QMessageBox>
 #include <QPushButton>
 
@@ -29,6 +30,17 @@ QMessageBox::Icon boxIcon(Dialogs::Icon icon) {
     return QMessageBox::NoIcon;
 }
 
+/// The window that asks: an editor, which is modal; else the one that is used. While a box that just closed still
+/// counts as active there is none, so the main window it is then.
+QWidget* asker() {
+    if (QWidget* const editor = QApplication::activeModalWidget()) return editor;
+    if (QWidget* const active = QApplication::activeWindow(); active != nullptr && active->isVisible()) return active;
+    for (QWidget* window : QApplication::topLevelWidgets()) {
+        if (window->isVisible() && qobject_cast<QMainWindow*>(window) != nullptr) return window;
+    }
+    return nullptr;
+}
+
 bool isClicked(const QMessageBox& box, const QAbstractButton* button) {
     return box.clickedButton() == button;
 }
@@ -40,27 +52,29 @@ QtDialogs::QtDialogs(const Captions& captions, std::function<bool()> ending)
 
 void QtDialogs::message(Icon icon, const QString& title, const QString& text, const QString& details) {
     if (m_ending()) return;
-    QMessageBox box(boxIcon(icon), title, text, QMessageBox::NoButton, QApplication::activeWindow());
+    QMessageBox box(boxIcon(icon), title, text, QMessageBox::NoButton, asker());
     box.setInformativeText(details);
     box.addButton(toText(m_captions.own(317, "OK")), QMessageBox::AcceptRole);
     box.exec();
 }
 
-bool QtDialogs::messageOrStop(const QString& title, const QString& text) {
+bool QtDialogs::messageOrStop(const QString& title, const QString& text, const QString& details,
+                              const QString& stopText, Icon icon) {
     if (m_ending()) return true;
-    QMessageBox box(QMessageBox::Critical, title, text, QMessageBox::NoButton, QApplication::activeWindow());
+    QMessageBox box(boxIcon(icon), title, text, QMessageBox::NoButton, asker());
+    box.setInformativeText(details);
     QPushButton* ok = box.addButton(toText(m_captions.own(317, "OK")), QMessageBox::AcceptRole);
     box.setDefaultButton(ok);
     box.setEscapeButton(ok);
-    const QPushButton* stop =
-        box.addButton(toText(m_captions.own(323, "&Rest abbrechen")), QMessageBox::DestructiveRole);
+    const QPushButton* stop = box.addButton(
+        stopText.isEmpty() ? toText(m_captions.own(323, "&Rest abbrechen")) : stopText, QMessageBox::DestructiveRole);
     box.exec();
     return m_ending() || isClicked(box, stop);
 }
 
 bool QtDialogs::confirm(const QString& title, const QString& text) {
     if (m_ending()) return false;
-    QMessageBox box(QMessageBox::Question, title, text, QMessageBox::NoButton, QApplication::activeWindow());
+    QMessageBox box(QMessageBox::Question, title, text, QMessageBox::NoButton, asker());
     const QPushButton* yes = box.addButton(toText(m_captions.own(315, "&Ja")), QMessageBox::YesRole);
     box.setEscapeButton(box.addButton(toText(m_captions.own(316, "&Nein")), QMessageBox::NoRole));
     box.exec();
@@ -69,7 +83,7 @@ bool QtDialogs::confirm(const QString& title, const QString& text) {
 
 QString QtDialogs::input(const QString& prompt, const QString& title, const QString& preset) {
     if (m_ending()) return {};
-    QInputDialog box(QApplication::activeWindow());
+    QInputDialog box(asker());
     box.setWindowTitle(title);
     box.setLabelText(prompt);
     box.setTextValue(preset);
@@ -80,7 +94,7 @@ QString QtDialogs::input(const QString& prompt, const QString& title, const QStr
 
 QString QtDialogs::fileToSave(const QString& title, const QString& preset, const QString& kind) {
     if (m_ending()) return {};
-    QFileDialog box(QApplication::activeWindow(), title, {}, kind);
+    QFileDialog box(asker(), title, {}, kind);
     box.setAcceptMode(QFileDialog::AcceptSave);
     box.setLabelText(QFileDialog::Accept, toText(m_captions.own(789, "&Sichern")));
     box.setLabelText(QFileDialog::Reject, toText(m_captions.own(318, "Abbrechen")));

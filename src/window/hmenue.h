@@ -21,6 +21,7 @@ class Page;
 class ProgressLine;
 class StatusRow;
 class Views;
+class WaysOut;
 
 /// The one main window: owns the pages and what ties them together.
 class HMenue : public QMainWindow, private StepWatcher {
@@ -46,6 +47,7 @@ signals:
 
 protected:
     bool eventFilter(QObject* watched, QEvent* event) override;
+    void closeEvent(QCloseEvent* event) override;
 
 private:
     void stepGoesOut(const Step& step, std::size_t number, std::size_t total) override;
@@ -61,7 +63,6 @@ private:
     void showSessionOpen(bool open);
     void watchPictures();
     void showNotice();
-    bool showInterfaceError(const std::string& text, bool sequenceRuns);
 
     Surroundings m_s;
     StatusRow* m_status;
@@ -73,6 +74,7 @@ private:
     std::vector<Page*> m_pages;
     ProgressLine* m_lowerEdge = nullptr;  // progress, and what the user should know
     QString m_startNotice;                // what start-up could not read
+    WaysOut* m_waysOut = nullptr;
     MainMenu* m_menu = nullptr;
     std::unique_ptr<Views> m_views;
 };

@@ -2,6 +2,7 @@
 
 #include <QString>
 
+#include <chrono>
 #include <functional>
 
 namespace kdx {
@@ -14,6 +15,7 @@ class FolderClaim;
 struct ProgramState;
 struct Session;
 class TickerGroup;
+class WorkerVisa;
 
 /// What the window works with; everything is borrowed and outlives it.
 struct Surroundings {
@@ -28,6 +30,8 @@ struct Surroundings {
     QString linkDescription;           ///< how instruments are reached, for the about box
     QString dataProblem;               ///< what is wrong with the data folder, in words; usually nothing
     std::function<void()> endProgram;  ///< ends the program at once
+    WorkerVisa* worker = nullptr;      ///< the session's link, where the calls to it run in a thread of their own
+    std::chrono::milliseconds answerTime{2000};  ///< how long an instrument may take for an answer
 };
 
 }  // namespace kdx
