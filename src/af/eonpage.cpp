@@ -4,7 +4,7 @@
 #include "af/othernetwork.h"
 #include "af/settings.h"
 #include "coder/sendparam.h"
-#include "link/instrument.h"
+#include "link/commandsequence.h"
 #include "settings/captions.h"
 #include "settings/programstate.h"
 #include "settings/storedvalue.h"
@@ -15,6 +15,7 @@
 #include "ui/sententry.h"
 #include "ui/statusrow.h"
 #include "ui/text.h"
+#include "ui/tick.h"
 
 #include <QScopedValueRollback>
 
@@ -34,7 +35,15 @@ void setQuietly(SentEntry* box, const std::string& bytes) {
 }  // namespace
 
 EonPage::EonPage(const PageContext& with, OtherNetwork& network, QWidget* parent)
-    : Page(with, parent), m_network(network) {
+    : Page(with, parent),
+      m_network(network),
+      m_announcing(
+          with.tickers.automatics(), [this] { return EON_TA_Label->text(); }, [this] { setAnnouncing(false); },
+          [this] {
+              if (!m_announcing.runs()) return;
+              setAnnouncing(false);
+              sendAndStore(setting::kEonTa, m_network.ta);
+          }) {
     m_openEditor = [this] { AF_Listenform(m_with, window()).exec(); };
     create();
     arrange();
@@ -153,6 +162,7 @@ void EonPage::EON_PI_Text_Change() {
 }
 
 void EonPage::EON_PI_Taste_Click() {
+    const CommandSequence sequence(m_with.instrument);
     holdPi(withoutControls(m_network.pi));  // the data set may hold what cannot be typed
     const auto& [label, key] = setting::kHeldNetworks;
     m_with.params.SendParam(setting::kEonRemoval, firstNetwork(m_with.instrument.X4_Abfrage(label, key)));
@@ -201,10 +211,15 @@ void EonPage::EON_TA_Schalter_Click() {
     const QScopedValueRollback<bool> switching(m_switchingTa, true);
     if (!mayAnnounce() || m_network.tp != "1") return;
     const bool on = m_network.ta != "1";
+    setAnnouncing(on);
+    sendAndStore(setting::kEonTa, m_network.ta);
+}
+
+void EonPage::setAnnouncing(bool on) {
     m_network.ta = on ? "1" : "0";
     EON_TA_Schalter->showState(on);
     EON_TA_Zeit->setEnabled(on);
-    sendAndStore(setting::kEonTa, m_network.ta);
+    m_announcing.setRunning(on);
 }
 
 /// Whether the own programme's indicators allow an announcement of the other network; tells the user why not. They are
@@ -220,13 +235,22 @@ bool EonPage::mayAnnounce() {
         reason = 169;
     }
     if (reason == 0) return true;
-    m_with.dialogs.message(Dialogs::Icon::Exclamation, caption({167}), caption({reason}));
+    if (Tick* const tick = m_with.tickers.tick()) {
+        tick->tell(Dialogs::Icon::Exclamation, caption({167}), caption({reason}));
+    } else {
+        m_with.dialogs.message(Dialogs::Icon::Exclamation, caption({167}), caption({reason}));
+    }
     return false;
 }
 
 void EonPage::EON_TA_Zeit_Timer() {
     // The timer goes on while a box is open; a tick must not open a second box over the first one every second.
-    if (!m_switchingTa) EON_TA_Schalter_Click();
+    if (m_switchingTa) return;
+    const Tick tick(m_with, EON_TA_Label->text(), [this] {
+        setAnnouncing(false);
+        m_with.profile.write(setting::kEonTa.place, m_network.ta);
+    });
+    EON_TA_Schalter_Click();
 }
 
 void EonPage::EON_AFB_Opt_Click(int index) {

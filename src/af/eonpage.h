@@ -1,6 +1,7 @@
 #pragma once
 
 #include "af/aflistview.h"
+#include "ui/automatics.h"
 #include "ui/page.h"
 
 #include <QCheckBox>
@@ -57,10 +58,12 @@ private:
     void holdPi(const std::string& pi);
     void noteSent(const std::string& key, const std::string& value);
     [[nodiscard]] bool mayAnnounce();
+    void setAnnouncing(bool on);
     void showStoredProgrammeType();
 
     OtherNetwork& m_network;
     std::function<void()> m_openEditor;
+    Automatic m_announcing;
     bool m_switchingTa = false;  // the switch's handler is running, perhaps waiting for a box to be closed
 
     QGroupBox* m_programme = nullptr;

@@ -12,6 +12,7 @@
 #include "app/options.h"
 #include "app/platform.h"
 #include "base/clock.h"
+#include "link/workervisa.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
 #include "settings/folderlock.h"
@@ -51,8 +52,8 @@ void endWhenAsked(kdx::Application& application) {
 /// not destroyed then.
 class EndsWithProgram {
 public:
-    explicit EndsWithProgram(kdx::Session& session) {
-        owned() = &session;
+    EndsWithProgram(kdx::Session& session, kdx::WorkerVisa& worker) : m_session(session), m_worker(worker) {
+        owned() = this;
         (void)std::atexit([] {
             if (owned() != nullptr) owned()->letGo();
         });
@@ -62,10 +63,17 @@ public:
     EndsWithProgram& operator=(const EndsWithProgram&) = delete;
 
 private:
-    static kdx::Session*& owned() {
-        static kdx::Session* session = nullptr;
-        return session;
+    void letGo() {
+        m_worker.setWaiter(nullptr);  // the window can show nothing any more
+        m_session.letGo();
     }
+    static EndsWithProgram*& owned() {
+        static EndsWithProgram* one = nullptr;
+        return one;
+    }
+
+    kdx::Session& m_session;
+    kdx::WorkerVisa& m_worker;
 };
 
 bool isFolder(const std::filesystem::path& folder) {
@@ -100,7 +108,7 @@ int main(int argc, char** argv) {
         return EXIT_SUCCESS;
     }
     kdx::SystemClock clock;
-    const kdx::ChosenVisa link = kdx::chooseVisa(options, clock);
+    kdx::ChosenVisa link = kdx::chooseVisa(options, clock);
     if (options.version) {
         print("KDX-RDS " KDX_VERSION "\n" + link.description);
         return EXIT_SUCCESS;
@@ -141,13 +149,14 @@ int main(int argc, char** argv) {
     if (options.tourFolder && claim.isShared()) data.setReadOnly();
     if (!options.tourFolder && !kdx::goesOnBesideAnother(claim, data, captions, dialogs)) return EXIT_SUCCESS;
     const auto end = [&application] { application.end(); };
-    kdx::Session session(*link.visa, state, data, captions, clock, end);
-    const EndsWithProgram letGo(session);
+    kdx::WorkerVisa worker(std::move(link.visa));
+    kdx::Session session(worker, state, data, captions, clock, end);
+    const EndsWithProgram letGo(session, worker);
     kdx::TickerGroup tickers;
     kdx::HMenue window({session, state, data, captions, clock, dialogs, tickers, claim,
-                        QString::fromStdString(link.description), QString::fromStdString(problem), end,
-                        link.simulated != nullptr, kdx::shippedAppFolder(argv[0]),
-                        options.tourFolder ? std::filesystem::path() : placeFile()});
+                        QString::fromStdString(link.description), QString::fromStdString(problem), end, &worker,
+                        options.answerTime.value_or(std::chrono::seconds(2)), link.simulated != nullptr,
+                        kdx::shippedAppFolder(argv[0]), options.tourFolder ? std::filesystem::path() : placeFile()});
     application.guarded(window.objectName(), [&] { window.startUp(); });
     if (options.tourFolder) {
         int result = EXIT_FAILURE;

@@ -3,6 +3,7 @@
 #include <netdb.h>
 #include <sys/socket.h>
 
+#include <algorithm>
 #include <condition_variable>
 #include <cstring>
 #include <memory>
@@ -43,7 +44,7 @@ Addresses lookUp(const std::string& host, int flags) {
 
 }  // namespace
 
-Addresses resolveHost(const std::string& host, Deadline deadline) {
+Addresses resolveHost(const std::string& host, Deadline deadline, const std::atomic_bool& aborting) {
     if (Addresses numeric = lookUp(host, AI_NUMERICHOST); !numeric.empty()) return numeric;
     // The system's call has no time-out of its own and cannot be stopped: silent name servers hold it for half a
     // minute. So a thread waits for it that nobody waits for.
@@ -55,7 +56,10 @@ Addresses resolveHost(const std::string& host, Deadline deadline) {
         lookup->done.notify_one();
     }).detach();
     std::unique_lock guard(lookup->mutex);
-    lookup->done.wait_until(guard, deadline, [&] { return lookup->addresses.has_value(); });
+    while (!aborting && std::chrono::steady_clock::now() < deadline) {
+        const Deadline look = std::min(deadline, std::chrono::steady_clock::now() + kAbortLatency);
+        if (lookup->done.wait_until(guard, look, [&] { return lookup->addresses.has_value(); })) break;
+    }
     return lookup->addresses.value_or(Addresses());
 }
 

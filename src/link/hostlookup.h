@@ -10,7 +10,8 @@
 namespace kdx {
 
 /// The IPv4 addresses of a host; empty when it is unknown, or when the system's name service has not said until the
-/// deadline.
-std::vector<sockaddr_in> resolveHost(const std::string& host, Deadline deadline);
+/// deadline, or until `aborting` is set by another thread.
+std::vector<sockaddr_in> resolveHost(const std::string& host, Deadline deadline,
+                                     const std::atomic_bool& aborting = kNeverAborted);
 
 }  // namespace kdx

@@ -136,7 +136,7 @@ std::string Instrument::VRN_Abfrage(const std::string& label, const std::string&
 
 void Instrument::fail() {
     const bool sequenceRuns = m_sequences > 0;
-    if (!m_interfaceError) return;
+    if (!m_interfaceError || m_sequenceStopped) return;
     const bool stop = m_interfaceError("Fehler: " + std::to_string(LastVisaStatus), sequenceRuns);
     if (stop && sequenceRuns) m_sequenceStopped = true;
 }
@@ -146,11 +146,13 @@ void Instrument::notify(Traffic::Kind kind, std::string text, VisaStatus status)
     for (TrafficWatcher* watcher : m_watchers) watcher->passed(traffic);
 }
 
-CommandSequence::CommandSequence(Instrument& instrument) : m_instrument(instrument) {
+CommandSequence::CommandSequence(Instrument& instrument, Kind kind) : m_instrument(instrument), m_kind(kind) {
     ++m_instrument.m_sequences;
+    if (m_kind == Kind::Run && m_instrument.m_runs++ == 0 && m_instrument.m_run) m_instrument.m_run(true);
 }
 
 CommandSequence::~CommandSequence() {
+    if (m_kind == Kind::Run && --m_instrument.m_runs == 0 && m_instrument.m_run) m_instrument.m_run(false);
     if (--m_instrument.m_sequences == 0) m_instrument.m_sequenceStopped = false;
 }
 

@@ -69,8 +69,8 @@ u_long millisecondsUntil(Deadline deadline) {
 /// Asks the host for the port of its VXI-11 core channel: version 2 of the port mapper over TCP, which all devices
 /// know.
 VisaStatus askForCorePort(const sockaddr_in& address, std::uint16_t portMapperPort, Deadline deadline,
-                          std::uint16_t& corePort) {
-    RpcChannel portMapper(PMAPPROG, PMAPVERS);
+                          const std::atomic_bool& aborting, std::uint16_t& corePort) {
+    RpcChannel portMapper(PMAPPROG, PMAPVERS, aborting);
     if (!portMapper.connect(address, portMapperPort, deadline)) return visa::kResourceNotFound;
     pmap wanted{DEVICE_CORE, DEVICE_CORE_VERSION, IPPROTO_TCP, 0};
     std::uint32_t port = 0;
@@ -88,15 +88,18 @@ VisaStatus askForCorePort(const sockaddr_in& address, std::uint16_t portMapperPo
 
 /// One link to one device, over a connection of its own.
 struct LanVisa::Link {
+    explicit Link(const std::atomic_bool& aborted) : aborting(aborted) {}
+
     VisaHandle manager = 0;
-    RpcChannel channel{DEVICE_CORE, DEVICE_CORE_VERSION};
+    const std::atomic_bool& aborting;
+    RpcChannel channel{DEVICE_CORE, DEVICE_CORE_VERSION, aborting};
     Device_Link id = 0;
     std::size_t maxReceive = kSmallestMaxReceive;  ///< the most bytes that the device takes in one call
 
     VisaStatus connect(const sockaddr_in& address, const LanOptions& options, Deadline deadline) {
         std::uint16_t port = options.corePort;
         if (port == 0) {
-            const VisaStatus status = askForCorePort(address, options.portMapperPort, deadline, port);
+            const VisaStatus status = askForCorePort(address, options.portMapperPort, deadline, aborting, port);
             if (status != visa::kSuccess) return status;
         }
         return channel.connect(address, port, deadline) ? visa::kSuccess : visa::kResourceNotFound;
@@ -139,22 +142,23 @@ VisaStatus LanVisa::viOpen(VisaHandle resourceManager, const std::string& resour
     const LanResource& wanted = std::get<LanResource>(parsed);
 
     const auto connectTime = openTimeoutMs > 0 ? std::chrono::milliseconds(openTimeoutMs) : m_options.connectTimeout;
-    const Deadline connectDeadline = steady_clock::now() + connectTime;
-    const std::vector<sockaddr_in> addresses = resolveHost(wanted.host, connectDeadline);
-    auto link = std::make_unique<Link>();
+    auto link = std::make_unique<Link>(m_aborting);
     link->manager = resourceManager;
-    VisaStatus status = visa::kResourceNotFound;
-    for (const sockaddr_in& address : addresses) {
-        status = link->connect(address, m_options, connectDeadline);
-        if (status != visa::kResourceNotFound) break;
-    }
-    if (status != visa::kSuccess) return status;
-    status = link->create(wanted.device, accessMode == 1,
-                          steady_clock::now() + m_options.ioTimeout + m_options.answerMargin);
-    if (status != visa::kSuccess) return status;
+    const VisaStatus status = open(wanted, accessMode == 1, steady_clock::now() + connectTime, *link);
+    if (status != visa::kSuccess) return unlessAborted(status);
     session = ++m_lastHandle;
     m_links.emplace(session, std::move(link));
     return visa::kSuccess;
+}
+
+VisaStatus LanVisa::open(const LanResource& wanted, bool locked, Deadline connectDeadline, Link& link) const {
+    VisaStatus status = visa::kResourceNotFound;
+    for (const sockaddr_in& address : resolveHost(wanted.host, connectDeadline, m_aborting)) {
+        status = link.connect(address, m_options, connectDeadline);
+        if (status != visa::kResourceNotFound) break;
+    }
+    if (status != visa::kSuccess) return status;
+    return link.create(wanted.device, locked, steady_clock::now() + m_options.ioTimeout + m_options.answerMargin);
 }
 
 VisaStatus LanVisa::viWrite(VisaHandle session, std::span<const char> bytes, std::int32_t& written) {
@@ -177,7 +181,7 @@ VisaStatus LanVisa::viWrite(VisaHandle session, std::span<const char> bytes, std
             device_write, part.size(), [&](XDR* xdr) { return xdr_Device_WriteParms(xdr, &wanted); },
             [&](XDR* xdr) { return xdr_Device_WriteResp(xdr, &done); }, deadline + m_options.answerMargin);
         const VisaStatus status = combined(outcome, done.error);
-        if (status != visa::kSuccess) return status;
+        if (status != visa::kSuccess) return unlessAborted(status);
         const auto taken = static_cast<std::uint32_t>(done.size);
         if (taken == 0 || taken > part.size()) return visa::kInputOutput;
         written += static_cast<std::int32_t>(taken);
@@ -211,7 +215,7 @@ VisaStatus LanVisa::viRead(VisaHandle session, std::span<char> buffer, std::int3
             device_read, 0, [&](XDR* xdr) { return xdr_Device_ReadParms(xdr, &wanted); }, decode,
             deadline + m_options.answerMargin);
         const VisaStatus status = combined(outcome, error);
-        if (status != visa::kSuccess) return status;
+        if (status != visa::kSuccess) return unlessAborted(status);
         count += static_cast<std::int32_t>(got);
         buffer = buffer.subspan(got);
         if ((reason & vxi11::kReasonEnd) != 0) return visa::kSuccess;
@@ -238,6 +242,11 @@ VisaStatus LanVisa::viClose(VisaHandle object) {
         return true;
     });
     return visa::kSuccess;
+}
+
+/// A wait that was aborted ends like one that lasted too long.
+VisaStatus LanVisa::unlessAborted(VisaStatus status) const {
+    return m_aborting ? visa::kAborted : status;
 }
 
 LanVisa::Link* LanVisa::find(VisaHandle session) {

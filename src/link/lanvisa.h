@@ -1,7 +1,9 @@
 #pragma once
 
+#include "link/deadline.h"
 #include "link/visa.h"
 
+#include <atomic>
 #include <chrono>
 #include <cstdint>
 #include <map>
@@ -10,6 +12,8 @@
 #include <string>
 
 namespace kdx {
+
+struct LanResource;
 
 /// Times and ports of the LAN client.
 struct LanOptions {
@@ -50,6 +54,7 @@ public:
     VisaStatus viRead(VisaHandle session, std::span<char> buffer, std::int32_t& count) override;
     /// Closing a resource manager closes its sessions. Succeeds also when the device is no longer there.
     VisaStatus viClose(VisaHandle object) override;
+    void setAborting(bool aborting) override { m_aborting = aborting; }
 
 private:
     struct Link;
@@ -57,7 +62,11 @@ private:
     Link* find(VisaHandle session);
     void destroyLink(Link& link);
 
+    [[nodiscard]] VisaStatus open(const LanResource& wanted, bool locked, Deadline connectDeadline, Link& link) const;
+    [[nodiscard]] VisaStatus unlessAborted(VisaStatus status) const;
+
     LanOptions m_options;
+    std::atomic_bool m_aborting = false;
     VisaHandle m_lastHandle = 0;  // never given twice: a closed handle stays invalid
     std::set<VisaHandle> m_managers;
     std::map<VisaHandle, std::unique_ptr<Link>> m_links;

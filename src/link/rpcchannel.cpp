@@ -8,6 +8,7 @@
 #include <poll.h>
 #include <sys/socket.h>
 
+#include <algorithm>
 #include <array>
 #include <cerrno>
 #include <utility>
@@ -16,23 +17,24 @@ namespace kdx {
 
 namespace {
 
-/// False at the deadline, at the latest.
-bool waitFor(int descriptor, short event, Deadline deadline) {
-    for (;;) {
-        const auto left = std::chrono::ceil<std::chrono::milliseconds>(deadline - std::chrono::steady_clock::now());
-        if (left.count() <= 0) return false;  // also when a peer that never stops sending always has something
-        pollfd waiting{descriptor, event, 0};
-        const int ready = poll(&waiting, 1, static_cast<int>(left.count()));
-        if (ready > 0) return true;
-        if (ready == 0 || errno != EINTR) return false;
-    }
-}
-
 bool wouldBlock() {
     return errno == EAGAIN || errno == EWOULDBLOCK || errno == EINTR;
 }
 
 }  // namespace
+
+/// False at the deadline, at the latest.
+bool RpcChannel::waitFor(int descriptor, short event, Deadline deadline) const {
+    while (!m_aborting) {
+        const auto left = std::chrono::ceil<std::chrono::milliseconds>(deadline - std::chrono::steady_clock::now());
+        if (left.count() <= 0) return false;  // also when a peer that never stops sending always has something
+        pollfd waiting{descriptor, event, 0};
+        const int ready = poll(&waiting, 1, static_cast<int>(std::min(left, kAbortLatency).count()));
+        if (ready > 0) return true;
+        if (ready < 0 && errno != EINTR) return false;
+    }
+    return false;
+}
 
 bool RpcChannel::connect(const sockaddr_in& address, std::uint16_t port, Deadline deadline) {
     FileDescriptor fresh(::socket(AF_INET, SOCK_STREAM | SOCK_NONBLOCK | SOCK_CLOEXEC, IPPROTO_TCP));

@@ -18,7 +18,9 @@ namespace kdx {
 /// writes ends the process with SIGPIPE. Here a call ends at its deadline, whatever the peer does.
 class RpcChannel {
 public:
-    RpcChannel(std::uint32_t program, std::uint32_t version) : m_program(program), m_version(version) {}
+    /// @param aborting set by another thread it ends a wait like a deadline that is reached; lent.
+    RpcChannel(std::uint32_t program, std::uint32_t version, const std::atomic_bool& aborting = kNeverAborted)
+        : m_program(program), m_version(version), m_aborting(aborting) {}
 
     /// Connects to the port of that address. False when nobody takes the connection until the deadline.
     bool connect(const sockaddr_in& address, std::uint16_t port, Deadline deadline);
@@ -35,12 +37,14 @@ public:
 private:
     static constexpr std::size_t kLargestReply = std::size_t{128} * 1024;  // twice the most that is ever asked for
 
+    [[nodiscard]] bool waitFor(int descriptor, short event, Deadline deadline) const;
     RpcOutcome send(Deadline deadline);
     RpcOutcome receiveReply(Deadline deadline);
     RpcOutcome close(RpcOutcome because);
 
     std::uint32_t m_program;
     std::uint32_t m_version;
+    const std::atomic_bool& m_aborting;
     FileDescriptor m_socket;
     std::uint32_t m_lastCall = 0;  ///< number of the call under way; answers bear it
     std::string m_request;         ///< with its record mark

@@ -49,6 +49,9 @@ public:
     virtual VisaStatus viClose(VisaHandle object) = 0;
     /// The instruments that the implementation knows of, as resource strings (viFindRsrc, viFindNext); most know none.
     [[nodiscard]] virtual std::vector<std::string> findResources() { return {}; }
+    /// While it is set the call under way ends as soon as it can, with kAborted. The only operation that another thread
+    /// may use; an implementation that cannot end a call goes on with it.
+    virtual void setAborting(bool /*aborting*/) {}
 };
 
 }  // namespace kdx

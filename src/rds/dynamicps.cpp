@@ -14,6 +14,7 @@
 #include "ui/sentvalue.h"
 #include "ui/statusrow.h"
 #include "ui/text.h"
+#include "ui/tick.h"
 
 namespace kdx {
 
@@ -44,7 +45,12 @@ protected:
 
 DynamicPs::DynamicPs(const PageContext& with, const Programme& programme, std::function<std::string()> typedPs,
                      QWidget* page)
-    : QObject(page), Form(with), m_programme(programme), m_typedPs(std::move(typedPs)) {
+    : QObject(page),
+      Form(with),
+      m_programme(programme),
+      m_typedPs(std::move(typedPs)),
+      m_running(
+          with.tickers.automatics(), [this] { return PS_A_Label->text(); }, [this] { switchOff(); }) {
     Taste_PS_Auto = wired<PictureSwitch>("Taste_PS_Auto", &PictureSwitch::clicked, &DynamicPs::Taste_PS_Auto_Click,
                                          with.data, page);
     PS_A_Label = heading("PS_A_Label", {390, "PS dyn."}, Taste_PS_Auto);
@@ -55,24 +61,28 @@ DynamicPs::DynamicPs(const PageContext& with, const Programme& programme, std::f
 }
 
 void DynamicPs::Taste_PS_Auto_Click() {
-    if (!m_running) {
+    if (!m_running.runs()) {
         const double interval = leadingNumber(m_with.profile.read(setting::kDynamicPsInterval));
         PS_Timer->setPeriod(std::clamp(interval, 0.0, double{Ticker::kLongestInterval}));
         Taste_PS_Auto->showState(true);
-        m_running = true;
+        m_running.setRunning(true);
         m_failureTold = false;
         return;
     }
-    Taste_PS_Auto->showState(false);
+    switchOff();
     Taste_PS_Auto->repaint();  // at once: nothing is painted during the pause, and the switch would look dead
-    PS_Timer->setPeriod(0);
-    m_running = false;
     WaitMs(m_with.clock, kStopPauseMs);
     restoreTypedPs();
 }
 
+void DynamicPs::switchOff() {
+    Taste_PS_Auto->showState(false);
+    PS_Timer->setPeriod(0);
+    m_running.setRunning(false);
+}
+
 void DynamicPs::PS_Timer_Timer() {
-    if (!m_running && m_restored) return;
+    if (!m_running.runs() && m_restored) return;
     std::string ps;
     try {
         ps = nextStep();
@@ -83,11 +93,15 @@ void DynamicPs::PS_Timer_Timer() {
         if (std::exchange(m_failureTold, true)) return;
         throw;
     }
-    m_with.params.SendParam(setting::kPs.sendKey, ps);
+    {
+        const Tick tick(m_with, PS_A_Label->text(), [this] { switchOff(); });
+        m_with.params.SendParam(setting::kPs.sendKey, ps);
+    }
+    if (PS_Timer->period() == 0) return;  // switched off at the box of a failure: nothing more is sent
     // A click that came in meanwhile may stop the steps: it is heard before the typed PS is looked at. The timer's
     // own next tick is not let in, however short its interval is.
     QCoreApplication::processEvents();
-    if (!m_running) {
+    if (!m_running.runs()) {
         m_restored = true;
         restoreTypedPs();
     }

@@ -6,6 +6,7 @@
 #include <string>
 
 #include "rds/dynamicpsrule.h"
+#include "ui/automatics.h"
 #include "ui/form.h"
 #include "ui/pictureswitch.h"
 
@@ -25,7 +26,7 @@ public:
     /// Start-up: the switch shows its off picture.
     void showStopped() { Taste_PS_Auto->showState(false); }
     /// Stops the steps without changing the switch's picture and without sending the typed PS.
-    void stopQuietly() { m_running = false; }
+    void stopQuietly() { m_running.setRunning(false); }
 
     QLabel* PS_A_Label = nullptr;
     PictureSwitch* Taste_PS_Auto = nullptr;
@@ -39,6 +40,8 @@ private:
     void Taste_PS_Auto_Click();
     void PS_Timer_Timer();
 
+    /// Switches it off; the typed PS is not sent.
+    void switchOff();
     [[nodiscard]] std::string nextStep();
     void show(const QString& ps);
     void restoreTypedPs();
@@ -47,7 +50,7 @@ private:
     const Programme& m_programme;
     std::function<std::string()> m_typedPs;
     DynamicPsRecord m_record;
-    bool m_running = false;
+    Automatic m_running;
     bool m_restored = false;
     bool m_failureTold = false;  ///< the last step failed and that was told
 };

@@ -1,6 +1,7 @@
 #include "rds/querypage.h"
 
 #include <array>
+#include <optional>
 #include <utility>
 
 #include "coder/readback.h"
@@ -93,7 +94,10 @@ void QueryPage::askAll() {
 
 void QueryPage::ask(const std::vector<const ReadBack*>& readBacks) {
     if (!m_with.state.InstrumentOnline) return;
-    const CommandSequence sequence(m_with.instrument);
+    std::optional<CommandSequence> sequence;  // a single question is none
+    if (readBacks.size() > 1 || readBacks.front()->queries(m_with.state.eonIdentifier).size() > 1) {
+        sequence.emplace(m_with.instrument);
+    }
     // Kept here while they come: a box of a failed question lets another button be pressed.
     std::vector<Answered> answers;
     for (const ReadBack* readBack : readBacks) {

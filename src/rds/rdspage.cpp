@@ -14,6 +14,7 @@
 #include "ui/dialogs.h"
 #include "ui/entrycounter.h"
 #include "ui/statusrow.h"
+#include "ui/tick.h"
 
 namespace kdx {
 
@@ -172,6 +173,7 @@ void RdsPage::Timer1_Timer() {
     if (!m_clockOn) return;
     showClock(toText(timeText(m_with.clock)));
     m_clockShowsWord = false;
+    const Tick tick(m_with, caption({836, "Uhr"}), [this] { Zeit_Taste_Click(); });
     m_with.params.SendParam(setting::kClock, toBytes(Uhr_Zeit->text()));
 }
 

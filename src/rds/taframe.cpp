@@ -9,12 +9,22 @@
 #include "ui/dialogs.h"
 #include "ui/layouts.h"
 #include "ui/statusrow.h"
+#include "ui/tick.h"
 #include "ui/valuescrollbar.h"
 
 namespace kdx {
 
+namespace {
+
+const QString kName = QStringLiteral("TA");  // in every language
+
+}  // namespace
+
 TaFrame::TaFrame(const PageContext& with, Programme& programme, QWidget* parent)
-    : Page(with, parent), m_programme(programme) {
+    : Page(with, parent),
+      m_programme(programme),
+      m_automatic(
+          with.tickers.automatics(), [] { return kName; }, [this] { endAutomatic(); }, [this] { endAnnouncement(); }) {
     create();
     arrange();
 }
@@ -106,8 +116,8 @@ void TaFrame::TA_Check_Click() {
 
 void TaFrame::TA_Option_Click(int index) {
     emit optionChosen();
-    m_automatic = index == 1;
-    if (m_automatic) {
+    m_automatic.setRunning(index == 1);
+    if (m_automatic.runs()) {
         m_announcementStart = now();
         m_repetitionStart = m_announcementStart;
         TA_Check->setEnabled(false);
@@ -133,7 +143,8 @@ void TaFrame::TA_Rep_HScroll_Change() {
 }
 
 void TaFrame::TA_Timer_Timer() {
-    if (!m_automatic) return;
+    if (!m_automatic.runs()) return;
+    const Tick tick(m_with, kName, [this] { endAutomatic(); });
     TA_Rep_Timer->setEnabled(false);
     if (!TA_Option[1]->isChecked()) return;
     if (now() <= m_announcementStart + static_cast<float>(TA_HScroll->value())) {
@@ -170,6 +181,23 @@ void TaFrame::TA_EON_Hilfe_Click() {
                            caption({389,
                                     "EON TA lässt sich nur geben, solange TP aus und TA ein ist und EON TP "
                                     "angekreuzt ist."}));
+}
+
+/// As a click on "manual", also while an announcement locks that.
+void TaFrame::endAutomatic() {
+    TA_Option[0]->setEnabled(true);
+    TA_Option.choose(0);
+    TA_Option_Click(0);
+}
+
+void TaFrame::endAnnouncement() {
+    if (m_automatic.runs()) endAutomatic();
+    if (!m_announcing) return;
+    TA_Check->setChecked(false);
+    m_programme.announcement = "0";
+    showByHand(false);
+    if (m_programme.trafficProgramme != "1") setTrafficProgramme(false);
+    sendTa(m_programme.announcement);
 }
 
 void TaFrame::showByHand(bool on) {

@@ -5,6 +5,7 @@
 #include <QPushButton>
 
 #include "base/clock.h"
+#include "ui/automatics.h"
 #include "ui/page.h"
 
 namespace kdx {
@@ -46,6 +47,9 @@ private:
     void TA_EON_Hilfe_Click();
 
     [[nodiscard]] float now() const { return static_cast<float>(m_with.clock.secondsSinceMidnight()); }
+    void endAutomatic();
+    /// Nothing is announced any more, on the air too.
+    void endAnnouncement();
     /// The announcement by hand was switched: while it runs the automatic cannot be chosen.
     void showByHand(bool on);
     void showAnnouncing(bool announcing);
@@ -65,7 +69,7 @@ private:
     Ticker *TA_Timer = nullptr, *TA_Rep_Timer = nullptr;
 
     Programme& m_programme;
-    bool m_automatic = false;
+    Automatic m_automatic;
     bool m_offSent = false;
     bool m_statusShown = false;  ///< the TA indicator shows one of the two words
     bool m_announcing = false;

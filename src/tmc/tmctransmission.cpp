@@ -13,6 +13,7 @@
 #include "ui/dialogs.h"
 #include "ui/layouts.h"
 #include "ui/text.h"
+#include "ui/tick.h"
 
 #include <memory>
 #include <stdexcept>
@@ -20,8 +21,17 @@
 
 namespace kdx {
 
+namespace {
+
+const QString kName = QStringLiteral("TMC");  // in every language
+
+}  // namespace
+
 TmcTransmission::TmcTransmission(const PageContext& with, const TmcBuilder& builder, QWidget* parent)
-    : Page(with, parent), m_builder(builder) {
+    : Page(with, parent),
+      m_builder(builder),
+      m_cycling(
+          with.tickers.automatics(), [] { return kName; }, [this] { Stop_Timer_Click(); }) {
     create();
     arrange();
     optSingleMessage->setChecked(true);
@@ -108,6 +118,7 @@ void TmcTransmission::TMC_Senden_Taste_Click() {
     allowChanges(false);
     TMC_Sende_Timer->setEnabled(true);
     TMC_Lauf->begin(TMC_Sende_Timer->period(), optSingleMessage->isChecked());
+    m_cycling.setRunning(true);
 }
 
 bool TmcTransmission::setInterval() {
@@ -125,6 +136,7 @@ bool TmcTransmission::setInterval() {
 
 void TmcTransmission::TMC_Sende_Timer_Timer() {
     // A failed write shows its box in here; the timer lets no further tick in until it is closed.
+    const Tick tick(m_with, kName, [this] { Stop_Timer_Click(); });
     m_sendPosition = nextPosition(m_sendPosition, TMC_List->count());
     sendAndStore(setting::kOpenDataAnnouncement, announcement(m_otherVariant));
     m_otherVariant = !m_otherVariant;
@@ -140,6 +152,7 @@ void TmcTransmission::TMC_Sende_Timer_Timer() {
 void TmcTransmission::Stop_Timer_Click() {
     if (TMC_Sende_Timer->isEnabled()) TMC_Lauf->end();
     TMC_Sende_Timer->setEnabled(false);
+    m_cycling.setRunning(false);
     allowChanges(true);
 }
 

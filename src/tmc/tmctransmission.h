@@ -1,5 +1,6 @@
 #pragma once
 
+#include "ui/automatics.h"
 #include "ui/page.h"
 
 #include <QLineEdit>
@@ -46,6 +47,7 @@ private:
     int m_sendPosition = 0;
     bool m_loaded = false;
     bool m_lossTold = false;      ///< that the list cannot be kept
+    Automatic m_cycling;
     bool m_otherVariant = false;  ///< which announcement comes next
 
     QListWidget* TMC_List = nullptr;

@@ -17,9 +17,11 @@ public:
     virtual void about(const QString& text, const QString& madeOf, const QString& /*details*/) {
         message(Icon::Exclamation, {}, text, madeOf);
     }
-    /// Shows a failure as a critical box with an OK button and one that stops the running sequence; true for the
-    /// latter.
-    virtual bool messageOrStop(const QString& title, const QString& text) = 0;
+    /// Shows a failure with an OK button and one that stops what failed; true for the latter.
+    /// @param details in smaller print under the text. @param stop caption of the second button; by default it stops
+    /// the rest of a sequence.
+    virtual bool messageOrStop(const QString& title, const QString& text, const QString& details = {},
+                               const QString& stop = {}, Icon icon = Icon::Critical) = 0;
     /// Asks with Yes and No; true for Yes.
     virtual bool confirm(const QString& title, const QString& text) = 0;
     /// Asks for a text; an empty answer is given for Cancel too.
@@ -31,6 +33,8 @@ public:
     }
     /// Asks for a file to read; else the same.
     virtual QString fileToOpen(const QString& /*title*/, const QString& /*kind*/) { return {}; }
+    /// Whether somebody is there to answer: not when the program is ending.
+    [[nodiscard]] virtual bool canAsk() const { return true; }
 };
 
 }  // namespace kdx

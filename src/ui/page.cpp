@@ -3,8 +3,10 @@
 #include <QComboBox>
 
 #include <algorithm>
+#include <optional>
 
 #include "coder/sendparam.h"
+#include "link/commandsequence.h"
 #include "settings/captions.h"
 #include "settings/profile.h"
 #include "settings/programstate.h"
@@ -21,7 +23,10 @@ void Page::resizeEvent(QResizeEvent* event) {
 }
 
 void Page::send(const Steps& steps) {
+    std::optional<CommandSequence> sequence;  // a single command is none
+    if (steps.size() > 1) sequence.emplace(m_with.instrument);
     for (const Step& step : steps) {
+        if (m_with.instrument.isSequenceStopped()) return;
         stepGoesOut(step);
         if (step.kind == Step::Kind::Parameter) m_with.params.SendParam(step.key, std::string(step.value));
     }

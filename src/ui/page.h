@@ -34,7 +34,7 @@ public:
 protected:
     /// However wide the window is, the controls stay together.
     void resizeEvent(QResizeEvent* event) override;
-    /// Sends steps at once, each for itself and without a sequence around them.
+    /// Sends steps at once; several are a run that the user can stop.
     void send(const Steps& steps);
     void sendAndStore(const Setting& setting, const std::string& value);
     /// Stores a text whose blanks at the edges mean something; they come back where that is corrected.

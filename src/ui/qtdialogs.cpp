@@ -4,6 +4,7 @@
 #include <QFileDialog>
 #include <QFileInfo>
 #include <QInputDialog>
+#include <QMainWindow>
 #include <QMessageBox>
 #include <QPushButton>
 #include <QWindow>
@@ -37,6 +38,23 @@ void leaveTitleEmpty(QMessageBox& box) {
     box.windowHandle()->setTitle(QStringLiteral(" "));
 }
 
+/// The window that asks: an editor, which is modal; else the one that is used. While a box that just closed still
+/// counts as active there is none, so the main window it is then.
+QWidget* asker() {
+    if (QWidget* const editor = QApplication::activeModalWidget()) return editor;
+    if (QWidget* const active = QApplication::activeWindow(); active != nullptr && active->isVisible()) return active;
+    for (QWidget* window : QApplication::topLevelWidgets()) {
+        if (window->isVisible() && qobject_cast<QMainWindow*>(window) != nullptr) return window;
+    }
+    return nullptr;
+}
+
+void nameParts(QFileDialog& box, const Captions& captions) {
+    box.setLabelText(QFileDialog::LookIn, toText(captions.own(1070, "Ordner:")));
+    box.setLabelText(QFileDialog::FileName, toText(captions.own(1071, "&Datei:")));
+    box.setLabelText(QFileDialog::FileType, toText(captions.own(1072, "Art:")));
+}
+
 bool isClicked(const QMessageBox& box, const QAbstractButton* button) {
     return box.clickedButton() == button;
 }
@@ -48,7 +66,7 @@ QtDialogs::QtDialogs(const Captions& captions, std::function<bool()> ending)
 
 void QtDialogs::message(Icon icon, const QString& title, const QString& text, const QString& details) {
     if (m_ending()) return;
-    QMessageBox box(boxIcon(icon), title, text, QMessageBox::NoButton, QApplication::activeWindow());
+    QMessageBox box(boxIcon(icon), title, text, QMessageBox::NoButton, asker());
     box.setInformativeText(details);
     box.addButton(toText(m_captions.own(317, "OK")), QMessageBox::AcceptRole);
     box.exec();
@@ -56,7 +74,7 @@ void QtDialogs::message(Icon icon, const QString& title, const QString& text, co
 
 void QtDialogs::about(const QString& text, const QString& madeOf, const QString& details) {
     if (m_ending()) return;
-    QMessageBox box(QMessageBox::Warning, {}, text, QMessageBox::NoButton, QApplication::activeWindow());
+    QMessageBox box(QMessageBox::Warning, {}, text, QMessageBox::NoButton, asker());
     box.setInformativeText(madeOf);
     box.setDetailedText(details);
     // The only button so far; the toolkit calls it anew at every click.
@@ -70,21 +88,23 @@ void QtDialogs::about(const QString& text, const QString& madeOf, const QString&
     box.exec();
 }
 
-bool QtDialogs::messageOrStop(const QString& title, const QString& text) {
+bool QtDialogs::messageOrStop(const QString& title, const QString& text, const QString& details,
+                              const QString& stopText, Icon icon) {
     if (m_ending()) return true;
-    QMessageBox box(QMessageBox::Critical, title, text, QMessageBox::NoButton, QApplication::activeWindow());
+    QMessageBox box(boxIcon(icon), title, text, QMessageBox::NoButton, asker());
+    box.setInformativeText(details);
     QPushButton* ok = box.addButton(toText(m_captions.own(317, "OK")), QMessageBox::AcceptRole);
     box.setDefaultButton(ok);
     box.setEscapeButton(ok);
-    const QPushButton* stop =
-        box.addButton(toText(m_captions.own(323, "&Rest abbrechen")), QMessageBox::DestructiveRole);
+    const QPushButton* stop = box.addButton(
+        stopText.isEmpty() ? toText(m_captions.own(323, "&Rest abbrechen")) : stopText, QMessageBox::DestructiveRole);
     box.exec();
     return m_ending() || isClicked(box, stop);
 }
 
 bool QtDialogs::confirm(const QString& title, const QString& text) {
     if (m_ending()) return false;
-    QMessageBox box(QMessageBox::Question, title, text, QMessageBox::NoButton, QApplication::activeWindow());
+    QMessageBox box(QMessageBox::Question, title, text, QMessageBox::NoButton, asker());
     const QPushButton* yes = box.addButton(toText(m_captions.own(315, "&Ja")), QMessageBox::YesRole);
     box.setEscapeButton(box.addButton(toText(m_captions.own(316, "&Nein")), QMessageBox::NoRole));
     box.exec();
@@ -93,7 +113,7 @@ bool QtDialogs::confirm(const QString& title, const QString& text) {
 
 QString QtDialogs::input(const QString& prompt, const QString& title, const QString& preset) {
     if (m_ending()) return {};
-    QInputDialog box(QApplication::activeWindow());
+    QInputDialog box(asker());
     box.setWindowTitle(title);
     box.setLabelText(prompt);
     box.setTextValue(preset);
@@ -104,8 +124,10 @@ QString QtDialogs::input(const QString& prompt, const QString& title, const QStr
 
 QString QtDialogs::fileToSave(const QString& title, const QString& preset, const QString& kind) {
     if (m_ending()) return {};
-    QFileDialog box(QApplication::activeWindow(), title, {}, kind);
+    QFileDialog box(asker(), title, {}, kind);
     box.setAcceptMode(QFileDialog::AcceptSave);
+    nameParts(box, m_captions);
+    box.setDefaultSuffix(QFileInfo(preset).suffix());
     box.setOption(QFileDialog::DontConfirmOverwrite);  // asked below, in the language of the window
     box.setLabelText(QFileDialog::Accept, toText(m_captions.own(789, "&Sichern")));
     box.setLabelText(QFileDialog::Reject, toText(m_captions.own(318, "Abbrechen")));
@@ -120,17 +142,9 @@ QString QtDialogs::fileToSave(const QString& title, const QString& preset, const
 
 QString QtDialogs::fileToOpen(const QString& title, const QString& kind) {
     if (m_ending()) return {};
-    QFileDialog box(QApplication::activeWindow(), title, {}, kind);
+    QFileDialog box(asker(), title, {}, kind);
     box.setFileMode(QFileDialog::ExistingFile);
-    box.setLabelText(QFileDialog::Accept, toText(m_captions.own(317, "OK")));
-    box.setLabelText(QFileDialog::Reject, toText(m_captions.own(318, "Abbrechen")));
-    return box.exec() == QDialog::Accepted ? box.selectedFiles().value(0) : QString();
-}
-
-QString QtDialogs::fileToOpen(const QString& title, const QString& kind) {
-    if (m_ending()) return {};
-    QFileDialog box(QApplication::activeWindow(), title, {}, kind);
-    box.setFileMode(QFileDialog::ExistingFile);
+    nameParts(box, m_captions);
     box.setLabelText(QFileDialog::Accept, toText(m_captions.own(317, "OK")));
     box.setLabelText(QFileDialog::Reject, toText(m_captions.own(318, "Abbrechen")));
     return box.exec() == QDialog::Accepted ? box.selectedFiles().value(0) : QString();

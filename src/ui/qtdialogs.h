@@ -8,7 +8,7 @@ namespace kdx {
 
 class Captions;
 
-/// The real boxes, modal over the active window, their buttons in the program's language.
+/// The real boxes, modal over the window or editor that asks, their buttons in the program's language.
 class QtDialogs final : public Dialogs {
 public:
     /// @param ending whether the program is ending: then no box opens any more, and one that was open when the end came
@@ -18,11 +18,13 @@ public:
 
     void message(Icon icon, const QString& title, const QString& text, const QString& details = {}) override;
     void about(const QString& text, const QString& madeOf, const QString& details) override;
-    bool messageOrStop(const QString& title, const QString& text) override;
+    bool messageOrStop(const QString& title, const QString& text, const QString& details = {}, const QString& stop = {},
+                       Icon icon = Icon::Critical) override;
     bool confirm(const QString& title, const QString& text) override;
     QString input(const QString& prompt, const QString& title, const QString& preset) override;
     QString fileToSave(const QString& title, const QString& preset, const QString& kind) override;
     QString fileToOpen(const QString& title, const QString& kind) override;
+    [[nodiscard]] bool canAsk() const override { return !m_ending(); }
 
 private:
     const Captions& m_captions;

@@ -4,8 +4,11 @@
 
 #include <vector>
 
+#include "ui/automatics.h"
+
 namespace kdx {
 
+class Tick;
 class Ticker;
 
 /// The window's timers, to be held all at once: while a box about a broken link waits for the user, and while a closed
@@ -14,10 +17,17 @@ class TickerGroup {
 public:
     /// Holds all ticks back, or lets them go; timers made later follow.
     void setHeld(bool held);
+    /// What they drive.
+    [[nodiscard]] Automatics& automatics() { return m_automatics; }
+    /// What is being sent by one of them; null when none is.
+    [[nodiscard]] Tick* tick() const { return m_tick; }
 
 private:
+    friend class Tick;
     friend class Ticker;
     std::vector<Ticker*> m_tickers;
+    Automatics m_automatics;
+    Tick* m_tick = nullptr;
     bool m_held = false;
 };
 

@@ -1,5 +1,6 @@
 #include "window/hmenue.h"
 
+#include <QCloseEvent>
 #include <QGroupBox>
 #include <QHBoxLayout>
 #include <QIcon>
@@ -36,6 +37,7 @@
 #include "window/pagetabs.h"
 #include "window/progressline.h"
 #include "window/views.h"
+#include "window/waysout.h"
 #include "window/windowsize.h"
 
 namespace kdx {
@@ -72,8 +74,6 @@ HMenue::HMenue(const Surroundings& surroundings)
     createMenu();
     arrange();
     m_s.session.transmitter.setWatcher(this);
-    m_s.session.instrument.onFailure(
-        [this](const std::string& text, bool sequenceRuns) { return showInterfaceError(text, sequenceRuns); });
     const auto changed = [this] { showNotice(); };
     m_s.data.onUnsavedFileChanged(changed);
     m_s.session.instrument.log.onChange(changed);
@@ -91,7 +91,6 @@ HMenue::HMenue(const Surroundings& surroundings)
 HMenue::~HMenue() {
     m_views->endScenario();
     m_s.session.transmitter.setWatcher(nullptr);
-    m_s.session.instrument.onFailure(nullptr);
     m_s.data.onUnsavedFileChanged(nullptr);
     m_s.session.instrument.log.onChange(nullptr);
     m_s.session.params.onQuotedKeysChanged(nullptr);
@@ -154,6 +153,9 @@ void HMenue::arrange() {
     parameters->setContentsMargins(0, 0, 0, 0);
     parameters->addWidget(SSTab1);
     m_lowerEdge = new ProgressLine(this);
+    m_waysOut = new WaysOut(m_s, *m_lowerEdge, this);
+    m_waysOut->letTakeFailures([this] { return m_views->takesFailure(); });
+    connect(m_waysOut, &WaysOut::localRequested, this, &HMenue::GTL_Taste_Click);
     auto* middle = new QWidget(this);
     auto* column = new QVBoxLayout(middle);
     column->setContentsMargins(6, 2, 6, 2);
@@ -222,6 +224,7 @@ void HMenue::Beschrifter() {
     }
     SSTab1->setCurrentIndex(0);
     m_status->label(m_s.captions);
+    m_waysOut->label();
     for (Page* page : m_pages) page->label();
     m_views->label();
     m_desktop->showTips();
@@ -231,10 +234,10 @@ void HMenue::Beschrifter() {
 void HMenue::INIT_Taste_Click() {
     Session& session = m_s.session;
     m_s.state.InterfaceKind = session.profile.read(setting::kInterface);
+    const CommandSequence run(session.instrument);  // the opening can be stopped, too
     const VisaStatus status = session.open(m_s.state.InterfaceKind, m_connection->address());
     if (status != 0) {
-        m_s.dialogs.message(Dialogs::Icon::Critical, QStringLiteral("Interface Error"),
-                            QStringLiteral("Please Check Device! %1").arg(status));
+        m_waysOut->tellOpening(status);
         return;
     }
     session.sendOpening();
@@ -285,19 +288,8 @@ void HMenue::showSessionOpen(bool open) {
     m_views->showSessionOpen(open);
 }
 
-bool HMenue::showInterfaceError(const std::string& text, bool sequenceRuns) {
-    if (m_views->takesFailure()) return true;
-    // While the box waits, timers would send more to the same broken link and pile up more boxes.
-    m_s.tickers.setHeld(true);
-    const QString title = QStringLiteral("Interface Error");
-    bool stop = false;
-    if (sequenceRuns) {
-        stop = m_s.dialogs.messageOrStop(title, toText(text));
-    } else {
-        m_s.dialogs.message(Dialogs::Icon::Critical, title, toText(text));
-    }
-    m_s.tickers.setHeld(false);
-    return stop;
+void HMenue::closeEvent(QCloseEvent* event) {
+    event->setAccepted(m_waysOut->mayClose());
 }
 
 void HMenue::SSTab1_Click(int page) {

@@ -22,6 +22,7 @@ class PageTabs;
 class ProgressLine;
 class StatusRow;
 class Views;
+class WaysOut;
 
 /// The one main window: owns the pages and what ties them together.
 class HMenue : public QMainWindow, private StepWatcher {
@@ -49,6 +50,7 @@ signals:
 
 protected:
     bool eventFilter(QObject* watched, QEvent* event) override;
+    void closeEvent(QCloseEvent* event) override;
 
 private:
     void stepGoesOut(const Step& step, std::size_t number, std::size_t total) override;
@@ -64,7 +66,6 @@ private:
     void showSessionOpen(bool open);
     void watchPictures();
     void showNotice();
-    bool showInterfaceError(const std::string& text, bool sequenceRuns);
 
     Surroundings m_s;
     StatusRow* m_status;
@@ -76,6 +77,7 @@ private:
     std::vector<Page*> m_pages;
     ProgressLine* m_lowerEdge = nullptr;  // progress, and what the user should know
     QString m_startNotice;                // what start-up could not read
+    WaysOut* m_waysOut = nullptr;
     MainMenu* m_menu = nullptr;
     std::unique_ptr<Views> m_views;
     std::unique_ptr<Desktop> m_desktop;

@@ -3,10 +3,17 @@
 #include <QHBoxLayout>
 #include <QLabel>
 #include <QProgressBar>
+#include <QPushButton>
 
 #include "ui/named.h"
 
 namespace kdx {
+
+namespace {
+
+constexpr int kButtonRoom = 6;  // above and below a caption, in pixels at 96 dpi
+
+}  // namespace
 
 ProgressLine::ProgressLine(QWidget* parent) : QWidget(parent) {
     m_text = named<QLabel>("QuietLine", this);
@@ -15,12 +22,24 @@ ProgressLine::ProgressLine(QWidget* parent) : QWidget(parent) {
     m_bar->setTextVisible(false);
     m_bar->setFixedSize(160, m_text->fontMetrics().height() - 3);
     m_bar->hide();
-    setFixedHeight(m_text->fontMetrics().height());
+    Stop_Taste = addButton("Stop_Taste");
+    Panik_Taste = addButton("Panik_Taste");
+    setFixedHeight(m_text->fontMetrics().height() + kButtonRoom);  // nothing moves when a button comes or goes
     auto* row = new QHBoxLayout(this);
     row->setContentsMargins(0, 0, 0, 0);
     row->setSpacing(8);
     row->addWidget(m_text, 1);
     row->addWidget(m_bar);
+    row->addWidget(Stop_Taste);
+    row->addWidget(Panik_Taste);
+}
+
+QPushButton* ProgressLine::addButton(const char* name) {
+    auto* button = named<QPushButton>(name, this);
+    button->setFixedHeight(fontMetrics().height() + kButtonRoom);
+    button->setFocusPolicy(Qt::TabFocus);  // a click leaves the cursor where it is
+    button->hide();
+    return button;
 }
 
 void ProgressLine::setNotice(const QString& notice) {

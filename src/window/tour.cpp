@@ -64,7 +64,8 @@ void TourDialogs::message(Icon /*icon*/, const QString& title, const QString& te
     note(title, text);
 }
 
-bool TourDialogs::messageOrStop(const QString& title, const QString& text) {
+bool TourDialogs::messageOrStop(const QString& title, const QString& text, const QString& /*details*/,
+                                const QString& /*stop*/, Icon /*icon*/) {
     note(title, text);
     return true;
 }

@@ -19,7 +19,8 @@ public:
     explicit TourDialogs(std::function<void(const std::string& line)> print);
 
     void message(Icon icon, const QString& title, const QString& text, const QString& details = {}) override;
-    bool messageOrStop(const QString& title, const QString& text) override;
+    bool messageOrStop(const QString& title, const QString& text, const QString& details, const QString& stop,
+                       Icon icon) override;
     bool confirm(const QString& title, const QString& text) override;
     QString input(const QString& prompt, const QString& title, const QString& preset) override;
     QString fileToSave(const QString& title, const QString& preset, const QString& kind) override;

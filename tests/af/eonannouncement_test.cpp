@@ -147,16 +147,21 @@ TEST_F(EonPageTest, WhenTheOthersTrafficProgrammeEndsTheTimerWaitsQuietly) {
 /// Boxes that stay open for a while: the timers tick on meanwhile.
 class SlowDialogs final : public Dialogs {
 public:
-    void message(Icon, const QString&, const QString&, const QString&) override {
+    void message(Icon, const QString&, const QString&, const QString&) override { show(); }
+    bool messageOrStop(const QString&, const QString&, const QString&, const QString&, Icon) override {
+        show();
+        return false;
+    }
+    bool confirm(const QString&, const QString&) override { return false; }
+    QString input(const QString&, const QString&, const QString&) override { return {}; }
+
+    void show() {
         ++open;
         ++boxes;
         mostOpen = std::max(mostOpen, open);
         if (open < 5) whileOpen();
         --open;
     }
-    bool messageOrStop(const QString&, const QString&) override { return false; }
-    bool confirm(const QString&, const QString&) override { return false; }
-    QString input(const QString&, const QString&, const QString&) override { return {}; }
 
     std::function<void()> whileOpen;
     int open = 0;

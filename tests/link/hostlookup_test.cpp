@@ -28,6 +28,21 @@ protected:
     }
 };
 
+TEST_F(NameServiceTest, ASilentQuestionCanBeAborted) {
+    nameServiceIsSilent = true;
+    useTimes(60s, 2s);
+    std::thread other([this, before = questions.load()] {
+        while (questions == before) std::this_thread::yield();
+        visa->setAborting(true);
+    });
+    const auto start = std::chrono::steady_clock::now();
+    EXPECT_EQ(open("TCPIP::slow.invalid::INSTR"), visa::kAborted);
+    EXPECT_LT(std::chrono::steady_clock::now() - start, kBounded);
+    other.join();
+    visa->setAborting(false);
+    EXPECT_EQ(open(), visa::kSuccess);
+}
+
 TEST_F(NameServiceTest, SilenceIsGivenUpAfterTheConnectTimeOut) {
     nameServiceIsSilent = true;
     useShortTimes();

@@ -21,23 +21,26 @@ public:
         QString text;
         QString preset;           ///< of an input box; of a message box the details
         bool offersStop = false;  ///< has a second button that stops the running sequence
+        QString stop = {};        ///< its caption where it is another one
     };
 
     void message(Icon icon, const QString& title, const QString& text, const QString& details = {}) override {
-        shown.push_back({icon, title, text, details, false});
+        shown.push_back({icon, title, text, details});
         if (expectedMessages > 0) {
             --expectedMessages;
         } else {
             ADD_FAILURE() << "unexpected box: " << title.toStdString() << " | " << text.toStdString();
         }
     }
-    bool messageOrStop(const QString& title, const QString& text) override {
-        message(Icon::Critical, title, text);
+    bool messageOrStop(const QString& title, const QString& text, const QString& details = {}, const QString& stop = {},
+                       Icon icon = Icon::Critical) override {
+        message(icon, title, text, details);
         shown.back().offersStop = true;
+        shown.back().stop = stop;
         return stopAtFailure;
     }
     bool confirm(const QString& title, const QString& text) override {
-        shown.push_back({Icon::None, title, text, {}, false});
+        shown.push_back({Icon::None, title, text, {}});
         if (confirmations.empty()) {
             ADD_FAILURE() << "unexpected question: " << text.toStdString();
             return false;
@@ -47,7 +50,7 @@ public:
         return answer;
     }
     QString input(const QString& prompt, const QString& title, const QString& preset) override {
-        shown.push_back({Icon::None, title, prompt, preset, false});
+        shown.push_back({Icon::None, title, prompt, preset});
         if (inputs.empty()) {
             ADD_FAILURE() << "unexpected input box: " << prompt.toStdString();
             return {};
@@ -58,7 +61,7 @@ public:
     }
 
     QString fileToSave(const QString& title, const QString& preset, const QString& kind) override {
-        shown.push_back({Icon::None, title, kind, preset, false});
+        shown.push_back({Icon::None, title, kind, preset});
         if (files.empty()) {
             ADD_FAILURE() << "unexpected box for a file: " << title.toStdString();
             return {};
@@ -69,6 +72,7 @@ public:
     }
 
     QString fileToOpen(const QString& title, const QString& kind) override { return fileToSave(title, {}, kind); }
+    [[nodiscard]] bool canAsk() const override { return !ending; }
 
     ~ScriptedDialogs() override {
         EXPECT_EQ(expectedMessages, 0) << "a box that was expected did not show";
@@ -81,6 +85,7 @@ public:
     bool stopAtFailure = false;      ///< press the button that stops the running sequence
     std::deque<QString> inputs;      ///< answers of the input boxes, in turn; empty for Cancel
     std::deque<QString> files;       ///< answers of the boxes for a file, in turn; empty for Cancel
+    bool ending = false;             ///< the program is, and nobody is there to answer
     std::deque<bool> confirmations;  ///< answers of the Yes/No boxes, in turn
     std::vector<Shown> shown;        ///< every box, in order
 };

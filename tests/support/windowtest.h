@@ -27,8 +27,8 @@ protected:
         session = std::make_unique<Session>(instrumentLink(), state, data, captions, clock, ask);
         tickers.setHeld(false);
         window = std::make_unique<HMenue>(Surroundings{*session, state, data, captions, clock, boxesOfWindow(), tickers,
-                                                       claim, QStringLiteral("scripted"), QString(), ask, simulated,
-                                                       shipped, placeFile});
+                                                       claim, QStringLiteral("scripted"), QString(), ask, worker(),
+                                                       std::chrono::seconds{2}, simulated, shipped, placeFile});
         m_listener = std::make_unique<TrafficListener>(session->instrument, [this](const Traffic& traffic) {
             if (heard) heard(traffic);
         });
@@ -51,6 +51,8 @@ protected:
 
     /// What the window sends through: the scripted instrument unless a test brings a link of its own.
     virtual Visa& instrumentLink() { return visa; }
+    /// The link where it runs in a thread of its own.
+    virtual WorkerVisa* worker() { return nullptr; }
     /// What its boxes go through: the scripted ones unless a test brings its own.
     virtual Dialogs& boxesOfWindow() { return dialogs; }
     QWidget& root() override { return *window; }

@@ -90,7 +90,7 @@ public:
     void message(Icon, const QString& title, const QString&, const QString&) override {
         if (onMessage) onMessage(title.toStdString());
     }
-    bool messageOrStop(const QString&, const QString&) override { return true; }
+    bool messageOrStop(const QString&, const QString&, const QString&, const QString&, Icon) override { return true; }
     bool confirm(const QString&, const QString&) override { return false; }
     QString input(const QString&, const QString&, const QString&) override { return {}; }
     std::function<void(const std::string& title)> onMessage;

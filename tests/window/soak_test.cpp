@@ -47,7 +47,7 @@ public:
     void message(Icon icon, const QString& title, const QString& text, const QString&) override {
         if (icon == Icon::Critical) fail(title, text);
     }
-    bool messageOrStop(const QString& title, const QString& text) override {
+    bool messageOrStop(const QString& title, const QString& text, const QString&, const QString&, Icon) override {
         fail(title, text);
         return true;
     }

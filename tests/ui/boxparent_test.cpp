@@ -1,0 +1,80 @@
+#include "ui/qtdialogs.h"
+
+#include <gtest/gtest.h>
+
+#include <QApplication>
+#include <QDialog>
+#include <QInputDialog>
+#include <QMainWindow>
+#include <QMessageBox>
+#include <QTimer>
+
+#include <functional>
+
+#include "settings/captions.h"
+#include "settings/datafolder.h"
+#include "support/tempfolder.h"
+
+namespace kdx::test {
+namespace {
+
+class BoxParentTest : public ::testing::Test {
+protected:
+    /// Opens a box, gives the window that it belongs to, and closes it.
+    static const QWidget* parentOf(const std::function<void()>& open) {
+        const QWidget* parent = nullptr;
+        QTimer::singleShot(0, qApp, [&] {
+            auto* box = qobject_cast<QDialog*>(QApplication::activeModalWidget());
+            ASSERT_NE(box, nullptr);
+            parent = box->parentWidget();
+            box->reject();
+        });
+        open();
+        return parent;
+    }
+
+    TempFolder folder;
+    DataFolder data{folder.path()};
+    Captions captions{data};
+    QtDialogs dialogs{captions};
+    QMainWindow window;
+};
+
+TEST_F(BoxParentTest, EveryBoxBelongsToTheMainWindowAlsoWhenItIsNotActive) {
+    window.show();
+    ASSERT_EQ(QApplication::activeWindow(), nullptr) << "as just after another box was closed";
+    const QString text;
+    EXPECT_EQ(parentOf([&] { dialogs.message(Dialogs::Icon::None, text, text); }), &window);
+    EXPECT_EQ(parentOf([&] { dialogs.messageOrStop(text, text); }), &window);
+    EXPECT_EQ(parentOf([&] { dialogs.confirm(text, text); }), &window);
+    EXPECT_EQ(parentOf([&] { dialogs.input(text, text, text); }), &window);
+}
+
+TEST_F(BoxParentTest, ABoxOfAnEditorBelongsToTheEditor) {
+    window.show();
+    QDialog editor(&window);
+    editor.setModal(true);
+    editor.show();
+    EXPECT_EQ(parentOf([&] { dialogs.confirm(QString(), QString()); }), &editor);
+    EXPECT_EQ(parentOf([&] { dialogs.confirm(QString(), QString()); }), &editor) << "the second one, too";
+}
+
+TEST_F(BoxParentTest, ABoxBeforeTheWindowIsShownBelongsToNone) {
+    EXPECT_EQ(parentOf([&] { dialogs.confirm(QString(), QString()); }), nullptr);
+}
+
+TEST_F(BoxParentTest, TheSmallPrintStandsUnderTheTextOfABoxWithAWayOut) {
+    QTimer::singleShot(0, qApp, [] {
+        auto* box = qobject_cast<QMessageBox*>(QApplication::activeModalWidget());
+        ASSERT_NE(box, nullptr);
+        EXPECT_EQ(box->informativeText(), QStringLiteral("why"));
+        EXPECT_EQ(box->icon(), QMessageBox::Warning);
+        ASSERT_EQ(box->buttons().size(), 2);
+        box->buttons().at(box->buttons().front()->text() == QStringLiteral("stop it") ? 0 : 1)->click();
+    });
+    EXPECT_TRUE(dialogs.messageOrStop(QString(), QString(), QStringLiteral("why"), QStringLiteral("stop it"),
+                                      Dialogs::Icon::Exclamation));
+}
+
+}  // namespace
+}  // namespace kdx::test
