@@ -167,7 +167,8 @@ void EonPage::EON_PI_Taste_Click() {
     const auto& [label, key] = setting::kHeldNetworks;
     m_with.params.SendParam(setting::kEonRemoval, firstNetwork(m_with.instrument.X4_Abfrage(label, key)));
     m_with.params.SendParam(setting::kEonPi.sendKey, m_network.pi);
-    noteSent(setting::kEonPi.sendKey, m_network.pi);
+    EON_PI_Text->wentOut(m_network.pi);
+    EON_PS_Text->forget();
 }
 
 void EonPage::EON_PS_Text_Change() {
@@ -178,20 +179,21 @@ void EonPage::EON_PS_Taste_Click() {
     m_network.ps = withoutControls(m_network.ps);
     storeText(setting::kEonPs, m_network.ps);
     m_with.params.SendParam(setting::kEonPs.sendKey, m_network.ps);
-    noteSent(setting::kEonPs.sendKey, m_network.ps);
+    EON_PS_Text->wentOut(m_network.ps);
 }
 
 void EonPage::stepGoesOut(const Step& step) {
-    noteSent(step.key, step.value);
+    if (step.key == setting::kEonPi.sendKey) {
+        EON_PI_Text->goesOut(step.value);
+        EON_PS_Text->forget();  // the network is a new one to the coder: it has no name there
+    } else if (step.key == setting::kEonPs.sendKey) {
+        EON_PS_Text->goesOut(step.value);
+    }
 }
 
-void EonPage::noteSent(const std::string& key, const std::string& value) {
-    if (key == setting::kEonPi.sendKey) {
-        EON_PI_Text->wentOut(value);
-        EON_PS_Text->forget();  // the network is a new one to the coder: it has no name there
-    } else if (key == setting::kEonPs.sendKey) {
-        EON_PS_Text->wentOut(value);
-    }
+void EonPage::stepFailed(const Step& step) {
+    if (step.key == setting::kEonPi.sendKey) EON_PI_Text->forget();
+    if (step.key == setting::kEonPs.sendKey) EON_PS_Text->forget();
 }
 
 void EonPage::EON_PTY_Combo_Change() {

@@ -34,6 +34,7 @@ public:
     void showDataSet() override;
     /// What goes out is what the coder has.
     void stepGoesOut(const Step& step) override;
+    void stepFailed(const Step& step) override;
 
     /// Replaces how the list editor is opened; the call returns when the editor has closed. By default the editor's
     /// window is shown, modal over this one.
@@ -56,7 +57,6 @@ private:
     void EON_AF_Bearbeiten_Click();
     void EON_AFB_Senden_Click();
     void holdPi(const std::string& pi);
-    void noteSent(const std::string& key, const std::string& value);
     [[nodiscard]] bool mayAnnounce();
     void setAnnouncing(bool on);
     void showStoredProgrammeType();

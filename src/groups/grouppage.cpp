@@ -168,10 +168,16 @@ void GroupPage::Gruppenfolge() {
 void GroupPage::stepGoesOut(const Step& step) {
     constexpr const Setting& kSequence = setting::kGroupSequence;
     if (step.key != kSequence.sendKey) return;
-    m_sent.wentOut(step.value);
+    m_sent.goesOut(step.value);
     showSequence();
     if (!m_sequence.isToBeStored(m_with.profile)) return;
     m_with.profile.write(kSequence.place, step.value + ",");
+}
+
+void GroupPage::stepFailed(const Step& step) {
+    if (step.key != setting::kGroupSequence.sendKey) return;
+    m_sent.forget();
+    showSequence();
 }
 
 void GroupPage::showStored() {

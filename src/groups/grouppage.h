@@ -30,6 +30,7 @@ public:
     void opened() override;
     /// The sequence that goes out is stored in the data set at work.
     void stepGoesOut(const Step& step) override;
+    void stepFailed(const Step& step) override;
 
 private:
     void create();

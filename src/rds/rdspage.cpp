@@ -84,18 +84,36 @@ void RdsPage::stepGoesOut(const Step& step) {
     if (step.key == setting::kTrafficProgramme) setTrafficProgramme(step.value == "1");
     m_ta->stepGoesOut(step);
     if (step.key == setting::kPs.sendKey) {
-        PS_T->wentOut(step.value);
+        PS_T->goesOut(step.value);
         showValue(StatusSlot::Ps, PS_T, step.value);
     } else if (step.key == setting::kPi.sendKey) {
-        PI_T->wentOut(step.value);
+        PI_T->goesOut(step.value);
         showValue(StatusSlot::Pi, PI_T, step.value);
     } else if (step.key == setting::kRadiotext.sendKey) {
-        RT_Text1->wentOut(step.value);
+        RT_Text1->goesOut(step.value);
     } else if (step.key == setting::kMusicSpeech.sendKey && !step.value.empty()) {
-        m_sentMusicSpeech.wentOut(step.value);
+        m_sentMusicSpeech.goesOut(step.value);
         showMusicSpeech();
     } else if (step.key == setting::kPty.sendKey) {
-        m_sentPty.wentOut(step.value);
+        m_sentPty.goesOut(step.value);
+        showProgrammeType();
+    }
+}
+
+void RdsPage::stepFailed(const Step& step) {
+    if (step.key == setting::kPs.sendKey) {
+        PS_T->forget();
+        showValue(StatusSlot::Ps, PS_T, step.value);
+    } else if (step.key == setting::kPi.sendKey) {
+        PI_T->forget();
+        showValue(StatusSlot::Pi, PI_T, step.value);
+    } else if (step.key == setting::kRadiotext.sendKey) {
+        RT_Text1->forget();
+    } else if (step.key == setting::kMusicSpeech.sendKey && !step.value.empty()) {
+        m_sentMusicSpeech.forget();
+        showMusicSpeech();
+    } else if (step.key == setting::kPty.sendKey) {
+        m_sentPty.forget();
         showProgrammeType();
     }
 }

@@ -36,6 +36,7 @@ public:
     void load() override;
     void showDataSet() override;
     void stepGoesOut(const Step& step) override;
+    void stepFailed(const Step& step) override;
 
 private:
     void create();
@@ -86,9 +87,8 @@ private:
     PictureSwitch* Zeit_Taste = nullptr;
     ClickableLabel* Uhr_Zeit = nullptr;
     Ticker* Timer1 = nullptr;  // sends the clock
-    QGroupBox* DI_Frame = nullptr;
+    QGroupBox *DI_Frame = nullptr, *RT_Frame = nullptr;
     OptionArray<16> DI_Opt;
-    QGroupBox* RT_Frame = nullptr;
     SentEntry* RT_Text1 = nullptr;
     QPushButton *RT_Taste1 = nullptr, *RT_clear1 = nullptr;
 

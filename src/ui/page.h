@@ -30,6 +30,8 @@ public:
     virtual void opened() {}
     /// A step of a running sequence goes out: shows what belongs to this page, and stores what sending it stores.
     virtual void stepGoesOut(const Step& /*step*/) {}
+    /// That step has not reached the instrument.
+    virtual void stepFailed(const Step& /*step*/) {}
 
 protected:
     /// However wide the window is, the controls stay together.

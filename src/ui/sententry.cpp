@@ -15,6 +15,11 @@ SentEntry::SentEntry(const PageContext& with, const char* key, QWidget* parent)
     connect(this, &QLineEdit::textChanged, this, &SentEntry::refresh);
 }
 
+void SentEntry::goesOut(std::string_view value) {
+    m_sent.goesOut(sentForm(value));
+    refresh();
+}
+
 void SentEntry::wentOut(std::string_view value) {
     m_sent.wentOut(sentForm(value));
     refresh();

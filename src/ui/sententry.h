@@ -17,7 +17,8 @@ public:
     /// @param key under which it is sent.
     SentEntry(const PageContext& with, const char* key, QWidget* parent);
 
-    /// The value goes out under the key.
+    /// As SentValue has it.
+    void goesOut(std::string_view value);
     void wentOut(std::string_view value);
     /// What went out has not arrived, or is meant for somebody else.
     void forget();

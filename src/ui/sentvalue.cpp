@@ -11,6 +11,10 @@ bool linkWorks(const PageContext& with) {
     return with.state.InstrumentOnline && !with.instrument.isSequenceStopped() && with.instrument.LastVisaStatus >= 0;
 }
 
+void SentValue::goesOut(const std::string& value) {
+    if (m_with.state.InstrumentOnline && !m_with.instrument.isSequenceStopped()) m_inForce = value;
+}
+
 void SentValue::wentOut(const std::string& value) {
     if (linkWorks(m_with)) m_inForce = value;
 }

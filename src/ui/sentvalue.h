@@ -8,7 +8,7 @@
 
 namespace kdx {
 
-/// Whether what goes out now reaches the instrument, as far as the link has told.
+/// Whether what went out last has reached the instrument.
 [[nodiscard]] bool linkWorks(const PageContext& with);
 
 /// What the instrument has of one setting.
@@ -17,7 +17,9 @@ public:
     /// @param key of the setting, for what the coder refuses.
     SentValue(const PageContext& with, const char* key) : m_with(with), m_key(key) {}
 
-    /// The value goes out.
+    /// The value is about to go out; whoever hears that it failed calls forget().
+    void goesOut(const std::string& value);
+    /// The value has gone out, as far as the link has told.
     void wentOut(const std::string& value);
     /// What went out has not arrived, or is meant for somebody else.
     void forget() { m_inForce.reset(); }

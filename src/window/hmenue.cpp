@@ -257,6 +257,7 @@ void HMenue::GTL_Taste_Click() {
 }
 
 void HMenue::stepGoesOut(const Step& step, std::size_t number, std::size_t total) {
+    m_outcome.next(step);
     if (number > 0) {
         m_lowerEdge->showProgress(captionText(m_s.captions, {324, "Sende Befehl %1 von %2"}), number, total);
     }
@@ -275,6 +276,7 @@ void HMenue::stepAnswered(const Step& step, const std::string& answer) {
 }
 
 void HMenue::stepsEnded() {
+    m_outcome.settle();
     m_lowerEdge->endProgress();
 }
 

@@ -7,6 +7,7 @@
 
 #include "station/session.h"
 #include "ui/pagecontext.h"
+#include "window/stepoutcome.h"
 #include "window/surroundings.h"
 
 class QGroupBox;
@@ -75,6 +76,7 @@ private:
     QPushButton* GTL_Taste = nullptr;
     PageTabs* SSTab1 = nullptr;
     std::vector<Page*> m_pages;
+    StepOutcome m_outcome{m_s.session.instrument, m_pages};
     ProgressLine* m_lowerEdge = nullptr;  // progress, and what the user should know
     QString m_startNotice;                // what start-up could not read
     WaysOut* m_waysOut = nullptr;

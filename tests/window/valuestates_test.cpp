@@ -25,6 +25,44 @@ TEST_F(ValueStatesTest, WhatSendingAllSentIsInForceAndShown) {
     EXPECT_EQ(stateOf("PI_T"), "");
 }
 
+TEST_F(ValueStatesTest, WhatDidNotArriveInASequenceIsNotInForce) {
+    startShipped();
+    openSession();
+    // Everything fails, and the user goes on to the end.
+    visa.writeStatus = -1073807339;
+    dialogs.expectedMessages = 1000;
+    click("Btn_SetRdsStereo");
+    dialogs.expectedMessages = 0;
+    for (const char* name : {"Status_1", "Status_2", "Status_3", "Status_4", "PS_T", "PI_T", "RT_Text1", "EON_PI_Text",
+                             "EON_PS_Text", "Label10"})
+        EXPECT_EQ(stateOf(name), "ungesendet") << name;
+    visa.writeStatus = 0;
+    click("Btn_SetRdsStereo");
+    for (const char* name : {"Status_1", "Status_2", "Status_3", "Status_4", "PS_T", "PI_T", "RT_Text1", "EON_PI_Text",
+                             "EON_PS_Text", "Label10"})
+        EXPECT_EQ(stateOf(name), "") << name;
+}
+
+TEST_F(ValueStatesTest, ASequenceStoppedAtAStepLeavesThatStepUnsent) {
+    startShipped();
+    openSession();
+    type("PI_T", "12AB");
+    sent();
+    click("Btn_SetRdsStereo");
+    const Lines commands = sent();
+    const auto pi = std::find(commands.begin(), commands.end(), direct("PI=12AB"));
+    ASSERT_NE(pi, commands.end());
+    type("PI_T", "12CD");
+    visa.writeStatuses.assign(static_cast<std::size_t>(pi - commands.begin()), 0);
+    visa.writeStatuses.push_back(-1073807339);
+    dialogs.stopAtFailure = true;
+    dialogs.expectedMessages = 1;
+    click("Btn_SetRdsStereo");
+    EXPECT_EQ(stateOf("PI_T"), "ungesendet");
+    EXPECT_EQ(stateOf("Status_2"), "ungesendet");
+    EXPECT_EQ(stateOf("PS_T"), "") << "what was sent before is in force still";
+}
+
 TEST_F(ValueStatesTest, AWrongPiIsFoundInTheStatusRow) {
     startShipped();
     openSession();
