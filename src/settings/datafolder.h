@@ -33,7 +33,6 @@ public:
 
     /// The data folder itself; it need not exist.
     [[nodiscard]] const std::filesystem::path& path() const { return m_path; }
-
     /// Where a file of the given name is: a file whose name differs in letter case only is found too; one spelled
     /// exactly so wins. When there is none, the path it would be created at.
     [[nodiscard]] std::filesystem::path file(const std::filesystem::path& name) const;
@@ -41,7 +40,6 @@ public:
     /// One value; "" when the key, the section or the file is missing, unreadable or the value is empty. Values are
     /// cut at 254 characters. Never creates a file, never throws.
     [[nodiscard]] std::string ReadIni(std::string_view section, std::string_view key, std::string_view fileName) const;
-
     /// All settings of a file as they are now, values that could not be written yet included; nothing when it is
     /// missing or cannot be read.
     [[nodiscard]] std::shared_ptr<const ProfileText> profile(std::string_view fileName) const;
@@ -50,21 +48,17 @@ public:
     /// nothing and opens no box: the value is kept, is what a read gives meanwhile (but nothing for a folder), and goes
     /// with the next write to the same file or with retryUnsaved().
     void WriteIni(std::string_view section, std::string_view key, std::string_view value, std::string_view fileName);
-
     /// From now on nothing in the folder is written: values count as ones that cannot be.
     void setReadOnly() { m_readOnly = true; }
     [[nodiscard]] bool isReadOnly() const { return m_readOnly; }
 
     /// Tries to write what could not be written so far, and looks again at what could not be read.
     void retryUnsaved();
-
     /// Name of the file that could not be written last and still lacks a value; nothing when all is saved.
     [[nodiscard]] std::optional<std::string> unsavedFile() const;
-
     /// Name of the file last found to be there but without settings that can be read: UTF-16 text, a folder, a file
     /// without rights. Such a file is never written. The one of unsavedFile() is left out: it is told as that.
     [[nodiscard]] std::optional<std::string> unreadableFile() const;
-
     /// Called whenever unsavedFile() or unreadableFile() changes.
     void onUnsavedFileChanged(std::function<void()> callback) { m_noticeChanged = std::move(callback); }
 
