@@ -137,6 +137,31 @@ TEST_F(CompareViewTest, TakesOverTheMultiplexIntoTheGeneralSettings) {
     EXPECT_NE(cells("Pilottonhub").back(), '!');
 }
 
+TEST_F(CompareViewTest, ANetworkThatOnlyTheInstrumentHasIsRemovedByTheWindow) {
+    openView();
+    send(direct("EON-PI=ABCD"));
+    click("Vergleich_Lesen");
+    EXPECT_EQ(cells("EON PI  ABCD"), "–|–|ABCD|!");
+    EXPECT_NE(cells("EON PS  ABCD").back(), '!');  // the network counts as one
+    table->selectRow(row("EON PI  ABCD"));
+    click("Vergleich_Senden");
+    EXPECT_EQ(taken(), Lines{direct("EON-DEL=ABCD")});
+    EXPECT_TRUE(text("Vergleich_Stand").starts_with("0 von ")) << text("Vergleich_Stand");
+}
+
+TEST_F(CompareViewTest, TakesOverAValueOfTheNetworkThatTheDataSetHas) {
+    openView();
+    session->params.SendParam("EON_PS", std::string("NEU"));
+    taken();
+    click("Vergleich_Lesen");
+    EXPECT_EQ(cells("EON PS  D7A2"), "TALWELLE|TALWELLE|NEU|!");
+    click("Vergleich_Uebernehmen");
+    EXPECT_EQ(taken(), Lines{});
+    EXPECT_EQ(profile(kSet1, "RDS", "EON_PS"), "NEU");
+    EXPECT_EQ(profile(kSet1, "RDS", "EON_PI"), "D7A2");
+    EXPECT_TRUE(text("Vergleich_Stand").starts_with("0 von ")) << text("Vergleich_Stand");
+}
+
 TEST_F(CompareViewTest, TellsWhatNoFileKeeps) {
     openView();
     send(direct("TA=1"));
