@@ -40,6 +40,8 @@ ScenarioView::ScenarioView(Session& session, const PageContext& with, QWidget* p
       m_session(session),
       m_with(with),
       m_run(new ScenarioRun(session, with, this)),
+      m_automatic(
+          with.tickers.automatics(), [this] { return caption({974, "Ablauf"}); }, [this] { m_run->stop(); }),
       m_steps("Ablauf_Liste", with.captions, this),
       m_sessionOpen(session.instrument.isOpen()) {
     setObjectName(QStringLiteral("ScenarioView"));
@@ -226,6 +228,7 @@ void ScenarioView::showState() {
         if (m_unmet > 0) state += caption({987, "nicht erfüllt: %1"}).arg(m_unmet);
     }
     Ablauf_Stand->setText(state.join(QStringLiteral("; ")));
+    m_automatic.setRunning(running);
     if (running != std::exchange(m_wasRunning, running)) emit runningChanged(running);
 }
 

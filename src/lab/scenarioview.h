@@ -4,6 +4,7 @@
 
 #include "lab/steptable.h"
 #include "scenario/scenario.h"
+#include "ui/automatics.h"
 #include "ui/caption.h"
 #include "ui/pagecontext.h"
 
@@ -54,6 +55,7 @@ private:
     PageContext m_with;
     CaptionBook m_book;
     ScenarioRun* m_run = nullptr;
+    Automatic m_automatic;
     StepTable m_steps;  // Ablauf_Liste
     QLabel* Ablauf_Titel = nullptr;
     QLabel* Ablauf_Stand = nullptr;

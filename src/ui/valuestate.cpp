@@ -21,6 +21,7 @@ namespace {
 
 // What the tip was made of: whoever captions the control anew replaces the tip, and that is its own from then on.
 constexpr const char* kOwnTip = "ownTip";
+constexpr const char* kStateTip = "stateTip";
 constexpr const char* kShownTip = "shownTip";
 
 const char* nameOf(ValueState state) {
@@ -46,8 +47,8 @@ void colour(QWidget& control, ValueState state) {
         palette.setColor(QPalette::WindowText, grey);
     } else if (state != ValueState::InForce) {
         const bool refused = state == ValueState::Refused;
-        const QColor letters = refused ? QColor(0xB0, 0, 0x10) : QColor(Qt::black);
-        const QColor ground = refused ? QColor(0xFF, 0xE4, 0xE1) : QColor(0xFF, 0xF8, 0xD0);
+        const QColor letters = refused ? QColor(Qt::red) : QColor(Qt::black);
+        const QColor ground = refused ? QColor(0xFF, 0xF4, 0xF2) : QColor(0xFF, 0xF8, 0xD0);
         for (const auto group : {QPalette::Active, QPalette::Inactive}) {
             palette.setColor(group, label ? QPalette::WindowText : QPalette::Text, letters);
             palette.setColor(group, label ? QPalette::Window : QPalette::Base, ground);
@@ -56,14 +57,16 @@ void colour(QWidget& control, ValueState state) {
     control.setPalette(palette);
 }
 
-void showTip(QWidget& control, const QString& tip) {
-    QString own = control.toolTip();
-    if (own == control.property(kShownTip).toString()) own = control.property(kOwnTip).toString();
-    const QString shown = tip.isEmpty() || own.isEmpty() ? tip + own : tip + QLatin1Char('\n') + own;
+bool isMade(const QWidget& control) {
+    return control.toolTip() == control.property(kShownTip).toString();
+}
+
+void showTips(QWidget& control, const QString& state, const QString& own) {
+    const QString shown = state.isEmpty() || own.isEmpty() ? state + own : state + QLatin1Char('\n') + own;
     control.setProperty(kOwnTip, own);
+    control.setProperty(kStateTip, state);
     control.setProperty(kShownTip, shown);
     control.setToolTip(shown);
-    control.setAccessibleDescription(tip);
 }
 
 bool isCarriedText(std::string_view key) {
@@ -72,8 +75,17 @@ bool isCarriedText(std::string_view key) {
 
 }  // namespace
 
+QString ownTip(const QWidget& control) {
+    return isMade(control) ? control.property(kOwnTip).toString() : control.toolTip();
+}
+
+void setOwnTip(QWidget& control, const QString& tip) {
+    showTips(control, isMade(control) ? control.property(kStateTip).toString() : QString(), tip);
+}
+
 void showState(QWidget& control, ValueState state, const QString& tip) {
-    showTip(control, tip);
+    showTips(control, tip, ownTip(control));
+    control.setAccessibleDescription(tip);
     control.setProperty("zustand", QString::fromLatin1(nameOf(state)));
     colour(control, state);
     control.update();

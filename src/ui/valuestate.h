@@ -20,6 +20,10 @@ enum class ValueState {
 /// Shows the state by colours, in the control's tip before what that says of itself, and in its property "zustand".
 void showState(QWidget& control, ValueState state, const QString& tip);
 
+/// What a control's tip says of the control itself, whatever its value's state is.
+[[nodiscard]] QString ownTip(const QWidget& control);
+void setOwnTip(QWidget& control, const QString& tip);
+
 /// Shows by the looks of a refused value what is wrong with one before it is sent; with "" nothing is.
 void showWarning(QWidget& control, const QString& tip);
 

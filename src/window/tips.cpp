@@ -6,6 +6,7 @@
 #include <array>
 
 #include "ui/caption.h"
+#include "ui/valuestate.h"
 
 namespace kdx {
 
@@ -112,9 +113,9 @@ void Tips::show(const QWidget& window, const Captions& captions) {
         const Tip* tip = tipOf(control->objectName());
         if (tip == nullptr) continue;
         QString& shown = m_shown[control];
-        if (!control->toolTip().isEmpty() && control->toolTip() != shown) continue;
+        if (const QString own = ownTip(*control); !own.isEmpty() && own != shown) continue;
         shown = captionText(captions, tip->caption);
-        control->setToolTip(shown);
+        setOwnTip(*control, shown);
     }
 }
 
