@@ -92,6 +92,7 @@ void TmcTransmission::load() {
 
 void TmcTransmission::keepMessages() {
     std::vector<std::string> entries;
+    entries.reserve(static_cast<std::size_t>(TMC_List->count()));
     for (int row = 0; row < TMC_List->count(); ++row) entries.push_back(toBytes(TMC_List->item(row)->text()));
     const bool kept = storeMessages(m_with.data.file(kMessageFile), entries);
     if (kept || std::exchange(m_lossTold, true)) return;

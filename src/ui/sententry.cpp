@@ -46,7 +46,7 @@ Judgement SentEntry::judge(const QString& entry) const {
 
 std::string SentEntry::sentForm(std::string_view value) const {
     const std::string_view key = m_key;
-    const std::string plain = withoutControls(value);
+    std::string plain = withoutControls(value);
     if (key == "PS" || key == "EON_PS") return padRight(plain, kPsLength);
     if (key == "PI" || key == "EON_PI") return padRight(plain, kPiLength);
     return plain;

@@ -22,13 +22,11 @@ void ValueScrollBar::mousePressEvent(QMouseEvent* event) {
 void ValueScrollBar::mouseMoveEvent(QMouseEvent* event) {
     if (!isSliderDown()) return QScrollBar::mouseMoveEvent(event);
     const int before = sliderPosition();
-    int dragged = before;
-    {
-        const QSignalBlocker quiet(this);  // the places between two steps are nobody's concern
-        QScrollBar::mouseMoveEvent(event);
-        dragged = sliderPosition();
-        setSliderPosition(before);
-    }
+    QSignalBlocker quiet(this);  // the places between two steps are nobody's concern
+    QScrollBar::mouseMoveEvent(event);
+    const int dragged = sliderPosition();
+    setSliderPosition(before);
+    quiet.unblock();
     setSliderPosition(onStep(dragged));
 }
 
