@@ -20,16 +20,21 @@ public:
         QString title;
         QString text;
         QString preset;           ///< of an input box; of a message box the details
+        QString aboutDetails;     ///< of the about box, shown when the user opens them
         bool offersStop = false;  ///< has a second button that stops the running sequence
     };
 
     void message(Icon icon, const QString& title, const QString& text, const QString& details = {}) override {
-        shown.push_back({icon, title, text, details, false});
+        shown.push_back({icon, title, text, details, {}, false});
         if (expectedMessages > 0) {
             --expectedMessages;
         } else {
             ADD_FAILURE() << "unexpected box: " << title.toStdString() << " | " << text.toStdString();
         }
+    }
+    void about(const QString& text, const QString& madeOf, const QString& details) override {
+        message(Icon::Exclamation, {}, text, madeOf);
+        shown.back().aboutDetails = details;
     }
     bool messageOrStop(const QString& title, const QString& text) override {
         message(Icon::Critical, title, text);
@@ -37,7 +42,7 @@ public:
         return stopAtFailure;
     }
     bool confirm(const QString& title, const QString& text) override {
-        shown.push_back({Icon::None, title, text, {}, false});
+        shown.push_back({Icon::None, title, text, {}, {}, false});
         if (confirmations.empty()) {
             ADD_FAILURE() << "unexpected question: " << text.toStdString();
             return false;
@@ -47,7 +52,7 @@ public:
         return answer;
     }
     QString input(const QString& prompt, const QString& title, const QString& preset) override {
-        shown.push_back({Icon::None, title, prompt, preset, false});
+        shown.push_back({Icon::None, title, prompt, preset, {}, false});
         if (inputs.empty()) {
             ADD_FAILURE() << "unexpected input box: " << prompt.toStdString();
             return {};
@@ -58,7 +63,7 @@ public:
     }
 
     QString fileToSave(const QString& title, const QString& preset, const QString& kind) override {
-        shown.push_back({Icon::None, title, kind, preset, false});
+        shown.push_back({Icon::None, title, kind, preset, {}, false});
         if (files.empty()) {
             ADD_FAILURE() << "unexpected box for a file: " << title.toStdString();
             return {};
