@@ -53,6 +53,8 @@ ConnectionBar::ConnectionBar(const PageContext& with, QWidget* parent) : QWidget
     Verbindung_Anzeige = named<QLabel>("Verbindung_Anzeige", this);
     Verbindung_Anzeige->setSizePolicy(QSizePolicy::Ignored,
                                       QSizePolicy::Fixed);  // a host name may be long: see the tip
+    Verbindung_Anzeige->setMinimumWidth(
+        Verbindung_Anzeige->fontMetrics().horizontalAdvance(QStringLiteral("verbunden: 000.000.000.000")));
     auto* state = column({row({Ende_Taste, kRoom}), Verbindung_Anzeige});
     state->setSpacing(1);
     auto* whole = row({Frame8, {state, 1}, Image2});

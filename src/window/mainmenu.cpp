@@ -96,9 +96,11 @@ void MainMenu::Mnu_Info_Ueber_Click() {
     const auto line = [this](const Caption& caption, const QString& what) {
         return captionText(m_with.captions, caption) + QStringLiteral(": ") + what;
     };
-    // The link in use stands in the first line, what was tried in vain after it.
-    const QString link = m_linkDescription.section(QLatin1Char('\n'), 0, 0);
-    const QString tried = m_linkDescription.section(QLatin1Char('\n'), 1);
+    // The link in use comes first; what was tried in vain after it takes lines of its own.
+    const bool hasTried = m_linkDescription.contains(QLatin1Char('\n'));
+    const QString between = QStringLiteral("; ");
+    const QString link = hasTried ? m_linkDescription.section(between, 0, 0) : m_linkDescription;
+    const QString tried = hasTried ? m_linkDescription.section(between, 1) : QString();
     const QStringList about{QStringLiteral("KDX-RDS %1").arg(QCoreApplication::applicationVersion()),
                             line({916, "Lizenz"}, QStringLiteral("MIT")), line({917, "Verbindung"}, link),
                             line({918, "Bibliotheken"},

@@ -20,17 +20,22 @@ public:
         QString title;
         QString text;
         QString preset;           ///< of an input box; of a message box the details
+        QString aboutDetails;     ///< of the about box, shown when the user opens them
         bool offersStop = false;  ///< has a second button that stops the running sequence
         QString stop = {};        ///< its caption where it is another one
     };
 
     void message(Icon icon, const QString& title, const QString& text, const QString& details = {}) override {
-        shown.push_back({icon, title, text, details});
+        shown.push_back({icon, title, text, details, {}, false});
         if (expectedMessages > 0) {
             --expectedMessages;
         } else {
             ADD_FAILURE() << "unexpected box: " << title.toStdString() << " | " << text.toStdString();
         }
+    }
+    void about(const QString& text, const QString& madeOf, const QString& details) override {
+        message(Icon::Exclamation, {}, text, madeOf);
+        shown.back().aboutDetails = details;
     }
     bool messageOrStop(const QString& title, const QString& text, const QString& details = {}, const QString& stop = {},
                        Icon icon = Icon::Critical) override {
@@ -40,7 +45,7 @@ public:
         return stopAtFailure;
     }
     bool confirm(const QString& title, const QString& text) override {
-        shown.push_back({Icon::None, title, text, {}});
+        shown.push_back({Icon::None, title, text, {}, {}, false});
         if (confirmations.empty()) {
             ADD_FAILURE() << "unexpected question: " << text.toStdString();
             return false;
@@ -50,7 +55,7 @@ public:
         return answer;
     }
     QString input(const QString& prompt, const QString& title, const QString& preset) override {
-        shown.push_back({Icon::None, title, prompt, preset});
+        shown.push_back({Icon::None, title, prompt, preset, {}, false});
         if (inputs.empty()) {
             ADD_FAILURE() << "unexpected input box: " << prompt.toStdString();
             return {};
@@ -61,7 +66,7 @@ public:
     }
 
     QString fileToSave(const QString& title, const QString& preset, const QString& kind) override {
-        shown.push_back({Icon::None, title, kind, preset});
+        shown.push_back({Icon::None, title, kind, preset, {}, false});
         if (files.empty()) {
             ADD_FAILURE() << "unexpected box for a file: " << title.toStdString();
             return {};

@@ -27,7 +27,7 @@ protected:
         session = std::make_unique<Session>(instrumentLink(), state, data, captions, clock, ask);
         tickers.setHeld(false);
         window = std::make_unique<HMenue>(Surroundings{*session, state, data, captions, clock, boxesOfWindow(), tickers,
-                                                       claim, QStringLiteral("scripted"), QString(), ask, worker(),
+                                                       claim, linkDescription, QString(), ask, worker(),
                                                        std::chrono::seconds{2}, simulated, shipped, placeFile});
         m_listener = std::make_unique<TrafficListener>(session->instrument, [this](const Traffic& traffic) {
             if (heard) heard(traffic);
@@ -73,6 +73,7 @@ protected:
     }
 
     ScriptedDialogs dialogs;
+    QString linkDescription = QStringLiteral("scripted");
     bool simulated = false;           ///< what the next start tells of the instrument
     std::filesystem::path shipped;    ///< the folder that the next start takes for the shipped one
     std::filesystem::path placeFile;  ///< where it keeps its page and place; nowhere when empty

@@ -37,6 +37,15 @@ TEST_F(MenuTest, TheAboutBoxTellsVersionLicenceLinkAndLibraries) {
     EXPECT_EQ(lines[3].toStdString().find("Bibliotheken: Qt 6."), 0U) << lines[3].toStdString();
 }
 
+TEST_F(MenuTest, WhatWasTriedInVainIsNoLinkInUse) {
+    linkDescription = QStringLiteral("Built-in client; no library found:\nlibvisa.so: missing");
+    start();
+    dialogs.expectedMessages = 1;
+    action("Mnu_Info_Ueber")->trigger();
+    EXPECT_EQ(dialogs.shown[0].preset.split(QLatin1Char('\n')).at(2).toStdString(), "Verbindung: Built-in client");
+    EXPECT_EQ(dialogs.shown[0].aboutDetails.toStdString(), "no library found:\nlibvisa.so: missing");
+}
+
 TEST_F(MenuTest, WithoutALanguageFileTheLanguageMenuIsStillThereToBeClicked) {
     std::filesystem::remove(folder.data() / kLanguageFile);
     start();
