@@ -37,7 +37,7 @@ const Caption kOther{839, "Die Übertragung ist fehlgeschlagen: Verbindung prüf
 QString failureHint(VisaStatus status, std::chrono::milliseconds answerTime, const Captions& captions) {
     const auto* const known =
         std::find_if(kHints.begin(), kHints.end(), [status](const Hint& hint) { return hint.status == status; });
-    const QString text = captionText(captions, known == kHints.end() ? kOther : known->caption);
+    QString text = captionText(captions, known == kHints.end() ? kOther : known->caption);
     if (status != visa::kTimeout) return text;
     return text.arg(QLocale().toString(static_cast<double>(answerTime.count()) / 1000, 'g', 3));
 }

@@ -65,6 +65,10 @@ WaitingLoop::WaitingLoop(const Dialogs& dialogs, QWidget* window, QWidget* stop,
     m_patience.setSingleShot(true);
     m_patience.setInterval(kPatience);
     connect(&m_patience, &QTimer::timeout, this, &WaitingLoop::becomeSlow);
+    // Queued: from the other thread, to end the waiting for events; and from within a filter.
+    connect(
+        this, &WaitingLoop::woken, this, [] {}, Qt::QueuedConnection);
+    connect(this, &WaitingLoop::closeRequested, this, &WaitingLoop::ask, Qt::QueuedConnection);
     m_window->installEventFilter(this);
 }
 
@@ -111,8 +115,7 @@ void WaitingLoop::waitUntil(const std::function<bool()>& over) {
 }
 
 void WaitingLoop::wake() {
-    QMetaObject::invokeMethod(
-        this, [] {}, Qt::QueuedConnection);
+    emit woken();
 }
 
 void WaitingLoop::process(bool wait) {
@@ -183,7 +186,7 @@ bool WaitingLoop::meetsClose(const QObject* receiver, QEvent* event) {
     if (!receiver->isWidgetType()) return false;
     event->ignore();
     // Not in here: the box has to come back before the window does.
-    if (receiver == m_window) QMetaObject::invokeMethod(this, &WaitingLoop::ask, Qt::QueuedConnection);
+    if (receiver == m_window) emit closeRequested();
     return true;
 }
 
@@ -202,14 +205,7 @@ void WaitingLoop::ask() {
 }
 
 void WaitingLoop::closeWhenOver() {
-    if (!m_closing) return;
-    QMetaObject::invokeMethod(
-        this,
-        [this] {
-            m_closing = false;
-            emit closeConfirmed();
-        },
-        Qt::QueuedConnection);
+    if (std::exchange(m_closing, false)) emit closeConfirmed();
 }
 
 bool WaitingLoop::dropsInput(QObject* receiver, QEvent* event) {

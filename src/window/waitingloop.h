@@ -40,8 +40,10 @@ public:
 
 signals:
     void givenUp();
-    /// The user wants the window closed, and what was being sent is over.
+    /// The user wants the window closed, and what was being sent is over. To be heard queued.
     void closeConfirmed();
+    void woken();
+    void closeRequested();
 
 private:
     void process(bool wait);

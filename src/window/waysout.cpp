@@ -28,15 +28,16 @@ WaysOut::WaysOut(const Surroundings& surroundings, const ProgressLine& lowerEdge
     Instrument& instrument = m_s.session.instrument;
     m_book.text(lowerEdge.stop(), {830, "&Stop"});
     m_book.tip(lowerEdge.stop(), {831, "Der Rest wird nicht gesendet, die Verbindung bleibt offen (Esc)"});
-    m_book.text(lowerEdge.panic(), {848, "&Alles anhalten"});
+    m_book.text(lowerEdge.panic(), {848, "Alles an&halten"});
     m_book.tip(lowerEdge.panic(), {849, "Hält an, was von selbst sendet, und schaltet TA aus"});
     connect(lowerEdge.stop(), &QPushButton::clicked, &m_waiting, &WaitingLoop::giveUp);
     connect(&m_waiting, &WaitingLoop::givenUp, this, [&instrument] { instrument.stopSequence(); });
-    connect(&m_waiting, &WaitingLoop::closeConfirmed, this, [this, window] {
+    const auto close = [this, window] {
         m_sure = true;
         window->close();
         m_sure = false;
-    });
+    };
+    connect(&m_waiting, &WaitingLoop::closeConfirmed, this, close, Qt::QueuedConnection);
     Automatics& automatics = m_s.tickers.automatics();
     connect(lowerEdge.panic(), &QPushButton::clicked, this, [&automatics] { automatics.panic(); });
     automatics.onChange([this] { m_lowerEdge.panic()->setVisible(m_s.tickers.automatics().anyRuns()); });
