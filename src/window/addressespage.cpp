@@ -26,6 +26,7 @@ AddressesPage::AddressesPage(const PageContext& with, Find find, QWidget* parent
     connect(Adressen_Verwenden, &QPushButton::clicked, this, &AddressesPage::Adressen_Verwenden_Click);
     for (QPushButton* button : {Adressen_Suchen, Adressen_Verwenden}) button->setAutoDefault(false);
     m_state = new QLabel(this);
+    connect(this, &AddressesPage::searched, this, &AddressesPage::showFound, Qt::QueuedConnection);
     layOut(this, column({m_heading, {Adressen_Liste, 1}, row({Adressen_Suchen, m_state, kRoom, Adressen_Verwenden})}),
            kPageMargin);
     showWhetherUsable();
@@ -59,23 +60,22 @@ void AddressesPage::Adressen_Suchen_Click() {
     m_state->setText(captionText(m_with.captions, {933, "Sucht..."}));
     if (m_search.joinable()) m_search.join();  // an earlier one, which has ended
     m_search = std::thread([this] {
-        std::vector<std::string> found;
+        QStringList found;
         try {
-            found = m_find([this] { return m_stopped.load(); });
+            for (const std::string& address : m_find([this] { return m_stopped.load(); })) found += toText(address);
         } catch (const std::exception&) {
             found.clear();  // without a network there is nothing to be found
         }
-        QMetaObject::invokeMethod(
-            this, [this, found] { showFound(found); }, Qt::QueuedConnection);
+        emit searched(found);
     });
 }
 
-void AddressesPage::showFound(const std::vector<std::string>& addresses) {
-    for (const std::string& address : addresses) {
-        const QString entry = QStringLiteral("TCPIP ") + toText(address);
+void AddressesPage::showFound(const QStringList& addresses) {
+    for (const QString& address : addresses) {
+        const QString entry = QStringLiteral("TCPIP ") + address;
         if (Adressen_Liste->findItems(entry, Qt::MatchExactly).isEmpty()) Adressen_Liste->addItem(entry);
     }
-    m_state->setText(addresses.empty() ? captionText(m_with.captions, {946, "Nichts gefunden"}) : QString());
+    m_state->setText(addresses.isEmpty() ? captionText(m_with.captions, {946, "Nichts gefunden"}) : QString());
     Adressen_Suchen->setEnabled(true);
 }
 

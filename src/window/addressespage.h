@@ -35,11 +35,13 @@ public:
 
 signals:
     void chosen(const QString& kind, const QString& address);
+    /// A search has ended; said in its thread.
+    void searched(const QStringList& addresses);
 
 private:
     void Adressen_Suchen_Click();
     void Adressen_Verwenden_Click();
-    void showFound(const std::vector<std::string>& addresses);
+    void showFound(const QStringList& addresses);
     void showWhetherUsable();
 
     PageContext m_with;
