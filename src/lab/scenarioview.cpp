@@ -137,9 +137,10 @@ void ScenarioView::open(const QString& file) {
         problems += caption({593, "%1 kann nicht gelesen werden."}).arg(file);
     } else {
         reading = scenario::readScenario(*bytes, false, m_with.state.corrections);
-        for (const auto& [line, at, sentence] : reading.problems)
+        for (const auto& [line, at, sentence] : reading.problems) {
             problems +=
                 caption({991, "Zeile %1, Spalte %2: %3"}).arg(line).arg(at).arg(QString::fromStdString(sentence));
+        }
         if (problems.isEmpty()) problems = problemsOf(reading.scenario);
     }
     if (!problems.isEmpty()) {

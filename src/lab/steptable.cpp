@@ -69,7 +69,7 @@ void StepTable::append(const std::string& step, int depth, const std::string& wh
     m_table->insertRow(row);
     const bool numbered = step != scenario::kOpening && step != scenario::kRestoring;
     showCell(m_table, row, Number, numbered ? QString::fromStdString(step) : QString(), false);
-    showCell(m_table, row, What, QString(4 * depth, QLatin1Char(' ')) + QString::fromStdString(what), false);
+    showCell(m_table, row, What, QString(qsizetype{4} * depth, QLatin1Char(' ')) + QString::fromStdString(what), false);
     showCell(m_table, row, Result, {}, false);
 }
 
