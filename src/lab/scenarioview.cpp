@@ -41,7 +41,11 @@ ScenarioView::ScenarioView(Session& session, const PageContext& with, QWidget* p
       m_with(with),
       m_run(new ScenarioRun(session, with, this)),
       m_automatic(
-          with.tickers.automatics(), [this] { return caption({974, "Ablauf"}); }, [this] { m_run->stop(); }),
+          with.tickers.automatics(),
+          [this] {
+              return caption({974, "Ablauf"});
+          },
+          [this] { m_run->stop(); }),
       m_steps("Ablauf_Liste", with.captions, this),
       m_sessionOpen(session.instrument.isOpen()) {
     setObjectName(QStringLiteral("ScenarioView"));
@@ -59,7 +63,9 @@ ScenarioView::ScenarioView(Session& session, const PageContext& with, QWidget* p
     Ablauf_Start = button("Ablauf_Start", {976, "St&art"}, &ScenarioView::Ablauf_Start_Click);
     Ablauf_Pause = button("Ablauf_Pause", {977, "&Pause"}, &ScenarioView::Ablauf_Pause_Click);
     Ablauf_Pause->setCheckable(true);
+    Ablauf_Pause->setProperty(kWorksWhileSending, true);
     Ablauf_Stop = button("Ablauf_Stop", {978, "S&topp"}, &ScenarioView::stop);
+    Ablauf_Stop->setProperty(kWorksWhileSending, true);
     Ablauf_Weiter = button("Ablauf_Weiter", {979, "&Weiter"}, &ScenarioView::Ablauf_Weiter_Click);
     Ablauf_Schliessen = button("Ablauf_Schliessen", {688, "&Schließen"}, &QDialog::close);
     connect(m_run, &ScenarioRun::stepBegan, this, [this](const std::string& step) {

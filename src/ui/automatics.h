@@ -10,6 +10,9 @@ namespace kdx {
 
 class Automatic;
 
+/// Property of a button that only takes note that something is to end: it can be used while commands go out.
+inline constexpr const char* kWorksWhileSending = "worksWhileSending";
+
 /// All that sends by itself until somebody stops it. The list of the window.
 class Automatics {
 public:

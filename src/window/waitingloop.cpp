@@ -11,6 +11,7 @@
 #include <chrono>
 #include <utility>
 
+#include "ui/automatics.h"
 #include "ui/dialogs.h"
 
 namespace kdx {
@@ -213,7 +214,8 @@ bool WaitingLoop::dropsInput(QObject* receiver, QEvent* event) {
         giveUp();
         return true;
     }
-    if (receiver->isWindowType() || receiver == m_stop) return false;  // a window hands on to its controls
+    // A window hands on to its controls.
+    if (receiver->isWindowType() || receiver == m_stop || receiver->property(kWorksWhileSending).toBool()) return false;
     if (isRelease(event->type()) && waitsForRelease(receiver))
         m_releases.emplace_back(receiver, std::unique_ptr<QEvent>(event->clone()));
     return true;

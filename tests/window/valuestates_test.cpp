@@ -93,7 +93,8 @@ TEST_F(ValueStatesTest, TheMarksFollowTheLanguage) {
     openSession();
     type("PS_T", "NEW");
     action("Mnu_Info_Sprache_E")->trigger();
-    EXPECT_EQ(find("PS_T")->toolTip().toStdString(), "Not sent yet.");
+    EXPECT_EQ(find("PS_T")->toolTip().toStdString(),
+              "Not sent yet.\nProgramme service name: what a radio shows, 8 characters at most");
 }
 
 }  // namespace
