@@ -22,8 +22,7 @@ class DynamicPs;
 class EntryCounter;
 class TaFrame;
 
-/// The page "R D S": programme service name, identification and type, traffic flags, music/speech, decoder
-/// information, radiotext and clock time.
+/// The page "R D S": what the own programme says of itself, and the clock time.
 class RdsPage : public Page {
     Q_OBJECT
 public:
@@ -70,10 +69,9 @@ private:
     Programme& m_programme;
 
     QLabel *PS_Label = nullptr, *PI_Label = nullptr;
-    SentEntry* PS_T = nullptr;
+    SentEntry *PS_T = nullptr, *PI_T = nullptr;
     EntryCounter *PS_Zaehler = nullptr, *PI_Zaehler = nullptr, *RT_Zaehler = nullptr;
     QPushButton* PS_Taste = nullptr;
-    SentEntry* PI_T = nullptr;
     QPushButton* Command3 = nullptr;  // sends the PI
     QLabel* Label1 = nullptr;         // heading of the programme type list
     QComboBox* PTY_Combo1 = nullptr;

@@ -46,7 +46,7 @@ private:
     const TmcBuilder& m_builder;
     int m_sendPosition = 0;
     bool m_loaded = false;
-    bool m_lossTold = false;      ///< that the list cannot be kept
+    bool m_lossTold = false;  ///< that the list cannot be kept
     Automatic m_cycling;
     bool m_otherVariant = false;  ///< which announcement comes next
 
