@@ -42,10 +42,8 @@ DataSetMenu::DataSetMenu(DataSets& sets, QWidget* window) : QObject(window), m_s
 
 QAction* DataSetMenu::entry(const char* name, QMenu* menu, void (DataSets::*handler)()) {
     auto* action = named<QAction>(name, menu);
-    connect(action, &QAction::triggered, this, [this, handler] {
-        (m_sets.*handler)();
-        showSets();
-    });
+    connect(action, &QAction::triggered, &m_sets, handler);
+    connect(action, &QAction::triggered, this, &DataSetMenu::showSets);
     menu->addAction(action);
     return action;
 }
