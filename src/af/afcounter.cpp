@@ -1,7 +1,5 @@
 #include "af/afcounter.h"
 
-#include <QListWidget>
-
 #include "af/aflist.h"
 #include "ui/caption.h"
 #include "ui/text.h"
@@ -17,6 +15,7 @@ AfCounter::AfCounter(const PageContext& with, const QListWidget* list, QWidget* 
 }
 
 void AfCounter::count() {
+    if (m_list == nullptr) return;
     AfList list;
     for (int row = 0; row < m_list->count(); ++row) list.frequencies.push_back(toBytes(m_list->item(row)->text()));
     const std::size_t count = afCount(joined(list));  // with what a comma within an entry makes of it

@@ -1,10 +1,10 @@
 #pragma once
 
 #include <QLabel>
+#include <QListWidget>
+#include <QPointer>
 
 #include "ui/pagecontext.h"
-
-class QListWidget;
 
 namespace kdx {
 
@@ -19,7 +19,7 @@ public:
 
 private:
     PageContext m_with;
-    const QListWidget* m_list;
+    QPointer<const QListWidget> m_list;  ///< empties itself at the end, when it is none any more
 };
 
 }  // namespace kdx

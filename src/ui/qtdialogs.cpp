@@ -133,7 +133,7 @@ QString QtDialogs::fileToSave(const QString& title, const QString& preset, const
     box.setLabelText(QFileDialog::Reject, toText(m_captions.own(318, "Abbrechen")));
     box.selectFile(preset);
     while (box.exec() == QDialog::Accepted) {
-        const QString file = box.selectedFiles().value(0);
+        QString file = box.selectedFiles().value(0);
         const QString question = toText(m_captions.own(898, "%1 überschreiben?")).arg(QFileInfo(file).fileName());
         if (!QFileInfo::exists(file) || confirm(title, question)) return file;
     }
