@@ -1,10 +1,11 @@
 #pragma once
 
 #include <QLabel>
-#include <QListWidget>
-#include <QPointer>
 
 #include "ui/pagecontext.h"
+
+class QAbstractItemModel;
+class QListWidget;
 
 namespace kdx {
 
@@ -19,7 +20,7 @@ public:
 
 private:
     PageContext m_with;
-    QPointer<const QListWidget> m_list;  ///< empties itself at the end, when it is none any more
+    const QAbstractItemModel* m_entries;  ///< not the list: at its end it is none any more when they go
 };
 
 }  // namespace kdx
