@@ -17,6 +17,7 @@
 #include "station/wrongsettings.h"
 #include "ui/dialogs.h"
 #include "ui/layouts.h"
+#include "ui/ticker.h"
 
 namespace kdx {
 

@@ -96,7 +96,7 @@ void GroupMonitor::show(const air::Shadow& shadow) {
     for (int row = 0; row < Air_Gruppen->rowCount(); ++row) {
         const auto found = shadow.types().find(kTypes.at(static_cast<std::size_t>(row)));
         const bool isSent = goesOut && found != shadow.types().end();
-        const int percent = isSent ? static_cast<int>((200 * found->second.count / all + 1) / 2) : 0;
+        const int percent = isSent && all > 0 ? static_cast<int>((200 * found->second.count / all + 1) / 2) : 0;
         showCell(row, Blocks, isSent ? blocksOf(found->second.latest) : QString());
         QTableWidgetItem* share = Air_Gruppen->item(row, Share);
         if (share->data(kPercent).toInt() != percent) share->setData(kPercent, percent);
