@@ -103,6 +103,11 @@ LogView::LogView(TrafficLog& log, const PageContext& with, QWidget* parent)
     label();
 }
 
+LogView::~LogView() {
+    // The list and its scroll bar change once more as they go, when there is no view any more.
+    for (const QObject* child : findChildren<QObject*>()) child->disconnect(this);
+}
+
 void LogView::label() {
     const auto text = [this](const Caption& caption) { return captionText(m_with.captions, caption); };
     setWindowTitle(text({680, "Log"}));

@@ -19,6 +19,7 @@ class LogView : public QDialog {
     Q_OBJECT
 public:
     LogView(TrafficLog& log, const PageContext& with, QWidget* parent);
+    ~LogView() override;
     void label();
 
 protected:

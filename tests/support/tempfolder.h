@@ -20,6 +20,7 @@ public:
         static std::atomic<int> count = 0;
         m_path = std::filesystem::temp_directory_path() /
                  ("kdx-test-" + std::to_string(getpid()) + "-" + std::to_string(count++));
+        std::filesystem::remove_all(m_path);  // of a test of the same number that was killed
         std::filesystem::create_directories(data());
     }
     ~TempFolder() {
