@@ -88,6 +88,7 @@ void QueryPage::Fragen_Schalter(bool on) {
 
 void QueryPage::askAll() {
     std::vector<const ReadBack*> all;
+    all.reserve(std::size(kOrder));
     for (const int index : kOrder) all.push_back(&readBacks()[static_cast<std::size_t>(index)]);
     ask(all);
 }
