@@ -48,29 +48,31 @@ void BudgetTable::show(const air::Shadow& shadow) {
     if (m_shown == shadow.commands()) return;
     m_shown = shadow.commands();
     std::vector<TableRow> rows;
-    addWarnings(rows, shadow);
-    addWaits(rows, shadow);
-    addShares(rows, shadow);
+    const air::GroupBudget budget = air::groupBudgetOf(shadow.transmission());
+    addWarnings(rows, shadow, budget);
+    addWaits(rows, budget);
+    addShares(rows, budget);
     addDeviations(rows, shadow);
     showRows(Air_Budget, rows);
 }
 
-void BudgetTable::addWarnings(std::vector<TableRow>& rows, const air::Shadow& shadow) const {
+void BudgetTable::addWarnings(std::vector<TableRow>& rows, const air::Shadow& shadow,
+                              const air::GroupBudget& budget) const {
     const auto add = [&](const std::vector<std::string>& warnings) {
         for (const std::string& warning : warnings) {
             const QString text = warningText(m_with.captions, warning);
             rows.push_back({{QStringLiteral("! ") + text}, false, text});
         }
     };
-    add(air::groupBudgetOf(shadow.transmission()).warnings);
+    add(budget.warnings);
     add(air::deviationBudgetOf(shadow.transmission().settings).warnings);
     add(shadow.warnings());
 }
 
-void BudgetTable::addWaits(std::vector<TableRow>& rows, const air::Shadow& shadow) const {
+void BudgetTable::addWaits(std::vector<TableRow>& rows, const air::GroupBudget& budget) const {
     rows.push_back(
         {{caption({759, "Ein Radio wartet auf"}), caption({757, "im Mittel"}), caption({758, "höchstens"})}, true});
-    for (const auto& item : air::groupBudgetOf(shadow.transmission()).items) {
+    for (const auto& item : budget.items) {
         const QString name = caption(kWaits.at(static_cast<std::size_t>(item.what)));
         if (!item.isSet) {
             rows.push_back({{name, caption({769, "nicht gesetzt"}), QString()}});
@@ -82,8 +84,7 @@ void BudgetTable::addWaits(std::vector<TableRow>& rows, const air::Shadow& shado
     }
 }
 
-void BudgetTable::addShares(std::vector<TableRow>& rows, const air::Shadow& shadow) const {
-    const air::GroupBudget budget = air::groupBudgetOf(shadow.transmission());
+void BudgetTable::addShares(std::vector<TableRow>& rows, const air::GroupBudget& budget) const {
     if (budget.shares.empty()) return;
     rows.push_back({{caption({751, "Gruppen"}), caption({754, "Anteil"}), QString()}, true});
     for (const auto& [type, share] : budget.shares) {

@@ -16,7 +16,8 @@ namespace kdx {
 
 namespace air {
 class Shadow;
-}
+struct GroupBudget;
+}  // namespace air
 
 /// What groups and deviation are spent on, and what is wrong with that.
 class BudgetTable : public QGroupBox {
@@ -28,9 +29,9 @@ public:
     [[nodiscard]] QString text() const;
 
 private:
-    void addWarnings(std::vector<TableRow>& rows, const air::Shadow& shadow) const;
-    void addWaits(std::vector<TableRow>& rows, const air::Shadow& shadow) const;
-    void addShares(std::vector<TableRow>& rows, const air::Shadow& shadow) const;
+    void addWarnings(std::vector<TableRow>& rows, const air::Shadow& shadow, const air::GroupBudget& budget) const;
+    void addWaits(std::vector<TableRow>& rows, const air::GroupBudget& budget) const;
+    void addShares(std::vector<TableRow>& rows, const air::GroupBudget& budget) const;
     void addDeviations(std::vector<TableRow>& rows, const air::Shadow& shadow) const;
     [[nodiscard]] QString caption(const Caption& caption) const { return captionText(m_with.captions, caption); }
 

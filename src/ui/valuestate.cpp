@@ -80,7 +80,9 @@ QString ownTip(const QWidget& control) {
 }
 
 void setOwnTip(QWidget& control, const QString& tip) {
-    showTips(control, isMade(control) ? control.property(kStateTip).toString() : QString(), tip);
+    const QString state = isMade(control) ? control.property(kStateTip).toString() : QString();
+    if (state.isEmpty()) return control.setToolTip(tip);  // most controls never have a state
+    showTips(control, state, tip);
 }
 
 void showState(QWidget& control, ValueState state, const QString& tip) {
