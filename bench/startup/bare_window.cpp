@@ -3,6 +3,7 @@
 // Usage: bare_window QLabel=120 QPushButton=60 ...
 #include <QCheckBox>
 #include <QComboBox>
+#include <QDoubleSpinBox>
 #include <QFont>
 #include <QGridLayout>
 #include <QGroupBox>
@@ -10,8 +11,12 @@
 #include <QLineEdit>
 #include <QListWidget>
 #include <QMainWindow>
+#include <QMenu>
+#include <QMenuBar>
+#include <QProgressBar>
 #include <QPushButton>
 #include <QRadioButton>
+#include <QScrollArea>
 #include <QScrollBar>
 #include <QTabWidget>
 
@@ -34,7 +39,19 @@ QWidget* make(const std::string& kind, int number, QWidget* page) {
     if (kind == "QScrollBar") return new QScrollBar(Qt::Horizontal, page);
     if (kind == "QListWidget") return new QListWidget(page);
     if (kind == "QComboBox") return new QComboBox(page);
+    if (kind == "QDoubleSpinBox") return new QDoubleSpinBox(page);
+    if (kind == "QProgressBar") return new QProgressBar(page);
+    if (kind == "QScrollArea") return new QScrollArea(page);
     return new QLabel(text, page);
+}
+
+/// @param actions counts the one that each menu is opened by.
+void addMenus(QMainWindow& window, int menus, int actions) {
+    for (int i = 0; i < menus; ++i) window.menuBar()->addMenu(QStringLiteral("Menu %1").arg(i));
+    const QList<QMenu*> made = window.menuBar()->findChildren<QMenu*>();
+    for (int i = 0; i < actions - menus; ++i) {
+        made[i % made.size()]->addAction(QStringLiteral("Action %1").arg(i));
+    }
 }
 
 }  // namespace
@@ -63,13 +80,15 @@ int main(int argc, char** argv) {
     }
     int made = 0;
     for (const auto& [kind, count] : counts) {
-        if (kind == QStringLiteral("QGroupBox")) continue;
+        if (kind == QStringLiteral("QGroupBox") || kind == QStringLiteral("QMenu") || kind == QStringLiteral("QAction"))
+            continue;
         for (int i = 0; i < count; ++i, ++made) {
             QGridLayout* frame = frames[static_cast<std::size_t>(made) % frames.size()];
             frame->addWidget(make(kind.toStdString(), made, frame->parentWidget()), frame->count() / 2,
                              frame->count() % 2);
         }
     }
+    addMenus(window, counts[QStringLiteral("QMenu")], counts[QStringLiteral("QAction")]);
     window.setCentralWidget(tabs);
     window.resize(640, 480);
     window.show();

@@ -1,14 +1,18 @@
 // The program's own window with settings loaded, up to its first paint; with --count, how many controls of each kind
 // it has. Usage: program_window APP_FOLDER [--count]
-#include <QAbstractButton>
+#include <QAction>
 #include <QCheckBox>
 #include <QComboBox>
+#include <QDoubleSpinBox>
 #include <QGroupBox>
 #include <QLabel>
 #include <QLineEdit>
 #include <QListWidget>
+#include <QMenu>
+#include <QProgressBar>
 #include <QPushButton>
 #include <QRadioButton>
+#include <QScrollArea>
 #include <QScrollBar>
 
 #include <cstdio>
@@ -34,10 +38,11 @@ int count(const QWidget& window) {
 void printCounts(const QWidget& window) {
     std::printf(
         "QLabel=%d QPushButton=%d QRadioButton=%d QCheckBox=%d QComboBox=%d QLineEdit=%d QListWidget=%d "
-        "QScrollBar=%d QGroupBox=%d\n",
+        "QScrollBar=%d QGroupBox=%d QDoubleSpinBox=%d QProgressBar=%d QScrollArea=%d QMenu=%d QAction=%d\n",
         count<QLabel>(window), count<QPushButton>(window), count<QRadioButton>(window), count<QCheckBox>(window),
         count<QComboBox>(window), count<QLineEdit>(window), count<QListWidget>(window), count<QScrollBar>(window),
-        count<QGroupBox>(window));
+        count<QGroupBox>(window), count<QDoubleSpinBox>(window), count<QProgressBar>(window),
+        count<QScrollArea>(window), count<QMenu>(window), count<QAction>(window));
 }
 
 }  // namespace

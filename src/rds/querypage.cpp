@@ -48,10 +48,10 @@ void QueryPage::create() {
     gelesen->setAlignment(Qt::AlignLeft | Qt::AlignTop);
     gelesen->setWordWrap(true);
     gelesen->setMargin(6);
-    gelesen->setTextInteractionFlags(Qt::TextSelectableByMouse | Qt::TextSelectableByKeyboard);
     QFont larger = font();
     larger.setPointSizeF(1.2 * larger.pointSizeF());  // read from a distance, with the hands at the instrument
     gelesen->setFont(larger);
+    gelesen->setTextInteractionFlags(Qt::TextSelectableByMouse | Qt::TextSelectableByKeyboard);
     m_shown->setMinimumHeight(gelesen->fontMetrics().lineSpacing() * 10 + 16);
 }
 

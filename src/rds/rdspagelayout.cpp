@@ -28,7 +28,7 @@ void RdsPage::create() {
     connect(m_ta, &TaFrame::optionChosen, m_dynamicPs, &DynamicPs::stopQuietly);
 
     Image1 = named<QLabel>("Image1", this);
-    Image1->setPixmap(QIcon(QStringLiteral(":/kdx-rds-64.png")).pixmap(QSize(40, 40), devicePixelRatioF()));
+    Image1->setPixmap(QIcon(QPixmap(QStringLiteral(":/kdx-rds-64.png"))).pixmap(QSize(40, 40), devicePixelRatioF()));
 
     MS_Frame = captioned<QGroupBox>("MS_Frame", {55}, this);
     createOptions(MS_opt, "MS_opt", {{56}, {57}}, MS_Frame, &RdsPage::MS_opt_Click);

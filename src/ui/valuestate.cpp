@@ -76,11 +76,13 @@ bool isCarriedText(std::string_view key) {
 }  // namespace
 
 QString ownTip(const QWidget& control) {
-    return isMade(control) ? control.property(kOwnTip).toString() : control.toolTip();
+    const QString shown = control.toolTip();
+    return !shown.isEmpty() && isMade(control) ? control.property(kOwnTip).toString() : shown;
 }
 
 void setOwnTip(QWidget& control, const QString& tip) {
-    const QString state = isMade(control) ? control.property(kStateTip).toString() : QString();
+    const bool hasState = !control.toolTip().isEmpty() && isMade(control);
+    const QString state = hasState ? control.property(kStateTip).toString() : QString();
     if (state.isEmpty()) return control.setToolTip(tip);  // most controls never have a state
     showTips(control, state, tip);
 }

@@ -19,8 +19,9 @@ namespace {
 
 constexpr int kBannerWidth = 240;
 
-/// From the large picture, so that it is as sharp as the display.
+/// On fine displays from the large picture, so that it is as sharp as they are.
 QPixmap banner(qreal pixelRatio) {
+    if (pixelRatio == 1) return QPixmap(QStringLiteral(":/banner.png"));
     QPixmap picture(QStringLiteral(":/banner@2x.png"));
     picture.setDevicePixelRatio(1);
     picture = picture.scaledToWidth(qRound(kBannerWidth * pixelRatio), Qt::SmoothTransformation);

@@ -58,7 +58,7 @@ HMenue::HMenue(const Surroundings& surroundings)
                                                                   m_s.dialogs,         m_s.data,
                                                                   m_s.clock,           m_s.tickers} {
     setObjectName(QStringLiteral("HMenue"));
-    setWindowIcon(QIcon(QStringLiteral(":/kdx-rds-64.png")));
+    setWindowIcon(QPixmap(QStringLiteral(":/kdx-rds-64.png")));  // read once for all that show it
     m_views = std::make_unique<Views>(m_context, m_s.session, this, [this] {
         m_s.session.load();
         const CommandSequence silent(m_s.session.instrument);  // what is shown anew is no setting that goes out
@@ -192,7 +192,6 @@ void HMenue::startUp() {
     m_s.session.load();
     setProperty(kQuotesDoubled, m_s.state.corrections.quotes);
     loadPages();
-    m_desktop->showTips();
     m_desktop->restorePlace();
     m_s.session.instrument.log.empty();
     if (upperCase(profile.read(setting::kOpenAtStart)) == "AUTO") INIT_Taste_Click();

@@ -1,8 +1,9 @@
 #include "window/tips.h"
 
+#include <QHash>
+#include <QLatin1String>
 #include <QWidget>
 
-#include <algorithm>
 #include <array>
 
 #include "ui/caption.h"
@@ -12,13 +13,12 @@ namespace kdx {
 
 namespace {
 
-/// @param name of a control, or what the names of like controls begin with.
+/// @param name of a control, or what the names of like controls begin with before their numbers.
 struct Tip {
     const char* name;
     Caption caption;
 };
 
-// The more exact name first.
 const std::array kTips = {
     Tip{"PS_T", {1000, "Programmname: was ein Radio anzeigt, höchstens 8 Zeichen"}},
     Tip{"PS_Taste", {1001, "Sendet und speichert den PS; Return im Feld tut dasselbe"}},
@@ -97,16 +97,26 @@ const std::array kTips = {
     Tip{"Adr1_Label", {1067, "Adresse des Geräts; ein Klick ändert sie"}},
 };
 
-bool isNumber(QStringView text) {
-    return std::all_of(text.begin(), text.end(), [](QChar c) { return c.isDigit() || c == QLatin1Char('_'); });
+using TipsByName = QHash<QLatin1String, const Tip*>;
+
+TipsByName tipsByName() {
+    TipsByName byName;
+    byName.reserve(static_cast<int>(kTips.size()));
+    for (const Tip& tip : kTips) byName.insert(QLatin1String(tip.name), &tip);
+    return byName;
 }
 
+/// The most exact one: like controls differ in the number at the end.
 const Tip* tipOf(const QString& name) {
-    const auto* found = std::find_if(kTips.begin(), kTips.end(), [&](const Tip& tip) {
-        const QLatin1String begin(tip.name);
-        return name.startsWith(begin) && isNumber(QStringView(name).sliced(begin.size()));
-    });
-    return found == kTips.end() ? nullptr : found;
+    static const TipsByName kByName = tipsByName();
+    const QByteArray latin = name.toLatin1();
+    qsizetype length = latin.size();
+    while (length > 0) {
+        if (const Tip* tip = kByName.value(QLatin1String(latin.data(), length))) return tip;
+        const char last = latin[--length];
+        if (last != '_' && (last < '0' || last > '9')) return nullptr;
+    }
+    return nullptr;
 }
 
 }  // namespace
