@@ -59,14 +59,36 @@ bool isAlternativeFrequency(std::string_view text) {
     return megahertz >= 87.5 && megahertz <= 108.0;
 }
 
+namespace {
+
+/// A table's column or a line of a letter is a list, too: semicolons and blanks between entries become commas.
+std::string withCommas(std::string_view text) {
+    std::string list;
+    bool between = false;
+    for (const char c : text) {
+        if (c == ';' || c == ' ' || c == '\t' || c == '\n' || c == '\r') {
+            between = true;
+            continue;
+        }
+        if (between && c != ',' && !list.empty() && list.back() != ',') list += ',';
+        between = false;
+        list += c;
+    }
+    return list;
+}
+
+}  // namespace
+
 std::vector<std::string> pastedFrequencies(std::string_view text) {
     std::vector<std::string> frequencies;
-    for (const std::string_view piece : split(text, ",")) {
+    const std::string commaList = withCommas(text);
+    for (const std::string_view piece : split(commaList, ",")) {
         auto number = decimalNumber(piece);
         if (!number || !isAlternativeFrequency(*number)) return {};
         frequencies.push_back(std::move(*number));
     }
-    const bool maybeDecimal = frequencies.size() == 2 && text.find('.') == std::string_view::npos;
+    const bool maybeDecimal =
+        frequencies.size() == 2 && text.find('.') == std::string_view::npos && text.find(',') != std::string_view::npos;
     return maybeDecimal ? std::vector<std::string>() : frequencies;
 }
 

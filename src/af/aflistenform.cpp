@@ -89,6 +89,7 @@ void AF_Listenform::Form_Load() {
 void AF_Listenform::AFList_Opt_Click(int index) {
     // A list without AFs leaves the former one in view, as on the pages: it can so be taken over into a new list.
     m_view.show(m_with.profile.read(place(index)));
+    m_unchanged = joined(shownList());
 }
 
 void AF_Listenform::AF_TN_Click() {
@@ -180,6 +181,12 @@ void AF_Listenform::Rem_Freq_Click() {
     if (m_with.dialogs.confirm(title, question.arg(AF_List1->item(row)->text()))) {
         const std::unique_ptr<QListWidgetItem> removed(AF_List1->takeItem(row));
     }
+}
+
+void AF_Listenform::reject() {
+    const bool changed = joined(shownList()) != m_unchanged;
+    if (!changed || m_with.dialogs.confirmLoss(windowTitle(), caption({1092, "Die Änderungen verwerfen?"})))
+        QDialog::reject();
 }
 
 void AF_Listenform::Uebernahme_Knopf_Click() {

@@ -21,6 +21,9 @@ class AF_Listenform : public QDialog, public Form {
 public:
     AF_Listenform(const PageContext& with, QWidget* parent);
 
+    /// The escape key and the window's own button, hit by accident: asks before changes are lost. `Ende_Knopf` says so.
+    void reject() override;
+
 protected:
     /// The delete key in the list asks as `Rem_Freq` does.
     bool eventFilter(QObject* watched, QEvent* event) override;
@@ -39,7 +42,7 @@ private:
     void AF_Ab_Click() { move(1); }
     void AF_Sortieren_Click();
     void Uebernahme_Knopf_Click();
-    void Ende_Knopf_Click() { reject(); }
+    void Ende_Knopf_Click() { QDialog::reject(); }
 
     /// Where the list with that option is kept.
     [[nodiscard]] const Place& place(int index) const;
@@ -64,6 +67,7 @@ private:
     QPushButton* Rem_Freq = nullptr;
     QPushButton *AF_Auf = nullptr, *AF_Ab = nullptr, *AF_Sortieren = nullptr;
     AfCounter* AF_Zaehler = nullptr;
+    std::string m_unchanged;   // the list as it was shown
     QLabel* m_hint = nullptr;  // what a comma in the entry does
     QPushButton* Uebernahme_Knopf = nullptr;
     QPushButton* Ende_Knopf = nullptr;

@@ -191,10 +191,13 @@ void CompareView::showRow(int row, const SettingSideBySide& setting) {
         return toText(printableLine(list ? value->substr(2) : *value, '\xB7'));
     };
     const bool silent = !setting.instrument && !m_present.empty() && setting.network.empty();
-    const QStringList cells{settingName(setting.key, m_with.captions) + network +
-                                (setting.differs ? QStringLiteral("  ") + kDifferenceSign : QString()),
-                            shown(setting.window), shown(setting.file),
-                            silent ? captionText(m_with.captions, {143}) : shown(setting.instrument)};
+    const QStringList cells{
+        settingName(setting.key, m_with.captions) + network +
+            (setting.differs ? QStringLiteral("  ") + kDifferenceSign : QString()),
+        setting.refused ? shown(setting.window) + QStringLiteral("  (%1)").arg(captionText(
+                                                      m_with.captions, {855, "Der Coder nimmt diesen Wert nicht an."}))
+                        : shown(setting.window),
+        shown(setting.file), silent ? captionText(m_with.captions, {143}) : shown(setting.instrument)};
     for (int column = 0; column < ColumnCount; ++column)
         showCell(Vergleich_Tabelle, row, column, cells[column], setting.differs);
     Vergleich_Tabelle->setRowHidden(row, Vergleich_Nur_Unterschiede->isChecked() && !setting.differs);

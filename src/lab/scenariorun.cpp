@@ -85,6 +85,7 @@ void ScenarioRun::AblaufTimer_Timer() {
     if (!isRunning() || m_inside || isHeld()) return;
     const auto pause = goOnToPause();
     if (!pause) return;
+    if (m_hurries && m_failed) return finish();  // given up while it went on
     const auto milliseconds = std::chrono::ceil<std::chrono::milliseconds>(*pause).count();
     m_timer->setPeriod(static_cast<double>(std::max<std::int64_t>(milliseconds, 1)));
     emit changed();
@@ -123,8 +124,10 @@ void ScenarioRun::setHeld(bool held) {
 }
 
 void ScenarioRun::stop() {
+    if (m_finishes) m_hurries = true;
     m_stopped = true;
     setHeld(false);
+    if (m_hurries && m_failed) finish();
 }
 
 void ScenarioRun::finish() {
@@ -143,6 +146,11 @@ void ScenarioRun::finish() {
 bool ScenarioRun::takesFailure() {
     if (!m_inside) return false;
     return std::exchange(m_failed, true);
+}
+
+void ScenarioRun::finishes() {
+    m_finishes = true;
+    emit changed();
 }
 
 std::chrono::nanoseconds ScenarioRun::left() const {

@@ -25,7 +25,8 @@ public:
     [[nodiscard]] std::string begin(const scenario::Scenario& scenario, const std::filesystem::path& report);
     /// It stands still, or goes on.
     void setHeld(bool held);
-    /// Ends it after the running command; what stood before comes back first.
+    /// Ends it after the running command; what stood before comes back first. The second time that is given up, too,
+    /// where the instrument does not answer.
     void stop();
     /// Ends it at once, what stood before brought back: the session is to be closed.
     void finish();
@@ -37,6 +38,8 @@ public:
     [[nodiscard]] bool isRunning() const { return m_runner != nullptr; }
     /// Whether what goes out right now is the run's.
     [[nodiscard]] bool isAtWork() const { return m_inside; }
+    /// Whether it is over but for what stood before, which is being set again.
+    [[nodiscard]] bool isRestoring() const { return m_finishes; }
     [[nodiscard]] bool isHeld() const { return m_clock.isHeld(); }
     /// Whether a step waits for a person, or would end at a word of one.
     [[nodiscard]] bool asks() const { return m_asks; }
@@ -62,7 +65,7 @@ private:
     bool goesOn() override { return m_finishes || (!m_stopped && !m_failed); }
     void forgetsTyped() override { m_pressed = false; }
     Return pressed() override;
-    void finishes() override { m_finishes = true; }
+    void finishes() override;
     void begins(const std::string& step, const scenario::Action&) override { emit stepBegan(step); }
     void happened(const scenario::Row& row) override { emit rowAdded(row); }
     void waits(std::chrono::nanoseconds length) override { m_until = m_clock.steadyNow() + length; }

@@ -3,6 +3,7 @@
 #include <QDir>
 #include <QFile>
 #include <QFileInfo>
+#include <QKeyEvent>
 #include <QLabel>
 #include <QPushButton>
 
@@ -131,8 +132,19 @@ bool ScenarioView::takesFailure() {
     return m_run->takesFailure();
 }
 
+void ScenarioView::keyPressEvent(QKeyEvent* event) {
+    if (event->key() != Qt::Key_Escape || !m_run->isRunning()) QDialog::keyPressEvent(event);
+}
+
+bool ScenarioView::leftNothing() const {
+    return m_scenario.restore && m_outcome && m_outcome->restored && m_outcome->changed.empty() &&
+           m_outcome->untold.empty();
+}
+
 void ScenarioView::Ablauf_Oeffnen_Click() {
-    const QString file = m_with.dialogs.fileToOpen(windowTitle(), caption({990, "Szenario (*.yaml *.yml)"}));
+    const QString folder = m_file.isEmpty() ? QFile::decodeName(m_with.data.file("Scenarios").string().c_str())
+                                            : QFileInfo(m_file).absolutePath();
+    const QString file = m_with.dialogs.fileToOpen(windowTitle(), caption({990, "Szenario (*.yaml *.yml)"}), folder);
     if (!file.isEmpty()) open(file);
 }
 
@@ -160,7 +172,7 @@ void ScenarioView::open(const QString& file) {
     m_file = file;
     m_scenario = std::move(reading.scenario);
     m_step.clear();
-    m_ended.clear();
+    m_outcome.reset();
     m_steps.show(m_scenario);
     showState();
 }
@@ -184,8 +196,14 @@ void ScenarioView::Ablauf_Start_Click() {
     if (!report.empty()) report = std::filesystem::path(QFile::encodeName(m_file).toStdString()).parent_path() / report;
     m_steps.clearResults();
     m_step.clear();
-    m_ended.clear();
+    m_outcome.reset();
     m_unmet = 0;
+    if (!report.empty() && !m_with.data.mayWrite(report)) {
+        m_with.dialogs.message(Dialogs::Icon::Critical, caption({313, "Fehler"}),
+                               caption({312, "Nicht gespeichert: %1"}).arg(QString::fromStdString(report.string())),
+                               caption({920, "Nur zum Lesen geöffnet: nichts wird gespeichert"}));
+        return;
+    }
     const std::string problem = m_run->begin(m_scenario, report);
     if (problem.empty()) return;
     m_with.dialogs.message(Dialogs::Icon::Critical, caption({313, "Fehler"}),
@@ -202,14 +220,18 @@ void ScenarioView::Ablauf_Weiter_Click() {
 }
 
 void ScenarioView::showEnd(const scenario::Outcome& outcome) {
+    m_outcome = outcome;
+    m_steps.mark({});
+}
+
+QString ScenarioView::endText(const scenario::Outcome& outcome) const {
     QStringList end{outcome.complete ? caption({985, "zu Ende"}) : caption({986, "abgebrochen"})};
     if (outcome.unmet > 0) end += caption({987, "nicht erfüllt: %1"}).arg(outcome.unmet);
     std::vector<std::string> other = outcome.changed;
     other.insert(other.end(), outcome.untold.begin(), outcome.untold.end());
     if (other.empty() && !outcome.restored) other.emplace_back("?");
     if (!other.empty()) end += caption({988, "nicht wie zuvor: %1"}).arg(QString::fromStdString(joined(other, ", ")));
-    m_ended = end.join(QStringLiteral("; "));
-    m_steps.mark({});
+    return end.join(QStringLiteral("; "));
 }
 
 void ScenarioView::showState() {
@@ -225,7 +247,9 @@ void ScenarioView::showState() {
     Ablauf_Titel->setText(title.isEmpty() ? name : title + QStringLiteral("  (%1)").arg(name));
     QStringList state;
     if (!running) {
-        state += m_ended;
+        if (m_outcome) state += endText(*m_outcome);
+    } else if (m_run->isRestoring()) {
+        state += caption({1090, "was vorher war, wird wiederhergestellt"});
     } else if (m_step.empty()) {
         state += caption({989, "was vorher war, wird gelesen und kommt danach wieder"});
     } else {

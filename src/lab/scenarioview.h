@@ -2,7 +2,10 @@
 
 #include <QDialog>
 
+#include <optional>
+
 #include "lab/steptable.h"
+#include "scenario/attendance.h"
 #include "scenario/scenario.h"
 #include "ui/automatics.h"
 #include "ui/caption.h"
@@ -36,8 +39,15 @@ public:
     /// A command failed. @returns whether nobody need be told any more.
     bool takesFailure();
 
+    /// Whether after the last run everything stands as before it.
+    [[nodiscard]] bool leftNothing() const;
+
 signals:
     void runningChanged(bool running);
+
+protected:
+    /// Esc ends what runs elsewhere: the view stays while it shows a run.
+    void keyPressEvent(QKeyEvent* event) override;
 
 private:
     void Ablauf_Oeffnen_Click();
@@ -48,6 +58,7 @@ private:
     void open(const QString& file);
     void showState();
     void showEnd(const scenario::Outcome& outcome);
+    [[nodiscard]] QString endText(const scenario::Outcome& outcome) const;
     [[nodiscard]] QStringList problemsOf(const scenario::Scenario& scenario) const;
     [[nodiscard]] QString caption(const Caption& caption) const { return captionText(m_with.captions, caption); }
 
@@ -67,8 +78,8 @@ private:
     QPushButton* Ablauf_Schliessen = nullptr;
     QString m_file;
     scenario::Scenario m_scenario;
-    std::string m_step;  // that runs
-    QString m_ended;     // how the last run ended
+    std::string m_step;                          // that runs
+    std::optional<scenario::Outcome> m_outcome;  // of the last run
     std::size_t m_unmet = 0;
     bool m_sessionOpen = false, m_wasRunning = false;
 };

@@ -115,6 +115,14 @@ bool DataFolder::save(const UnsavedFile& unsaved) {
     return underFolderLock(m_path, [&] { saved = changeFile(unsaved); }) && saved;
 }
 
+bool DataFolder::mayWrite(const fs::path& file) const {
+    if (!m_readOnly) return true;
+    std::error_code error;
+    const fs::path folder = fs::weakly_canonical(m_path, error);
+    const fs::path target = fs::weakly_canonical(file, error);
+    return !error && std::mismatch(folder.begin(), folder.end(), target.begin(), target.end()).first != folder.end();
+}
+
 bool DataFolder::changeFile(const UnsavedFile& unsaved) {
     const fs::path path = file(unsaved.name);
     const auto before = load(unsaved.name, path);

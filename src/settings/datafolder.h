@@ -51,7 +51,8 @@ public:
     /// From now on nothing in the folder is written: values count as ones that cannot be.
     void setReadOnly() { m_readOnly = true; }
     [[nodiscard]] bool isReadOnly() const { return m_readOnly; }
-
+    /// Whether what the user saves may go to that file: not into a folder that is only read, also not by a link.
+    [[nodiscard]] bool mayWrite(const std::filesystem::path& file) const;
     /// Tries to write what could not be written so far, and looks again at what could not be read.
     void retryUnsaved();
     /// Name of the file that could not be written last and still lacks a value; nothing when all is saved.

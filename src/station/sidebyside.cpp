@@ -4,6 +4,7 @@
 #include <array>
 #include <utility>
 
+#include "coder/keyfacts.h"
 #include "settings/profile.h"
 #include "settings/profilefile.h"
 #include "settings/storedvalue.h"
@@ -59,6 +60,17 @@ bool differ(const SettingSideBySide& row, bool present) {
     });
 }
 
+/// What the coder does not take is shown as it was entered, and goes nowhere.
+void showRefused(std::vector<SettingSideBySide>& rows, const Station& entered, const Corrections& corrections) {
+    for (const Step& step : openingSteps(entered, corrections)) {
+        if (step.kind != Step::Kind::Parameter || !wrongValue(step.key, step.value, corrections)) continue;
+        const auto row = rowOf(rows, {step.key, {}, {}});
+        if (row == rows.end()) continue;
+        row->window = step.value;
+        row->refused = true;
+    }
+}
+
 /// Without it no networks would mean that there are none.
 const Reading kOtherNetworksUnknown{kNetwork, {}, std::nullopt};
 
@@ -90,10 +102,12 @@ SideBySide sideBySide(DataFolder& data, const Captions& captions, const Profile&
     file.apply(source);
     fill(result.settings, &SettingSideBySide::window,
          sentOf(result.window, SentValues(entered, readCorrections(source))));
+    const Corrections corrections = readCorrections(source);
+    showRefused(result.settings, entered, corrections);
     fill(result.settings, &SettingSideBySide::file, sentOf(file.readOut(), SentValues(source)));
     fill(result.settings, &SettingSideBySide::instrument, present);
     const bool asked = !present.empty() && knowsNetworks(present);
-    for (SettingSideBySide& row : result.settings) row.differs = differ(row, asked);
+    for (SettingSideBySide& row : result.settings) row.differs = row.refused || differ(row, asked);
     return result;
 }
 
@@ -102,7 +116,7 @@ SettingCommands commandsForWindow(const std::vector<SettingSideBySide>& settings
     Differences differing;
     for (const SettingSideBySide& row : settings) {
         const bool wholeNetwork = row.key == kNetwork && !row.network.empty();
-        const bool known = wholeNetwork || (row.window && row.instrument);
+        const bool known = !row.refused && (wholeNetwork || (row.window && row.instrument));
         if (known && row.window != row.instrument)
             differing.push_back({row.key, row.network, row.window, row.instrument});
     }

@@ -21,6 +21,7 @@ struct SettingSideBySide {
     std::optional<std::string> window;
     std::optional<std::string> file;
     std::optional<std::string> instrument;
+    bool refused = false;  ///< the coder does not take what the window has: it stays as it is
     bool differs = false;  ///< not all of them that are known are the same
 
     [[nodiscard]] bool isAt(const Reading& reading) const { return reading.key == key && reading.network == network; }

@@ -7,6 +7,8 @@
 #include "tmc/groupcode.h"
 #include "tmc/messagelist.h"
 
+#include <utility>
+
 namespace kdx {
 
 namespace {
@@ -22,25 +24,44 @@ bool isEntry(const std::string& line) {
            line.compare(kEvent + kMessageTextLength, kAfterEvent.size(), kAfterEvent) == 0;
 }
 
+struct Lines {
+    std::vector<std::string> entries, others;
+};
+
+Lines sorted(std::string_view content) {
+    Lines lines;
+    for (std::string_view line : split(content, "\n")) {
+        if (line.ends_with('\r')) line.remove_suffix(1);
+        std::string entry = withoutControls(line);
+        if (isEntry(entry) && lines.entries.size() < kMostEntries) {
+            lines.entries.push_back(std::move(entry));
+        } else if (!line.empty()) {
+            lines.others.emplace_back(line);
+        }
+    }
+    return lines;
+}
+
+bool replaceEntries(const std::filesystem::path& file, const std::vector<std::string>& entries) {
+    const auto content = readFile(file);
+    std::error_code error;
+    if (!content && std::filesystem::symlink_status(file, error).type() != std::filesystem::file_type::not_found)
+        return false;
+    std::string bytes;
+    for (const std::string& line : sorted(content.value_or(std::string())).others) bytes += line + "\r\n";
+    for (const std::string& entry : entries) bytes += entry + "\r\n";
+    return replaceFile(file, bytes);
+}
+
 }  // namespace
 
 std::vector<std::string> loadMessages(const std::filesystem::path& file) {
-    std::vector<std::string> entries;
-    const auto content = readFile(file);
-    if (!content) return entries;
-    for (std::string_view line : split(*content, "\n")) {
-        if (line.ends_with('\r')) line.remove_suffix(1);
-        const std::string entry = withoutControls(line);
-        if (isEntry(entry) && entries.size() < kMostEntries) entries.push_back(entry);
-    }
-    return entries;
+    return sorted(readFile(file).value_or(std::string())).entries;
 }
 
 bool storeMessages(const std::filesystem::path& file, const std::vector<std::string>& entries) {
-    std::string bytes;
-    for (const std::string& entry : entries) bytes += entry + "\r\n";
     bool stored = false;
-    return underFolderLock(file.parent_path(), [&] { stored = replaceFile(file, bytes); }) && stored;
+    return underFolderLock(file.parent_path(), [&] { stored = replaceEntries(file, entries); }) && stored;
 }
 
 }  // namespace kdx

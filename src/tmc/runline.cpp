@@ -3,7 +3,10 @@
 #include <QLocale>
 
 #include "base/clock.h"
+#include "coder/keyfacts.h"
 #include "settings/programstate.h"
+#include "tmc/groupcode.h"
+#include "tmc/settings.h"
 #include "ui/caption.h"
 #include "ui/text.h"
 
@@ -48,6 +51,12 @@ QString RunLine::seconds() const {
     return locale.toString(m_interval / kPerSecond, 'g', QLocale::FloatingPointShortest);
 }
 
+QString RunLine::shownCode() const {
+    const QString code = toText(m_code);
+    if (!wrongValue(setting::kTrafficMessage.sendKey, sentMessage(m_code))) return code;
+    return QStringLiteral("%1 (%2)").arg(code, captionText(m_with.captions, {1091, "vom Coder abgelehnt"}));
+}
+
 QString RunLine::text() const {
     const auto say = [this](const Caption& caption) { return captionText(m_with.captions, caption); };
     if (m_running && m_interval == 0)
@@ -57,7 +66,7 @@ QString RunLine::text() const {
         return say({882, "Sendet alle %1 s eine Meldung, seit %2, bis zum Anhalten."}).arg(seconds(), toText(m_since));
     if (m_running) {
         return say({883, "Sendet %1 (%2 von %3) alle %4 s, %5-mal seit %6, bis zum Anhalten."})
-            .arg(toText(m_code))
+            .arg(shownCode())
             .arg(m_number)
             .arg(m_messages)
             .arg(seconds())
@@ -67,7 +76,7 @@ QString RunLine::text() const {
     if (m_count == 0) return say({884, "Es wird nichts gesendet."});
     return say({885, "Gesendet: %1-mal von %2 bis %3, zuletzt %4."})
         .arg(m_count)
-        .arg(toText(m_since), toText(m_until), toText(m_code));
+        .arg(toText(m_since), toText(m_until), shownCode());
 }
 
 }  // namespace kdx

@@ -25,6 +25,8 @@ public:
 
 private:
     [[nodiscard]] QString text() const;
+    /// The code that is being sent; with a word when the coder does not take it.
+    [[nodiscard]] QString shownCode() const;
     [[nodiscard]] QString seconds() const;
 
     PageContext m_with;

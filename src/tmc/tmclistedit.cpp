@@ -110,7 +110,8 @@ void TMC_Listedit::Eintrag_Loeschen_Click() {
     const Chosen where = chosen();
     if (where.row < 0) return;
     const std::string line = where.entries->line(where.row);
-    if (!m_with.dialogs.confirm(windowTitle(), caption({878, "Diesen Eintrag löschen: %1?"}).arg(toText(line)))) return;
+    if (!m_with.dialogs.confirmLoss(windowTitle(), caption({878, "Diesen Eintrag löschen: %1?"}).arg(toText(line))))
+        return;
     showChange(where, !m_with.data.isReadOnly() && removeFromTmcList(m_with.data.file(where.fileName),
                                                                      static_cast<std::size_t>(where.row), line));
 }
@@ -205,6 +206,13 @@ bool TMC_Listedit::append(QListView* list, ShownList* entries, const QLabel* tex
     entries->load(m_with, fileName);
     list->scrollToBottom();
     return true;
+}
+
+void TMC_Listedit::reject() {
+    const bool nothing = Event_Input_TXT->text().isEmpty() && Event_Input_Nr->text().isEmpty() &&
+                         Loc_INput_TXT1->text().isEmpty() && Loc_Input_Nr->text().isEmpty();
+    if (nothing || m_with.dialogs.confirmLoss(windowTitle(), caption({1093, "Die Eingaben verwerfen?"})))
+        QDialog::reject();
 }
 
 void TMC_Listedit::ask(QLabel* label) {

@@ -21,6 +21,8 @@ public:
 
     /// Captions every control in the current language.
     void label();
+    /// The escape key and the window's own button: asks before a text or code that was not added is lost.
+    void reject() override;
 
     /// Fills `List1` from the event file. @throws std::runtime_error when it cannot be read; the list is then empty.
     void Event_Laden();
@@ -51,7 +53,7 @@ private:
     void Loc_Hinzu_Click() { take(Loc_INput_TXT1, Loc_Input_Nr, &TMC_Listedit::Location_Anhaengen); }
     void Eintrag_Aendern_Click();
     void Eintrag_Loeschen_Click();
-    void Zuruek_Knopf_Click() { close(); }
+    void Zuruek_Knopf_Click() { QDialog::reject(); }
 
     /// The list with the chosen entry, and what it is made of; no row where none is chosen.
     struct Chosen {

@@ -62,6 +62,7 @@ void TmcTransmission::createSending() {
     lblCycleTime = heading("lblCycleTime", {200}, txtCycleTime);
     TMC_Senden_Taste = clicked<QPushButton>("TMC_Senden_Taste", {53}, this, &TmcTransmission::TMC_Senden_Taste_Click);
     Stop_Timer = clicked<QPushButton>("Stop_Timer", {584, "stop"}, this, &TmcTransmission::Stop_Timer_Click);
+    Stop_Timer->setProperty(kWorksWhileSending, true);
     TMC_Sende_Timer = timer("TMC_Sende_Timer", 0, &TmcTransmission::TMC_Sende_Timer_Timer);
     TMC_Lauf = named<RunLine>("TMC_Lauf", m_with, this);
 }
@@ -94,7 +95,7 @@ void TmcTransmission::keepMessages() {
     std::vector<std::string> entries;
     entries.reserve(static_cast<std::size_t>(TMC_List->count()));
     for (int row = 0; row < TMC_List->count(); ++row) entries.push_back(toBytes(TMC_List->item(row)->text()));
-    const bool kept = storeMessages(m_with.data.file(kMessageFile), entries);
+    const bool kept = !m_with.data.isReadOnly() && storeMessages(m_with.data.file(kMessageFile), entries);
     if (kept || std::exchange(m_lossTold, true)) return;
     m_with.dialogs.message(Dialogs::Icon::Exclamation, caption({585, "Meldungen"}),
                            caption({624, "%1 kann nicht gespeichert werden."}).arg(QLatin1String(kMessageFile)));

@@ -24,6 +24,8 @@ public:
                                const QString& stop = {}, Icon icon = Icon::Critical) = 0;
     /// Asks with Yes and No; true for Yes.
     virtual bool confirm(const QString& title, const QString& text) = 0;
+    /// The same where Yes loses something: No is the answer that a hurried Return gives.
+    virtual bool confirmLoss(const QString& title, const QString& text) { return confirm(title, text); }
     /// Asks for a text; an empty answer is given for Cancel too.
     virtual QString input(const QString& prompt, const QString& title, const QString& preset) = 0;
     /// Asks for a file to write to, of a kind like "Text (*.txt)"; an empty answer is given for Cancel too. Nobody is
@@ -31,8 +33,10 @@ public:
     virtual QString fileToSave(const QString& /*title*/, const QString& /*preset*/, const QString& /*kind*/) {
         return {};
     }
-    /// Asks for a file to read; else the same.
-    virtual QString fileToOpen(const QString& /*title*/, const QString& /*kind*/) { return {}; }
+    /// Asks for a file to read; else the same. @param folder where to look first; "" where the last one was.
+    virtual QString fileToOpen(const QString& /*title*/, const QString& /*kind*/, const QString& /*folder*/ = {}) {
+        return {};
+    }
     /// Whether somebody is there to answer: not when the program is ending.
     [[nodiscard]] virtual bool canAsk() const { return true; }
 };

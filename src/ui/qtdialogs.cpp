@@ -3,10 +3,13 @@
 #include <QApplication>
 #include <QFileDialog>
 #include <QFileInfo>
+#include <QGridLayout>
 #include <QInputDialog>
 #include <QMainWindow>
 #include <QMessageBox>
+#include <QPointer>
 #include <QPushButton>
+#include <QSpacerItem>
 #include <QWindow>
 
 #include <utility>
@@ -38,15 +41,32 @@ void leaveTitleEmpty(QMessageBox& box) {
     box.windowHandle()->setTitle(QStringLiteral(" "));
 }
 
-/// The window that asks: an editor, which is modal; else the one that is used. While a box that just closed still
-/// counts as active there is none, so the main window it is then.
-QWidget* asker() {
-    if (QWidget* const editor = QApplication::activeModalWidget()) return editor;
-    if (QWidget* const active = QApplication::activeWindow(); active != nullptr && active->isVisible()) return active;
+QWidget* mainWindow() {
     for (QWidget* window : QApplication::topLevelWidgets()) {
         if (window->isVisible() && qobject_cast<QMainWindow*>(window) != nullptr) return window;
     }
     return nullptr;
+}
+
+/// The window that asks: an editor, which is modal; else the one that is used. While a box that just closed still
+/// counts as active there is none: then it is the one that asked before, a view that goes on asking.
+QWidget* asker() {
+    static QPointer<QWidget> before;
+    if (QWidget* const editor = QApplication::activeModalWidget()) return editor;
+    if (QWidget* const active = QApplication::activeWindow(); active != nullptr && active->isVisible()) {
+        before = active;
+    } else if (before == nullptr || !before->isVisible()) {
+        before = mainWindow();
+    }
+    return before;
+}
+
+/// Wide enough for the title and a sentence a line.
+void widen(QMessageBox& box) {
+    auto* grid = qobject_cast<QGridLayout*>(box.layout());
+    if (grid == nullptr) return;
+    const int width = 56 * box.fontMetrics().averageCharWidth();
+    grid->addItem(new QSpacerItem(width, 0), grid->rowCount(), 0, 1, grid->columnCount());
 }
 
 void nameParts(QFileDialog& box, const Captions& captions) {
@@ -69,6 +89,7 @@ void QtDialogs::message(Icon icon, const QString& title, const QString& text, co
     QMessageBox box(boxIcon(icon), title, text, QMessageBox::NoButton, asker());
     box.setInformativeText(details);
     box.addButton(toText(m_captions.own(317, "OK")), QMessageBox::AcceptRole);
+    widen(box);
     box.exec();
 }
 
@@ -98,15 +119,26 @@ bool QtDialogs::messageOrStop(const QString& title, const QString& text, const Q
     box.setEscapeButton(ok);
     const QPushButton* stop = box.addButton(
         stopText.isEmpty() ? toText(m_captions.own(323, "&Rest abbrechen")) : stopText, QMessageBox::DestructiveRole);
+    widen(box);
     box.exec();
     return m_ending() || isClicked(box, stop);
 }
 
 bool QtDialogs::confirm(const QString& title, const QString& text) {
+    return isConfirmed(title, text, true);
+}
+
+bool QtDialogs::confirmLoss(const QString& title, const QString& text) {
+    return isConfirmed(title, text, false);
+}
+
+bool QtDialogs::isConfirmed(const QString& title, const QString& text, bool yesByReturn) {
     if (m_ending()) return false;
     QMessageBox box(QMessageBox::Question, title, text, QMessageBox::NoButton, asker());
-    const QPushButton* yes = box.addButton(toText(m_captions.own(315, "&Ja")), QMessageBox::YesRole);
-    box.setEscapeButton(box.addButton(toText(m_captions.own(316, "&Nein")), QMessageBox::NoRole));
+    QPushButton* yes = box.addButton(toText(m_captions.own(315, "&Ja")), QMessageBox::YesRole);
+    QPushButton* no = box.addButton(toText(m_captions.own(316, "&Nein")), QMessageBox::NoRole);
+    box.setEscapeButton(no);
+    box.setDefaultButton(yesByReturn ? yes : no);
     box.exec();
     return isClicked(box, yes);
 }
@@ -135,14 +167,14 @@ QString QtDialogs::fileToSave(const QString& title, const QString& preset, const
     while (box.exec() == QDialog::Accepted) {
         QString file = box.selectedFiles().value(0);
         const QString question = toText(m_captions.own(898, "%1 überschreiben?")).arg(QFileInfo(file).fileName());
-        if (!QFileInfo::exists(file) || confirm(title, question)) return file;
+        if (!QFileInfo::exists(file) || confirmLoss(title, question)) return file;
     }
     return {};
 }
 
-QString QtDialogs::fileToOpen(const QString& title, const QString& kind) {
+QString QtDialogs::fileToOpen(const QString& title, const QString& kind, const QString& folder) {
     if (m_ending()) return {};
-    QFileDialog box(asker(), title, {}, kind);
+    QFileDialog box(asker(), title, folder, kind);
     box.setFileMode(QFileDialog::ExistingFile);
     nameParts(box, m_captions);
     box.setLabelText(QFileDialog::Accept, toText(m_captions.own(317, "OK")));

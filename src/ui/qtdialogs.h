@@ -21,12 +21,15 @@ public:
     bool messageOrStop(const QString& title, const QString& text, const QString& details = {}, const QString& stop = {},
                        Icon icon = Icon::Critical) override;
     bool confirm(const QString& title, const QString& text) override;
+    bool confirmLoss(const QString& title, const QString& text) override;
     QString input(const QString& prompt, const QString& title, const QString& preset) override;
     QString fileToSave(const QString& title, const QString& preset, const QString& kind) override;
-    QString fileToOpen(const QString& title, const QString& kind) override;
+    QString fileToOpen(const QString& title, const QString& kind, const QString& folder = {}) override;
     [[nodiscard]] bool canAsk() const override { return !m_ending(); }
 
 private:
+    [[nodiscard]] bool isConfirmed(const QString& title, const QString& text, bool yesByReturn);
+
     const Captions& m_captions;
     std::function<bool()> m_ending;
 };

@@ -20,8 +20,11 @@ void SentValue::wentOut(const std::string& value) {
 }
 
 Judgement SentValue::judge(const std::string& value, const QString& entry) const {
-    if (m_inForce != value) return {ValueState::Unsent, captionText(m_with.captions, {857, "Noch nicht gesendet."})};
     const QString why = whyRefused(m_with, m_key, entry);
+    if (m_inForce != value) {
+        const QString unsent = captionText(m_with.captions, {857, "Noch nicht gesendet."});
+        return {ValueState::Unsent, why.isEmpty() ? unsent : unsent + QLatin1Char('\n') + why};
+    }
     return {why.isEmpty() ? ValueState::InForce : ValueState::Refused, why};
 }
 

@@ -94,7 +94,17 @@ void StatusRow::label(const Captions& captions) {
 void StatusRow::show(StatusSlot slot, const QString& text, const Judgement& judgement) {
     at(slot)->setText(text);
     at(slot)->setToolTip(text);
+    m_shown[slot] = judgement;
     showState(*at(slot), judgement.state, judgement.tip);
+}
+
+void StatusRow::doubt(const QString& tip) {
+    for (const auto& [slot, judgement] : m_shown) showState(*at(slot), ValueState::Unsent, tip);
+}
+
+void StatusRow::trust() {
+    for (const auto& [slot, judgement] : m_shown) showState(*at(slot), judgement.state, judgement.tip);
+    setAnnouncing(m_announcing);
 }
 
 void StatusRow::show(StatusSlot slot, std::string_view bytes, const Judgement& judgement) {
@@ -106,6 +116,7 @@ QString StatusRow::text(StatusSlot slot) const {
 }
 
 void StatusRow::setAnnouncing(bool announcing) {
+    m_announcing = announcing;
     QPalette palette = at(StatusSlot::Ta)->palette();
     const QPalette window = QWidget::palette();
     // Light green of the standard sixteen colours, with black text whatever the theme.

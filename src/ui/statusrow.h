@@ -4,6 +4,7 @@
 #include <QWidget>
 
 #include <array>
+#include <map>
 #include <string_view>
 
 #include "ui/valuestate.h"
@@ -47,6 +48,10 @@ public:
     /// Shows a value; one that is not said to be otherwise is in force.
     void show(StatusSlot slot, const QString& text, const Judgement& judgement = {});
     void show(StatusSlot slot, std::string_view bytes, const Judgement& judgement = {});
+    /// Something else sends: until a value is shown again it may not be the one on air. The tip says why.
+    void doubt(const QString& tip);
+    /// What was doubted is in force again.
+    void trust();
     /// What the indicator reads: other handlers decide by it.
     [[nodiscard]] QString text(StatusSlot slot) const;
     /// Light green while an announcement runs, else the look of a button face.
@@ -59,6 +64,8 @@ private:
 
     QLabel* Gen1_Label = nullptr;
     std::array<QLabel*, kSlots> Status{};
+    std::map<StatusSlot, Judgement> m_shown;  // as the values were shown last
+    bool m_announcing = false;
 };
 
 }  // namespace kdx

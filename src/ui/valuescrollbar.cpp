@@ -2,6 +2,7 @@
 
 #include <QApplication>
 #include <QFocusEvent>
+#include <QKeyEvent>
 #include <QSignalBlocker>
 #include <QWheelEvent>
 
@@ -39,6 +40,12 @@ int ValueScrollBar::onStep(int position) const {
 void ValueScrollBar::wheelEvent(QWheelEvent* event) {
     if (m_clicked) return QScrollBar::wheelEvent(event);
     event->ignore();
+}
+
+void ValueScrollBar::keyPressEvent(QKeyEvent* event) {
+    if (event->modifiers() != Qt::NoModifier || (event->key() != Qt::Key_Up && event->key() != Qt::Key_Down))
+        return QScrollBar::keyPressEvent(event);
+    triggerAction(event->key() == Qt::Key_Up ? SliderSingleStepAdd : SliderSingleStepSub);
 }
 
 void ValueScrollBar::focusInEvent(QFocusEvent* event) {

@@ -23,6 +23,14 @@ fs::path pathOf(const QString& file) {
     return QFileInfo(file).filesystemAbsoluteFilePath();
 }
 
+bool isDataSet(const fs::path& file) {
+    constexpr std::uintmax_t kMost = 10'000'000;  // bytes; a data set has some thousand
+    std::error_code error;
+    if (const auto size = fs::file_size(file, error); error || size > kMost) return false;
+    const auto bytes = readFile(file);
+    return bytes && !storedDataSet(ProfileText(*bytes)).empty();
+}
+
 QString shownFile(const fs::path& file) {
     return QString::fromStdString(file.filename().string());
 }
@@ -43,8 +51,8 @@ void DataSets::open() {
         std::error_code error;
         if (fs::equivalent(file, m_with.data.file(dataSetFile(std::to_string(set))), error)) return choose(set);
     }
-    const auto text = m_with.data.profile(file.string());
-    if (!text || storedDataSet(*text).empty()) {
+    // Looked at before it is read as settings are: a file that is none is no problem to be told from then on.
+    if (!isDataSet(file)) {
         m_with.dialogs.message(Dialogs::Icon::Exclamation, title(),
                                caption({905, "In %1 ist kein Datensatz."}).arg(shownFile(file)));
         return;
@@ -67,7 +75,7 @@ void DataSets::saveAs(int number) {
     const bool taken = stored && !storedDataSet(*stored).empty();
     const QString what = setText(number) + QStringLiteral(" (%1)").arg(about(number));
     const QString question = caption({898, "%1 überschreiben?"}).arg(what);
-    if (!taken || m_with.dialogs.confirm(title(), question)) keep(m_with.data.file(name));
+    if (!taken || m_with.dialogs.confirmLoss(title(), question)) keep(m_with.data.file(name));
 }
 
 void DataSets::saveToFile() {
@@ -82,7 +90,7 @@ void DataSets::keep(const fs::path& file) {
     const auto text = textAtWork();
     const DataSetContent content =
         dataSetAtWork(text ? *text : ProfileText(), m_session.station, m_with.state.corrections.edgeBlanks);
-    if (!mayWrite(file) || !writeDataSet(content, file)) tellNotSaved(file);
+    if (!m_with.data.mayWrite(file) || !writeDataSet(content, file)) tellNotSaved(file);
 }
 
 void DataSets::rename() {
@@ -93,10 +101,10 @@ void DataSets::rename() {
 
 void DataSets::restore() {
     const QString question = caption({901, "%1 durch den ausgelieferten ersetzen?"}).arg(whatIsAtWork());
-    if (!canBeRestored() || !m_with.dialogs.confirm(title(), question)) return;
+    if (!canBeRestored() || !m_with.dialogs.confirmLoss(title(), question)) return;
     const auto shipped = readFile(shippedFile());
     const fs::path file = m_with.data.file(fileAtWork());
-    if (!shipped || !mayWrite(file) || !writeDataSet(storedDataSet(ProfileText(*shipped)), file))
+    if (!shipped || !m_with.data.mayWrite(file) || !writeDataSet(storedDataSet(ProfileText(*shipped)), file))
         return tellNotSaved(file);
     load(whatIsAtWork());
 }
@@ -125,12 +133,6 @@ bool DataSets::canBeRestored() const {
     std::error_code error;
     return !file.empty() && fs::is_regular_file(file, error) &&
            !fs::equivalent(file, m_with.data.file(fileAtWork()), error);
-}
-
-/// A folder that is only read stays so; what the user saves elsewhere is his own.
-bool DataSets::mayWrite(const fs::path& file) const {
-    std::error_code error;
-    return !m_with.data.isReadOnly() || !fs::equivalent(file.parent_path(), m_with.data.path(), error);
 }
 
 std::string DataSets::fileAtWork() const {

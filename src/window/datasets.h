@@ -53,7 +53,6 @@ signals:
 private:
     void load(const QString& what);
     void keep(const std::filesystem::path& file);
-    [[nodiscard]] bool mayWrite(const std::filesystem::path& file) const;
     [[nodiscard]] std::string fileAtWork() const;
     [[nodiscard]] std::filesystem::path shippedFile() const;
     [[nodiscard]] std::shared_ptr<const ProfileText> textAtWork() const;

@@ -101,10 +101,11 @@ void MainMenu::Mnu_Info_Ueber_Click() {
     const QString between = QStringLiteral("; ");
     const QString link = hasTried ? m_linkDescription.section(between, 0, 0) : m_linkDescription;
     const QString tried = hasTried ? m_linkDescription.section(between, 1) : QString();
-    const QStringList about{QStringLiteral("KDX-RDS %1").arg(QCoreApplication::applicationVersion()),
-                            line({916, "Lizenz"}, QStringLiteral("MIT")), line({917, "Verbindung"}, link),
-                            line({918, "Bibliotheken"},
-                                 QStringLiteral("Qt %1, libtirpc, CLI11, liquid-dsp").arg(QLatin1String(qVersion())))};
+    const QStringList about{
+        QStringLiteral("KDX-RDS %1").arg(QCoreApplication::applicationVersion()),
+        line({916, "Lizenz"}, QStringLiteral("MIT")), line({917, "Verbindung"}, link),
+        line({918, "Bibliotheken"}, QStringLiteral("Qt %1, libtirpc, CLI11, yaml-cpp, liquid-dsp, FFTW, libsndfile")
+                                        .arg(QLatin1String(qVersion())))};
     m_with.dialogs.about(QStringLiteral("\nRDS/Stereo Remote Software for KDX-X4\n\n"
                                         "Supported IEEE-Interface: National Instruments\n\n"
                                         "VISA I/O standard\n\n"),

@@ -17,12 +17,13 @@ namespace kdx {
 
 namespace {
 
-/// The language file's absence is told in both languages: no other text can be looked up.
-QString missingLanguageFile(const Surroundings& with) {
+/// What keeps the captions away is told in both languages: no other text can be looked up.
+QString missingLanguage(const Surroundings& with) {
     const std::filesystem::path file = with.data.file(kLanguageFile);
+    const QString shown = QString::fromStdString(shownPath(file));
     std::error_code error;
-    if (std::filesystem::exists(file, error)) return {};
-    return QStringLiteral("Nicht gefunden / not found: ") + QString::fromStdString(shownPath(file));
+    if (!std::filesystem::exists(file, error)) return QStringLiteral("Nicht gefunden / not found: ") + shown;
+    return with.data.profile(kLanguageFile) ? QString() : QStringLiteral("Nicht lesbar / cannot be read: ") + shown;
 }
 
 }  // namespace
@@ -34,10 +35,10 @@ QStringList notes(const Surroundings& with, const QWidget& window, const QString
         notes += what.isEmpty() ? text : text.arg(what);
     };
     if (!with.dataProblem.isEmpty()) notes += with.dataProblem;
-    if (const QString missing = missingLanguageFile(with); with.captions.isEmpty() && !missing.isEmpty()) {
+    if (const QString missing = missingLanguage(with); with.captions.isEmpty() && !missing.isEmpty()) {
         notes += missing;
     } else if (with.captions.isEmpty()) {
-        // Unreadable, garbage, or without this language: the captions are empty all the same.
+        // Garbage, or without this language.
         note({322, "Nicht gefunden: %1"},
              QStringLiteral("%1 [%2]").arg(QLatin1String(kLanguageFile), toText(with.state.language)));
     } else if (!startNotice.isEmpty()) {

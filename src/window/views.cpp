@@ -8,12 +8,15 @@
 #include "lab/scenarioview.h"
 #include "onair/onairview.h"
 #include "station/session.h"
+#include "ui/statusrow.h"
 #include "window/logview.h"
 #include "window/trafficlog.h"
 
 namespace kdx {
 
 namespace {
+
+const Caption kScenarioSends{1094, "Ein Ablauf sendet: Auf Sendung kann anderes sein."};
 
 void bringToFront(QWidget& view) {
     view.show();
@@ -68,7 +71,13 @@ void Views::openCompare() {
 }
 
 void Views::openScenario() {
-    if (m_scenarioView == nullptr) m_scenarioView = std::make_unique<ScenarioView>(m_session, m_with, m_window);
+    if (m_scenarioView == nullptr) {
+        m_scenarioView = std::make_unique<ScenarioView>(m_session, m_with, m_window);
+        QObject::connect(m_scenarioView.get(), &ScenarioView::runningChanged, m_window, [this](bool running) {
+            if (running) m_with.status.doubt(captionText(m_with.captions, kScenarioSends));
+            if (!running && m_scenarioView->leftNothing()) m_with.status.trust();
+        });
+    }
     bringToFront(*m_scenarioView);
 }
 

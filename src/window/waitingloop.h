@@ -33,6 +33,7 @@ public:
     void giveUp();
     /// Whether the wait that was the last was given up.
     [[nodiscard]] bool wasGivenUp() const { return m_givenUp; }
+    [[nodiscard]] bool isWaiting() const { return m_waiting; }
 
     void waitUntil(const std::function<bool()>& over) override;
     void wake() override;

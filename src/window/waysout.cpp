@@ -39,7 +39,8 @@ WaysOut::WaysOut(const Surroundings& surroundings, const ProgressLine& lowerEdge
     };
     connect(&m_waiting, &WaitingLoop::closeConfirmed, this, close, Qt::QueuedConnection);
     Automatics& automatics = m_s.tickers.automatics();
-    connect(lowerEdge.panic(), &QPushButton::clicked, this, [&automatics] { automatics.panic(); });
+    lowerEdge.panic()->setProperty(kWorksWhileSending, true);
+    connect(lowerEdge.panic(), &QPushButton::clicked, this, &WaysOut::panic);
     automatics.onChange([this] { m_lowerEdge.panic()->setVisible(m_s.tickers.automatics().anyRuns()); });
     instrument.onFailure(
         [this](const std::string& text, bool sequenceRuns) { return tellFailure(text, sequenceRuns); });
@@ -52,6 +53,13 @@ WaysOut::~WaysOut() {
     m_s.session.instrument.onRun(nullptr);
     m_s.session.instrument.onFailure(nullptr);
     m_s.tickers.automatics().onChange(nullptr);
+}
+
+/// While a slow instrument is waited for, its call ends first: nothing can be sent within it.
+void WaysOut::panic() {
+    if (!m_waiting.isWaiting()) return m_s.tickers.automatics().panic();
+    m_waiting.giveUp();
+    QMetaObject::invokeMethod(this, &WaysOut::panic, Qt::QueuedConnection);
 }
 
 void WaysOut::label() {
@@ -101,9 +109,9 @@ bool WaysOut::mayClose() {
 bool WaysOut::askToClose(const Caption& question) const {
     const QStringList running = m_s.tickers.automatics().names();
     const QString text = caption(question);
-    return m_s.dialogs.confirm(QStringLiteral("KDX-RDS"), text.contains(QStringLiteral("%1"))
-                                                              ? text.arg(running.join(QStringLiteral(", ")))
-                                                              : text);
+    return m_s.dialogs.confirmLoss(QStringLiteral("KDX-RDS"), text.contains(QStringLiteral("%1"))
+                                                                  ? text.arg(running.join(QStringLiteral(", ")))
+                                                                  : text);
 }
 
 QString WaysOut::hint(VisaStatus status) const {

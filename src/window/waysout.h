@@ -40,6 +40,7 @@ signals:
 private:
     bool tellFailure(const std::string& text, bool sequenceRuns);
     void runBegins(bool begins);
+    void panic();
     [[nodiscard]] bool askToClose(const Caption& question) const;
     [[nodiscard]] QString caption(const Caption& caption) const { return captionText(m_s.captions, caption); }
     [[nodiscard]] QString hint(VisaStatus status) const;

@@ -159,6 +159,10 @@ TEST(PastedFrequencies, TakesAWholeListOfAllowedOnes) {
     EXPECT_EQ(pastedFrequencies("90.1,"), List{});
     EXPECT_EQ(pastedFrequencies("90.1,x"), List{});
     EXPECT_LE(pastedFrequencies("90.1").size(), 1U);
+    EXPECT_EQ(pastedFrequencies("90.1; 94.3;103.5 105.1"), (List{"90.1", "94.3", "103.5", "105.1"}));
+    EXPECT_EQ(pastedFrequencies("90.1\n94.3\r\n"), (List{"90.1", "94.3"})) << "a column of a table";
+    EXPECT_EQ(pastedFrequencies("90 88"), (List{"90", "88"}));
+    EXPECT_EQ(pastedFrequencies("90.1 94.3 200.1"), List{});
 }
 
 TEST(SortFrequencies, GoesByTheNumberAndKeepsEqualOnesInOrder) {

@@ -112,6 +112,23 @@ TEST_F(EditorTest, ClosingStoresNothing) {
     EXPECT_FALSE(editor->isVisible());
 }
 
+TEST_F(EditorTest, EscapeAsksBeforeChangesAreLost) {
+    open();
+    editor->reject();
+    EXPECT_FALSE(editor->isVisible()) << "nothing would be lost";
+    open();
+    type("Text2", "107.1");
+    click("Command1");
+    dialogs.confirmations = {false, true};
+    editor->close();
+    EXPECT_TRUE(editor->isVisible());
+    EXPECT_EQ(rows().size(), 3U);
+    editor->reject();
+    EXPECT_FALSE(editor->isVisible());
+    EXPECT_EQ(dialogs.shown.back().text, QStringLiteral("Die Änderungen verwerfen?"));
+    EXPECT_EQ(profile(kSet1, "RDS", "AF_LISTE1"), "87.6,90.1,94.3");
+}
+
 TEST_F(EditorTest, AListWithoutAfsIsStoredAsItsTunedFrequencyAlone) {
     setList("AF_LISTE1", "87.6,90.1");
     dialogs.confirmations = {true};

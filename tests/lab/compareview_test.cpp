@@ -78,6 +78,16 @@ TEST_F(CompareViewTest, MarksWhatIsTypedInTheWindowAndNotSent) {
     EXPECT_EQ(cells("PS"), "GETIPPT|MESSTURM|MESSTURM|!");
 }
 
+TEST_F(CompareViewTest, ShowsWhatTheCoderRefusesAsItWasTyped) {
+    openView();
+    type("PS_T", "TEST\"AB");
+    click("Vergleich_Lesen");
+    EXPECT_EQ(cells("PS"), "TEST\"AB  (Der Coder nimmt diesen Wert nicht an.)|MESSTURM|MESSTURM|!");
+    taken();
+    click("Vergleich_Senden");
+    EXPECT_EQ(taken(), Lines{});
+}
+
 TEST_F(CompareViewTest, MarksWhatAnotherProgramChangedInTheFile) {
     openView();
     setDataSet1("RDS", "PS", "ANDERS");

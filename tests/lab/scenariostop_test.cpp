@@ -105,6 +105,59 @@ TEST_F(ScenarioStopTest, ALostLinkEndsTheRunWithOneBox) {
     EXPECT_EQ(result(2), "\u2717 -1073807194");
 }
 
+TEST_F(ScenarioStopTest, ThatItBringsBackIsToldAndStopGivesThatUp) {
+    openView();
+    load("restore: true\nsteps: [send: {PS: EINS}, wait: 1 h]");
+    click("Ablauf_Start");
+    pass(10s);
+    cable.cut = true;
+    dialogs.expectedMessages = 1;
+    click("Ablauf_Stop");
+    pass(1s);
+    ASSERT_TRUE(view->isRunning());
+    EXPECT_EQ(text("Ablauf_Stand"), "was vorher war, wird wiederhergestellt");
+    click("Ablauf_Stop");
+    EXPECT_FALSE(view->isRunning());
+    EXPECT_TRUE(text("Ablauf_Stand").starts_with("abgebrochen; nicht wie zuvor: PS")) << text("Ablauf_Stand");
+}
+
+TEST_F(ScenarioStopTest, EscapeDoesNotCloseTheViewOfARun) {
+    openView();
+    load("steps: [wait: 1 h]");
+    click("Ablauf_Start");
+    const auto escape = [this] {
+        QKeyEvent press(QEvent::KeyPress, Qt::Key_Escape, Qt::NoModifier);
+        QApplication::sendEvent(view, &press);
+    };
+    escape();
+    EXPECT_TRUE(view->isVisible());
+    click("Ablauf_Stop");
+    passAll();
+    escape();
+    EXPECT_FALSE(view->isVisible());
+}
+
+TEST_F(ScenarioStopTest, WhileItRunsTheStatusRowIsInDoubt) {
+    openView();
+    const auto shownState = [this] { return find("Status_3")->property("zustand").toString().toStdString(); };
+    EXPECT_EQ(shownState(), "");
+    load("restore: true\nsteps: [send: {PS: EINS}, wait: 1 h]");
+    click("Ablauf_Start");
+    pass(1s);
+    EXPECT_EQ(shownState(), "ungesendet");
+    EXPECT_EQ(find("Status_3")->toolTip().section(QLatin1Char('\n'), 0, 0),
+              QStringLiteral("Ein Ablauf sendet: Auf Sendung kann anderes sein."));
+    click("Ablauf_Stop");
+    passAll();
+    EXPECT_EQ(shownState(), "") << "all is as before";
+    load("steps: [send: {PS: EINS}]");
+    click("Ablauf_Start");
+    passAll();
+    EXPECT_EQ(shownState(), "ungesendet") << "what it sent stays on the air";
+    click("PS_Taste");
+    EXPECT_EQ(shownState(), "");
+}
+
 TEST_F(ScenarioStopTest, TheEndOfTheProgramDoesNotWaitForAnInstrumentThatHasGone) {
     openView();
     load("restore: true\nsteps: [send: {PS: EINS}, wait: 1 h]");

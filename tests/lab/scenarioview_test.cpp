@@ -149,6 +149,18 @@ TEST_F(ScenarioViewTest, TheReportStandsBesideTheScenario) {
     EXPECT_NE(bytes.find("2,note,fertig"), std::string::npos) << bytes;
 }
 
+TEST_F(ScenarioViewTest, NoReportGoesIntoAFolderThatIsOnlyRead) {
+    openView();
+    std::ofstream(folder.data() / "inside.yaml") << "report: report.csv\nsteps: [send: {PS: EINS}]";
+    dialogs.files.push_back(QString::fromStdString((folder.data() / "inside.yaml").string()));
+    click("Ablauf_Oeffnen");
+    data.setReadOnly();
+    dialogs.expectedMessages = 1;
+    click("Ablauf_Start");
+    EXPECT_FALSE(view->isRunning());
+    EXPECT_FALSE(std::filesystem::exists(folder.data() / "report.csv"));
+}
+
 TEST_F(ScenarioViewTest, AFileThatIsNoReportIsNotOverwritten) {
     openView();
     folder.write("../brief.csv", "lieber Leser");

@@ -76,7 +76,9 @@ public:
         return file;
     }
 
-    QString fileToOpen(const QString& title, const QString& kind) override { return fileToSave(title, {}, kind); }
+    QString fileToOpen(const QString& title, const QString& kind, const QString& /*folder*/ = {}) override {
+        return fileToSave(title, {}, kind);
+    }
     [[nodiscard]] bool canAsk() const override { return !ending; }
 
     ~ScriptedDialogs() override {

@@ -185,6 +185,16 @@ TEST_F(TmcListeditTest, TheExitButtonClosesTheWindow) {
     EXPECT_FALSE(editor->isVisible());
 }
 
+TEST_F(TmcListeditTest, EscapeAsksBeforeWhatWasTypedIsLost) {
+    enter("Event_Input_TXT", "Stau");
+    dialogs.confirmations = {false, true};
+    editor->close();
+    EXPECT_TRUE(editor->isVisible());
+    EXPECT_EQ(text("Event_Input_TXT"), "Stau");
+    editor->reject();
+    EXPECT_FALSE(editor->isVisible());
+}
+
 TEST_F(TmcListeditTest, AMissingFileIsToldAndLeavesItsListEmpty) {
     auto& application = dynamic_cast<Application&>(*QApplication::instance());
     Lines told;

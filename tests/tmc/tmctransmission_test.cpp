@@ -60,38 +60,6 @@ TEST_F(TmcTransmissionTest, AnEntryWithLongTextsStillEndsInItsCode) {
     EXPECT_EQ(messagesSent(1), Lines{message("0810013039")});
 }
 
-TEST_F(TmcTransmissionTest, TheMessagesAreKeptOverARestart) {
-    addMessages(3);
-    list().setCurrentRow(1);
-    click("TMC_Gr8_Remove");
-    const Lines before = rowsOf(list());
-    page = std::make_unique<TmcPage>(context, nullptr);
-    page->label();
-    page->load();
-    EXPECT_EQ(rowsOf(list()), before);
-    EXPECT_EQ(before.size(), 2U);
-    page->load();  // another data set
-    EXPECT_EQ(rowsOf(list()), before);
-    EXPECT_EQ(folder.read("TMC_Liste.txt"), before[0] + "\r\n" + before[1] + "\r\n");
-}
-
-TEST_F(TmcTransmissionTest, WhatIsNoMessageInTheKeptListIsPassedOver) {
-    addMessages(1);
-    const Lines before = rowsOf(list());
-    folder.write("TMC_Liste.txt", "\r\nnonsense\r\n" + before[0] + "\n" + std::string(5000, 'x'));
-    page = std::make_unique<TmcPage>(context, nullptr);
-    page->load();
-    EXPECT_EQ(rowsOf(list()), before);
-}
-
-TEST_F(TmcTransmissionTest, AListThatCannotBeKeptIsToldOnce) {
-    std::filesystem::create_directory(folder.data() / "TMC_Liste.txt");
-    dialogs.expectedMessages = 1;
-    addMessages(2);
-    EXPECT_EQ(list().count(), 2);
-    EXPECT_EQ(dialogs.shown.at(0).text, QStringLiteral("TMC_Liste.txt kann nicht gespeichert werden."));
-}
-
 TEST_F(TmcTransmissionTest, ALineTellsWhatIsBeingSent) {
     EXPECT_EQ(text("TMC_Lauf"), "Es wird nichts gesendet.");
     addMessages(3);
@@ -111,6 +79,15 @@ TEST_F(TmcTransmissionTest, ALineTellsWhatIsBeingSent) {
               "Sends " + code(2) + " (3 of 3) every 2.5 s, 2 times since " + since + ", until stopped.");
     click("Stop_Timer");
     EXPECT_EQ(text("TMC_Lauf"), "Sent: 2 times from " + since + " to " + timeText(clock) + ", last " + code(2) + ".");
+}
+
+TEST_F(TmcTransmissionTest, TheLineSaysThatTheCoderRefusesAMessage) {
+    click("TMC_Gr8_apply");  // no field is chosen: the code lacks bits
+    const std::string code = list().item(0)->text().right(10).toStdString();
+    click("optMultiMessage");
+    click("TMC_Senden_Taste");
+    messagesSent(1);
+    EXPECT_NE(text("TMC_Lauf").find(code + " (vom Coder abgelehnt) (1 von 1)"), std::string::npos) << text("TMC_Lauf");
 }
 
 TEST_F(TmcTransmissionTest, TheLineSaysWhenNothingWillEverBeSent) {

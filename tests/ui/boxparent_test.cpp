@@ -59,6 +59,19 @@ TEST_F(BoxParentTest, ABoxOfAnEditorBelongsToTheEditor) {
     EXPECT_EQ(parentOf([&] { dialogs.confirm(QString(), QString()); }), &editor) << "the second one, too";
 }
 
+TEST_F(BoxParentTest, TheSecondBoxOfAViewBelongsToTheView) {
+    window.show();
+    QDialog view(&window);
+    view.show();
+    QApplication::setActiveWindow(&view);
+    ASSERT_EQ(QApplication::activeWindow(), &view);
+    EXPECT_EQ(parentOf([&] { dialogs.confirm(QString(), QString()); }), &view);
+    QApplication::setActiveWindow(nullptr);
+    EXPECT_EQ(parentOf([&] { dialogs.confirm(QString(), QString()); }), &view) << "just after the first was closed";
+    view.hide();
+    EXPECT_EQ(parentOf([&] { dialogs.confirm(QString(), QString()); }), &window) << "the view is gone";
+}
+
 TEST_F(BoxParentTest, ABoxBeforeTheWindowIsShownBelongsToNone) {
     EXPECT_EQ(parentOf([&] { dialogs.confirm(QString(), QString()); }), nullptr);
 }

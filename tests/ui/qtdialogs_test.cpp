@@ -97,6 +97,30 @@ TEST_F(QtDialogsTest, AQuestionIsAnsweredByYesAndNo) {
     EXPECT_FALSE(answer([](QMessageBox& box) { box.reject(); }));
 }
 
+TEST_F(QtDialogsTest, ReturnLosesNothing) {
+    const auto isDefault = [](const QMessageBox& box, const char* caption) {
+        return button(box, caption)->isDefault();
+    };
+    meet<QMessageBox>([&](QMessageBox& box) {
+        EXPECT_TRUE(isDefault(box, "&No"));
+        button(box, "&Yes")->click();
+    });
+    EXPECT_TRUE(dialogs.confirmLoss(QStringLiteral("Data set"), QStringLiteral("Overwrite?")));
+    meet<QMessageBox>([&](QMessageBox& box) {
+        EXPECT_TRUE(isDefault(box, "&Yes"));
+        box.reject();
+    });
+    EXPECT_FALSE(dialogs.confirm(QStringLiteral("Data set"), QStringLiteral("Send?")));
+}
+
+TEST_F(QtDialogsTest, ATitleIsNotCutOff) {
+    meet<QMessageBox>([](QMessageBox& box) {
+        EXPECT_GE(box.sizeHint().width(), 50 * box.fontMetrics().averageCharWidth());
+        box.reject();
+    });
+    dialogs.message(Dialogs::Icon::Critical, QStringLiteral("Interface Error"), QStringLiteral("short"));
+}
+
 TEST_F(QtDialogsTest, AnInputGivesWhatWasTypedAndNothingWhenCancelled) {
     const auto answer = [this](const std::function<void(QInputDialog&)>& user) {
         meet<QInputDialog>(user);

@@ -253,6 +253,32 @@ TEST_F(DataSetsTest, AFileWithoutADataSetIsRefused) {
     EXPECT_EQ(text("PS_T"), "MESSTURM");
 }
 
+TEST_F(DataSetsTest, AFileOpenedInVainIsNoLastingProblem) {
+    folder.write("../utf16.INI", std::string("\xFF\xFE[\0R\0", 6));
+    std::ofstream(folder.path() / "huge.INI") << "[RDS]\r\nPS=HUGE\r\n";
+    std::filesystem::resize_file(folder.path() / "huge.INI", 50'000'000);
+    start();
+    dialogs.files = {file("utf16.INI"), file("huge.INI")};
+    dialogs.expectedMessages = 2;
+    for (int i = 0; i < 2; ++i) action("Mnu_Datensatz_Oeffnen")->trigger();
+    EXPECT_EQ(dialogs.shown.back().text.toStdString(), "In huge.INI ist kein Datensatz.");
+    EXPECT_EQ(text("QuietLine"), "");
+}
+
+TEST_F(DataSetsTest, AFolderThatIsOnlyReadIsNotWrittenThroughALinkEither) {
+    start();
+    data.setReadOnly();
+    const std::string before = folder.read("Datenset2.INI");
+    std::filesystem::create_symlink(folder.data() / "Datenset2.INI", folder.path() / "link.INI");
+    std::filesystem::create_directory(folder.data() / "below");
+    dialogs.files = {file("link.INI"), file("Daten/below/new.INI"), file("own.INI")};
+    dialogs.expectedMessages = 2;
+    for (int i = 0; i < 3; ++i) action("Mnu_Datensatz_Sichern_unter")->trigger();
+    EXPECT_EQ(folder.read("Datenset2.INI"), before);
+    EXPECT_FALSE(std::filesystem::exists(folder.data() / "below" / "new.INI"));
+    EXPECT_TRUE(std::filesystem::exists(folder.path() / "own.INI")) << "elsewhere it is the user's own";
+}
+
 TEST_F(DataSetsTest, WhatTheWindowHoldsCanBeSavedToAnyFile) {
     start();
     type("RT_Text1", "Getippt");

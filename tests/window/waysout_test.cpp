@@ -98,6 +98,28 @@ TEST_F(WaysOutTest, PanicEndsAnAnnouncementOnTheAir) {
     EXPECT_FALSE(tick("TA_Timer"));
 }
 
+TEST_F(WaysOutTest, PanicAndStopReachATimerThatWaitsForASlowInstrument) {
+    using namespace std::chrono_literals;
+    startAndOpen();
+    for (const char* way : {"Panik_Taste", "Stop_Timer"}) {
+        cycleMessages();
+        sent();
+        hangAnd([&] {
+            QTimer::singleShot(250ms, window.get(), [&] {  // by then it is waited for
+                mouse(way);
+                if (way == std::string("Stop_Timer")) slow->goOn();
+            });
+        });
+        tick("TMC_Sende_Timer");
+        QCoreApplication::processEvents();
+        slow->goOn();
+        EXPECT_FALSE(tick("TMC_Sende_Timer")) << way;
+        EXPECT_FALSE(find("Panik_Taste")->isVisible()) << way;
+        EXPECT_EQ(sent().size(), way == std::string("Panik_Taste") ? 1U : 2U) << "panic ends the tick, too";
+        click("TMC_Gr8_Remove");
+    }
+}
+
 TEST_F(WaysOutTest, PanicEndsAnAnnouncementByHandAndOneOfTheOtherNetwork) {
     startAndOpen();
     if (!checked("Check1")) click("Check1");
