@@ -16,6 +16,10 @@ void Automatics::stopAll() {
 }
 
 void Automatics::panic() {
+    // What need not be ended on the air goes first: the end of an announcement stops the dynamic PS without its switch.
+    for (const Automatic* one : running()) {
+        if (!one->m_panic) one->m_stop();
+    }
     for (const Automatic* one : std::vector(m_all)) {
         if (one->m_panic) one->m_panic();
     }

@@ -70,17 +70,6 @@ TEST_F(DataSetsTest, ASetThatWasChosenIsShownAndSentAlsoWhereSet1IsReadOtherwise
         EXPECT_NE(std::find(lines.begin(), lines.end(), line), lines.end()) << line;
 }
 
-TEST_F(DataSetsTest, LoadSet3AndSendIt) {
-    start();
-    openSession();
-    visa.written.clear();
-    dialogs.confirmations = {true};
-    choose(3);
-    EXPECT_EQ(dialogs.shown.back().text.toStdString(), "Datensatz 3 jetzt an das Gerät senden?");
-    const Lines lines = sent();
-    EXPECT_NE(std::find(lines.begin(), lines.end(), R"(:STEREO:DIRECT "PS=KLANGHOF")"), lines.end());
-}
-
 TEST_F(DataSetsTest, ASetThatIsNotToBeSentIsOnlyShown) {
     start();
     openSession();

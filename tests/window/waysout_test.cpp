@@ -85,6 +85,15 @@ TEST_F(WaysOutTest, PanicSendsNothingWhenNoTrafficIsAnnounced) {
     EXPECT_TRUE(enabled("TMC_Gr8_apply"));
 }
 
+TEST_F(WaysOutTest, PanicSwitchesTheDynamicPsOffAlsoBesideAutomaticAnnouncements) {
+    startAndOpen();
+    announceAutomatically();
+    click("Taste_PS_Auto");
+    click("Panik_Taste");
+    EXPECT_FALSE(checked("Taste_PS_Auto"));
+    EXPECT_FALSE(tick("PS_Timer"));
+}
+
 TEST_F(WaysOutTest, PanicEndsAnAnnouncementOnTheAir) {
     startAndOpen();
     announceAutomatically();
