@@ -12,6 +12,7 @@
 #include "app/options.h"
 #include "app/platform.h"
 #include "base/clock.h"
+#include "link/patientclock.h"
 #include "link/workervisa.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
@@ -107,8 +108,8 @@ int main(int argc, char** argv) {
         std::fputs(kdx::helpText().c_str(), stdout);
         return EXIT_SUCCESS;
     }
-    kdx::SystemClock clock;
-    kdx::ChosenVisa link = kdx::chooseVisa(options, clock);
+    kdx::SystemClock linkClock;
+    kdx::ChosenVisa link = kdx::chooseVisa(options, linkClock);
     if (options.version) {
         print("KDX-RDS " KDX_VERSION "\n" + link.description);
         return EXIT_SUCCESS;
@@ -150,6 +151,7 @@ int main(int argc, char** argv) {
     if (!options.tourFolder && !kdx::goesOnBesideAnother(claim, data, captions, dialogs)) return EXIT_SUCCESS;
     const auto end = [&application] { application.end(); };
     kdx::WorkerVisa worker(std::move(link.visa));
+    kdx::PatientClock clock(worker);
     kdx::Session session(worker, state, data, captions, clock, end);
     const EndsWithProgram letGo(session, worker);
     kdx::TickerGroup tickers;

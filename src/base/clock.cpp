@@ -66,6 +66,7 @@ void WaitMs(Clock& clock, const std::int16_t& milliseconds) {
         auto left = std::max(ceil<nanoseconds>(duration<double>(static_cast<double>(target) - now)), 1000ns);
         if (ends) left = std::min<nanoseconds>(left, latest - steadyNow);
         clock.sleep(left);
+        if (clock.wasGivenUp()) return;
     }
 }
 

@@ -25,6 +25,8 @@ public:
     [[nodiscard]] virtual std::chrono::steady_clock::time_point steadyNow() const = 0;
     /// Sleeps for the given time; takes no processor time and handles no events.
     virtual void sleep(std::chrono::nanoseconds duration) = 0;
+    /// Whether the last sleep ended early, because whoever is there will not wait any longer.
+    [[nodiscard]] virtual bool wasGivenUp() const { return false; }
 
     /// The user's choice whether a wait over midnight ends like any other; it does not unless chosen.
     void correctMidnight(bool corrected) { m_midnightCorrected = corrected; }
@@ -51,7 +53,8 @@ public:
 /// Waits until the clock's seconds since midnight, held in single precision, have reached start + milliseconds / 1000.
 /// The rounding is the one the instrument's timing was tried out with. A target past midnight is never reached, since
 /// the seconds start at 0 again: the wait then does not end, on purpose, unless the clock corrects midnight. Every
-/// other wait ends at the latest 100 ms after its length, even when the PC clock is set back meanwhile.
+/// other wait ends at the latest 100 ms after its length, even when the PC clock is set back meanwhile. One that is
+/// given up ends at once.
 /// @param milliseconds length of the wait; 0 returns at once.
 void WaitMs(Clock& clock, const std::int16_t& milliseconds);
 

@@ -304,6 +304,7 @@ void ParamSender::sendCommand(const std::string& key, const std::string& command
     m_instrument.WriteLog(key, "", command);
     // Gives the coder time to take one command before the next; without a session nothing is sent to it.
     if (m_state.InstrumentOnline) WaitMs(m_clock, kCommandPauseMs);
+    if (m_instrument.isSequenceStopped()) return;  // in the pause
     if (m_composed) m_composed(command);
     m_instrument.Send2Gen(command);
 }

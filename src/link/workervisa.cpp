@@ -211,4 +211,23 @@ std::vector<std::string> WorkerVisa::findResources() {
     return m_queue->perform(job) ? *found : std::vector<std::string>();
 }
 
+bool WorkerVisa::pause(std::chrono::nanoseconds duration) {
+    struct Rest {
+        std::mutex mutex;
+        std::condition_variable changed;
+        bool over = false;
+    };
+    const auto rest = std::make_shared<Rest>();
+    const auto job = std::make_shared<Job>(Job{[rest, duration](Visa&) {
+        std::unique_lock lock(rest->mutex);
+        rest->changed.wait_for(lock, duration, [&rest] { return rest->over; });
+        return visa::kSuccess;
+    }});
+    if (m_queue->perform(job)) return true;
+    const std::lock_guard guard(rest->mutex);
+    rest->over = true;
+    rest->changed.notify_all();
+    return false;
+}
+
 }  // namespace kdx

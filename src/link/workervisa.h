@@ -1,5 +1,6 @@
 #pragma once
 
+#include <chrono>
 #include <functional>
 #include <memory>
 #include <thread>
@@ -43,6 +44,9 @@ public:
     /// Is carried out also when it is not waited for.
     VisaStatus viClose(VisaHandle object) override;
     [[nodiscard]] std::vector<std::string> findResources() override;
+
+    /// Lets so much time pass as if it were a call. @returns false when the waiter has given it up before.
+    [[nodiscard]] bool pause(std::chrono::nanoseconds duration);
 
 private:
     struct Job;
