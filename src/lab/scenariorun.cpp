@@ -53,7 +53,8 @@ std::string ScenarioRun::begin(const scenario::Scenario& scenario, const std::fi
         if (std::string problem = m_report.begin(); !problem.empty()) return problem;
     }
     m_scenario = scenario;
-    m_stopped = m_failed = m_finishes = m_hurries = m_pressed = m_asks = m_asked = false;
+    m_stopped = m_failed = m_finishes = m_hurries = m_pressed = m_asks = m_asked = m_panics = false;
+    m_announcements.clear();
     m_identifier = m_with.state.eonIdentifier;
     m_restorer = std::make_unique<Restorer>(*this);
     scenario::Surroundings with{m_session, m_with.state, m_clock, *this, *this};
@@ -97,6 +98,7 @@ std::optional<std::chrono::nanoseconds> ScenarioRun::goOnToPause() {
         const QScopedValueRollback inside(m_inside, true);
         m_asked = false;
         pause = m_runner->goOn();
+        if (!pause && m_panics && !(m_hurries && m_failed)) endAnnouncements();
     } catch (...) {
         close();
         throw;
@@ -104,6 +106,22 @@ std::optional<std::chrono::nanoseconds> ScenarioRun::goOnToPause() {
     if (pause && pause->count() > 0) m_asks = m_asked;  // else the step is in the middle of its work
     if (!pause) close();
     return pause;
+}
+
+void ScenarioRun::happened(const scenario::Row& row) {
+    const bool announces =
+        row.command.find("\"TA=") != std::string::npos || row.command.find("\"EON-TA=") != std::string::npos;
+    if (announces && row.status == "0") {
+        std::string end = row.command;
+        const char state = std::exchange(end[end.size() - 2], '0');  // before the quotation mark
+        if (state == '1') m_announcements[end] = row.key;
+        if (state == '0') m_announcements.erase(end);
+    }
+    emit rowAdded(row);
+}
+
+void ScenarioRun::endAnnouncements() {
+    for (const auto& [end, key] : std::exchange(m_announcements, {})) m_session.params.sendCommand(key, end);
 }
 
 void ScenarioRun::close() {
@@ -128,6 +146,12 @@ void ScenarioRun::stop() {
     m_stopped = true;
     setHeld(false);
     if (m_hurries && m_failed) finish();
+}
+
+void ScenarioRun::panic() {
+    if (!isRunning()) return;
+    m_panics = true;
+    stop();
 }
 
 void ScenarioRun::finish() {

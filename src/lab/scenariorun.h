@@ -2,6 +2,7 @@
 
 #include <QObject>
 
+#include <map>
 #include <memory>
 
 #include "lab/heldclock.h"
@@ -28,6 +29,8 @@ public:
     /// Ends it after the running command; what stood before comes back first. The second time that is given up, too,
     /// where the instrument does not answer.
     void stop();
+    /// The same, and no announcement of traffic is left on the air, nor brought back.
+    void panic();
     /// Ends it at once, what stood before brought back: the session is to be closed.
     void finish();
     /// The person is done with what a step asks for.
@@ -60,6 +63,7 @@ private:
     /// @returns how long the pause lasts; nothing at the end.
     std::optional<std::chrono::nanoseconds> goOnToPause();
     void close();
+    void endAnnouncements();
     void sendDataSet(int number);
 
     bool goesOn() override { return m_finishes || (!m_stopped && !m_failed); }
@@ -67,7 +71,7 @@ private:
     Return pressed() override;
     void finishes() override;
     void begins(const std::string& step, const scenario::Action&) override { emit stepBegan(step); }
-    void happened(const scenario::Row& row) override { emit rowAdded(row); }
+    void happened(const scenario::Row& row) override;
     void waits(std::chrono::nanoseconds length) override { m_until = m_clock.steadyNow() + length; }
     void reportLost() override {}
     void ended(const scenario::Outcome&) override {}
@@ -81,9 +85,10 @@ private:
     std::unique_ptr<Restorer> m_restorer;
     std::unique_ptr<scenario::Runner> m_runner;
     std::chrono::steady_clock::time_point m_until;
-    std::string m_identifier;  // of the other network at work before
+    std::map<std::string, std::string> m_announcements;  // on the air: the command that ends each, and its key
+    std::string m_identifier;                            // of the other network at work before
     bool m_inside = false, m_stopped = false, m_failed = false, m_finishes = false, m_hurries = false;
-    bool m_pressed = false, m_asked = false, m_asks = false;
+    bool m_pressed = false, m_asked = false, m_asks = false, m_panics = false;
 };
 
 }  // namespace kdx

@@ -47,7 +47,7 @@ ScenarioView::ScenarioView(Session& session, const PageContext& with, QWidget* p
           [this] {
               return caption({974, "Ablauf"});
           },
-          [this] { m_run->stop(); }),
+          [this] { m_run->stop(); }, [this] { m_run->panic(); }),
       m_steps("Ablauf_Liste", with.captions, this),
       m_sessionOpen(session.instrument.isOpen()) {
     setObjectName(QStringLiteral("ScenarioView"));

@@ -166,5 +166,63 @@ TEST_F(ScenarioStopTest, TheOtherNetworkOfTheWindowIsTheOldOneAfterwards) {
     EXPECT_EQ(state.eonIdentifier, before);
 }
 
+TEST_F(ScenarioStopTest, PanicEndsTheRunAndBringsBackWhatStoodBefore) {
+    openView();
+    load("restore: true\nsteps: [send: {PS: EINS}, wait: 1 h, send: {PS: ZWEI}]");
+    click("Ablauf_Start");
+    pass(10s);
+    taken();
+    ASSERT_TRUE(find("Panik_Taste")->isVisible());
+    click("Panik_Taste");
+    pass(200ms);
+    EXPECT_FALSE(view->isRunning());
+    EXPECT_EQ(taken(), Lines{direct("PS=MESSTURM")});
+    EXPECT_EQ(text("Ablauf_Stand"), "abgebrochen");
+    EXPECT_FALSE(find("Panik_Taste")->isVisible());
+    pass(2h);
+    EXPECT_EQ(taken(), Lines{});
+}
+
+TEST_F(ScenarioStopTest, PanicEndsAnAnnouncementThatTheScenarioMadeOrBringsBack) {
+    openView();
+    for (const char* restore : {"false", "true"}) {
+        load(std::string("restore: ") + restore + "\nsteps: [send: {TP: 1, TA: 1}, wait: 1 h]");
+        click("Ablauf_Start");
+        pass(10s);
+        ASSERT_EQ(value("TA"), "1");
+        click("Panik_Taste");
+        pass(200ms);
+        EXPECT_FALSE(view->isRunning());
+        EXPECT_EQ(value("TA"), "0") << restore;
+    }
+    click("Check1");
+    click("TA_Check");
+    load("restore: true\nsteps: [send: {TA: 0}, wait: 1 h]");
+    click("Ablauf_Start");
+    pass(10s);
+    click("Panik_Taste");
+    pass(200ms);
+    EXPECT_EQ(value("TA"), "0") << "on before, but panic is the last word";
+}
+
+TEST_F(ScenarioStopTest, ClosingTheWindowAsksAndNoLetsTheRunGoOn) {
+    openView();
+    load("restore: true\nsteps: [send: {PS: EINS}, wait: 20 s, send: {PS: ZWEI}, wait: 1 h]");
+    click("Ablauf_Start");
+    pass(10s);
+    taken();
+    dialogs.confirmations = {false};
+    EXPECT_FALSE(window->close());
+    EXPECT_EQ(dialogs.shown.back().text, QStringLiteral("Es läuft noch: Ablauf. Anhalten und das Programm beenden?"));
+    pass(20s);
+    EXPECT_TRUE(view->isRunning());
+    EXPECT_EQ(taken(), Lines{direct("PS=ZWEI    ")});
+    dialogs.confirmations = {true};
+    EXPECT_TRUE(window->close());
+    EXPECT_FALSE(view->isRunning());
+    EXPECT_EQ(taken(), Lines{direct("PS=MESSTURM")}) << "before the session is closed";
+    EXPECT_FALSE(find("SSTab1")->isEnabled());
+}
+
 }  // namespace
 }  // namespace kdx::test
