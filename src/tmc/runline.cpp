@@ -1,7 +1,5 @@
 #include "tmc/runline.h"
 
-#include <QLocale>
-
 #include "base/clock.h"
 #include "coder/keyfacts.h"
 #include "settings/programstate.h"
@@ -46,9 +44,7 @@ void RunLine::end() {
 
 QString RunLine::seconds() const {
     constexpr double kPerSecond = 1000;
-    const bool german = m_with.state.language == "deutsch";
-    const QLocale locale(german ? QLocale::German : QLocale::English);
-    return locale.toString(m_interval / kPerSecond, 'g', QLocale::FloatingPointShortest);
+    return numberLocale(m_with.state.language).toString(m_interval / kPerSecond, 'g', QLocale::FloatingPointShortest);
 }
 
 QString RunLine::shownCode() const {

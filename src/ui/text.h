@@ -1,5 +1,6 @@
 #pragma once
 
+#include <QLocale>
 #include <QString>
 
 #include <string>
@@ -48,6 +49,11 @@ namespace kdx {
         if (text[at].isHighSurrogate() && at + 1 < text.size() && text[at + 1].isLowSurrogate()) ++at;
     }
     return bytes;
+}
+
+/// How a text in that language ("deutsch", "english", "english US") writes numbers.
+[[nodiscard]] inline QLocale numberLocale(std::string_view language) {
+    return QLocale(language == "deutsch" ? QLocale::German : QLocale::English);
 }
 
 }  // namespace kdx

@@ -1,7 +1,5 @@
 #include "window/failurehint.h"
 
-#include <QLocale>
-
 #include <algorithm>
 #include <array>
 
@@ -34,12 +32,13 @@ const Caption kOther{839, "Die Übertragung ist fehlgeschlagen: Verbindung prüf
 
 }  // namespace
 
-QString failureHint(VisaStatus status, std::chrono::milliseconds answerTime, const Captions& captions) {
+QString failureHint(VisaStatus status, std::chrono::milliseconds answerTime, const Captions& captions,
+                    const QLocale& locale) {
     const auto* const known =
         std::find_if(kHints.begin(), kHints.end(), [status](const Hint& hint) { return hint.status == status; });
     QString text = captionText(captions, known == kHints.end() ? kOther : known->caption);
     if (status != visa::kTimeout) return text;
-    return text.arg(QLocale().toString(static_cast<double>(answerTime.count()) / 1000, 'g', 3));
+    return text.arg(locale.toString(static_cast<double>(answerTime.count()) / 1000, 'g', 3));
 }
 
 }  // namespace kdx

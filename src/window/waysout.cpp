@@ -3,6 +3,7 @@
 #include <QMainWindow>
 #include <QPushButton>
 
+#include "settings/programstate.h"
 #include "station/session.h"
 #include "ui/dialogs.h"
 #include "ui/text.h"
@@ -115,7 +116,7 @@ bool WaysOut::askToClose(const Caption& question) const {
 }
 
 QString WaysOut::hint(VisaStatus status) const {
-    return failureHint(status, m_s.answerTime, m_s.captions);
+    return failureHint(status, m_s.answerTime, m_s.captions, numberLocale(m_s.state.language));
 }
 
 }  // namespace kdx

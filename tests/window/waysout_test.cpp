@@ -2,6 +2,9 @@
 
 #include <gmock/gmock.h>
 
+#include "ui/text.h"
+#include "window/failurehint.h"
+
 namespace kdx::test {
 namespace {
 
@@ -267,6 +270,14 @@ TEST_P(FailureMeaningTest, StandsUnderThePrescribedLineInBothLanguages) {
         EXPECT_EQ(dialogs.shown.back().preset.toStdString(), german ? GetParam().german : GetParam().english);
         EXPECT_FALSE(dialogs.shown.back().offersStop) << "a single command";
     }
+}
+
+TEST_F(WaysOutTest, ATimeIsWrittenAsTheLanguageDoes) {
+    const auto hint = [&](const char* language) {
+        return failureHint(visa::kTimeout, std::chrono::milliseconds(500), captions, numberLocale(language));
+    };
+    EXPECT_TRUE(hint("deutsch").contains(QStringLiteral(" 0,5 s")));
+    EXPECT_TRUE(hint("english").contains(QStringLiteral(" 0.5 s")));
 }
 
 INSTANTIATE_TEST_SUITE_P(
