@@ -3,6 +3,7 @@
 #include <QDir>
 #include <QFileInfo>
 
+#include "base/paths.h"
 #include "rds/settings.h"
 #include "settings/datafolder.h"
 #include "settings/profilefile.h"
@@ -24,7 +25,7 @@ fs::path pathOf(const QString& file) {
 }
 
 QString shownFile(const fs::path& file) {
-    return QString::fromStdString(file.filename().string());
+    return QString::fromStdString(utf8Of(file.filename()));
 }
 
 }  // namespace
@@ -43,13 +44,13 @@ void DataSets::open() {
         std::error_code error;
         if (fs::equivalent(file, m_with.data.file(dataSetFile(std::to_string(set))), error)) return choose(set);
     }
-    const auto text = m_with.data.profile(file.string());
+    const auto text = m_with.data.profile(utf8Of(file));
     if (!text || storedDataSet(*text).empty()) {
         m_with.dialogs.message(Dialogs::Icon::Exclamation, title(),
                                caption({905, "In %1 ist kein Datensatz."}).arg(shownFile(file)));
         return;
     }
-    m_with.state.openedFile = file.string();
+    m_with.state.openedFile = utf8Of(file);
     load(shownFile(file));
 }
 
@@ -107,7 +108,7 @@ int DataSets::number() const {
 
 QString DataSets::shown() const {
     if (number() > 0) return QString::number(number());
-    return shownFile(m_with.state.openedFile);
+    return shownFile(pathFromUtf8(m_with.state.openedFile));
 }
 
 QString DataSets::about(int number) const {
