@@ -2,7 +2,7 @@
 #include "harness.h"
 
 #include "simserver/portmapper.h"
-#include "vxi11/xdr.h"
+#include "simserver/tirpcxdr.h"
 
 int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     using kdx::fuzz::demand;

@@ -6,9 +6,9 @@
 #include "simserver/abortchannel.h"
 #include "simserver/corechannel.h"
 #include "simserver/pollloop.h"
+#include "simserver/tirpcxdr.h"
 #include "support/fakeclock.h"
 #include "vxi11/numbers.h"
-#include "vxi11/xdr.h"
 
 #include <vxi11.h>
 

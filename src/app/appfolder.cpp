@@ -2,13 +2,14 @@
 
 #include "app/options.h"
 #include "app/platform.h"
+#include "base/paths.h"
 #include "settings/dataplace.h"
 
 namespace kdx {
 
 std::filesystem::path appFolder(const Options& options, const char* program, std::string& problem) {
     DataPlaces places;
-    if (options.appFolder) places.asked = *options.appFolder;
+    if (options.appFolder) places.asked = pathFromUtf8(*options.appFolder);
     places.program = programFolder(program);
     places.user = userFolder();
     places.shipped = shippedFolder(places.program, KDX_SHIPPED_DATA);

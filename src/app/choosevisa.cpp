@@ -35,7 +35,7 @@ ChosenVisa chooseVisa(const Options& options, const Clock& clock) {
     VisaLibrary library = loadVisaLibrary(options.visaLibrary.value_or(std::string()), options.answerTime);
     if (library.visa) {
         chosen.visa = std::move(library.visa);
-        chosen.description = "VISA library " + shownPath(library.file);
+        chosen.description = "VISA library " + shownText(library.file);
         return chosen;
     }
     if (options.visaLibrary) {

@@ -12,6 +12,7 @@
 #include "app/options.h"
 #include "app/platform.h"
 #include "base/clock.h"
+#include "base/paths.h"
 #include "link/patientclock.h"
 #include "link/workervisa.h"
 #include "settings/captions.h"
@@ -86,7 +87,7 @@ bool isFolder(const std::filesystem::path& folder) {
 std::filesystem::path placeFile() {
     const QString folder = QStandardPaths::writableLocation(QStandardPaths::GenericConfigLocation);
     return folder.isEmpty() ? std::filesystem::path()
-                            : std::filesystem::path(folder.toStdString()) / "kdx-rds" / "window.ini";
+                            : kdx::pathFromUtf8(folder.toStdString()) / "kdx-rds" / "window.ini";
 }
 
 /// Tries a last time to save what could not be, while there is still somebody to tell.
@@ -101,7 +102,7 @@ void saveTheRest(kdx::DataFolder& data) {
 int main(int argc, char** argv) {
     const kdx::Options options = kdx::parseOptions({argv + 1, argv + argc});
     if (!options.error.empty()) {
-        std::fprintf(stderr, "kdx-rds: %s\nTry kdx-rds --help.\n", kdx::shownPath(options.error).c_str());
+        std::fprintf(stderr, "kdx-rds: %s\nTry kdx-rds --help.\n", kdx::shownText(options.error).c_str());
         return kUsageError;
     }
     if (options.help) {
@@ -118,9 +119,9 @@ int main(int argc, char** argv) {
         std::fprintf(stderr, "kdx-rds: %s\n", link.description.c_str());
         return EXIT_FAILURE;
     }
-    if (options.appFolder && !isFolder(*options.appFolder)) {
+    if (options.appFolder && !isFolder(kdx::pathFromUtf8(*options.appFolder))) {
         std::fprintf(stderr, "kdx-rds: --app-folder: there is no folder %s\n",
-                     kdx::shownPath(*options.appFolder).c_str());
+                     kdx::shownText(*options.appFolder).c_str());
         return kUsageError;
     }
     if (!kdx::hasDisplay()) {
@@ -163,7 +164,8 @@ int main(int argc, char** argv) {
     if (options.tourFolder) {
         int result = EXIT_FAILURE;
         application.guarded(window.objectName(), [&] {
-            result = kdx::makeTour(window, session.instrument, tourBoxes, *options.tourFolder, print);
+            result =
+                kdx::makeTour(window, session.instrument, tourBoxes, kdx::pathFromUtf8(*options.tourFolder), print);
         });
         saveTheRest(data);
         return result;

@@ -7,6 +7,7 @@
 #include <QLabel>
 #include <QPushButton>
 
+#include "base/paths.h"
 #include "base/split.h"
 #include "lab/scenariorun.h"
 #include "rds/settings.h"
@@ -149,7 +150,7 @@ void ScenarioView::Ablauf_Oeffnen_Click() {
 }
 
 void ScenarioView::open(const QString& file) {
-    const auto bytes = readFile(QFile::encodeName(file).toStdString());
+    const auto bytes = readFile(QFileInfo(file).filesystemFilePath());
     QStringList problems;
     scenario::Reading reading;
     if (!bytes) {
@@ -191,9 +192,9 @@ QStringList ScenarioView::problemsOf(const scenario::Scenario& scenario) const {
 
 void ScenarioView::Ablauf_Start_Click() {
     if (m_run->isRunning() || m_file.isEmpty()) return;
-    std::filesystem::path report = m_scenario.report;
+    std::filesystem::path report = pathFromUtf8(m_scenario.report);
     // A relative one stands beside the scenario: nobody knows what folder the window was started in.
-    if (!report.empty()) report = std::filesystem::path(QFile::encodeName(m_file).toStdString()).parent_path() / report;
+    if (!report.empty()) report = QFileInfo(m_file).filesystemFilePath().parent_path() / report;
     m_steps.clearResults();
     m_step.clear();
     m_outcome.reset();
@@ -208,7 +209,7 @@ void ScenarioView::Ablauf_Start_Click() {
     if (problem.empty()) return;
     m_with.dialogs.message(Dialogs::Icon::Critical, caption({313, "Fehler"}),
                            caption({994, "Der Bericht %1 %2"})
-                               .arg(QString::fromStdString(report.string()), QString::fromStdString(problem)));
+                               .arg(QString::fromStdString(utf8Of(report)), QString::fromStdString(problem)));
 }
 
 void ScenarioView::Ablauf_Pause_Click() {

@@ -1,22 +1,14 @@
 #include "link/discovery.h"
 
-#include "base/filedescriptor.h"
 #include "link/deadline.h"
 #include "link/rpcmessage.h"
-#include "vxi11.h"
+#include "link/socket.h"
 #include "vxi11/ipv4networks.h"
+#include "vxi11/messages.h"
 #include "vxi11/xdr.h"
-
-#include <arpa/inet.h>
-#include <netinet/in.h>
-#include <poll.h>
-#include <rpc/pmap_prot.h>
-#include <sys/socket.h>
 
 #include <algorithm>
 #include <array>
-#include <cstring>
-#include <memory>
 #include <random>
 #include <set>
 
@@ -28,8 +20,8 @@ using std::chrono::steady_clock;
 
 /// Where everybody in this machine's networks hears a question; and the machine itself, whose port mapper need not
 /// hear what is asked of everybody on the loopback interface.
-std::set<std::uint32_t> placesToAsk() {
-    std::set<std::uint32_t> places{INADDR_LOOPBACK};
+std::set<Ipv4Address> placesToAsk() {
+    std::set<Ipv4Address> places{kLoopbackAddress};
     for (const vxi11::Ipv4Network& network : vxi11::ipv4Networks()) {
         if (const auto broadcast = network.broadcast()) places.insert(*broadcast);
     }
@@ -37,66 +29,54 @@ std::set<std::uint32_t> placesToAsk() {
 }
 
 /// Whether the datagram answers our question with a port: whoever serves no instrument says 0.
-bool isInstrument(std::string message, std::uint32_t question) {
+bool isInstrument(std::string_view message, std::uint32_t question) {
     if (message.size() < 4 || xdrWord(message) != question) return false;
     std::uint32_t port = 0;
-    const RpcOutcome outcome = readRpcReply(message, [&](XDR* xdr) { return xdr_uint32_t(xdr, &port) != 0; });
+    const RpcOutcome outcome = readRpcReply(message, [&](std::string_view results) {
+        port = vxi11::portResult(results).value_or(0);
+        return true;
+    });
     return outcome == RpcOutcome::Done && port > 0 && port <= 0xFFFF;
 }
 
 /// Takes the answers that come until then.
-void gather(int socket, std::uint32_t question, Deadline deadline, const Discovery& how,
-            std::set<std::uint32_t>& found) {
+void gather(Socket& socket, std::uint32_t question, Deadline deadline, const Discovery& how,
+            std::set<Ipv4Address>& found) {
     constexpr std::size_t kMost = 1000;  // no network has so many: somebody makes answers up
     constexpr std::chrono::milliseconds kLookEvery{100};
-    std::array<char, 1024> datagram;
+    std::array<char, 1024> room;
     while (!how.stopped() && found.size() < kMost) {
         const auto left = std::chrono::ceil<std::chrono::milliseconds>(deadline - steady_clock::now());
         if (left.count() <= 0) return;
-        pollfd waiting{socket, POLLIN, 0};
-        if (poll(&waiting, 1, static_cast<int>(std::min(left, kLookEvery).count())) <= 0) continue;
-        sockaddr_in sender{};
-        socklen_t size = sizeof sender;
-        const ssize_t got =
-            recvfrom(socket, datagram.data(), datagram.size(), 0, reinterpret_cast<sockaddr*>(&sender), &size);
-        if (got < 0 || sender.sin_family != AF_INET) continue;
-        if (isInstrument({datagram.data(), static_cast<std::size_t>(got)}, question))
-            found.insert(ntohl(sender.sin_addr.s_addr));
+        if (!socket.waitFor(Socket::Ready::ToRead, std::min(left, kLookEvery))) continue;
+        const auto datagram = socket.receiveFrom(room);
+        if (datagram && isInstrument({room.data(), datagram->size}, question)) found.insert(datagram->sender);
     }
 }
 
-void ask(int socket, const std::string& call, const Discovery& how) {
-    for (const std::uint32_t place : placesToAsk()) {
-        sockaddr_in peer{};
-        peer.sin_family = AF_INET;
-        peer.sin_port = htons(how.portMapperPort);
-        peer.sin_addr.s_addr = htonl(place);
-        // A network that cannot be asked now is left out; the others may answer.
-        sendto(socket, call.data(), call.size(), 0, reinterpret_cast<const sockaddr*>(&peer), sizeof peer);
-    }
+void ask(Socket& socket, const std::string& call, const Discovery& how) {
+    // A network that cannot be asked now is left out; the others may answer.
+    for (const Ipv4Address place : placesToAsk()) socket.sendTo(place, how.portMapperPort, call);
 }
 
 }  // namespace
 
 std::vector<std::string> discoverLanInstruments(const Discovery& how) {
-    const FileDescriptor socket(::socket(AF_INET, SOCK_DGRAM | SOCK_NONBLOCK | SOCK_CLOEXEC, 0));
-    const int on = 1;
-    if (!socket.isOpen() || setsockopt(socket.number(), SOL_SOCKET, SO_BROADCAST, &on, sizeof on) != 0) return {};
+    Socket socket = Socket::forDatagrams();
+    if (!socket.isOpen()) return {};
     const std::uint32_t question = std::random_device()();
-    pmap wanted{DEVICE_CORE, DEVICE_CORE_VERSION, IPPROTO_TCP, 0};
-    const auto call = rpcCall({question, PMAPPROG, PMAPVERS, PMAPPROC_GETPORT}, 0,
-                              [&](XDR* xdr) { return xdr_pmap(xdr, &wanted) != 0; });
-    if (!call) return {};
-    std::set<std::uint32_t> found;
+    const std::string call =
+        rpcCall({question, vxi11::kPortMapper, vxi11::kPortMapperVersion, vxi11::kGetPort}, vxi11::getPortArguments());
+    std::set<Ipv4Address> found;
     const Deadline begin = steady_clock::now();
     // Twice: a datagram may get lost.
-    ask(socket.number(), *call, how);
-    gather(socket.number(), question, begin + how.wait / 3, how, found);
-    ask(socket.number(), *call, how);
-    gather(socket.number(), question, begin + how.wait, how, found);
+    ask(socket, call, how);
+    gather(socket, question, begin + how.wait / 3, how, found);
+    ask(socket, call, how);
+    gather(socket, question, begin + how.wait, how, found);
     std::vector<std::string> addresses;
     addresses.reserve(found.size());
-    for (const std::uint32_t address : found) addresses.push_back(vxi11::dotted(address));
+    for (const Ipv4Address address : found) addresses.push_back(vxi11::dotted(address));
     return addresses;
 }
 

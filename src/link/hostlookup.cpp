@@ -1,11 +1,7 @@
 #include "link/hostlookup.h"
 
-#include <netdb.h>
-#include <sys/socket.h>
-
 #include <algorithm>
 #include <condition_variable>
-#include <cstring>
 #include <memory>
 #include <mutex>
 #include <optional>
@@ -16,7 +12,7 @@ namespace kdx {
 
 namespace {
 
-using Addresses = std::vector<sockaddr_in>;
+using Addresses = std::vector<Ipv4Address>;
 
 /// What the helper thread finds out; it belongs to both, since the one who asks may be gone before the answer comes.
 struct Lookup {
@@ -25,32 +21,15 @@ struct Lookup {
     std::optional<Addresses> addresses;
 };
 
-Addresses lookUp(const std::string& host, int flags) {
-    addrinfo hints{};
-    hints.ai_family = AF_INET;  // VXI-11 knows no other
-    hints.ai_socktype = SOCK_STREAM;
-    hints.ai_flags = flags;
-    addrinfo* first = nullptr;
-    if (getaddrinfo(host.c_str(), nullptr, &hints, &first) != 0) return {};
-    const std::unique_ptr<addrinfo, decltype(&freeaddrinfo)> list(first, &freeaddrinfo);
-    Addresses addresses;
-    for (const addrinfo* entry = first; entry != nullptr; entry = entry->ai_next) {
-        sockaddr_in address{};
-        std::memcpy(&address, entry->ai_addr, sizeof address);
-        addresses.push_back(address);
-    }
-    return addresses;
-}
-
 }  // namespace
 
 Addresses resolveHost(const std::string& host, Deadline deadline, const std::atomic_bool& aborting) {
-    if (Addresses numeric = lookUp(host, AI_NUMERICHOST); !numeric.empty()) return numeric;
+    if (Addresses numeric = hostAddresses(host, true); !numeric.empty()) return numeric;
     // The system's call has no time-out of its own and cannot be stopped: silent name servers hold it for half a
     // minute. So a thread waits for it that nobody waits for.
     const auto lookup = std::make_shared<Lookup>();
     std::thread([lookup, host] {
-        Addresses found = lookUp(host, 0);
+        Addresses found = hostAddresses(host, false);
         const std::lock_guard guard(lookup->mutex);
         lookup->addresses = std::move(found);
         lookup->done.notify_one();

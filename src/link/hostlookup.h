@@ -1,8 +1,7 @@
 #pragma once
 
 #include "link/deadline.h"
-
-#include <netinet/in.h>
+#include "link/socket.h"
 
 #include <string>
 #include <vector>
@@ -11,7 +10,7 @@ namespace kdx {
 
 /// The IPv4 addresses of a host; empty when it is unknown, or when the system's name service has not said until the
 /// deadline, or until `aborting` is set by another thread.
-std::vector<sockaddr_in> resolveHost(const std::string& host, Deadline deadline,
+std::vector<Ipv4Address> resolveHost(const std::string& host, Deadline deadline,
                                      const std::atomic_bool& aborting = kNeverAborted);
 
 }  // namespace kdx

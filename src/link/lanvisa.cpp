@@ -4,12 +4,11 @@
 #include "link/lanresource.h"
 #include "link/rpcchannel.h"
 #include "link/visastatus.h"
-#include "vxi11.h"
+#include "vxi11/messages.h"
 #include "vxi11/numbers.h"
 
-#include <rpc/pmap_prot.h>
-
 #include <algorithm>
+#include <optional>
 #include <variant>
 
 namespace kdx {
@@ -37,7 +36,7 @@ VisaStatus statusOf(RpcOutcome outcome) {
     return visa::kInputOutput;
 }
 
-VisaStatus statusOfDeviceError(long error) {
+VisaStatus statusOfDeviceError(std::int32_t error) {
     switch (error) {
         case vxi11::kNoError:
             return visa::kSuccess;
@@ -57,26 +56,32 @@ VisaStatus statusOfDeviceError(long error) {
     }
 }
 
-VisaStatus combined(RpcOutcome outcome, long deviceError) {
+VisaStatus combined(RpcOutcome outcome, std::int32_t deviceError) {
     return outcome == RpcOutcome::Done ? statusOfDeviceError(deviceError) : statusOf(outcome);
 }
 
-u_long millisecondsUntil(Deadline deadline) {
+std::uint32_t millisecondsUntil(Deadline deadline) {
     const auto left = std::chrono::ceil<std::chrono::milliseconds>(deadline - steady_clock::now());
-    return left.count() > 0 ? static_cast<u_long>(left.count()) : 0;
+    return left.count() > 0 ? static_cast<std::uint32_t>(left.count()) : 0;
+}
+
+/// Whether there is one; it is taken then.
+template <class Result>
+bool taken(std::optional<Result> read, Result& result) {
+    if (read) result = *read;
+    return read.has_value();
 }
 
 /// Asks the host for the port of its VXI-11 core channel: version 2 of the port mapper over TCP, which all devices
 /// know.
-VisaStatus askForCorePort(const sockaddr_in& address, std::uint16_t portMapperPort, Deadline deadline,
+VisaStatus askForCorePort(Ipv4Address address, std::uint16_t portMapperPort, Deadline deadline,
                           const std::atomic_bool& aborting, std::uint16_t& corePort) {
-    RpcChannel portMapper(PMAPPROG, PMAPVERS, aborting);
+    RpcChannel portMapper(vxi11::kPortMapper, vxi11::kPortMapperVersion, aborting);
     if (!portMapper.connect(address, portMapperPort, deadline)) return visa::kResourceNotFound;
-    pmap wanted{DEVICE_CORE, DEVICE_CORE_VERSION, IPPROTO_TCP, 0};
     std::uint32_t port = 0;
     const RpcOutcome outcome = portMapper.call(
-        PMAPPROC_GETPORT, 0, [&](XDR* xdr) { return xdr_pmap(xdr, &wanted); },
-        [&](XDR* xdr) { return xdr_uint32_t(xdr, &port); }, deadline);
+        vxi11::kGetPort, vxi11::getPortArguments(),
+        [&](std::string_view results) { return taken(vxi11::portResult(results), port); }, deadline);
     if (outcome != RpcOutcome::Done) return statusOf(outcome);
     if (port == 0) return visa::kResourceNotFound;  // not registered
     if (port > 0xFFFF) return visa::kInputOutput;
@@ -92,11 +97,11 @@ struct LanVisa::Link {
 
     VisaHandle manager = 0;
     const std::atomic_bool& aborting;
-    RpcChannel channel{DEVICE_CORE, DEVICE_CORE_VERSION, aborting};
-    Device_Link id = 0;
+    RpcChannel channel{vxi11::kCore, vxi11::kCoreVersion, aborting};
+    std::int32_t id = 0;
     std::size_t maxReceive = kSmallestMaxReceive;  ///< the most bytes that the device takes in one call
 
-    VisaStatus connect(const sockaddr_in& address, const LanOptions& options, Deadline deadline) {
+    VisaStatus connect(Ipv4Address address, const LanOptions& options, Deadline deadline) {
         std::uint16_t port = options.corePort;
         if (port == 0) {
             const VisaStatus status = askForCorePort(address, options.portMapperPort, deadline, aborting, port);
@@ -105,16 +110,15 @@ struct LanVisa::Link {
         return channel.connect(address, port, deadline) ? visa::kSuccess : visa::kResourceNotFound;
     }
 
-    VisaStatus create(std::string device, bool locked, Deadline deadline) {
-        Create_LinkParms wanted{manager, locked, 0, device.data()};
-        Create_LinkResp made{};
+    VisaStatus create(const std::string& device, bool locked, Deadline deadline) {
+        vxi11::CreatedLink made;
         const RpcOutcome outcome = channel.call(
-            create_link, device.size(), [&](XDR* xdr) { return xdr_Create_LinkParms(xdr, &wanted); },
-            [&](XDR* xdr) { return xdr_Create_LinkResp(xdr, &made); }, deadline);
+            vxi11::kCreateLink, vxi11::argumentsOf(vxi11::CreateLink{manager, locked, 0, device}),
+            [&](std::string_view results) { return taken(vxi11::createdLink(results), made); }, deadline);
         const VisaStatus status = combined(outcome, made.error);
         if (status != visa::kSuccess) return status;
-        id = made.lid;
-        if (const auto most = static_cast<std::uint32_t>(made.maxRecvSize); most > 0) maxReceive = most;
+        id = made.link;
+        if (made.maxReceive > 0) maxReceive = made.maxReceive;
         return status;
     }
 };
@@ -153,7 +157,7 @@ VisaStatus LanVisa::viOpen(VisaHandle resourceManager, const std::string& resour
 
 VisaStatus LanVisa::open(const LanResource& wanted, bool locked, Deadline connectDeadline, Link& link) const {
     VisaStatus status = visa::kResourceNotFound;
-    for (const sockaddr_in& address : resolveHost(wanted.host, connectDeadline, m_aborting)) {
+    for (Ipv4Address address : resolveHost(wanted.host, connectDeadline, m_aborting)) {
         status = link.connect(address, m_options, connectDeadline);
         if (status != visa::kResourceNotFound) break;
     }
@@ -169,23 +173,22 @@ VisaStatus LanVisa::viWrite(VisaHandle session, std::span<const char> bytes, std
     const std::size_t most = std::min(link->maxReceive, kLargestTransfer);
     while (!bytes.empty()) {
         const std::span<const char> part = bytes.first(std::min(bytes.size(), most));
-        Device_WriteParms wanted{};
-        wanted.lid = link->id;
-        wanted.io_timeout = millisecondsUntil(deadline);
-        wanted.lock_timeout = wanted.io_timeout;
+        vxi11::DeviceWrite wanted;
+        wanted.link = link->id;
+        wanted.ioTimeoutMs = millisecondsUntil(deadline);
+        wanted.lockTimeoutMs = wanted.ioTimeoutMs;
         wanted.flags = vxi11::kFlagWaitLock | (part.size() == bytes.size() ? vxi11::kFlagEnd : 0);
-        wanted.data.data_len = static_cast<u_int>(part.size());
-        wanted.data.data_val = const_cast<char*>(part.data());  // only read from
-        Device_WriteResp done{};
+        wanted.data = {part.data(), part.size()};
+        vxi11::DeviceWritten done;
         const RpcOutcome outcome = link->channel.call(
-            device_write, part.size(), [&](XDR* xdr) { return xdr_Device_WriteParms(xdr, &wanted); },
-            [&](XDR* xdr) { return xdr_Device_WriteResp(xdr, &done); }, deadline + m_options.answerMargin);
+            vxi11::kDeviceWrite, vxi11::argumentsOf(wanted),
+            [&](std::string_view results) { return taken(vxi11::deviceWritten(results), done); },
+            deadline + m_options.answerMargin);
         const VisaStatus status = combined(outcome, done.error);
         if (status != visa::kSuccess) return unlessAborted(status);
-        const auto taken = static_cast<std::uint32_t>(done.size);
-        if (taken == 0 || taken > part.size()) return visa::kInputOutput;
-        written += static_cast<std::int32_t>(taken);
-        bytes = bytes.subspan(taken);
+        if (done.size == 0 || done.size > part.size()) return visa::kInputOutput;
+        written += static_cast<std::int32_t>(done.size);
+        bytes = bytes.subspan(done.size);
     }
     return visa::kSuccess;
 }
@@ -197,23 +200,25 @@ VisaStatus LanVisa::viRead(VisaHandle session, std::span<char> buffer, std::int3
     const Deadline deadline = steady_clock::now() + m_options.ioTimeout;
     while (!buffer.empty()) {
         const std::span<char> room = buffer.first(std::min(buffer.size(), kLargestTransfer));
-        Device_ReadParms wanted{};
-        wanted.lid = link->id;
-        wanted.requestSize = room.size();
-        wanted.io_timeout = millisecondsUntil(deadline);
-        wanted.lock_timeout = wanted.io_timeout;
+        vxi11::DeviceRead wanted;
+        wanted.link = link->id;
+        wanted.size = static_cast<std::uint32_t>(room.size());
+        wanted.ioTimeoutMs = millisecondsUntil(deadline);
+        wanted.lockTimeoutMs = wanted.ioTimeoutMs;
         wanted.flags = vxi11::kFlagWaitLock;
-        Device_ErrorCode error = 0;
-        long reason = 0;
-        u_int got = 0;
-        // Straight into the buffer, and checked against it: the length that the device states is not to be trusted.
-        const auto decode = [&](XDR* xdr) {
-            return xdr_Device_ErrorCode(xdr, &error) && xdr_long(xdr, &reason) && xdr_u_int(xdr, &got) &&
-                   got <= room.size() && xdr_opaque(xdr, room.data(), got);
+        std::int32_t error = 0, reason = 0;
+        std::size_t got = 0;
+        const auto copy = [&](std::string_view results) {
+            // Not more than was asked for: the length that the device states is not to be trusted.
+            const auto read = vxi11::deviceWasRead(results, room.size());
+            if (!read) return false;
+            error = read->error;
+            reason = read->reason;
+            got = read->data.copy(room.data(), room.size());
+            return true;
         };
-        const RpcOutcome outcome = link->channel.call(
-            device_read, 0, [&](XDR* xdr) { return xdr_Device_ReadParms(xdr, &wanted); }, decode,
-            deadline + m_options.answerMargin);
+        const RpcOutcome outcome =
+            link->channel.call(vxi11::kDeviceRead, vxi11::argumentsOf(wanted), copy, deadline + m_options.answerMargin);
         const VisaStatus status = combined(outcome, error);
         if (status != visa::kSuccess) return unlessAborted(status);
         count += static_cast<std::int32_t>(got);
@@ -256,10 +261,10 @@ LanVisa::Link* LanVisa::find(VisaHandle session) {
 
 /// Whatever the device says to it, the session is over.
 void LanVisa::destroyLink(Link& link) {
-    Device_Error ignored{};
     link.channel.call(
-        destroy_link, 0, [&](XDR* xdr) { return xdr_Device_Link(xdr, &link.id); },
-        [&](XDR* xdr) { return xdr_Device_Error(xdr, &ignored); }, steady_clock::now() + m_options.closeTimeout);
+        vxi11::kDestroyLink, vxi11::destroyLinkArguments(link.id),
+        [](std::string_view results) { return vxi11::errorResult(results).has_value(); },
+        steady_clock::now() + m_options.closeTimeout);
 }
 
 }  // namespace kdx

@@ -1,5 +1,6 @@
 #include "link/libraryvisa.h"
 
+#include "base/paths.h"
 #include "link/sharedlibrary.h"
 #include "link/visastatus.h"
 #include "settings/shownpath.h"
@@ -170,26 +171,18 @@ std::unique_ptr<Visa> load(const std::filesystem::path& path, AnswerTime answerT
     return std::make_unique<LibraryVisa>(std::move(library), operations, answerTime);
 }
 
-/// A file that is there is meant as such when the user names it, though the system would look for a bare name
-/// elsewhere.
-std::filesystem::path asFile(const std::string& name) {
-    std::error_code ignored;
-    const std::filesystem::path path(name);
-    return std::filesystem::exists(path, ignored) ? std::filesystem::absolute(path, ignored) : path;
-}
-
 }  // namespace
 
 VisaLibrary loadFirstVisaLibrary(std::span<const std::string> names, AnswerTime answerTime) {
     VisaLibrary result;
     for (const std::string& name : names) {
         std::string cause;
-        result.visa = load(name, answerTime, result.file, cause);
+        result.visa = load(pathFromUtf8(name), answerTime, result.file, cause);
         if (result.visa) break;
         // The system's own message may begin with the name.
         if (!cause.starts_with(name)) cause.insert(0, name + ": ");
         if (!result.reason.empty()) result.reason += '\n';
-        result.reason += shownPath(cause);  // the name in it may have any bytes
+        result.reason += shownText(cause);  // the name in it may have any bytes
     }
     return result;
 }
@@ -197,7 +190,7 @@ VisaLibrary loadFirstVisaLibrary(std::span<const std::string> names, AnswerTime 
 VisaLibrary loadVisaLibrary(const std::string& path, AnswerTime answerTime) {
     // The usual names stay bare: what lies in the folder that the program happens to be started in is not installed.
     if (path.empty()) return loadFirstVisaLibrary(usualVisaLibraryNames(), answerTime);
-    return loadFirstVisaLibrary(std::array{asFile(path).string()}, answerTime);
+    return loadFirstVisaLibrary(std::array{utf8Of(fileOrSystemName(path))}, answerTime);
 }
 
 }  // namespace kdx

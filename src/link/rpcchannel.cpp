@@ -2,66 +2,35 @@
 
 #include "vxi11/xdr.h"
 
-#include <arpa/inet.h>
-#include <netinet/in.h>
-#include <netinet/tcp.h>
-#include <poll.h>
-#include <sys/socket.h>
-
 #include <algorithm>
 #include <array>
-#include <cerrno>
 #include <utility>
 
 namespace kdx {
 
-namespace {
-
-bool wouldBlock() {
-    return errno == EAGAIN || errno == EWOULDBLOCK || errno == EINTR;
-}
-
-}  // namespace
-
 /// False at the deadline, at the latest.
-bool RpcChannel::waitFor(int descriptor, short event, Deadline deadline) const {
+bool RpcChannel::waitFor(const Socket& socket, Socket::Ready ready, Deadline deadline) const {
     while (!m_aborting) {
         const auto left = std::chrono::ceil<std::chrono::milliseconds>(deadline - std::chrono::steady_clock::now());
         if (left.count() <= 0) return false;  // also when a peer that never stops sending always has something
-        pollfd waiting{descriptor, event, 0};
-        const int ready = poll(&waiting, 1, static_cast<int>(std::min(left, kAbortLatency).count()));
-        if (ready > 0) return true;
-        if (ready < 0 && errno != EINTR) return false;
+        if (socket.waitFor(ready, std::min(left, kAbortLatency))) return true;
     }
     return false;
 }
 
-bool RpcChannel::connect(const sockaddr_in& address, std::uint16_t port, Deadline deadline) {
-    FileDescriptor fresh(::socket(AF_INET, SOCK_STREAM | SOCK_NONBLOCK | SOCK_CLOEXEC, IPPROTO_TCP));
-    if (!fresh.isOpen()) return false;
-    sockaddr_in peer = address;
-    peer.sin_port = htons(port);
-    if (::connect(fresh.number(), reinterpret_cast<const sockaddr*>(&peer), sizeof peer) != 0) {
-        if (errno != EINPROGRESS && errno != EINTR) return false;
-        if (!waitFor(fresh.number(), POLLOUT, deadline)) return false;
-        int failure = 0;
-        socklen_t size = sizeof failure;
-        if (getsockopt(fresh.number(), SOL_SOCKET, SO_ERROR, &failure, &size) != 0 || failure != 0) return false;
-    }
-    const int on = 1;  // a short question must not wait for the acknowledgement of the command before it
-    setsockopt(fresh.number(), IPPROTO_TCP, TCP_NODELAY, &on, sizeof on);
+bool RpcChannel::connect(Ipv4Address address, std::uint16_t port, Deadline deadline) {
+    Socket fresh = Socket::connecting(address, port);
+    if (!fresh.isOpen() || !waitFor(fresh, Socket::Ready::ToWrite, deadline) || !fresh.isConnected()) return false;
     m_socket = std::move(fresh);
     m_received = RecordReader(kLargestReply);
     return true;
 }
 
-RpcOutcome RpcChannel::call(std::uint32_t procedure, std::size_t variableBytes, const Coder& arguments,
-                            const Coder& results, Deadline deadline) {
+RpcOutcome RpcChannel::call(std::uint32_t procedure, std::string_view arguments, const RpcResults& results,
+                            Deadline deadline) {
     if (!m_socket.isOpen()) return RpcOutcome::Lost;
     ++m_lastCall;
-    const auto message = rpcCall({m_lastCall, m_program, m_version, procedure}, variableBytes, arguments);
-    if (!message) return RpcOutcome::Failed;
-    m_request = framed(*message);
+    m_request = framed(rpcCall({m_lastCall, m_program, m_version, procedure}, arguments));
     RpcOutcome outcome = send(deadline);
     if (outcome == RpcOutcome::Done) outcome = receiveReply(deadline);
     if (outcome == RpcOutcome::Done) outcome = readRpcReply(m_reply, results);
@@ -69,16 +38,19 @@ RpcOutcome RpcChannel::call(std::uint32_t procedure, std::size_t variableBytes, 
 }
 
 RpcOutcome RpcChannel::send(Deadline deadline) {
-    std::size_t sent = 0;
-    while (sent < m_request.size()) {
-        const ssize_t taken = ::send(m_socket.number(), m_request.data() + sent, m_request.size() - sent, MSG_NOSIGNAL);
-        if (taken > 0) {
-            sent += static_cast<std::size_t>(taken);
-        } else if (taken < 0 && !wouldBlock()) {
-            return close(RpcOutcome::Lost);
-        } else if (!waitFor(m_socket.number(), POLLOUT, deadline)) {
-            // The rest of a request begun could not be told from the next one.
-            return sent == 0 ? RpcOutcome::TimedOut : close(RpcOutcome::TimedOut);
+    std::string_view left = m_request;
+    while (!left.empty()) {
+        std::size_t sent = 0;
+        switch (m_socket.send(left, sent)) {
+            case Socket::Transfer::Some:
+                left.remove_prefix(sent);
+                break;
+            case Socket::Transfer::Lost:
+                return close(RpcOutcome::Lost);
+            case Socket::Transfer::Later:
+                if (waitFor(m_socket, Socket::Ready::ToWrite, deadline)) break;
+                // The rest of a request begun could not be told from the next one.
+                return left.size() == m_request.size() ? RpcOutcome::TimedOut : close(RpcOutcome::TimedOut);
         }
     }
     return RpcOutcome::Done;
@@ -97,13 +69,11 @@ RpcOutcome RpcChannel::receiveReply(Deadline deadline) {
             return RpcOutcome::Done;
         }
         if (m_received.broken()) return close(RpcOutcome::Failed);
-        if (!waitFor(m_socket.number(), POLLIN, deadline)) return RpcOutcome::TimedOut;
-        const ssize_t got = recv(m_socket.number(), piece.data(), piece.size(), 0);
-        if (got > 0) {
-            m_received.feed({piece.data(), static_cast<std::size_t>(got)});
-        } else if (got == 0 || !wouldBlock()) {
-            return close(RpcOutcome::Lost);
-        }
+        if (!waitFor(m_socket, Socket::Ready::ToRead, deadline)) return RpcOutcome::TimedOut;
+        std::size_t got = 0;
+        const Socket::Transfer transfer = m_socket.receive(piece, got);
+        if (transfer == Socket::Transfer::Lost) return close(RpcOutcome::Lost);
+        if (transfer == Socket::Transfer::Some) m_received.feed({piece.data(), got});
     }
 }
 

@@ -1,21 +1,18 @@
 #pragma once
 
-#include "base/filedescriptor.h"
 #include "link/deadline.h"
 #include "link/rpcmessage.h"
+#include "link/socket.h"
 #include "vxi11/rpcrecord.h"
 
 #include <cstdint>
 #include <string>
-
-struct sockaddr_in;
+#include <string_view>
 
 namespace kdx {
 
 /// Remote procedure calls (ONC RPC version 2) over one TCP connection: one program, one call at a time.
-/// The messages are put together with libtirpc's XDR; the connection is kept here, because a client of libtirpc starts
-/// its time-out anew with every piece that arrives, takes garbage for silence, and a connection that breaks while it
-/// writes ends the process with SIGPIPE. Here a call ends at its deadline, whatever the peer does.
+/// A call ends at its deadline, whatever the peer does.
 class RpcChannel {
 public:
     /// @param aborting set by another thread it ends a wait like a deadline that is reached; lent.
@@ -23,21 +20,17 @@ public:
         : m_program(program), m_version(version), m_aborting(aborting) {}
 
     /// Connects to the port of that address. False when nobody takes the connection until the deadline.
-    bool connect(const sockaddr_in& address, std::uint16_t port, Deadline deadline);
+    bool connect(Ipv4Address address, std::uint16_t port, Deadline deadline);
 
-    using Coder = RpcCoder;
-
-    /// Calls one procedure.
-    /// @param variableBytes how many bytes of texts and data are among the arguments
+    /// Calls one procedure. @param arguments in XDR
     /// After Lost, Failed, or a request that could not be sent whole, the connection is closed and every later call is
     /// Lost; after any other TimedOut it goes on, and the late answer is passed over.
-    RpcOutcome call(std::uint32_t procedure, std::size_t variableBytes, const Coder& arguments, const Coder& results,
-                    Deadline deadline);
+    RpcOutcome call(std::uint32_t procedure, std::string_view arguments, const RpcResults& results, Deadline deadline);
 
 private:
     static constexpr std::size_t kLargestReply = std::size_t{128} * 1024;  // twice the most that is ever asked for
 
-    [[nodiscard]] bool waitFor(int descriptor, short event, Deadline deadline) const;
+    [[nodiscard]] bool waitFor(const Socket& socket, Socket::Ready ready, Deadline deadline) const;
     RpcOutcome send(Deadline deadline);
     RpcOutcome receiveReply(Deadline deadline);
     RpcOutcome close(RpcOutcome because);
@@ -45,7 +38,7 @@ private:
     std::uint32_t m_program;
     std::uint32_t m_version;
     const std::atomic_bool& m_aborting;
-    FileDescriptor m_socket;
+    Socket m_socket;
     std::uint32_t m_lastCall = 0;  ///< number of the call under way; answers bear it
     std::string m_request;         ///< with its record mark
     RecordReader m_received{kLargestReply};

@@ -1,13 +1,9 @@
 #pragma once
 
-#include <rpc/types.h>
-#include <rpc/xdr.h>
-
-#include <cstddef>
 #include <cstdint>
 #include <functional>
-#include <optional>
 #include <string>
+#include <string_view>
 
 namespace kdx {
 
@@ -20,8 +16,8 @@ enum class RpcOutcome {
     Failed,       ///< the peer refused the call or answered something that is no answer
 };
 
-/// Writes (or reads) the fields of a message; false when they do not fit.
-using RpcCoder = std::function<bool(XDR*)>;
+/// Reads the results of a call; false when the bytes are none.
+using RpcResults = std::function<bool(std::string_view)>;
 
 /// What is called; its answer bears the same number.
 struct RpcHead {
@@ -31,12 +27,10 @@ struct RpcHead {
     std::uint32_t procedure = 0;
 };
 
-/// The message of a call (ONC RPC version 2) with neither credentials nor verifier; nothing when the arguments do not
-/// fit. @param variableBytes how many bytes of texts and data are among the arguments
-[[nodiscard]] std::optional<std::string> rpcCall(const RpcHead& head, std::size_t variableBytes,
-                                                 const RpcCoder& arguments);
+/// The message of a call (ONC RPC version 2) with neither credentials nor verifier. @param arguments in XDR
+[[nodiscard]] std::string rpcCall(const RpcHead& head, std::string_view arguments);
 
 /// Reads the message that answers a call; whose answer it is was looked at before. Done, Unavailable or Failed.
-[[nodiscard]] RpcOutcome readRpcReply(std::string& message, const RpcCoder& results);
+[[nodiscard]] RpcOutcome readRpcReply(std::string_view message, const RpcResults& results);
 
 }  // namespace kdx

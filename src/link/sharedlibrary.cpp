@@ -2,10 +2,14 @@
 
 #ifdef _WIN32
 #include <windows.h>
+
+#include "base/codepage.h"
 #else
 #include <dlfcn.h>
 #include <link.h>
 #endif
+
+#include "base/paths.h"
 
 #include <system_error>
 
@@ -18,10 +22,20 @@ std::vector<std::string> usualVisaLibraryNames() {
                               : std::vector<std::string>{"VISA32.DLL"};
 }
 
+std::filesystem::path fileOrSystemName(const std::string& name) {
+    const std::filesystem::path path = pathFromUtf8(name);
+    for (const std::string& usual : usualVisaLibraryNames()) {
+        if (equalNoCase(usual, name)) return path;
+    }
+    std::error_code ignored;
+    return std::filesystem::exists(path, ignored) ? std::filesystem::absolute(path, ignored) : path;
+}
+
 std::unique_ptr<SharedLibrary> SharedLibrary::load(const std::filesystem::path& file, std::string& reason) {
-    // What a file needs besides may lie beside it; a bare name is not looked for in the current folder.
-    const DWORD places =
-        LOAD_LIBRARY_SEARCH_DEFAULT_DIRS | (file.is_absolute() ? DWORD{LOAD_LIBRARY_SEARCH_DLL_LOAD_DIR} : DWORD{0});
+    // A bare name is the system's own: whoever can put a file beside this program, as into a folder of downloads, must
+    // not have it run. What a file needs besides may lie beside it.
+    const DWORD places = file.is_absolute() ? LOAD_LIBRARY_SEARCH_DEFAULT_DIRS | LOAD_LIBRARY_SEARCH_DLL_LOAD_DIR
+                                            : LOAD_LIBRARY_SEARCH_SYSTEM32;
     if (HMODULE handle = LoadLibraryExW(file.c_str(), nullptr, places)) {
         return std::unique_ptr<SharedLibrary>(new SharedLibrary(handle));
     }
@@ -38,15 +52,21 @@ void* SharedLibrary::address(const char* name) const {
 }
 
 std::string SharedLibrary::file() const {
-    wchar_t name[MAX_PATH] = {};
-    GetModuleFileNameW(static_cast<HMODULE>(m_handle), name, MAX_PATH);
-    return std::filesystem::path(name).string();
+    std::wstring name(32768, L'\0');  // the longest path there is
+    name.resize(GetModuleFileNameW(static_cast<HMODULE>(m_handle), name.data(), static_cast<DWORD>(name.size())));
+    return utf8Of(name);
 }
 
 #else
 
 std::vector<std::string> usualVisaLibraryNames() {
     return {"libvisa.so", "libvisa.so.0", "libktvisa32.so", "libiovisa.so"};
+}
+
+std::filesystem::path fileOrSystemName(const std::string& name) {
+    std::error_code ignored;
+    const std::filesystem::path path = pathFromUtf8(name);
+    return std::filesystem::exists(path, ignored) ? std::filesystem::absolute(path, ignored) : path;
 }
 
 std::unique_ptr<SharedLibrary> SharedLibrary::load(const std::filesystem::path& file, std::string& reason) {

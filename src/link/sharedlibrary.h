@@ -17,6 +17,10 @@ namespace kdx {
 /// The file names under which VISA libraries are installed on this system, in the order in which they are tried.
 [[nodiscard]] std::vector<std::string> usualVisaLibraryNames();
 
+/// A file that is there is meant as such when the user names it, though the system would look for a bare name
+/// elsewhere. On Windows the usual names stay bare: there the folder that the program is started in is nobody's choice.
+[[nodiscard]] std::filesystem::path fileOrSystemName(const std::string& name);
+
 /// A library loaded at run time; it stays loaded as long as this object lives.
 class SharedLibrary {
 public:

@@ -5,6 +5,7 @@
 #include <utility>
 
 #include "base/codepage.h"
+#include "base/paths.h"
 #include "settings/folderlock.h"
 #include "settings/profilefile.h"
 #include "settings/shownpath.h"
@@ -49,8 +50,8 @@ std::string dataSetFile(std::string_view number) {
 
 DataFolder::DataFolder(const fs::path& appFolder) : m_path(entryNamed(appFolder, "Daten")) {}
 
-fs::path DataFolder::file(const fs::path& name) const {
-    return entryNamed(m_path, name);
+fs::path DataFolder::file(std::string_view name) const {
+    return entryNamed(m_path, pathFromUtf8(name));
 }
 
 std::string DataFolder::ReadIni(std::string_view section, std::string_view key, std::string_view fileName) const {

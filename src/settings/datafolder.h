@@ -25,7 +25,8 @@ inline constexpr const char* kPictureOff = "Sch_Off.ico";
 [[nodiscard]] std::string dataSetFile(std::string_view number);
 
 /// The data folder ("Daten" in the program's folder): finds its files without regard to letter case on every system,
-/// and reads and writes settings in its profile files, also while other programs do. Texts are 8-bit Windows-1252.
+/// and reads and writes settings in its profile files, also while other programs do. Texts are 8-bit Windows-1252,
+/// names of files UTF-8; a file elsewhere is named with its whole path.
 class DataFolder {
 public:
     /// @param appFolder the program's folder; the data are in its sub-folder "Daten" (any letter case).
@@ -35,7 +36,7 @@ public:
     [[nodiscard]] const std::filesystem::path& path() const { return m_path; }
     /// Where a file of the given name is: a file whose name differs in letter case only is found too; one spelled
     /// exactly so wins. When there is none, the path it would be created at.
-    [[nodiscard]] std::filesystem::path file(const std::filesystem::path& name) const;
+    [[nodiscard]] std::filesystem::path file(std::string_view name) const;
 
     /// One value; "" when the key, the section or the file is missing, unreadable or the value is empty. Values are
     /// cut at 254 characters. Never creates a file, never throws.

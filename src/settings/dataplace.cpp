@@ -2,6 +2,7 @@
 
 #include <fstream>
 
+#include "base/paths.h"
 #include "settings/datafolder.h"
 #include "settings/leftovers.h"
 #include "settings/profilefile.h"
@@ -32,7 +33,7 @@ void fillFrom(const fs::path& shipped, const DataFolder& target, std::string& pr
     for (auto entry = fs::directory_iterator(shipped, error); !error && entry != fs::directory_iterator();
          entry.increment(error)) {
         // A file whose name differs in letter case only is the same file.
-        const fs::path file = target.file(entry->path().filename());
+        const fs::path file = target.file(utf8Of(entry->path().filename()));
         std::error_code ignored;
         if (fs::exists(file, ignored) || !entry->is_regular_file(ignored)) continue;
         // Whole or not at all: half a file would count as the user's own from the next start on.

@@ -13,8 +13,8 @@ constexpr std::string_view kCarrierSection = "VRN";
 
 }  // namespace
 
-Profile Profile::ofFile(DataFolder& data, const std::filesystem::path& file) {
-    Profile profile(data, nullptr, nullptr, file.string());
+Profile Profile::ofFile(DataFolder& data, const std::string& file) {
+    Profile profile(data, nullptr, nullptr, file);
     const auto text = data.profile(profile.m_file);
     profile.m_wholeSetup = text != nullptr && text->anyKey(kMultiplexSection, [](std::string_view) { return true; });
     return profile;

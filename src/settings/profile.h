@@ -1,6 +1,5 @@
 #pragma once
 
-#include <filesystem>
 #include <string>
 #include <string_view>
 #include <utility>
@@ -41,8 +40,8 @@ public:
     /// The same with any file in the place of a data set's. One that has a section "FM" holds a whole set-up: the
     /// multiplex, which data sets leave to the general settings, and the carrier come from there too, as far as it has
     /// them.
-    /// @param file absolute, or relative to the data folder.
-    [[nodiscard]] static Profile ofFile(DataFolder& data, const std::filesystem::path& file);
+    /// @param file absolute, or relative to the data folder; in UTF-8.
+    [[nodiscard]] static Profile ofFile(DataFolder& data, const std::string& file);
 
     /// "" when nothing is there.
     [[nodiscard]] std::string read(const Place& place) const;

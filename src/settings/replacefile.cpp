@@ -1,8 +1,10 @@
 #include <system_error>
 
+#include "base/clock.h"
 #include "settings/durablefile.h"
 #include "settings/leftovers.h"
 #include "settings/profilefile.h"
+#include "settings/renameover.h"
 
 namespace kdx {
 
@@ -42,8 +44,11 @@ bool replaceFile(const fs::path& file, std::string_view bytes) {
     const fs::path beside = nameBeside(*target);
     std::error_code error;
     if (writeNewFile(beside, bytes, *target)) {
-        fs::rename(beside, *target, error);
-        if (!error) {
+        SystemClock clock;
+        const auto rename = [](const fs::path& from, const fs::path& to, std::error_code& why) {
+            fs::rename(from, to, why);
+        };
+        if (renameOver(beside, *target, clock, rename)) {
             flushFolder(target->parent_path());
             return true;
         }

@@ -1,37 +1,22 @@
 #include "settings/shownpath.h"
 
 #include <algorithm>
-#include <string_view>
 #include <system_error>
 
 #include "base/codepage.h"
+#include "base/paths.h"
 #include "base/printable.h"
 
 namespace kdx {
 
-namespace {
-
-/// The bytes of a name: on POSIX systems the name itself, elsewhere its UTF-8 form.
-std::string bytesOf(const std::filesystem::path& path) {
-    if constexpr (sizeof(std::filesystem::path::value_type) == 1) {
-        return {path.native().begin(), path.native().end()};
-    } else {
-        try {
-            const std::u8string text = path.u8string();
-            return {text.begin(), text.end()};
-        } catch (const std::system_error&) {
-            return "?";  // half a surrogate pair: no text in any encoding
-        }
-    }
+std::string shownPath(const std::filesystem::path& path) {
+    return shownText(utf8Of(path));
 }
 
-}  // namespace
-
-std::string shownPath(const std::filesystem::path& path) {
+std::string shownText(std::string_view text) {
     constexpr std::string_view kDigits = "0123456789ABCDEF";
-    const std::string bytes = bytesOf(path);
     std::string shown;
-    for (std::string_view rest = bytes; !rest.empty();) {
+    for (std::string_view rest = text; !rest.empty();) {
         const std::size_t length = isControl(rest.front()) ? 0 : characterLength(rest);
         if (length == 0) {
             const auto byte = static_cast<unsigned char>(rest.front());

@@ -1,7 +1,7 @@
 #include "simserver/abortchannel.h"
 
 #include "simserver/corechannel.h"
-#include "vxi11/xdr.h"
+#include "simserver/tirpcxdr.h"
 
 #include <vxi11.h>
 

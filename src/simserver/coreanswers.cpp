@@ -1,6 +1,6 @@
 #include "simserver/coreanswers.h"
 
-#include "vxi11/xdr.h"
+#include "simserver/tirpcxdr.h"
 
 #include <vxi11.h>
 

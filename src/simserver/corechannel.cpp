@@ -5,8 +5,8 @@
 #include "link/resource.h"
 #include "sim/scpi.h"
 #include "simserver/coreanswers.h"
+#include "simserver/tirpcxdr.h"
 #include "vxi11/numbers.h"
-#include "vxi11/xdr.h"
 
 #include <vxi11.h>
 

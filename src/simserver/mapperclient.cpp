@@ -1,20 +1,20 @@
 #include "simserver/mapperclient.h"
 
+#include "simserver/tirpcxdr.h"
+#include "vxi11/messages.h"
+
 #include <arpa/inet.h>
 #include <netinet/in.h>
 #include <rpc/pmap_prot.h>
-#include <rpc/rpc.h>
 
 namespace kdx::simserver {
 
 MapperClient::MapperClient(const std::string& otherAddress, unsigned short mapperPort, Deadline deadline)
     : m_channel(PMAPPROG, PMAPVERS), m_deadline(deadline) {
-    sockaddr_in address{};
-    address.sin_family = AF_INET;
-    address.sin_addr.s_addr = htonl(INADDR_LOOPBACK);
-    m_connected = m_channel.connect(address, mapperPort, deadline) ||
-                  (::inet_pton(AF_INET, otherAddress.c_str(), &address.sin_addr) == 1 &&
-                   m_channel.connect(address, mapperPort, deadline));
+    in_addr other{};
+    m_connected = m_channel.connect(kLoopbackAddress, mapperPort, deadline) ||
+                  (::inet_pton(AF_INET, otherAddress.c_str(), &other) == 1 &&
+                   m_channel.connect(ntohl(other.s_addr), mapperPort, deadline));
 }
 
 std::optional<std::uint32_t> MapperClient::portOf(const PortMapping& mapping) {
@@ -31,11 +31,10 @@ void MapperClient::remove(const PortMapping& mapping) {
 
 // The answer of all three procedures is a word: a port or a truth value.
 std::optional<std::uint32_t> MapperClient::ask(std::uint32_t procedure, const PortMapping& mapping) {
-    pmap question{mapping.program, mapping.version, IPPROTO_TCP, mapping.port};
-    std::uint32_t answer = 0;
-    const RpcOutcome outcome = m_channel.call(
-        procedure, 0, [&](XDR* xdr) { return xdr_pmap(xdr, &question); },
-        [&](XDR* xdr) { return xdr_uint32_t(xdr, &answer); }, m_deadline);
+    const pmap question{mapping.program, mapping.version, IPPROTO_TCP, mapping.port};
+    std::optional<std::uint32_t> answer;
+    const auto read = [&](std::string_view results) { return (answer = vxi11::portResult(results)).has_value(); };
+    const RpcOutcome outcome = m_channel.call(procedure, toXdr(question, xdr_pmap), read, m_deadline);
     if (outcome != RpcOutcome::Done) return std::nullopt;
     return answer;
 }

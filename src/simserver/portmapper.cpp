@@ -1,7 +1,7 @@
 #include "simserver/portmapper.h"
 
 #include "simserver/localnetwork.h"
-#include "vxi11/xdr.h"
+#include "simserver/tirpcxdr.h"
 
 #include <netinet/in.h>
 #include <poll.h>

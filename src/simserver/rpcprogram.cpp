@@ -1,6 +1,6 @@
 #include "simserver/rpcprogram.h"
 
-#include "vxi11/xdr.h"
+#include "simserver/tirpcxdr.h"
 
 #include <utility>
 

@@ -1,28 +1,30 @@
 #pragma once
 
+#include <cstdint>
+
 /// Numbers of the VXI-11 standard that both ends of the wire use: errors, flags of calls, reasons why a read has
-/// stopped. Program and procedure numbers come with the generated header.
+/// stopped.
 namespace kdx::vxi11 {
 
-constexpr long kNoError = 0;
-constexpr long kDeviceNotAccessible = 3;
-constexpr long kInvalidLink = 4;
-constexpr long kParameterError = 5;
-constexpr long kNotSupported = 8;
-constexpr long kOutOfResources = 9;
-constexpr long kLockedByAnotherLink = 11;
-constexpr long kNoLockHeld = 12;
-constexpr long kIoTimeout = 15;
-constexpr long kIoError = 17;
-constexpr long kInvalidAddress = 21;
-constexpr long kAborted = 23;
+constexpr std::int32_t kNoError = 0;
+constexpr std::int32_t kDeviceNotAccessible = 3;
+constexpr std::int32_t kInvalidLink = 4;
+constexpr std::int32_t kParameterError = 5;
+constexpr std::int32_t kNotSupported = 8;
+constexpr std::int32_t kOutOfResources = 9;
+constexpr std::int32_t kLockedByAnotherLink = 11;
+constexpr std::int32_t kNoLockHeld = 12;
+constexpr std::int32_t kIoTimeout = 15;
+constexpr std::int32_t kIoError = 17;
+constexpr std::int32_t kInvalidAddress = 21;
+constexpr std::int32_t kAborted = 23;
 
-constexpr long kFlagWaitLock = 0x01;
-constexpr long kFlagEnd = 0x08;
-constexpr long kFlagTermChar = 0x80;
+constexpr std::int32_t kFlagWaitLock = 0x01;
+constexpr std::int32_t kFlagEnd = 0x08;
+constexpr std::int32_t kFlagTermChar = 0x80;
 
-constexpr long kReasonRequestCount = 1;
-constexpr long kReasonTermChar = 2;
-constexpr long kReasonEnd = 4;
+constexpr std::int32_t kReasonRequestCount = 1;
+constexpr std::int32_t kReasonTermChar = 2;
+constexpr std::int32_t kReasonEnd = 4;
 
 }  // namespace kdx::vxi11

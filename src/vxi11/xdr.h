@@ -1,21 +1,11 @@
 #pragma once
 
-#include <rpc/rpc.h>
-
 #include <cstddef>
 #include <cstdint>
-#include <limits>
 #include <string>
 #include <string_view>
 
 namespace kdx {
-
-/// An XDR routine as the RPC library and its generator make them.
-template <class Value>
-using XdrRoutine = bool_t (*)(XDR*, Value*);
-
-/// Stands for "no counted field" in XdrDecoded.
-constexpr std::size_t kNoCount = std::numeric_limits<std::size_t>::max();
 
 /// The 32-bit word whose four bytes stand there; they have to be there.
 inline std::uint32_t xdrWord(std::string_view bytes, std::size_t at = 0) {
@@ -24,52 +14,41 @@ inline std::uint32_t xdrWord(std::string_view bytes, std::size_t at = 0) {
     return value;
 }
 
-/// A value read from XDR, with the memory that belongs to it.
-template <class Value>
-class XdrDecoded {
+/// Writes values in the external data representation (XDR, RFC 4506): words of 32 bits, the highest byte first, and
+/// bytes with their count before them, filled up to whole words.
+class XdrWriter {
 public:
-    /// @param countAt where the length word of a string or opaque field stands. The XDR routines trust that length when
-    ///        they allocate, so one that points past the bytes is refused here first.
-    XdrDecoded(std::string_view bytes, XdrRoutine<Value> routine, std::size_t countAt = kNoCount) : m_routine(routine) {
-        if (countAt != kNoCount && !countFits(bytes, countAt)) return;
-        XDR stream;
-        xdrmem_create(&stream, const_cast<char*>(bytes.data()), static_cast<u_int>(bytes.size()), XDR_DECODE);
-        m_valid = m_routine(&stream, &m_value) != 0;
-    }
-    XdrDecoded(const XdrDecoded&) = delete;
-    XdrDecoded& operator=(const XdrDecoded&) = delete;
-    ~XdrDecoded() {
-        XDR stream{};
-        stream.x_op = XDR_FREE;
-        m_routine(&stream, &m_value);
-    }
+    XdrWriter& word(std::uint32_t value);
+    XdrWriter& word(std::int32_t value) { return word(static_cast<std::uint32_t>(value)); }
+    XdrWriter& counted(std::string_view bytes);
 
-    /// False: the bytes are no such value.
-    explicit operator bool() const { return m_valid; }
-    const Value& operator*() const { return m_value; }
-    const Value* operator->() const { return &m_value; }
+    [[nodiscard]] std::string bytes() const { return m_bytes; }
 
 private:
-    static bool countFits(std::string_view bytes, std::size_t countAt) {
-        return bytes.size() >= countAt + 4 && xdrWord(bytes, countAt) <= bytes.size() - countAt - 4;
-    }
-
-    XdrRoutine<Value> m_routine;
-    Value m_value{};
-    bool m_valid = false;
+    std::string m_bytes;
 };
 
-/// The value in XDR.
-/// @param variableBytes an upper limit for the bytes of its strings and opaque fields.
-template <class Value>
-std::string toXdr(Value value, XdrRoutine<Value> routine, std::size_t variableBytes = 0) {
-    constexpr std::size_t kFixedBytes = 128;  // more than any of the fixed parts in use here
-    std::string bytes(kFixedBytes + variableBytes, '\0');
-    XDR stream;
-    xdrmem_create(&stream, bytes.data(), static_cast<u_int>(bytes.size()), XDR_ENCODE);
-    const bool written = routine(&stream, &value) != 0;
-    bytes.resize(written ? xdr_getpos(&stream) : 0);
-    return bytes;
-}
+/// Reads such values one after the other. What is not there reads as 0 or nothing, and so does all that follows.
+class XdrReader {
+public:
+    /// @param bytes lent: counted() leads into them.
+    explicit XdrReader(std::string_view bytes) : m_left(bytes) {}
+
+    std::uint32_t word();
+    std::int32_t signedWord() { return static_cast<std::int32_t>(word()); }
+    /// Bytes with their count before them; not there when the count is greater than that.
+    std::string_view counted(std::size_t atMost);
+
+    /// What has not been read yet.
+    [[nodiscard]] std::string_view rest() const { return m_left; }
+    /// Whether all that was asked for was there.
+    explicit operator bool() const { return m_whole; }
+
+private:
+    std::string_view take(std::size_t count);
+
+    std::string_view m_left;
+    bool m_whole = true;
+};
 
 }  // namespace kdx

@@ -3,6 +3,7 @@
 #include <QDir>
 #include <QFileInfo>
 
+#include "base/paths.h"
 #include "rds/settings.h"
 #include "settings/datafolder.h"
 #include "settings/profilefile.h"
@@ -32,7 +33,7 @@ bool isDataSet(const fs::path& file) {
 }
 
 QString shownFile(const fs::path& file) {
-    return QString::fromStdString(file.filename().string());
+    return QString::fromStdString(utf8Of(file.filename()));
 }
 
 }  // namespace
@@ -57,7 +58,7 @@ void DataSets::open() {
                                caption({905, "In %1 ist kein Datensatz."}).arg(shownFile(file)));
         return;
     }
-    m_with.state.openedFile = file.string();
+    m_with.state.openedFile = utf8Of(file);
     load(shownFile(file));
 }
 
@@ -115,7 +116,7 @@ int DataSets::number() const {
 
 QString DataSets::shown() const {
     if (number() > 0) return QString::number(number());
-    return shownFile(m_with.state.openedFile);
+    return shownFile(pathFromUtf8(m_with.state.openedFile));
 }
 
 QString DataSets::about(int number) const {

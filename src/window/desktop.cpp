@@ -9,6 +9,7 @@
 #include <QSignalBlocker>
 #include <QTabWidget>
 
+#include "base/paths.h"
 #include "link/discovery.h"
 #include "settings/programstate.h"
 #include "station/session.h"
@@ -30,7 +31,7 @@ constexpr const char* kPageKey = "window/page";
 constexpr const char* kAddressesKey = "addresses/used";
 
 QString fileText(const std::filesystem::path& file) {
-    return QString::fromStdString(file.string());
+    return QString::fromStdString(utf8Of(file));
 }
 
 }  // namespace

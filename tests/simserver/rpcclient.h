@@ -1,6 +1,6 @@
 #pragma once
 
-#include "vxi11/xdr.h"
+#include "simserver/tirpcxdr.h"
 
 #include <sys/types.h>
 

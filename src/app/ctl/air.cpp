@@ -10,6 +10,7 @@
 #include "app/ctl/aircommands.h"
 #include "app/ctl/laboratory.h"
 #include "app/ctl/secondsoption.h"
+#include "base/paths.h"
 #include "settings/shownpath.h"
 
 namespace kdx::ctl {
@@ -37,7 +38,7 @@ public:
         : m_isOutput(file == kStandardOutput),
           m_isSilent(m_isOutput && laboratory.call().json),
           m_document(laboratory.output().document) {
-        if (!m_isOutput) m_file.open(file, std::ios::binary);
+        if (!m_isOutput) m_file.open(pathFromUtf8(file), std::ios::binary);
         if (m_isSilent) m_document["lines"] = nlohmann::json::array();
     }
 
@@ -64,6 +65,10 @@ private:
     std::ofstream m_file;
     std::size_t m_count = 0;
 };
+
+bool areSame(const std::string& one, const std::string& other) {
+    return isSameFile(pathFromUtf8(one), pathFromUtf8(other));
+}
 
 /// What is on the air, group by group, until its time is over or the user wants to stop.
 class Recording {
@@ -153,9 +158,9 @@ int onAir(Laboratory& laboratory, const Air& what) {
         return kWrongCall;
     }
     for (const std::string& written : {what.groupFile, what.multiplexFile}) {
-        const bool isRead = isSameFile(written, what.log) || isSameFile(written, what.commandFile) ||
-                            isSameFile(written, what.source.file);
-        if (!isRead && !isSameFile(what.groupFile, what.multiplexFile)) continue;
+        const bool isRead =
+            areSame(written, what.log) || areSame(written, what.commandFile) || areSame(written, what.source.file);
+        if (!isRead && !areSame(what.groupFile, what.multiplexFile)) continue;
         laboratory.output().problem(written + " is named twice: it cannot be written and be something else");
         return kWrongCall;
     }

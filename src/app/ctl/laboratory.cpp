@@ -7,6 +7,7 @@
 #include "app/platform.h"
 #include "base/codepage.h"
 #include "base/numbers.h"
+#include "base/paths.h"
 #include "base/printable.h"
 #include "coder/keyfacts.h"
 #include "coder/sendparam.h"
@@ -71,7 +72,7 @@ Laboratory::Laboratory(const Call& call, Output& output, const char* program, in
     m_session->instrument.addWatcher(*this);
     m_session->instrument.log.onChange([this, told = false]() mutable {
         if (m_session->instrument.log.isWritable() || std::exchange(told, true)) return;
-        m_output.problem("the command log " + m_data.file(kCommandLog).string() + " cannot be written");
+        m_output.problem("the command log " + utf8Of(m_data.file(kCommandLog)) + " cannot be written");
     });
 }
 
@@ -99,7 +100,7 @@ bool Laboratory::open() {
         kind = "IEC";
         address = std::to_string(*m_call.gpib);
     } else if (address.empty() && !m_call.program.simulate) {
-        m_output.problem("no instrument is named: " + m_data.file(kGeneralSettings).string() +
+        m_output.problem("no instrument is named: " + utf8Of(m_data.file(kGeneralSettings)) +
                          (m_data.profile(kGeneralSettings) ? " has no address" : " cannot be read") +
                          ". Name it with --lan or --gpib, or the folder with your settings with --app-folder.");
         return false;

@@ -67,7 +67,7 @@ std::string sentence(const CLI::App& app, const CLI::Error& error) {
     const auto words = app.remaining();
     const auto word = std::find_if(words.begin(), words.end(), [](const auto& text) { return !text.starts_with('-'); });
     const bool unknown = app.get_parent() == nullptr && app.get_subcommands().empty() && word != words.end();
-    return kdx::shownPath(unknown ? "there is no subcommand " + *word : std::string(error.what()));
+    return kdx::shownText(unknown ? "there is no subcommand " + *word : std::string(error.what()));
 }
 
 /// What the parser has to say: help that was asked for, or what is wrong with the call.

@@ -42,7 +42,7 @@ void Output::remark(const std::string& text) {
 
 void Output::problem(const std::string& problem) {
     // Names and values come from the command line and from files, with any bytes in them.
-    const std::string text = shownPath(problem);
+    const std::string text = shownText(problem);
     endProgress();
     std::fflush(stdout);
     std::fprintf(stderr, "kdx-ctl: %s%s\n", m_place.c_str(), text.c_str());

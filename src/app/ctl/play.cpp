@@ -6,6 +6,7 @@
 #include "app/ctl/laboratory.h"
 #include "app/ctl/scenariofile.h"
 #include "app/platform.h"
+#include "base/paths.h"
 #include "base/split.h"
 #include "scenario/readoutrestorer.h"
 #include "scenario/runner.h"
@@ -143,12 +144,12 @@ int play(Laboratory& laboratory, const Play& what) {
     if (!scenario) return kWrongCall;
     const auto options = readOptions(laboratory, *scenario, what);
     if (!options) return kWrongCall;
-    const scenario::Report report(what.report.empty() ? scenario->report : what.report);
+    const scenario::Report report(pathFromUtf8(what.report.empty() ? scenario->report : what.report));
     laboratory.hasten(what.speed);
     if (!laboratory.open()) return kNoConnection;
     const std::string problem = report.file().empty() ? "" : report.begin();
     if (!problem.empty()) {
-        laboratory.output().problem("the report " + report.file().string() + " " + problem);
+        laboratory.output().problem("the report " + utf8Of(report.file()) + " " + problem);
         laboratory.close();
         return kWrongCall;
     }

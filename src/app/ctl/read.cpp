@@ -5,6 +5,7 @@
 #include "app/ctl/laboratory.h"
 #include "app/ctl/readings.h"
 #include "base/codepage.h"
+#include "base/paths.h"
 #include "settings/profilefile.h"
 #include "station/comparison.h"
 #include "station/setupfile.h"
@@ -37,10 +38,11 @@ bool tellNotKept(Laboratory& laboratory, const std::string& file, const Readout&
 }
 
 int read(Laboratory& laboratory, const std::string& into) {
-    const std::string file = std::filesystem::absolute(into).string();
+    const std::filesystem::path path = std::filesystem::absolute(pathFromUtf8(into));
+    const std::string file = utf8Of(path);
     std::error_code error;
-    const bool exists = std::filesystem::exists(file, error);
-    const auto before = exists ? readFile(file) : std::string();
+    const bool exists = std::filesystem::exists(path, error);
+    const auto before = exists ? readFile(path) : std::string();
     if (!before || isUtf16(*before)) {
         laboratory.output().problem(file + " is there and is no settings file that can be read");
         return kWrongCall;
@@ -51,7 +53,7 @@ int read(Laboratory& laboratory, const std::string& into) {
     if (laboratory.result() != kDone) return laboratory.result();
     ProfileText text(*before);
     keep(readout, text);
-    if (!replaceFile(file, text.bytes())) {
+    if (!replaceFile(path, text.bytes())) {
         laboratory.output().problem(file + " cannot be written");
         return kFailed;
     }

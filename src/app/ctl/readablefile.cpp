@@ -1,12 +1,13 @@
 #include "app/ctl/readablefile.h"
 
 #include "app/ctl/output.h"
+#include "base/paths.h"
 #include "settings/profilefile.h"
 
 namespace kdx::ctl {
 
 std::optional<std::string> bytesOf(Output& output, const std::string& file) {
-    auto bytes = readFile(file);
+    auto bytes = readFile(pathFromUtf8(file));
     if (!bytes) output.problem(file + " cannot be read");
     return bytes;
 }

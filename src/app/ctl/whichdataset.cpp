@@ -3,6 +3,7 @@
 #include <CLI/CLI.hpp>
 
 #include "app/ctl/laboratory.h"
+#include "base/paths.h"
 #include "rds/settings.h"
 
 namespace kdx::ctl {
@@ -22,8 +23,8 @@ std::optional<Profile> WhichDataSet::profile(Laboratory& laboratory) const {
         return std::nullopt;
     }
     laboratory.state().CurrentDataSet = std::to_string(number.value_or(1));
-    const std::string name =
-        file.empty() ? dataSetFile(laboratory.state().CurrentDataSet) : std::filesystem::absolute(file).string();
+    const std::string name = file.empty() ? dataSetFile(laboratory.state().CurrentDataSet)
+                                          : utf8Of(std::filesystem::absolute(pathFromUtf8(file)));
     if (!laboratory.data().profile(name)) {
         laboratory.output().problem(name + " cannot be read");
         return std::nullopt;

@@ -1,0 +1,116 @@
+#include <windows.h>
+
+#include <algorithm>
+#include <limits>
+#include <utility>
+
+#include "settings/durablefile.h"
+
+namespace kdx {
+
+namespace {
+
+/// An open file, closed when this goes.
+class File {
+public:
+    File(const std::filesystem::path& name, DWORD access, DWORD how, DWORD flags = 0)
+        : m_handle(CreateFileW(name.c_str(), access, FILE_SHARE_READ | FILE_SHARE_WRITE | FILE_SHARE_DELETE, nullptr,
+                               how, FILE_ATTRIBUTE_NORMAL | flags, nullptr)) {}
+    ~File() { close(); }
+    File(const File&) = delete;
+    File& operator=(const File&) = delete;
+
+    [[nodiscard]] HANDLE handle() const { return m_handle; }
+    [[nodiscard]] bool isOpen() const { return m_handle != INVALID_HANDLE_VALUE; }
+    bool close() { return isOpen() && CloseHandle(std::exchange(m_handle, INVALID_HANDLE_VALUE)) != 0; }
+    [[nodiscard]] bool write(std::string_view bytes) const {
+        while (!bytes.empty()) {
+            DWORD written = 0;
+            const auto most = static_cast<DWORD>(std::min<std::size_t>(bytes.size(), 1U << 30U));
+            if (WriteFile(m_handle, bytes.data(), most, &written, nullptr) == 0 || written == 0) return false;
+            bytes.remove_prefix(written);
+        }
+        return true;
+    }
+
+private:
+    HANDLE m_handle;
+};
+
+/// Not through a link, and no device: NUL and the like open everywhere.
+bool isPlain(const File& file) {
+    BY_HANDLE_FILE_INFORMATION facts;
+    return file.isOpen() && GetFileType(file.handle()) == FILE_TYPE_DISK &&
+           GetFileInformationByHandle(file.handle(), &facts) != 0 &&
+           (facts.dwFileAttributes & (FILE_ATTRIBUTE_REPARSE_POINT | FILE_ATTRIBUTE_DIRECTORY)) == 0;
+}
+
+std::uint64_t joined(DWORD high, DWORD low) {
+    return std::uint64_t{high} << 32U | low;
+}
+
+std::int64_t nanoseconds(const FILETIME& time) {
+    constexpr std::int64_t kStep = 100;
+    return static_cast<std::int64_t>(joined(time.dwHighDateTime, time.dwLowDateTime)) * kStep;
+}
+
+}  // namespace
+
+std::optional<FileIdentity> identityOf(const std::filesystem::path& file) {
+    const File opened(file, FILE_READ_ATTRIBUTES, OPEN_EXISTING, FILE_FLAG_BACKUP_SEMANTICS);  // folders too
+    BY_HANDLE_FILE_INFORMATION facts;
+    if (!opened.isOpen() || GetFileInformationByHandle(opened.handle(), &facts) == 0) return std::nullopt;
+    FileIdentity identity;
+    identity.device = facts.dwVolumeSerialNumber;
+    identity.number = joined(facts.nFileIndexHigh, facts.nFileIndexLow);
+    identity.size = joined(facts.nFileSizeHigh, facts.nFileSizeLow);
+    identity.modified = nanoseconds(facts.ftLastWriteTime);
+    identity.changed = nanoseconds(facts.ftCreationTime);
+    return identity;
+}
+
+bool isSettled(const FileIdentity& identity) {
+    constexpr std::int64_t kCoarseSteps = 2'000'000'000;
+    FILETIME now;
+    GetSystemTimeAsFileTime(&now);
+    return nanoseconds(now) - std::max(identity.modified, identity.changed) > kCoarseSteps;
+}
+
+bool userMayWrite(const std::filesystem::path& file) {
+    return File(file, FILE_APPEND_DATA, OPEN_EXISTING).isOpen();
+}
+
+bool writeNewFile(const std::filesystem::path& file, std::string_view bytes, const std::filesystem::path& /*model*/) {
+    // Rights come from the folder, and a file that is marked read-only is never replaced: the model has nothing to
+    // give.
+    File created(file, GENERIC_WRITE, CREATE_NEW);
+    return created.isOpen() && created.write(bytes) && FlushFileBuffers(created.handle()) != 0 && created.close();
+}
+
+bool appendToPlainFile(const std::filesystem::path& file, std::string_view bytes) {
+    File opened(file, FILE_APPEND_DATA | FILE_READ_ATTRIBUTES, OPEN_ALWAYS, FILE_FLAG_OPEN_REPARSE_POINT);
+    return isPlain(opened) && opened.write(bytes) && opened.close();
+}
+
+bool emptyPlainFile(const std::filesystem::path& file) {
+    File opened(file, GENERIC_WRITE | FILE_READ_ATTRIBUTES, OPEN_ALWAYS, FILE_FLAG_OPEN_REPARSE_POINT);
+    return isPlain(opened) && SetEndOfFile(opened.handle()) != 0 && opened.close();
+}
+
+std::uint64_t processNumber() {
+    return GetCurrentProcessId();
+}
+
+bool mayStillBeWritten(const std::filesystem::path&, std::uint64_t process) {
+    // The own number was another program's before.
+    if (process == processNumber() || process < 1 || process > std::numeric_limits<DWORD>::max()) return false;
+    const HANDLE found = OpenProcess(SYNCHRONIZE, FALSE, static_cast<DWORD>(process));
+    if (found == nullptr) return GetLastError() == ERROR_ACCESS_DENIED;  // another user's
+    const bool lives = WaitForSingleObject(found, 0) == WAIT_TIMEOUT;
+    CloseHandle(found);
+    return lives;
+}
+
+void flushFolder(const std::filesystem::path&) {}  // the system keeps a log of names by itself
+
+}  // namespace kdx
