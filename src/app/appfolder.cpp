@@ -11,12 +11,12 @@ std::filesystem::path appFolder(const Options& options, const char* program, std
     if (options.appFolder) places.asked = *options.appFolder;
     places.program = programFolder(program);
     places.user = userFolder();
-    places.shipped = shippedFolder(places.program, KDX_SHIPPED_DATA);
+    places.shipped = shippedFolder(places.program);
     return chooseAppFolder(places, problem);
 }
 
 std::filesystem::path shippedAppFolder(const char* program) {
-    return shippedFolder(programFolder(program), KDX_SHIPPED_DATA);
+    return shippedFolder(programFolder(program));
 }
 
 }  // namespace kdx

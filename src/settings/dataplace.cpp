@@ -1,5 +1,7 @@
 #include "settings/dataplace.h"
 
+#include <algorithm>
+#include <array>
 #include <fstream>
 
 #include "settings/datafolder.h"
@@ -62,10 +64,14 @@ fs::path chooseAppFolder(const DataPlaces& places, std::string& problem) {
     return places.user;
 }
 
-fs::path shippedFolder(const fs::path& program, const fs::path& builtIn) {
-    fs::path installed = program / ".." / "share" / "kdx-rds";
-    std::error_code error;  // a folder that nobody may look into counts as none
-    return fs::is_directory(DataFolder(installed).path(), error) ? installed : builtIn;
+fs::path shippedFolder(const fs::path& program) {
+    const fs::path share = program.parent_path() / "share";
+    const std::array places = {share / "kdx-rds", share / "kdx-tools", program};
+    const auto found = std::find_if(places.begin(), places.end(), [](const fs::path& place) {
+        std::error_code error;  // a folder that nobody may look into counts as none
+        return fs::is_directory(DataFolder(place).path(), error);
+    });
+    return found == places.end() ? places.front() : *found;
 }
 
 }  // namespace kdx

@@ -20,9 +20,8 @@ struct DataPlaces {
 /// @param problem gets a message, in UTF-8, when the user's folder is not known or could not be filled.
 [[nodiscard]] std::filesystem::path chooseAppFolder(const DataPlaces& places, std::string& problem);
 
-/// The folder with the "Daten" that came with the program: ../share/kdx-rds as seen from the program's folder, or the
-/// built-in one when there is none there. Never throws, whatever the rights of that folder.
-[[nodiscard]] std::filesystem::path shippedFolder(const std::filesystem::path& program,
-                                                  const std::filesystem::path& builtIn);
+/// The folder with the "Daten" that came with the program, as seen from the program's own folder: ../share/kdx-rds, or
+/// ../share/kdx-tools where the programs without a window came alone; else its own. Never throws, whatever the rights.
+[[nodiscard]] std::filesystem::path shippedFolder(const std::filesystem::path& program);
 
 }  // namespace kdx
