@@ -5,6 +5,7 @@ Usage: install_test.py CMAKE BUILD-FOLDER SOURCE-FOLDER
 
 import os
 import pathlib
+import pty
 import shutil
 import subprocess
 import sys
@@ -35,9 +36,40 @@ class Installed(unittest.TestCase):
         user = self.folder / "home" / ".local" / "share" / "kdx-rds" / "Daten"
         shipped = self.prefix / "share" / "kdx-rds" / "Daten"
         files = sorted(path.name for path in shipped.iterdir() if path.is_file())
-        self.assertEqual(sorted(path.name for path in user.iterdir() if path.name != "RDS_log.txt"), files)
+        self.assertEqual(sorted(path.name for path in user.iterdir()), sorted([*files, "kdx-rds-shipped.txt"]))
         for name in files:
             self.assertEqual((user / name).read_bytes(), (shipped / name).read_bytes(), name)
+
+    def ctlOnATerminal(self, *words, home):
+        """@returns what a person at a terminal is told."""
+        main, terminal = pty.openpty()
+        environment = {**os.environ, "HOME": str(self.folder / home)}
+        environment.pop("XDG_DATA_HOME", None)
+        subprocess.run([self.prefix / "bin" / "kdx-ctl", *words], stdout=subprocess.DEVNULL, stderr=terminal,
+                       env=environment, check=True)
+        os.write(terminal, b"end\n")
+        told = b""
+        while not told.endswith(b"end\r\n"):
+            told += os.read(main, 4096)
+        os.close(main)
+        os.close(terminal)
+        return told[:-len(b"end\r\n")].decode()
+
+    def testAnEarlierEventListIsRenewedAndOneOfTheUsersOwnIsKeptAndToldOnce(self):
+        data = self.folder / "third home" / ".local" / "share" / "kdx-rds" / "Daten"
+        shipped = self.prefix / "share" / "kdx-rds" / "Daten"
+        earlier = (pathlib.Path(SOURCE) / "tests" / "settings" / "event_earlier.txt").read_bytes()
+        data.mkdir(parents=True)
+        (data / "Event.txt").write_bytes(earlier)
+        (data / "Location.txt").write_bytes(b"Mein Ort;00999\r\n")
+        run = self.ctl("list", "keys", home="third home")
+        self.assertEqual((run.returncode, run.stderr), (0, ""))  # nobody may read what a script prints
+        self.assertEqual((data / "Event.txt").read_bytes(), (shipped / "Event.txt").read_bytes())
+        self.assertEqual(self.ctlOnATerminal("list", "keys", home="third home"),
+                         f"warning: Location.txt stays as you changed it; a new version of it is "
+                         f"{shipped / 'Location.txt'}\r\n")
+        self.assertEqual(self.ctlOnATerminal("list", "keys", home="third home"), "")
+        self.assertEqual((data / "Location.txt").read_bytes(), b"Mein Ort;00999\r\n")
 
     def testDataOfTheToolsAloneAreFound(self):
         alone = self.folder / "alone"

@@ -32,14 +32,15 @@ protected:
         std::ofstream(file, std::ios::binary) << bytes;
     }
     static std::string get(const fs::path& file) { return readFile(file).value_or("(none)"); }
-    fs::path choose() { return chooseAppFolder(places, problem); }
+    fs::path choose() { return chooseAppFolder(places, news); }
 
     TempFolder base;
     fs::path program = base.path() / "program";
     fs::path user = base.path() / "home" / "kdx-rds";
     fs::path shipped = base.path() / "share";
     DataPlaces places{std::nullopt, program, user, shipped};
-    std::string problem;
+    DataNews news;
+    std::string& problem = news.problem;
 };
 
 TEST_F(DataPlaceTest, TheFolderAskedForWinsAsItIs) {
