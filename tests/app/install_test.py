@@ -7,6 +7,7 @@ import os
 import pathlib
 import pty
 import shutil
+import struct
 import subprocess
 import sys
 import tempfile
@@ -86,6 +87,24 @@ class Installed(unittest.TestCase):
                 if file.name != "RDS_log.txt":
                     self.assertEqual((target / file).read_bytes(), (source / file).read_bytes(), file)
             self.assertFalse((target / "RDS_log.txt").exists())
+
+    def testTheDesktopFindsTheProgram(self):
+        share = self.prefix / "share"
+        entry = (share / "applications" / "kdx-rds.desktop").read_text()
+        self.assertIn("\nExec=kdx-rds\n", entry)
+        self.assertTrue((share / "icons" / "hicolor" / "scalable" / "apps" / "kdx-rds.svg").is_file())
+        sizes = {}
+        for icon in (share / "icons" / "hicolor").glob("*/apps/kdx-rds.png"):
+            sizes[icon.parts[-3]] = "{}x{}".format(*struct.unpack(">II", icon.read_bytes()[16:24]))
+        self.assertEqual(len(sizes), 8)
+        for folder, size in sizes.items():
+            self.assertEqual(folder, size)
+
+    def testManualPagesCompletionAndLicencesAreThere(self):
+        for file in ("man/man1/kdx-rds.1", "man/man1/kdx-ctl.1", "man/man1/kdx-sim.1", "doc/kdx-rds/LICENSE",
+                     "bash-completion/completions/kdx-ctl", "doc/kdx-rds/licences.md",
+                     "metainfo/org.kdx_rds.kdx_rds.metainfo.xml"):
+            self.assertTrue((self.prefix / "share" / file).is_file(), file)
 
     def testNoProgramNamesTheFolderItWasBuiltFrom(self):
         for program in PROGRAMS:
