@@ -4,13 +4,16 @@
 #include <sys/resource.h>
 #include <sys/wait.h>
 
+#include <algorithm>
+#include <array>
 #include <csignal>
 #include <fstream>
+#include <string>
 #include <thread>
+#include <vector>
 
 #include "settings/datafolder.h"
 #include "settings/folderlock.h"
-#include "settings/leftovers.h"
 #include "settings/profilefile.h"
 #include "support/sourcefolder.h"
 #include "support/tempfolder.h"
