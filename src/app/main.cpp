@@ -20,6 +20,7 @@
 #include "settings/folderlock.h"
 #include "settings/leftovers.h"
 #include "settings/programstate.h"
+#include "settings/shippedfiles.h"
 #include "settings/shownpath.h"
 #include "sim/virtualinstrument.h"
 #include "station/session.h"
@@ -134,9 +135,10 @@ int main(int argc, char** argv) {
 
     kdx::Application application(argc, argv);
     endWhenAsked(application);
-    std::string problem;
-    kdx::DataFolder data(kdx::appFolder(options, argv[0], problem));
-    if (!problem.empty()) std::fprintf(stderr, "kdx-rds: %s\n", problem.c_str());
+    kdx::DataNews news;
+    kdx::DataFolder data(kdx::appFolder(options, argv[0], !options.tourFolder, news));
+    if (!news.problem.empty()) std::fprintf(stderr, "kdx-rds: %s\n", news.problem.c_str());
+    for (const auto& shipped : news.kept) std::fprintf(stderr, "kdx-rds: %s\n", kdx::keptFileText(shipped).c_str());
     kdx::sweepLeftovers(data.path());
     const kdx::FolderClaim claim(data.path());
     kdx::ProgramState state;
@@ -157,9 +159,10 @@ int main(int argc, char** argv) {
     const EndsWithProgram letGo(session, worker);
     kdx::TickerGroup tickers;
     kdx::HMenue window({session, state, data, captions, clock, dialogs, tickers, claim,
-                        QString::fromStdString(link.description), QString::fromStdString(problem), end, &worker,
+                        QString::fromStdString(link.description), QString::fromStdString(news.problem), end, &worker,
                         options.answerTime.value_or(std::chrono::seconds(2)), link.simulated != nullptr,
-                        kdx::shippedAppFolder(argv[0]), options.tourFolder ? std::filesystem::path() : placeFile()});
+                        kdx::shippedAppFolder(argv[0]), options.tourFolder ? std::filesystem::path() : placeFile(),
+                        news.kept});
     application.guarded(window.objectName(), [&] { window.startUp(); });
     if (options.tourFolder) {
         int result = EXIT_FAILURE;

@@ -44,6 +44,7 @@ double letterSize(double desktop) {
 
 Application::Application(int& argc, char** argv) : QApplication(argc, argv) {
     setApplicationName(QStringLiteral("KDX-RDS"));
+    setDesktopFileName(QStringLiteral("kdx-rds"));  // by which a desktop finds name and icon
     setApplicationVersion(QStringLiteral(KDX_VERSION));
     // One look on every desktop: the pages are laid out for it, and platform themes cost twice the start time.
     setStyle(QStyleFactory::create(QStringLiteral("Fusion")));

@@ -44,6 +44,11 @@ QStringList notes(const Surroundings& with, const QWidget& window, const QString
     } else if (!startNotice.isEmpty()) {
         notes += startNotice;
     }
+    QStringList kept;
+    for (const auto& shipped : with.keptFiles) kept += QString::fromStdString(shownPath(shipped));
+    if (!kept.isEmpty()) {
+        note({1100, "Von Ihnen geändert, darum nicht erneuert; neue Fassung: %1"}, kept.join(QStringLiteral(", ")));
+    }
     QStringList unreadable;
     if (const auto file = with.data.unreadableFile()) unreadable += toText(*file);
     for (const PictureSwitch* button : window.findChildren<PictureSwitch*>()) unreadable += button->brokenPicture();

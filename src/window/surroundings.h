@@ -5,6 +5,7 @@
 #include <chrono>
 #include <filesystem>
 #include <functional>
+#include <vector>
 
 namespace kdx {
 
@@ -36,6 +37,7 @@ struct Surroundings {
     bool simulated = false;                      ///< the instrument is the virtual one inside the program
     std::filesystem::path shipped{};             ///< the program's folder as it was shipped; none where it is not known
     std::filesystem::path placeFile{};           ///< keeps the window's page and place; none: they are not kept
+    std::vector<std::filesystem::path> keptFiles{};  ///< shipped files in whose places the user's own changed ones stay
 };
 
 }  // namespace kdx

@@ -32,14 +32,15 @@ protected:
         std::ofstream(file, std::ios::binary) << bytes;
     }
     static std::string get(const fs::path& file) { return readFile(file).value_or("(none)"); }
-    fs::path choose() { return chooseAppFolder(places, problem); }
+    fs::path choose() { return chooseAppFolder(places, news); }
 
     TempFolder base;
     fs::path program = base.path() / "program";
     fs::path user = base.path() / "home" / "kdx-rds";
     fs::path shipped = base.path() / "share";
     DataPlaces places{std::nullopt, program, user, shipped};
-    std::string problem;
+    DataNews news;
+    std::string& problem = news.problem;
 };
 
 TEST_F(DataPlaceTest, TheFolderAskedForWinsAsItIs) {
@@ -158,18 +159,21 @@ TEST_F(DataPlaceTest, ShippedFilesOfAnyNameAreCopied) {
     EXPECT_EQ(problem, "");
 }
 
-TEST_F(DataPlaceTest, TheShippedDataAreTheInstalledOnesElseTheBuiltInOnes) {
-    const fs::path builtIn = base.path() / "source";
-    const fs::path installed = program / ".." / "share" / "kdx-rds";
-    EXPECT_EQ(shippedFolder(program, builtIn), builtIn);
-    fs::create_directories(base.path() / "share" / "kdx-rds" / "Daten");
-    EXPECT_EQ(shippedFolder(program, builtIn), installed);
-    fs::permissions(base.path() / "share", fs::perms::none);
+TEST_F(DataPlaceTest, TheShippedDataAreFoundFromTheProgramsFolder) {
+    fs::remove_all(shipped);
+    EXPECT_EQ(shippedFolder(program), shipped / "kdx-rds");  // what is missing is named by its usual place
+    fs::create_directories(program / "Daten");
+    EXPECT_EQ(shippedFolder(program), program);
+    fs::create_directories(shipped / "kdx-tools" / "Daten");
+    EXPECT_EQ(shippedFolder(program), shipped / "kdx-tools");
+    fs::create_directories(shipped / "kdx-rds" / "Daten");
+    EXPECT_EQ(shippedFolder(program), shipped / "kdx-rds");
+    fs::permissions(shipped, fs::perms::none);
     {
         const Unprivileged ordinary;
-        EXPECT_EQ(shippedFolder(program, builtIn), builtIn);
+        EXPECT_EQ(shippedFolder(program), program);
     }
-    fs::permissions(base.path() / "share", fs::perms::all);
+    fs::permissions(shipped, fs::perms::all);
 }
 
 TEST_F(DataPlaceTest, ShippedDataThatNobodyMayLookIntoAreReported) {

@@ -26,9 +26,9 @@ protected:
         const auto ask = [this] { ++ended; };
         session = std::make_unique<Session>(instrumentLink(), state, data, captions, clock, ask);
         tickers.setHeld(false);
-        window = std::make_unique<HMenue>(Surroundings{*session, state, data, captions, clock, boxesOfWindow(), tickers,
-                                                       claim, linkDescription, QString(), ask, worker(),
-                                                       std::chrono::seconds{2}, simulated, shipped, placeFile});
+        window = std::make_unique<HMenue>(
+            Surroundings{*session, state, data, captions, clock, boxesOfWindow(), tickers, claim, linkDescription,
+                         QString(), ask, worker(), std::chrono::seconds{2}, simulated, shipped, placeFile, keptFiles});
         m_listener = std::make_unique<TrafficListener>(session->instrument, [this](const Traffic& traffic) {
             if (heard) heard(traffic);
         });
@@ -74,10 +74,11 @@ protected:
 
     ScriptedDialogs dialogs;
     QString linkDescription = QStringLiteral("scripted");
-    bool simulated = false;           ///< what the next start tells of the instrument
-    std::filesystem::path shipped;    ///< the folder that the next start takes for the shipped one
-    std::filesystem::path placeFile;  ///< where it keeps its page and place; nowhere when empty
-    int ended = 0;                    ///< how often the end of the program was asked for
+    bool simulated = false;                        ///< what the next start tells of the instrument
+    std::filesystem::path shipped;                 ///< the folder that the next start takes for the shipped one
+    std::filesystem::path placeFile;               ///< where it keeps its page and place; nowhere when empty
+    std::vector<std::filesystem::path> keptFiles;  ///< what the next start tells of files that were not renewed
+    int ended = 0;                                 ///< how often the end of the program was asked for
     TickerGroup tickers;
     std::unique_ptr<Session> session;
     FolderClaim claim{folder.data()};

@@ -40,6 +40,19 @@ TEST_F(NoticeTest, ALogThatLeadsElsewhereIsToldAlsoWithLoggingOff) {
     EXPECT_EQ(notice(), "");
 }
 
+TEST_F(NoticeTest, FilesThatTheUserChangedAndAreNotRenewedAreTold) {
+    keptFiles = {"/usr/share/kdx-rds/Daten/Event.txt", "/usr/share/kdx-rds/Daten/Location.txt"};
+    start();
+    EXPECT_EQ(notice(),
+              "Von Ihnen geändert, darum nicht erneuert; neue Fassung: /usr/share/kdx-rds/Daten/Event.txt, "
+              "/usr/share/kdx-rds/Daten/Location.txt");
+    setGeneral("Sprache", "Sprache", "english");
+    start();
+    EXPECT_EQ(notice(),
+              "Changed by you and so not renewed; new version: /usr/share/kdx-rds/Daten/Event.txt, "
+              "/usr/share/kdx-rds/Daten/Location.txt");
+}
+
 TEST_F(NoticeTest, SettingsAndALogThatCannotBeWrittenAreBothTold) {
     std::filesystem::create_directory(folder.data() / kCommandLog);
     folder.write("Datenset1.INI", "\xFF\xFE");

@@ -13,6 +13,7 @@
 #include "coder/sendparam.h"
 #include "link/visastatus.h"
 #include "settings/generalsettings.h"
+#include "settings/shippedfiles.h"
 #include "settings/withoutcontrols.h"
 #include "sim/virtualinstrument.h"
 #include "station/wrongsettings.h"
@@ -22,9 +23,10 @@ namespace kdx::ctl {
 namespace {
 
 std::filesystem::path folderOf(const Call& call, Output& output, const char* program) {
-    std::string problem;
-    auto folder = appFolder(call.program, program, problem);
-    if (!problem.empty()) output.problem(problem);
+    DataNews news;
+    auto folder = appFolder(call.program, program, errorIsTerminal(), news);  // nobody may read what a script prints
+    if (!news.problem.empty()) output.problem(news.problem);
+    for (const auto& shipped : news.kept) output.warning(keptFileText(shipped));
     return folder;
 }
 
