@@ -143,7 +143,7 @@ bool ScenarioView::leftNothing() const {
 }
 
 void ScenarioView::Ablauf_Oeffnen_Click() {
-    const QString folder = m_file.isEmpty() ? QFile::decodeName(m_with.data.file("Scenarios").string().c_str())
+    const QString folder = m_file.isEmpty() ? QString::fromStdString(utf8Of(m_with.data.file("Scenarios")))
                                             : QFileInfo(m_file).absolutePath();
     const QString file = m_with.dialogs.fileToOpen(windowTitle(), caption({990, "Szenario (*.yaml *.yml)"}), folder);
     if (!file.isEmpty()) open(file);
@@ -201,7 +201,7 @@ void ScenarioView::Ablauf_Start_Click() {
     m_unmet = 0;
     if (!report.empty() && !m_with.data.mayWrite(report)) {
         m_with.dialogs.message(Dialogs::Icon::Critical, caption({313, "Fehler"}),
-                               caption({312, "Nicht gespeichert: %1"}).arg(QString::fromStdString(report.string())),
+                               caption({312, "Nicht gespeichert: %1"}).arg(QString::fromStdString(utf8Of(report))),
                                caption({920, "Nur zum Lesen geöffnet: nichts wird gespeichert"}));
         return;
     }

@@ -4,7 +4,6 @@
 #include <array>
 #include <fstream>
 
-#include "base/paths.h"
 #include "settings/datafolder.h"
 #include "settings/leftovers.h"
 

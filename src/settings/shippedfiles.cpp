@@ -9,6 +9,7 @@
 #include <utility>
 
 #include "base/codepage.h"
+#include "base/paths.h"
 #include "settings/datafolder.h"
 #include "settings/folderlock.h"
 #include "settings/profilefile.h"
@@ -83,7 +84,7 @@ public:
 
     void take(const fs::path& shipped) {
         // A file whose name differs in letter case only is the same file.
-        const fs::path mine = m_user.file(shipped.filename());
+        const fs::path mine = m_user.file(utf8Of(shipped.filename()));
         const std::string name = shownPath(shipped.filename());
         std::error_code ignored;
         const fs::file_status there = fs::status(mine, ignored);
