@@ -47,12 +47,10 @@ struct Roles {
 
 Roles rolesOf(const QWidget& control) {
     if (qobject_cast<const QLabel*>(&control) != nullptr) return {QPalette::WindowText, QPalette::Window};
-    const bool face = qobject_cast<const QPushButton*>(&control) != nullptr ||
-                      qobject_cast<const QComboBox*>(&control) != nullptr ||
-                      qobject_cast<const QScrollBar*>(&control) != nullptr;
-    if (face) return {QPalette::ButtonText, QPalette::Button};
     if (qobject_cast<const QAbstractButton*>(&control) != nullptr)
-        return {QPalette::WindowText, QPalette::Window, true};
+        return {QPalette::ButtonText, QPalette::Button, qobject_cast<const QPushButton*>(&control) == nullptr};
+    if (qobject_cast<const QComboBox*>(&control) != nullptr || qobject_cast<const QScrollBar*>(&control) != nullptr)
+        return {QPalette::ButtonText, QPalette::Button};
     return {QPalette::Text, QPalette::Base};
 }
 
@@ -72,6 +70,7 @@ void colour(QWidget& control, ValueState state) {
         const QColor ground = refused ? QColor(0xFF, 0xF4, 0xF2) : QColor(0xFF, 0xF8, 0xD0);
         for (const auto group : {QPalette::Active, QPalette::Inactive}) {
             palette.setColor(group, roles.letters, letters);
+            if (roles.onParent) palette.setColor(group, QPalette::WindowText, letters);  // beside an indicator
             palette.setColor(group, roles.ground, ground);
         }
     }

@@ -151,6 +151,7 @@ TEST_F(ValueStatesTest, AMarkStaysWithTheNextLanguageAndSaysItThere) {
     startShipped();
     openSession();
     withoutInstrument([this] { click("Pre_opt_2"); });
+    EXPECT_EQ(find("Pre_opt_2")->palette().color(find("Pre_opt_2")->backgroundRole()), QColor(0xFF, 0xF8, 0xD0));
     action("Mnu_Info_Sprache_E")->trigger();
     EXPECT_EQ(stateOf("Pre_opt_2"), "ungesendet");
     EXPECT_TRUE(find("Pre_opt_2")->toolTip().startsWith(QStringLiteral("Has not reached the instrument.\n")));
