@@ -41,4 +41,9 @@ void AfListView::show(std::string_view listText) {
     FillAfLists(*m_list, *m_tuned, listText);
 }
 
+void AfListView::mark(const Judgement& judgement) {
+    showJudgement(*m_list, judgement);
+    showJudgement(*m_tuned, judgement);
+}
+
 }  // namespace kdx

@@ -8,6 +8,7 @@
 #include "af/aflist.h"
 #include "ui/caption.h"
 #include "ui/controls.h"
+#include "ui/valuestate.h"
 
 class QBoxLayout;
 
@@ -31,6 +32,8 @@ public:
     void chooseStored(std::string_view number);
     /// Shows a list text; one without AFs leaves what was shown before.
     void show(std::string_view listText);
+    /// Says of the list that is shown what is to be said.
+    void mark(const Judgement& judgement);
 
     [[nodiscard]] OptionArray<kAfLists>& options() { return m_options; }
     [[nodiscard]] QListWidget* list() const { return m_list; }

@@ -5,6 +5,7 @@
 #include "af/settings.h"
 #include "settings/programstate.h"
 #include "ui/dialogs.h"
+#include "ui/keymarks.h"
 #include "ui/layouts.h"
 
 namespace kdx {
@@ -23,6 +24,8 @@ void AfPage::create() {
 
     m_view.createOptions("AFList_Opt", 74, m_book, m_choice);
     m_view.options().onClick(this, &AfPage::AFList_Opt_Click);
+    for (const Setting& list : setting::kAfLists)
+        m_with.marks.watch(list.sendKey, this, [this](const Judgement&) { showMarks(); });
     AF_Bearbeiten = clicked<QPushButton>("AF_Bearbeiten", {72}, m_choice, &AfPage::AF_Bearbeiten_Click);
     m_view.createContent(named<QLabel>("AF_TN", m_shown), {443, "Sendefrequenz [MHz]"}, "AF_List1", {444, "AF [MHz]"},
                          m_book);
@@ -69,6 +72,12 @@ void AfPage::Taste_AF_Senden_Click() {
     Steps steps;
     m_lists.appendSteps(steps);
     send(steps);
+    judgeLists();  // not all may have gone out
+}
+
+void AfPage::AFMethod_opt_Click(int index) {
+    m_lists.method = index == 1 ? AfMethod::B : AfMethod::A;
+    judgeLists();
 }
 
 void AfPage::stepGoesOut(const Step& step) {
@@ -91,6 +100,36 @@ void AfPage::refuse(int number) {
 void AfPage::showList(int index) {
     m_lists.load(m_with.profile);
     m_view.show(m_lists.lists.at(static_cast<std::size_t>(index)));
+    judgeLists();
+}
+
+void AfPage::judgeLists() {
+    for (std::size_t i = 0; i < m_lists.lists.size(); ++i) {
+        const std::string& list = m_lists.lists[i];
+        const char* const key = setting::kAfLists.at(i).sendKey;
+        if (list.empty()) {
+            m_with.marks.forget(key);
+        } else {
+            m_with.marks.shows(key, afValue(list, static_cast<int>(i) + 1, m_lists.method).value_or(list));
+        }
+    }
+    showMarks();
+}
+
+void AfPage::showMarks() {
+    const int chosen = m_view.options().chosen();
+    m_view.mark(chosen < 0 ? Judgement{}
+                           : m_with.marks.judge(setting::kAfLists.at(static_cast<std::size_t>(chosen)).sendKey));
+    // The coder knows the method by the lists alone: by those it has.
+    for (std::size_t i = 0; i < m_lists.lists.size(); ++i) {
+        const auto value = afValue(m_lists.lists[i], static_cast<int>(i) + 1, m_lists.method);
+        if (value && m_with.marks.has(setting::kAfLists.at(i).sendKey, *value)) m_sentMethod = m_lists.method;
+    }
+    const Judgement method = m_lists.method == m_sentMethod
+                                 ? Judgement{}
+                                 : Judgement{ValueState::Unsent, caption({857, "Noch nicht gesendet."})};
+    for (std::size_t i = 0; i < AFMethod_opt.size(); ++i)
+        showJudgement(*AFMethod_opt[i], static_cast<int>(i) == AFMethod_opt.chosen() ? method : Judgement{});
 }
 
 }  // namespace kdx

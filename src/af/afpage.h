@@ -36,13 +36,17 @@ private:
     void arrange();
     void AFList_Opt_Click(int index);
     void AF_Bearbeiten_Click();
-    void AFMethod_opt_Click(int index) { m_lists.method = index == 1 ? AfMethod::B : AfMethod::A; }
+    void AFMethod_opt_Click(int index);
     void Taste_AF_Senden_Click();
     void showList(int index);
     void refuse(int number);
+    /// Whether the lists, as they would be sent now, are those that were.
+    void judgeLists();
+    void showMarks();
 
     AfListSet& m_lists;
     std::function<void()> m_openEditor;
+    AfMethod m_sentMethod = AfMethod::A;  ///< of the lists in force
 
     QGroupBox* Frame2 = nullptr;
     AfListView m_view;  // AFList_Opt, AF_TN, AF_List1

@@ -10,6 +10,7 @@
 #include "settings/storedvalue.h"
 #include "settings/withoutcontrols.h"
 #include "ui/dialogs.h"
+#include "ui/keymarks.h"
 #include "ui/layouts.h"
 #include "ui/pictureswitch.h"
 #include "ui/sententry.h"
@@ -82,6 +83,9 @@ void EonPage::createProgramme() {
     EON_TA_Schalter = wired<PictureSwitch>("EON_TA_Schalter", &PictureSwitch::clicked, &EonPage::EON_TA_Schalter_Click,
                                            m_with.data, m_programme);
     m_book.tip(EON_TA_Schalter, {487, "Gibt den Start EON"});
+    m_with.marks.add(setting::kEonType, EON_PTY_Combo);
+    m_with.marks.add(setting::kEonTp.sendKey, EON_TP_Check);
+    m_with.marks.add(setting::kEonTa.sendKey, EON_TA_Schalter);
     EON_TA_Label = heading("EON_TA_Label", {486, "EON TA"}, EON_TA_Schalter);
     EON_TA_Zeit = timer("EON_TA_Zeit", kAnnouncementMs, &EonPage::EON_TA_Zeit_Timer);
 }
@@ -90,6 +94,8 @@ void EonPage::createLists() {
     Frame3 = captioned<QGroupBox>("Frame3", {87}, this);
     m_view.createOptions("EON_AFB_Opt", 88, m_book, Frame3);
     m_view.options().onClick(this, &EonPage::EON_AFB_Opt_Click);
+    for (const Setting& list : setting::kEonAfLists)
+        m_with.marks.watch(list.sendKey, this, [this](const Judgement&) { markList(); });
     EON_AF_Bearbeiten = clicked<QPushButton>("EON_AF_Bearbeiten", {89}, Frame3, &EonPage::EON_AF_Bearbeiten_Click);
     m_view.createContent(named<QLabel>("Tuned_AFB", Frame3), {488, "Sendefrequenz [MHz]"}, "AFB_Liste",
                          {489, "AF [MHz]"}, m_book);
@@ -148,6 +154,9 @@ void EonPage::showDataSet() {
     // Still led by the old network's identifier; nothing else would end what was announced there.
     if (EON_TA_Zeit->isEnabled()) m_with.params.SendParam(setting::kEonTa.sendKey, "0");
     EonPage::load();
+    m_with.marks.shows(setting::kEonType, m_network.pty);
+    m_with.marks.shows(setting::kEonTp.sendKey, m_network.tp);
+    m_with.marks.forget(setting::kEonTa.sendKey);
 }
 
 /// Every EON command is led by the program-wide identifier, which is this network's PI always.
@@ -168,7 +177,16 @@ void EonPage::EON_PI_Taste_Click() {
     m_with.params.SendParam(setting::kEonRemoval, firstNetwork(m_with.instrument.X4_Abfrage(label, key)));
     m_with.params.SendParam(setting::kEonPi.sendKey, m_network.pi);
     EON_PI_Text->wentOut(m_network.pi);
+    forgetNetwork();
+    if (m_network.tp == "1") m_with.marks.shows(setting::kEonTp.sendKey, m_network.tp);
+    judgeLists();
+}
+
+void EonPage::forgetNetwork() {
     EON_PS_Text->forget();
+    for (const char* key : {setting::kEonType, setting::kEonTp.sendKey, setting::kEonTa.sendKey})
+        m_with.marks.forget(key);
+    for (const Setting& list : setting::kEonAfLists) m_with.marks.forget(list.sendKey);
 }
 
 void EonPage::EON_PS_Text_Change() {
@@ -185,7 +203,7 @@ void EonPage::EON_PS_Taste_Click() {
 void EonPage::stepGoesOut(const Step& step) {
     if (step.key == setting::kEonPi.sendKey) {
         EON_PI_Text->goesOut(step.value);
-        EON_PS_Text->forget();  // the network is a new one to the coder: it has no name there
+        forgetNetwork();
     } else if (step.key == setting::kEonPs.sendKey) {
         EON_PS_Text->goesOut(step.value);
     }
@@ -201,6 +219,7 @@ void EonPage::EON_PTY_Combo_Change() {
     m_network.pty = corrected ? std::to_string(EON_PTY_Combo->currentIndex()) : toBytes(EON_PTY_Combo->currentText());
     m_with.profile.write(setting::kEonPty.place, m_network.pty);
     m_with.params.SendParam(corrected ? setting::kEonType : setting::kEonPty.sendKey, m_network.pty);
+    if (!corrected) m_with.marks.sentUnder(setting::kEonPty.sendKey, setting::kEonType);
 }
 
 void EonPage::EON_TP_Check_Click() {
@@ -258,6 +277,25 @@ void EonPage::EON_TA_Zeit_Timer() {
 void EonPage::EON_AFB_Opt_Click(int index) {
     m_network.loadLists(m_with.profile);
     m_view.show(m_network.lists.at(static_cast<std::size_t>(index)));
+    judgeLists();
+}
+
+void EonPage::judgeLists() {
+    for (std::size_t i = 0; i < m_network.lists.size(); ++i) {
+        const std::string& list = m_network.lists[i];
+        const char* const key = setting::kEonAfLists.at(i).sendKey;
+        if (list.empty()) {
+            m_with.marks.forget(key);
+        } else {
+            m_with.marks.shows(key, newOrFurtherList(static_cast<int>(i) + 1) + list);
+        }
+    }
+    markList();
+}
+
+void EonPage::markList() {
+    const int chosen = m_view.options().chosen();
+    if (chosen >= 0) m_view.mark(m_with.marks.judge(setting::kEonAfLists.at(static_cast<std::size_t>(chosen)).sendKey));
 }
 
 void EonPage::EON_AF_Bearbeiten_Click() {
@@ -271,6 +309,7 @@ void EonPage::EON_AFB_Senden_Click() {
     Steps steps;
     m_network.appendListSteps(steps);
     send(steps);
+    judgeLists();  // not all may have gone out
 }
 
 }  // namespace kdx

@@ -60,6 +60,11 @@ private:
     [[nodiscard]] bool mayAnnounce();
     void setAnnouncing(bool on);
     void showStoredProgrammeType();
+    /// The coder has the network anew: nothing of it but its PI.
+    void forgetNetwork();
+    /// Whether the lists are those that were sent.
+    void judgeLists();
+    void markList();
 
     OtherNetwork& m_network;
     std::function<void()> m_openEditor;

@@ -293,9 +293,14 @@ void ParamSender::SendParam(const std::string& key, std::string& value, const st
         m_endProgram();
         return;
     }
+    if (const auto command = compose(key, value)) sendCommand(key, *command);
+}
+
+std::optional<std::string> ParamSender::compose(const std::string& key, std::string& value) const {
     const ParamContext context{m_state.eonIdentifier, m_state.shownClock, timeText(m_clock), dateText(m_clock.today())};
-    const std::optional<std::string> command = composeCommand(key, value, context);
-    if (command) sendCommand(key, m_state.corrections.quotes ? quotesDoubled(*command) : *command);
+    std::optional<std::string> command = composeCommand(key, value, context);
+    if (command && m_state.corrections.quotes) command = quotesDoubled(*command);
+    return command;
 }
 
 void ParamSender::sendCommand(const std::string& key, const std::string& command) {
@@ -307,6 +312,7 @@ void ParamSender::sendCommand(const std::string& key, const std::string& command
     if (m_instrument.isSequenceStopped()) return;  // in the pause
     if (m_composed) m_composed(command);
     m_instrument.Send2Gen(command);
+    if (m_written && m_state.InstrumentOnline) m_written(key, command, m_instrument.LastVisaStatus >= 0);
 }
 
 void ParamSender::noteQuotes(const std::string& key, std::string_view command) {

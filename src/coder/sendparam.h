@@ -64,6 +64,9 @@ public:
     /// The same for a value that nobody keeps.
     void SendParam(const std::string& key, std::string&& value);
 
+    /// The command that SendParam writes now for key and value; see composeCommand.
+    [[nodiscard]] std::optional<std::string> compose(const std::string& key, std::string& value) const;
+
     /// Logs a composed command under the key, waits 50 ms and writes it.
     void sendCommand(const std::string& key, const std::string& command);
 
@@ -71,6 +74,11 @@ public:
     [[nodiscard]] const std::set<std::string>& quotedKeys() const { return m_quotedKeys; }
     /// Hears of every command that is to be written, whether there is a session or not.
     void onComposed(std::function<void(const std::string& command)> callback) { m_composed = std::move(callback); }
+
+    /// Hears of every command that was written in a session, and whether it arrived as far as the link can tell.
+    void onWritten(std::function<void(const std::string& key, const std::string& command, bool arrived)> callback) {
+        m_written = std::move(callback);
+    }
 
     /// Called whenever quotedKeys() changes.
     void onQuotedKeysChanged(std::function<void()> callback) { m_quotedKeysChanged = std::move(callback); }
@@ -85,6 +93,7 @@ private:
     std::set<std::string> m_quotedKeys;
     std::function<void()> m_quotedKeysChanged;
     std::function<void(const std::string&)> m_composed;
+    std::function<void(const std::string&, const std::string&, bool)> m_written;
 };
 
 }  // namespace kdx

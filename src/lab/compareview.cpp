@@ -17,6 +17,7 @@
 #include "settings/programstate.h"
 #include "settings/storedvalue.h"
 #include "station/station.h"
+#include "ui/keymarks.h"
 #include "ui/layouts.h"
 #include "ui/statusrow.h"
 #include "ui/text.h"
@@ -121,7 +122,9 @@ void CompareView::Vergleich_Senden_Click() {
 void CompareView::Vergleich_Uebernehmen_Click() {
     if (m_present.empty()) read();
     compare();
-    const std::size_t left = takeOver(chosen(), m_with.profile);
+    const std::vector<SettingSideBySide> taken = chosen();
+    const std::size_t left = takeOver(taken, m_with.profile);
+    for (const SettingSideBySide& setting : taken) m_with.marks.forget(setting.key);
     emit takenOver();
     compare();
     if (left == 0) return;

@@ -13,6 +13,7 @@
 #include "settings/withoutcontrols.h"
 #include "ui/dialogs.h"
 #include "ui/entrycounter.h"
+#include "ui/keymarks.h"
 #include "ui/statusrow.h"
 #include "ui/tick.h"
 
@@ -40,6 +41,7 @@ void RdsPage::fillProgrammeTypes() {
     showProgrammeTypes(PTY_Combo1, setting::kPty.place);
     // The stored type of data set 1 is put in force, unless the user chose a set: its type is in force then.
     if (!m_with.state.dataSetChosen) m_programme.pty = std::to_string(PTY_Combo1->currentIndex());
+    m_with.marks.shows(setting::kPty.sendKey, m_programme.pty);
     showProgrammeType();
 }
 
@@ -61,6 +63,9 @@ void RdsPage::showDataSet() {
     m_with.status.show(StatusSlot::MusicSpeech, QString());
     m_with.status.show(StatusSlot::Pty, QString());
     showProgramme();
+    m_with.marks.shows(setting::kMusicSpeech.sendKey, m_programme.musicSpeech);
+    m_with.marks.shows(setting::kDecoderInfo.sendKey, m_programme.decoderInfo);
+    m_with.marks.shows(setting::kPty.sendKey, m_programme.pty);
 }
 
 void RdsPage::showProgramme() {
@@ -184,6 +189,7 @@ void RdsPage::Zeit_Taste_Click() {
     // Switching off sends nothing: the coder's clock runs on with the last time it was given.
     Timer1->setPeriod(kClockRepeatMs);
     showClock(caption({193}));
+    m_with.marks.forget(setting::kClock);
     m_clockShowsWord = true;
 }
 
@@ -212,7 +218,7 @@ void RdsPage::setTrafficProgramme(bool on) {
 
 void RdsPage::showTrafficProgramme(bool on) {
     m_shownTrafficProgramme = on;
-    m_with.status.show(StatusSlot::Tp, caption({on ? 192 : 193}));
+    m_with.status.show(StatusSlot::Tp, caption({on ? 192 : 193}), m_with.marks.judge(setting::kTrafficProgramme));
 }
 
 void RdsPage::showClock(const QString& text) {

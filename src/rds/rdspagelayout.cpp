@@ -7,6 +7,7 @@
 #include "rds/taframe.h"
 #include "settings/withoutcontrols.h"
 #include "ui/entrycounter.h"
+#include "ui/keymarks.h"
 #include "ui/layouts.h"
 
 namespace kdx {
@@ -18,6 +19,15 @@ RdsPage::RdsPage(const PageContext& with, Programme& programme, QWidget* parent)
       m_sentPty(with, setting::kPty.sendKey) {
     create();
     arrange();
+    KeyMarks& marks = m_with.marks;
+    marks.add(setting::kPty.sendKey, PTY_Combo1);
+    marks.add(setting::kTrafficProgramme, Check1);
+    marks.watch(setting::kTrafficProgramme, this, [this](const Judgement&) {
+        if (m_shownTrafficProgramme) showTrafficProgramme(*m_shownTrafficProgramme);
+    });
+    marks.add(setting::kMusicSpeech.sendKey, MS_opt);
+    marks.add(setting::kDecoderInfo.sendKey, DI_Opt);
+    marks.add(setting::kClock, Uhr_Zeit);
 }
 
 void RdsPage::create() {

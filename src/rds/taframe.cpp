@@ -7,6 +7,7 @@
 #include "rds/programme.h"
 #include "rds/settings.h"
 #include "ui/dialogs.h"
+#include "ui/keymarks.h"
 #include "ui/layouts.h"
 #include "ui/statusrow.h"
 #include "ui/tick.h"
@@ -33,6 +34,10 @@ void TaFrame::create() {
     Frame1 = captioned<QGroupBox>("Frame1", {47}, this);
     TA_Check = clicked<QCheckBox>("TA_Check", {381, "TA on / off"}, Frame1, &TaFrame::TA_Check_Click);
     TA_Check->setEnabled(false);
+    m_with.marks.add(setting::kAnnouncement, TA_Check);
+    m_with.marks.watch(setting::kAnnouncement, this, [this](const Judgement&) {
+        if (m_statusShown) showAnnouncing(m_announcing);
+    });
     TA_EON_Hilfe = clicked<QPushButton>("TA_EON_Hilfe", {385, "EON ?"}, Frame1, &TaFrame::TA_EON_Hilfe_Click);
     createOptions(TA_Option, "TA_Option", {{48}, {383, "&Automatisch"}}, Frame1, &TaFrame::TA_Option_Click);
     TA_Option.choose(0);
@@ -208,7 +213,7 @@ void TaFrame::showByHand(bool on) {
 void TaFrame::showAnnouncing(bool announcing) {
     m_statusShown = true;
     m_announcing = announcing;
-    m_with.status.show(StatusSlot::Ta, caption({announcing ? 192 : 193}));
+    m_with.status.show(StatusSlot::Ta, caption({announcing ? 192 : 193}), m_with.marks.judge(setting::kAnnouncement));
     m_with.status.setAnnouncing(announcing);
 }
 

@@ -2,6 +2,7 @@
 
 #include "coder/sendparam.h"
 #include "rds/settings.h"
+#include "ui/keymarks.h"
 #include "ui/layouts.h"
 
 namespace kdx {
@@ -24,6 +25,8 @@ TestMode::TestMode(const PageContext& with, QWidget* parent) : Page(with, parent
     m_book.tip(Taste_DATA_MODE, {421, "Zwischen RDS-Betrieb und Testmuster umschalten"});
     TestDat_Opt.create("TestDat_Opt", Frame11);
     TestDat_Opt.onClick(this, &TestMode::TestDat_Opt_Click);
+    m_with.marks.add(setting::kTestMode, Taste_DATA_MODE);
+    m_with.marks.add(setting::kTestPattern, TestDat_Opt);
     for (std::size_t i = 0; i < kPatterns.size(); ++i) TestDat_Opt[i]->setText(QString::fromLatin1(kPatterns[i]));
     // The coder starts in RDS mode, where a pattern command would be read as a change of mode.
     enablePatterns(false);

@@ -39,17 +39,21 @@ bool Transmitter::run(Steps steps) {
     const CommandSequence sequence(m_instrument);
     const Run running(*this);
     std::size_t number = 0;
-    for (std::size_t at = 0; at < steps.size() && !m_instrument.isSequenceStopped(); ++at) {
+    std::size_t at = 0;
+    for (; at < steps.size() && !m_instrument.isSequenceStopped(); ++at) {
         const Step step = steps[at];
         const bool sent = isSent(step);
         if (sent) ++number;
         if (m_watcher != nullptr) m_watcher->stepGoesOut(step, sent ? number : 0, sent ? countSent(steps) : 0);
+        const bool stopped = m_instrument.isSequenceStopped();  // meanwhile: the step itself is left out
         if (step.kind == Step::Kind::AskNetworks) {
             askNetworks(steps, at);
         } else {
             runStep(step);
         }
+        if (stopped) break;
     }
+    for (; at < steps.size() && m_watcher != nullptr; ++at) m_watcher->stepLeftOut(steps[at]);
     return !m_instrument.isSequenceStopped();
 }
 

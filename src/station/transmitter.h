@@ -16,6 +16,8 @@ public:
     virtual ~StepWatcher() = default;
     /// The step goes out now, as command `number` (from 1) of `total`; both 0 for a step that sends nothing.
     virtual void stepGoesOut(const Step& step, std::size_t number, std::size_t total) = 0;
+    /// The sequence was stopped before this step.
+    virtual void stepLeftOut(const Step& /*step*/) {}
     /// A question was answered: with the buffer as read, "Error" when the read failed.
     virtual void stepAnswered(const Step& step, const std::string& answer) = 0;
     /// The outermost sequence is over: sent, stopped, or ended by an exception.

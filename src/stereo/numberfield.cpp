@@ -5,7 +5,7 @@
 #include <cmath>
 
 #include "ui/caption.h"
-#include "ui/valuestate.h"
+#include "ui/keymarks.h"
 
 namespace kdx {
 
@@ -19,7 +19,7 @@ void keepSmall(QAbstractSpinBox* field, const QString& widest) {
 
 constexpr double kPerKilohertz = 100;  // tens of hertz
 
-void prepare(const PageContext& with, QAbstractSpinBox* field) {
+void prepare(const PageContext& with, QAbstractSpinBox* field, const char* key) {
     field->setLocale(QLocale::c());                        // a point, as everywhere in the window
     field->setButtonSymbols(QAbstractSpinBox::NoButtons);  // the bar has its own
     field->setAlignment(Qt::AlignRight);
@@ -27,8 +27,10 @@ void prepare(const PageContext& with, QAbstractSpinBox* field) {
     QObject::connect(entry, &QLineEdit::textEdited, field, [&with = with.captions, field] {
         showState(*field, ValueState::Unsent, captionText(with, {857, "Noch nicht gesendet."}));
     });
+    // Entered is not yet in force: that is what became of the command.
     QObject::connect(field, &QAbstractSpinBox::editingFinished, field,
-                     [field] { showState(*field, ValueState::InForce, {}); });
+                     [&marks = with.marks, key, field] { showJudgement(*field, marks.judge(key)); });
+    with.marks.add(key, field);
 }
 
 }  // namespace
@@ -44,8 +46,8 @@ QValidator::State KilohertzField::validate(QString& text, int& at) const {
     return QDoubleSpinBox::validate(text, at);
 }
 
-void tie(const PageContext& with, KilohertzField* field, SettingScrollBar* bar) {
-    prepare(with, field);
+void tie(const PageContext& with, KilohertzField* field, SettingScrollBar* bar, const char* key) {
+    prepare(with, field, key);
     field->setRange(bar->minimum() / kPerKilohertz, bar->maximum() / kPerKilohertz);
     field->setSingleStep(bar->singleStep() / kPerKilohertz);
     keepSmall(field, QString::number(field->maximum(), 'f', field->decimals()) + field->suffix());
@@ -54,8 +56,8 @@ void tie(const PageContext& with, KilohertzField* field, SettingScrollBar* bar) 
     });
 }
 
-void tie(const PageContext& with, QSpinBox* field, SettingScrollBar* bar) {
-    prepare(with, field);
+void tie(const PageContext& with, QSpinBox* field, SettingScrollBar* bar, const char* key) {
+    prepare(with, field, key);
     field->setKeyboardTracking(false);
     field->setSuffix(QStringLiteral(" °"));
     field->setRange(bar->minimum(), bar->maximum());
@@ -64,16 +66,16 @@ void tie(const PageContext& with, QSpinBox* field, SettingScrollBar* bar) {
     QObject::connect(field, &QSpinBox::valueChanged, bar, &QScrollBar::setValue);
 }
 
-void showQuietly(KilohertzField* field, int tensOfHertz) {
+void showQuietly(KilohertzField* field, int tensOfHertz, const Judgement& judgement) {
     const QSignalBlocker quiet(field);
     field->setValue(tensOfHertz / kPerKilohertz);
-    showState(*field, ValueState::InForce, {});
+    showJudgement(*field, judgement);
 }
 
-void showQuietly(QSpinBox* field, int degrees) {
+void showQuietly(QSpinBox* field, int degrees, const Judgement& judgement) {
     const QSignalBlocker quiet(field);
     field->setValue(degrees);
-    showState(*field, ValueState::InForce, {});
+    showJudgement(*field, judgement);
 }
 
 }  // namespace kdx

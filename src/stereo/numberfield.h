@@ -5,6 +5,7 @@
 
 #include "stereo/settingscrollbar.h"
 #include "ui/pagecontext.h"
+#include "ui/valuestate.h"
 
 namespace kdx {
 
@@ -18,12 +19,13 @@ public:
 
 /// Puts the field beside the bar in force: same range and step; what is entered moves the bar, which sends it. What is
 /// typed is marked until then.
-void tie(const PageContext& with, KilohertzField* field, SettingScrollBar* bar);
+/// @param key under which the bar's value goes out.
+void tie(const PageContext& with, KilohertzField* field, SettingScrollBar* bar, const char* key);
 /// The same for whole degrees.
-void tie(const PageContext& with, QSpinBox* field, SettingScrollBar* bar);
+void tie(const PageContext& with, QSpinBox* field, SettingScrollBar* bar, const char* key);
 
 /// Shows the bar's value, which counts tens of hertz.
-void showQuietly(KilohertzField* field, int tensOfHertz);
-void showQuietly(QSpinBox* field, int degrees);
+void showQuietly(KilohertzField* field, int tensOfHertz, const Judgement& judgement);
+void showQuietly(QSpinBox* field, int degrees, const Judgement& judgement);
 
 }  // namespace kdx

@@ -9,6 +9,7 @@
 #include "stereo/carrier.h"
 #include "stereo/steppedlabel.h"
 #include "ui/dialogs.h"
+#include "ui/keymarks.h"
 #include "ui/layouts.h"
 #include "ui/text.h"
 
@@ -38,6 +39,7 @@ void RfPage::create() {
     HfOnOffState = wired<PictureSwitch>("HfOnOffState", &PictureSwitch::clicked, &RfPage::HfOnOffState_Click,
                                         m_with.data, m_outputFrame);
     m_book.describe(HfOnOffState, {632, "HF-Ausgang ein / aus"});
+    m_with.marks.add(setting::kRfOutput, HfOnOffState);
 }
 
 void RfPage::createValue(Value& value, const char* name, const char* frame, const Caption& title,
@@ -48,6 +50,7 @@ void RfPage::createValue(Value& value, const char* name, const char* frame, cons
             [this, &value](int steps) { step(value, steps); });
     m_book.tip(value.label, {631, "Klicken, um einen neuen Wert einzugeben"});
     value.label->setText(kNothing);
+    m_with.marks.watch(value.setting.sendKey, this, [this, &value](const Judgement&) { showJudged(value); });
     value.label->setAlignment(Qt::AlignCenter);
     value.label->setMargin(2 * kGap);
     QFont font = value.label->font();
@@ -146,12 +149,19 @@ QString RfPage::checked(QString& answer, const std::string& lowest, const std::s
 
 void RfPage::showValue(const Value& value, const QString& text) {
     value.label->setText(text);
-    m_with.status.show(value.slot, text, judge(value));
+    showJudged(value);
+}
+
+void RfPage::showJudged(const Value& value) {
+    const QString shown = value.label->text();
+    if (shown != kNothing) m_with.status.show(value.slot, shown, judge(value));
     label();
 }
 
 Judgement RfPage::judge(const Value& value) const {
     if (value.label->text() == kNothing) return {};
+    const Judgement sent = m_with.marks.judge(value.setting.sendKey);
+    if (sent.state != ValueState::InForce) return sent;
     const QString why = whyRefused(m_with, value.setting.sendKey, value.label->text());
     return {why.isEmpty() ? ValueState::InForce : ValueState::Refused, why};
 }

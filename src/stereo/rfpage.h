@@ -53,6 +53,7 @@ private:
     [[nodiscard]] std::string highest(const Value& value) const;
     [[nodiscard]] QString checked(QString& answer, const std::string& lowest, const std::string& highest) const;
     void showValue(const Value& value, const QString& text);
+    void showJudged(const Value& value);
     [[nodiscard]] Judgement judge(const Value& value) const;
     void showOutput(bool on);
     [[nodiscard]] std::array<Value*, 3> values() {

@@ -6,6 +6,7 @@
 #include "settings/programstate.h"
 #include "settings/storedvalue.h"
 #include "stereo/numberfield.h"
+#include "ui/keymarks.h"
 #include "ui/text.h"
 
 namespace kdx {
@@ -77,12 +78,12 @@ void StereoPage::turn(const FlagSwitch& flag, bool on) {
 
 void StereoPage::showDeviation(const DeviationBar& bar, int tensOfHertz) {
     bar.label->setText(caption({21}) + QLatin1Char(' ') + toText(deviationText(bar.deviation, tensOfHertz)));
-    showQuietly(bar.number, tensOfHertz);
+    showQuietly(bar.number, tensOfHertz, m_with.marks.judge(bar.setting.sendKey));
 }
 
 void StereoPage::showPilotPhase(int degrees) {
     HScroll1_Label->setText(caption({340, "Phase"}) + QStringLiteral(" %1 °").arg(degrees));
-    showQuietly(HScroll1_Zahl, degrees);
+    showQuietly(HScroll1_Zahl, degrees, m_with.marks.judge(setting::kPilotPhase.sendKey));
 }
 
 std::array<DeviationBar*, 4> StereoPage::deviations() {

@@ -7,6 +7,7 @@
 
 #include "settings/storedvalue.h"
 #include "stereo/numberfield.h"
+#include "ui/keymarks.h"
 #include "ui/layouts.h"
 
 namespace kdx {
@@ -37,6 +38,10 @@ void StereoPage::create() {
     createFm();
     createStereo();
     createSubcarriers();
+    const auto mark = [this](const auto&... choice) {
+        (m_with.marks.add(choice.setting.sendKey, choice.options), ...);
+    };
+    mark(FM_Source_Opt, FM_Imp_Opt, Pre_opt, Stereo_Opt, ARI_Mode_Opt, BK_Opt);
     m_testMode->setParent(this);
     Btn_SetRdsStereo = captioned<QPushButton>("Btn_SetRdsStereo", {346, "&Alles senden"}, this);
     m_book.tip(Btn_SetRdsStereo, {347, "Den ganzen Datensatz an das Gerät senden"});
@@ -73,8 +78,10 @@ void StereoPage::createStereo() {
     HScroll1 = named<SettingScrollBar>("HScroll1", Frame_stereo);
     HScroll1->setScale(kLowestPilotPhase, kHighestPilotPhase, 1);
     setQuietly(HScroll1, storedPosition(m_multiplex.pilotPhase, kLowestPilotPhase, kHighestPilotPhase));
+    for (QWidget* control : std::initializer_list<QWidget*>{HScroll1, HScroll1_Label})
+        m_with.marks.add(setting::kPilotPhase.sendKey, control);
     m_book.describe(HScroll1, {350, "Pilottonphase"});
-    tie(m_with, HScroll1_Zahl, HScroll1);
+    tie(m_with, HScroll1_Zahl, HScroll1, setting::kPilotPhase.sendKey);
     m_book.describe(HScroll1_Zahl, {350, "Pilottonphase"});
     connect(HScroll1, &QScrollBar::sliderMoved, this, &StereoPage::showPilotPhase);
     connect(HScroll1, &QScrollBar::valueChanged, this, &StereoPage::HScroll1_Change);
@@ -109,7 +116,10 @@ void StereoPage::createDeviation(DeviationBar& bar, const char* scroll, const ch
     bar.scroll = named<SettingScrollBar>(scroll, frame);
     bar.scroll->setScale(0, bar.deviation.highest, bar.deviation.step);
     m_book.describe(bar.scroll, spoken);
-    tie(m_with, bar.number, bar.scroll);
+    const char* const key = bar.setting.sendKey;
+    tie(m_with, bar.number, bar.scroll, key);
+    m_with.marks.add(key, bar.scroll);
+    m_with.marks.add(key, bar.label);
     m_book.describe(bar.number, spoken);
     connect(bar.scroll, &QScrollBar::sliderMoved, this,
             [this, &bar](int tensOfHertz) { showDeviation(bar, tensOfHertz); });
@@ -120,6 +130,7 @@ void StereoPage::createSwitch(FlagSwitch& flag, const char* name, const Caption&
                               void (StereoPage::*handler)()) {
     flag.button = wired<PictureSwitch>(name, &PictureSwitch::clicked, handler, m_with.data, frame);
     m_book.describe(flag.button, spoken);
+    m_with.marks.add(flag.setting.sendKey, flag.button);
 }
 
 void StereoPage::arrange() {

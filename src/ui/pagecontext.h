@@ -7,6 +7,7 @@ class Clock;
 class DataFolder;
 class Dialogs;
 class Instrument;
+class KeyMarks;
 class ParamSender;
 class Profile;
 class StatusRow;
@@ -25,6 +26,7 @@ struct PageContext {
     DataFolder& data;
     Clock& clock;
     TickerGroup& tickers;
+    KeyMarks& marks;
 };
 
 }  // namespace kdx

@@ -91,6 +91,10 @@ void PictureSwitch::paintEvent(QPaintEvent* /*event*/) {
     } else {
         painter.drawPixmap(place, m_picture);
     }
+    if (!property("zustand").toString().isEmpty()) {  // the picture hides the ground that tells it elsewhere
+        painter.setPen(QPen(QColor(0xC0, 0x60, 0), 2));
+        painter.drawRect(rect().adjusted(1, 1, -1, -1));
+    }
     painter.end();
     paintFocus(*this);
 }

@@ -1,7 +1,11 @@
 #include "ui/valuestate.h"
 
+#include <QAbstractButton>
+#include <QComboBox>
 #include <QLabel>
 #include <QPalette>
+#include <QPushButton>
+#include <QScrollBar>
 #include <QVariant>
 #include <QWidget>
 
@@ -36,12 +40,27 @@ const char* nameOf(ValueState state) {
     return "";
 }
 
+struct Roles {
+    QPalette::ColorRole letters, ground;
+    bool onParent = false;  ///< has no ground of its own as long as it is in force
+};
+
+Roles rolesOf(const QWidget& control) {
+    if (qobject_cast<const QLabel*>(&control) != nullptr) return {QPalette::WindowText, QPalette::Window};
+    if (qobject_cast<const QAbstractButton*>(&control) != nullptr)
+        return {QPalette::ButtonText, QPalette::Button, qobject_cast<const QPushButton*>(&control) == nullptr};
+    if (qobject_cast<const QComboBox*>(&control) != nullptr || qobject_cast<const QScrollBar*>(&control) != nullptr)
+        return {QPalette::ButtonText, QPalette::Button};
+    return {QPalette::Text, QPalette::Base};
+}
+
 /// Text and ground together, so that they go with each other whatever the theme. Controls that cannot be used keep the
 /// look of those.
 void colour(QWidget& control, ValueState state) {
     QPalette palette;
     palette.setResolveMask(0);  // nothing of its own: what it has from its parents
     const bool label = qobject_cast<QLabel*>(&control) != nullptr;
+    const Roles roles = rolesOf(control);
     if (state == ValueState::Unsent && label) {
         const QColor grey = palette.color(QPalette::Disabled, QPalette::WindowText);
         palette.setColor(QPalette::WindowText, grey);
@@ -50,10 +69,12 @@ void colour(QWidget& control, ValueState state) {
         const QColor letters = refused ? QColor(Qt::red) : QColor(Qt::black);
         const QColor ground = refused ? QColor(0xFF, 0xF4, 0xF2) : QColor(0xFF, 0xF8, 0xD0);
         for (const auto group : {QPalette::Active, QPalette::Inactive}) {
-            palette.setColor(group, label ? QPalette::WindowText : QPalette::Text, letters);
-            palette.setColor(group, label ? QPalette::Window : QPalette::Base, ground);
+            palette.setColor(group, roles.letters, letters);
+            if (roles.onParent) palette.setColor(group, QPalette::WindowText, letters);  // beside an indicator
+            palette.setColor(group, roles.ground, ground);
         }
     }
+    if (roles.onParent) control.setAutoFillBackground(state != ValueState::InForce);
     control.setPalette(palette);
 }
 
@@ -93,6 +114,11 @@ void showState(QWidget& control, ValueState state, const QString& tip) {
     control.setProperty("zustand", QString::fromLatin1(nameOf(state)));
     colour(control, state);
     control.update();
+}
+
+void showJudgement(QWidget& control, const Judgement& judgement) {
+    if (judgement.state == ValueState::InForce && !control.property("zustand").isValid()) return;
+    showState(control, judgement.state, judgement.tip);
 }
 
 void showWarning(QWidget& control, const QString& tip) {

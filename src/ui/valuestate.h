@@ -27,13 +27,16 @@ void setOwnTip(QWidget& control, const QString& tip);
 /// Shows by the looks of a refused value what is wrong with one before it is sent; with "" nothing is.
 void showWarning(QWidget& control, const QString& tip);
 
-/// Why the coder does not take the entry for the key, in the current language; "" when it does.
-[[nodiscard]] QString whyRefused(const PageContext& with, const char* key, const QString& entry);
-
 /// A value with what is to be said about it.
 struct Judgement {
     ValueState state = ValueState::InForce;
     QString tip = {};
 };
+
+/// Shows what is to be said of a control's value; of one that never had a state nothing is.
+void showJudgement(QWidget& control, const Judgement& judgement);
+
+/// Why the coder does not take the entry for the key, in the current language; "" when it does.
+[[nodiscard]] QString whyRefused(const PageContext& with, const char* key, const QString& entry);
 
 }  // namespace kdx

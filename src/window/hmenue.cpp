@@ -52,11 +52,20 @@ constexpr std::chrono::seconds kRetryInterval{10};  // until what could not be s
 }  // namespace
 
 HMenue::HMenue(const Surroundings& surroundings)
-    : m_s(surroundings), m_status(new StatusRow(this)), m_context{m_s.session.params,  m_s.session.instrument,
-                                                                  m_s.session.profile, m_s.state,
-                                                                  *m_status,           m_s.captions,
-                                                                  m_s.dialogs,         m_s.data,
-                                                                  m_s.clock,           m_s.tickers} {
+    : m_s(surroundings),
+      m_status(new StatusRow(this)),
+      m_marks(m_s.session.params, m_s.session.instrument, m_s.state, m_s.captions),
+      m_context{m_s.session.params,
+                m_s.session.instrument,
+                m_s.session.profile,
+                m_s.state,
+                *m_status,
+                m_s.captions,
+                m_s.dialogs,
+                m_s.data,
+                m_s.clock,
+                m_s.tickers,
+                m_marks} {
     setObjectName(QStringLiteral("HMenue"));
     setWindowIcon(QPixmap(QStringLiteral(":/kdx-rds-64.png")));  // read once for all that show it
     m_views = std::make_unique<Views>(m_context, m_s.session, this, [this] {
@@ -226,6 +235,7 @@ void HMenue::Beschrifter() {
     m_waysOut->label();
     for (Page* page : m_pages) page->label();
     m_views->label();
+    m_marks.refresh();
     m_desktop->showTips();
     showNotice();
 }
@@ -265,6 +275,10 @@ void HMenue::stepGoesOut(const Step& step, std::size_t number, std::size_t total
     if (step.kind == Step::Kind::Refused) m_s.tickers.setHeld(true);
     for (Page* page : m_pages) page->stepGoesOut(step);
     if (step.kind == Step::Kind::Refused) m_s.tickers.setHeld(false);
+}
+
+void HMenue::stepLeftOut(const Step& step) {
+    if (!m_views->scenarioSends()) m_marks.leftOut(step.key, step.value);
 }
 
 void HMenue::stepAnswered(const Step& step, const std::string& answer) {

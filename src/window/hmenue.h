@@ -6,6 +6,7 @@
 #include <vector>
 
 #include "station/session.h"
+#include "ui/keymarks.h"
 #include "ui/pagecontext.h"
 #include "window/stepoutcome.h"
 #include "window/surroundings.h"
@@ -55,6 +56,7 @@ protected:
 
 private:
     void stepGoesOut(const Step& step, std::size_t number, std::size_t total) override;
+    void stepLeftOut(const Step& step) override;
     void stepAnswered(const Step& step, const std::string& answer) override;
     void stepsEnded() override;
 
@@ -70,6 +72,7 @@ private:
 
     Surroundings m_s;
     StatusRow* m_status;
+    KeyMarks m_marks;
     PageContext m_context;
     ConnectionBar* m_connection = nullptr;
     QGroupBox* Frame7 = nullptr;  // the parameter controls

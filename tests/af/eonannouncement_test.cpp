@@ -172,7 +172,7 @@ public:
 TEST_F(EonPageTest, ATickWhileARefusalIsOpenOpensNoSecondBox) {
     SlowDialogs slow;
     slow.whileOpen = [this] { tick("EON_TA_Zeit"); };
-    makePage({params, instrument, settings, state, statusRow, captions, slow, data, clock, tickers});
+    makePage({params, instrument, settings, state, statusRow, captions, slow, data, clock, tickers, marks});
     load();
     click("EON_TA_Schalter");
     indicate("ein", "ein");

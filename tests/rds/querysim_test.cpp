@@ -49,7 +49,7 @@ protected:
     sim::SimVisa library{device};
     Instrument link{library, state, data, captions, clock};
     ParamSender dispatcher{link, state, clock, [] {}};
-    PageContext simulated{dispatcher, link, settings, state, statusRow, captions, dialogs, data, clock, tickers};
+    PageContext simulated{dispatcher, link, settings, state, statusRow, captions, dialogs, data, clock, tickers, marks};
     QueryPage page{simulated, nullptr};
 };
 

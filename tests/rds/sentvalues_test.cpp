@@ -6,7 +6,6 @@ namespace {
 /// What the page and the status row tell of a value: is it the one that the instrument has?
 class SentValuesTest : public RdsPageTest {
 protected:
-    std::string stateOf(const char* name) { return find(name)->property("zustand").toString().toStdString(); }
     std::string tipOf(const char* name) { return find(name)->toolTip().toStdString(); }
     QLabel* slot(int number) { return statusRow.findChild<QLabel*>(QStringLiteral("Status_%1").arg(number)); }
     std::string statusState(int number) { return slot(number)->property("zustand").toString().toStdString(); }

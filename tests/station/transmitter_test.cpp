@@ -19,6 +19,7 @@ public:
                         std::to_string(m_visa.written.size()));
         if (onStep) onStep(step);
     }
+    void stepLeftOut(const Step& step) override { heard.push_back("left out " + step.key); }
     void stepAnswered(const Step& /*step*/, const std::string& answer) override {
         heard.push_back("answer " + answer.substr(0, answer.find('\n')));
     }
@@ -93,6 +94,21 @@ TEST_F(TransmitterTest, CanBeStoppedFromOutside) {
     EXPECT_FALSE(transmitter.run({parameter("TA", "1"), parameter("TA", "2"), parameter("TA", "3")}));
     EXPECT_EQ(sent(), Lines{direct("TA=1")});
     EXPECT_EQ(recorder.heard.back(), "end");
+}
+
+TEST_F(TransmitterTest, ReportsWhatAStopLeavesOut) {
+    const Steps steps = {parameter("TA", "1"), parameter("TP", "1"), parameter("MS", "M")};
+    recorder.onStep = [this](const Step& step) {
+        if (step.key == "TP") transmitter.stop();
+    };
+    EXPECT_FALSE(transmitter.run(steps));
+    EXPECT_EQ(recorder.heard, (Lines{"TA 1/3 after 0", "TP 2/3 after 1", "left out TP", "left out MS", "end"}));
+    recorder.heard.clear();
+    recorder.onStep = nullptr;
+    visa.writeStatus = visa::kTimeout;
+    stopAtFailure = true;
+    EXPECT_FALSE(transmitter.run(steps));
+    EXPECT_EQ(recorder.heard, (Lines{"TA 1/3 after 1", "left out TP", "left out MS", "end"}));
 }
 
 TEST_F(TransmitterTest, ClosingClosesTheSessionAndCountsAsNoCommand) {

@@ -17,7 +17,6 @@ protected:
         entry->selectAll();
         entry->insert(QString::fromLatin1(number));
     }
-    std::string stateOf(const char* name) { return find(name)->property("zustand").toString().toStdString(); }
 };
 
 TEST_F(NumberFieldTest, HasTheRangeAndTheStepOfItsBar) {

@@ -96,6 +96,29 @@ TEST_F(RfPageTest, AStepStaysWithinTheLimitsAndStartsFromWhatIsKept) {
     EXPECT_EQ(profile(kSet1, "VRN", "HF_Frequenz"), "98.7");
 }
 
+TEST_F(RfPageTest, AValueThatDidNotArriveIsMarkedUntilItDoes) {
+    sendSequence();
+    const struct {
+        const char* label;
+        StatusSlot slot;
+    } rows[] = {{"Input_HF_Freq_Label", StatusSlot::RfFrequency},
+                {"Input_HF_Pegel_Label", StatusSlot::RfLevel},
+                {"Input_AF_Freq_Label", StatusSlot::AudioFrequency}};
+    for (const auto& row : rows) {
+        inVain([&] { press(row.label, Qt::Key_Up); });
+        EXPECT_EQ(stateOf(row.label), "ungesendet") << row.label;
+        EXPECT_EQ(stateOf(row.slot), "ungesendet") << row.label;
+        EXPECT_TRUE(find(row.label)->toolTip().startsWith(QStringLiteral("Nicht beim Gerät angekommen.")));
+        press(row.label, Qt::Key_Up);
+        EXPECT_EQ(stateOf(row.label), "") << row.label;
+        EXPECT_EQ(stateOf(row.slot), "") << row.label;
+    }
+    inVain([&] { click("HfOnOffState"); });
+    EXPECT_EQ(stateOf("HfOnOffState"), "ungesendet");
+    click("HfOnOffState");
+    EXPECT_EQ(stateOf("HfOnOffState"), "");
+}
+
 TEST_F(RfPageTest, AFrequencyIsAskedForShownAndSent) {
     answer({"101.2"});
     clickLabel("Input_HF_Freq_Label");

@@ -17,6 +17,7 @@
 #include "settings/profilefile.h"
 #include "support/linkfixture.h"
 #include "support/scripteddialogs.h"
+#include "ui/keymarks.h"
 #include "ui/pagecontext.h"
 #include "ui/statusrow.h"
 #include "ui/text.h"
@@ -63,6 +64,8 @@ protected:
         }
     }
     bool checked(const char* name) { return find<QAbstractButton>(name)->isChecked(); }
+    /// What is said of the value that the control shows: "" when it is in force.
+    std::string stateOf(const char* name) { return find(name)->property("zustand").toString().toStdString(); }
     /// Whether the control itself may be used, a closed session left aside.
     bool enabled(const char* name) {
         auto* control = find(name);
@@ -102,11 +105,25 @@ protected:
         captions.load(language, standard);
     }
     std::string status(StatusSlot slot) const { return statusRow.text(slot).toStdString(); }
+    std::string stateOf(StatusSlot slot) const {
+        const auto name = QStringLiteral("Status_%1").arg(static_cast<int>(slot));
+        return statusRow.findChild<QLabel*>(name)->property("zustand").toString().toStdString();
+    }
+    using ControlTest::stateOf;
+    /// What is done while the instrument does not answer: one command, whose box is closed.
+    void inVain(const std::function<void()>& action) {
+        visa.writeStatus = visa::kTimeout;
+        dialogs.expectedMessages = 1;
+        action();
+        EXPECT_EQ(dialogs.expectedMessages, 0) << "nothing was sent";
+        visa.writeStatus = 0;
+    }
 
     StatusRow statusRow{nullptr};
     ScriptedDialogs dialogs;
     TickerGroup tickers;
-    PageContext context{params, instrument, settings, state, statusRow, captions, dialogs, data, clock, tickers};
+    KeyMarks marks{params, instrument, state, captions};
+    PageContext context{params, instrument, settings, state, statusRow, captions, dialogs, data, clock, tickers, marks};
 };
 
 }  // namespace kdx::test

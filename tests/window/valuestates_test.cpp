@@ -1,5 +1,8 @@
 #include <gtest/gtest.h>
 
+#include <functional>
+#include <vector>
+
 #include "support/windowtest.h"
 
 namespace kdx::test {
@@ -7,7 +10,16 @@ namespace {
 
 class ValueStatesTest : public WindowTest {
 protected:
-    std::string stateOf(const char* name) { return find(name)->property("zustand").toString().toStdString(); }
+    /// What is done while nothing reaches the instrument; the user goes on at every box, or stops at the first one.
+    void withoutInstrument(const std::function<void()>& action, bool stop = false) {
+        visa.writeStatus = visa::kTimeout;
+        dialogs.stopAtFailure = stop;
+        dialogs.expectedMessages = stop ? 1 : 1000;
+        action();
+        visa.writeStatus = 0;
+        dialogs.stopAtFailure = false;
+        dialogs.expectedMessages = 0;
+    }
 };
 
 TEST_F(ValueStatesTest, WhatSendingAllSentIsInForceAndShown) {
@@ -28,19 +40,41 @@ TEST_F(ValueStatesTest, WhatSendingAllSentIsInForceAndShown) {
 TEST_F(ValueStatesTest, WhatDidNotArriveInASequenceIsNotInForce) {
     startShipped();
     openSession();
-    // Everything fails, and the user goes on to the end.
-    visa.writeStatus = -1073807339;
-    dialogs.expectedMessages = 1000;
+    const std::vector<const char*> shown = {"Status_0",
+                                            "Status_1",
+                                            "Status_2",
+                                            "Status_3",
+                                            "Status_4",
+                                            "Status_10",
+                                            "Status_13",
+                                            "PS_T",
+                                            "PI_T",
+                                            "RT_Text1",
+                                            "PTY_Combo1",
+                                            "Check1",
+                                            "TA_Check",
+                                            "MS_opt_0",
+                                            "Label10",
+                                            "AF_List1",
+                                            "EON_PI_Text",
+                                            "EON_PS_Text",
+                                            "EON_TP_Check",
+                                            "EON_TA_Schalter",
+                                            "Pre_opt_1",
+                                            "HScroll1",
+                                            "HScroll1_Zahl",
+                                            "Pilot_OnOff",
+                                            "Pilot_Hub_Zahl",
+                                            "RDS_Hub_Scroll",
+                                            "RDS_OnOff",
+                                            "Ari_OnOff",
+                                            "Taste_DATA_MODE",
+                                            "Input_HF_Freq_Label",
+                                            "Status_17"};
+    withoutInstrument([this] { click("Btn_SetRdsStereo"); });
+    for (const char* name : shown) EXPECT_EQ(stateOf(name), "ungesendet") << name;
     click("Btn_SetRdsStereo");
-    dialogs.expectedMessages = 0;
-    for (const char* name : {"Status_1", "Status_2", "Status_3", "Status_4", "PS_T", "PI_T", "RT_Text1", "EON_PI_Text",
-                             "EON_PS_Text", "Label10"})
-        EXPECT_EQ(stateOf(name), "ungesendet") << name;
-    visa.writeStatus = 0;
-    click("Btn_SetRdsStereo");
-    for (const char* name : {"Status_1", "Status_2", "Status_3", "Status_4", "PS_T", "PI_T", "RT_Text1", "EON_PI_Text",
-                             "EON_PS_Text", "Label10"})
-        EXPECT_EQ(stateOf(name), "") << name;
+    for (const char* name : shown) EXPECT_EQ(stateOf(name), "") << name;
 }
 
 TEST_F(ValueStatesTest, ASequenceStoppedAtAStepLeavesThatStepUnsent) {
@@ -95,6 +129,61 @@ TEST_F(ValueStatesTest, TheMarksFollowTheLanguage) {
     action("Mnu_Info_Sprache_E")->trigger();
     EXPECT_EQ(find("PS_T")->toolTip().toStdString(),
               "Not sent yet.\nProgramme service name: what a radio shows, 8 characters at most");
+}
+
+TEST_F(ValueStatesTest, WhatAStoppedOpeningLeftOutIsNotInForce) {
+    startShipped();
+    visa.writeStatuses.assign(4, 0);  // the identification and the base state
+    withoutInstrument([this] { openSession(); }, true);
+    for (const char* name : {"FM_Hub_Zahl", "FM_Hub_Scroll", "FM_Source_Opt_3", "Pre_opt_1", "Pilot_OnOff", "AF_List1",
+                             "PTY_Combo1", "MS_opt_0", "EON_TP_Check", "HfOnOffState"})
+        EXPECT_EQ(stateOf(name), "ungesendet") << name;
+    EXPECT_TRUE(find("FM_Hub_Zahl")->toolTip().startsWith(QStringLiteral("Nicht beim Gerät angekommen.")));
+    EXPECT_TRUE(find("Pre_opt_1")->toolTip().startsWith(QStringLiteral("Noch nicht gesendet.")));
+    click("GTL_Taste");
+    openSession();
+    for (const char* name : {"FM_Hub_Zahl", "FM_Hub_Scroll", "FM_Source_Opt_3", "Pre_opt_1", "Pilot_OnOff", "AF_List1",
+                             "PTY_Combo1", "MS_opt_0", "EON_TP_Check", "HfOnOffState"})
+        EXPECT_EQ(stateOf(name), "") << name;
+}
+
+TEST_F(ValueStatesTest, AMarkStaysWithTheNextLanguageAndSaysItThere) {
+    startShipped();
+    openSession();
+    withoutInstrument([this] { click("Pre_opt_2"); });
+    EXPECT_EQ(find("Pre_opt_2")->palette().color(find("Pre_opt_2")->backgroundRole()), QColor(0xFF, 0xF8, 0xD0));
+    action("Mnu_Info_Sprache_E")->trigger();
+    EXPECT_EQ(stateOf("Pre_opt_2"), "ungesendet");
+    EXPECT_TRUE(find("Pre_opt_2")->toolTip().startsWith(QStringLiteral("Has not reached the instrument.\n")));
+    click("Pre_opt_2");
+    EXPECT_EQ(stateOf("Pre_opt_2"), "");
+    EXPECT_FALSE(find("Pre_opt_2")->toolTip().isEmpty());
+    EXPECT_FALSE(find("Pre_opt_2")->toolTip().contains(QStringLiteral("instrument.\n")));
+}
+
+TEST_F(ValueStatesTest, AnotherDataSetIsNotInForceBeforeItIsSent) {
+    startShipped();
+    openSession();
+    dialogs.confirmations = {false};
+    action("Mnu_Datensatz_3")->trigger();
+    for (const char* name : {"PS_T", "PTY_Combo1", "DI_Opt_3", "AF_List1", "EON_PI_Text"})
+        EXPECT_EQ(stateOf(name), "ungesendet") << name;
+    EXPECT_EQ(stateOf("FM_Hub_Zahl"), "") << "belongs to no set";
+    click("Btn_SetRdsStereo");
+    for (const char* name : {"PS_T", "PTY_Combo1", "AF_List1", "EON_PI_Text"}) EXPECT_EQ(stateOf(name), "") << name;
+    EXPECT_EQ(stateOf("DI_Opt_3"), "ungesendet") << "a whole data set leaves it out";
+    click("DI_Opt_3");
+    EXPECT_EQ(stateOf("DI_Opt_3"), "");
+}
+
+TEST_F(ValueStatesTest, NothingThatWasSentIsMarkedAfterAnOpening) {
+    startShipped();
+    openSession();
+    for (const QWidget* control : window->findChildren<QWidget*>()) {
+        // There is no code of a message that nobody has chosen.
+        if (control->objectName() == QStringLiteral("TMC_Gr8_Label")) continue;
+        EXPECT_EQ(control->property("zustand").toString().toStdString(), "") << control->objectName().toStdString();
+    }
 }
 
 }  // namespace
