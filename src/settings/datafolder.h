@@ -41,8 +41,7 @@ public:
     /// One value; "" when the key, the section or the file is missing, unreadable or the value is empty. Values are
     /// cut at 254 characters. Never creates a file, never throws.
     [[nodiscard]] std::string ReadIni(std::string_view section, std::string_view key, std::string_view fileName) const;
-    /// All settings of a file as they are now, values that could not be written yet included; nothing when it is
-    /// missing or cannot be read.
+    /// All settings of a file as they are now, unwritten ones included; nothing when it is missing or cannot be read.
     [[nodiscard]] std::shared_ptr<const ProfileText> profile(std::string_view fileName) const;
 
     /// Writes one key at once; creates the file and the section if needed. A failure changes nothing on disk, throws

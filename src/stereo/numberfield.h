@@ -14,6 +14,15 @@ class KilohertzField : public QDoubleSpinBox {
 public:
     explicit KilohertzField(QWidget* parent);
 
+    /// A number out of range can be typed, else a digit would be lost and the rest go out; it is not taken.
+    [[nodiscard]] QValidator::State validate(QString& text, int& at) const override;
+};
+
+/// The same for a phase in whole degrees.
+class DegreeField : public QSpinBox {
+public:
+    using QSpinBox::QSpinBox;
+
     [[nodiscard]] QValidator::State validate(QString& text, int& at) const override;
 };
 

@@ -74,7 +74,7 @@ void StereoPage::createStereo() {
     createDeviation(Pilot_Hub_Scroll, "Pilot_Hub_Scroll", "Pilot_hub_Label", "Pilot_Hub_Zahl", {349, "Pilottonhub"},
                     Frame_stereo, &StereoPage::Pilot_Hub_Scroll_Change);
     HScroll1_Label = named<QLabel>("HScroll1_Label", Frame_stereo);
-    HScroll1_Zahl = named<QSpinBox>("HScroll1_Zahl", Frame_stereo);
+    HScroll1_Zahl = named<DegreeField>("HScroll1_Zahl", Frame_stereo);
     HScroll1 = named<SettingScrollBar>("HScroll1", Frame_stereo);
     HScroll1->setScale(kLowestPilotPhase, kHighestPilotPhase, 1);
     setQuietly(HScroll1, storedPosition(m_multiplex.pilotPhase, kLowestPilotPhase, kHighestPilotPhase));

@@ -72,6 +72,40 @@ TEST_F(NumberFieldTest, WhatIsTypedGoesOutOnceAtReturn) {
     EXPECT_EQ(general("MPX_DEV"), "06825");
 }
 
+TEST_F(NumberFieldTest, ANumberOutOfRangeIsMarkedAndNotSent) {
+    const auto press = [&](const char* name, const char* keys) {
+        auto* field = find<QAbstractSpinBox>(name);
+        field->selectAll();
+        for (const char* at = keys; *at != 0; ++at) {
+            QKeyEvent key(QEvent::KeyPress, 0, Qt::NoModifier, QString(QLatin1Char(*at)));
+            QApplication::sendEvent(field, &key);
+        }
+    };
+    const auto enter = [&](const char* name) {
+        QKeyEvent key(QEvent::KeyPress, Qt::Key_Return, Qt::NoModifier);
+        QApplication::sendEvent(find(name), &key);
+    };
+    const struct {
+        const char *name, *typed, *range;
+    } rows[] = {{"FM_Hub_Zahl", "100", "Von 0 bis 80.00; "},
+                {"Ari_hub_Zahl", "99.9", "Von 0 bis 8.00; "},
+                {"HScroll1_Zahl", "17", "Von -4 bis 5; "}};
+    for (const auto& row : rows) {
+        const QString before = find<QAbstractSpinBox>(row.name)->text();
+        press(row.name, row.typed);
+        EXPECT_TRUE(find<QAbstractSpinBox>(row.name)->text().startsWith(QLatin1String(row.typed))) << row.name;
+        EXPECT_EQ(find(row.name)->property("zustand").toString(), QStringLiteral("abgelehnt")) << row.name;
+        EXPECT_TRUE(find(row.name)->toolTip().startsWith(QLatin1String(row.range))) << row.name;
+        enter(row.name);
+        EXPECT_EQ(sent(), Lines{}) << row.name;
+        EXPECT_EQ(find<QAbstractSpinBox>(row.name)->text(), before) << "what is in force stands there again";
+        EXPECT_EQ(find(row.name)->property("zustand").toString(), QString()) << row.name;
+    }
+    press("FM_Hub_Zahl", "7,5");
+    enter("FM_Hub_Zahl");
+    EXPECT_EQ(sent(), Lines{":STEREO:DEVIATION 7500HZ"});
+}
+
 TEST_F(NumberFieldTest, TheArrowKeysGoByTheStepAndTheWheelPasses) {
     scroll("Pilot_Hub_Scroll", 675);
     sent();
