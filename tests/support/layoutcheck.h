@@ -8,6 +8,7 @@
 #include <QGroupBox>
 #include <QLabel>
 #include <QRadioButton>
+#include <QScrollArea>
 #include <QStyle>
 #include <QStyleOptionGroupBox>
 #include <QWidget>
@@ -42,7 +43,11 @@ inline void expectNothingCutOff(const QWidget& root, const std::string& where) {
         }
         EXPECT_GE(widget->width(), need.width()) << name << " cuts off \"" << text.toStdString() << '"';
         EXPECT_GE(widget->height(), need.height()) << name << " cuts off \"" << text.toStdString() << '"';
-        if (const QWidget* parent = widget->parentWidget(); parent && !widget->isWindow()) {
+        const QWidget* parent = widget->parentWidget();
+        if (const auto* area = parent ? qobject_cast<const QScrollArea*>(parent->parentWidget()) : nullptr;
+            area && area->widget() == widget) {
+            EXPECT_LE(widget->width(), parent->width()) << name << " would have to be scrolled to the side";
+        } else if (parent && !widget->isWindow()) {
             EXPECT_TRUE(parent->rect().contains(widget->geometry())) << name << " sticks out of its parent";
         }
     }

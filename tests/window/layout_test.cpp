@@ -1,4 +1,4 @@
-#include "support/layoutcheck.h"
+#include "support/everyfont.h"
 
 #include <gtest/gtest.h>
 
@@ -53,10 +53,8 @@ private:
     }
 };
 
-constexpr const char* kLanguages[] = {"deutsch", "english", "english US"};
-
 TEST_F(LayoutTest, NothingIsCutOffInAnyLanguageAtTheDesignSize) {
-    for (const char* language : kLanguages) {
+    for (const char* language : kEveryLanguage) {
         walk(language, [&](int page) {
             EXPECT_EQ(window->size(), QSize(640, 480));
             expectNothingCutOff(*window, std::string(language) + " page " + std::to_string(page));
@@ -65,7 +63,7 @@ TEST_F(LayoutTest, NothingIsCutOffInAnyLanguageAtTheDesignSize) {
 }
 
 TEST_F(LayoutTest, EveryProgrammeTypeIsShownWhole) {
-    for (const char* language : kLanguages) {
+    for (const char* language : kEveryLanguage) {
         walk(language, [&](int page) {
             for (auto* types : {find<QComboBox>("PTY_Combo1"), find<QComboBox>("EON_PTY_Combo")}) {
                 const QSignalBlocker quiet(types);
@@ -79,7 +77,7 @@ TEST_F(LayoutTest, EveryProgrammeTypeIsShownWhole) {
 }
 
 TEST_F(LayoutTest, NoPageNeedsMoreRoomThanItHasAtTheDesignSize) {
-    for (const char* language : kLanguages) {
+    for (const char* language : kEveryLanguage) {
         walk(language, [&](int index) {
             const QWidget* page = find<QTabWidget>("SSTab1")->widget(index);
             EXPECT_LE(page->minimumSizeHint().width(), page->width()) << language << " page " << index;
@@ -90,7 +88,7 @@ TEST_F(LayoutTest, NoPageNeedsMoreRoomThanItHasAtTheDesignSize) {
 }
 
 TEST_F(LayoutTest, EveryTabShowsItsWholeCaption) {
-    for (const char* language : kLanguages) {
+    for (const char* language : kEveryLanguage) {
         walk(language, [&](int page) {
             const auto* bar = find<QTabWidget>("SSTab1")->tabBar();
             const int needed = bar->fontMetrics().horizontalAdvance(bar->tabText(page)) + 8;
@@ -101,7 +99,7 @@ TEST_F(LayoutTest, EveryTabShowsItsWholeCaption) {
 }
 
 TEST_F(LayoutTest, EveryControlThatCanBeUsedHasANameForThoseWhoCannotSeeIt) {
-    for (const char* language : kLanguages) {
+    for (const char* language : kEveryLanguage) {
         walk(language, [&](int page) {
             for (const QWidget* control : find<QTabWidget>("SSTab1")->widget(page)->findChildren<QWidget*>()) {
                 if (control->focusPolicy() == Qt::NoFocus || control->objectName().isEmpty() ||
@@ -122,7 +120,7 @@ TEST_F(LayoutTest, EveryControlThatCanBeUsedHasANameForThoseWhoCannotSeeIt) {
 }
 
 TEST_F(LayoutTest, NoMnemonicIsGivenTwiceOnAPage) {
-    for (const char* language : kLanguages) {
+    for (const char* language : kEveryLanguage) {
         walk(language, [&](int page) {
             std::map<QString, std::string> taken;
             for (const QAbstractButton* button : window->findChildren<QAbstractButton*>()) {
@@ -160,22 +158,14 @@ TEST_F(LayoutTest, TheControlsOfAllPagesBearTheSystemsNames) {
 /// The window with another font than the one it was designed with, in points.
 class FontTest : public LayoutTest, public ::testing::WithParamInterface<int> {
 protected:
-    FontTest() {
-        QFont font = m_before;
-        font.setPointSizeF(GetParam());
-        QApplication::setFont(font);
-    }
-    ~FontTest() override {
-        end();
-        QApplication::setFont(m_before);
-    }
+    ~FontTest() override { end(); }
 
 private:
-    QFont m_before = QApplication::font();
+    FontSize m_font{GetParam()};
 };
 
 TEST_P(FontTest, NothingIsCutOffOrOutOfReachAtTheLeastSize) {
-    for (const char* language : kLanguages) {
+    for (const char* language : kEveryLanguage) {
         walk(language, [&](int index) {
             window->resize(1, 1);  // as small as it becomes
             QCoreApplication::processEvents();
@@ -191,7 +181,7 @@ TEST_P(FontTest, NothingIsCutOffOrOutOfReachAtTheLeastSize) {
     }
 }
 
-INSTANTIATE_TEST_SUITE_P(Points, FontTest, ::testing::Values(8, 10, 12),
+INSTANTIATE_TEST_SUITE_P(Points, FontTest, ::testing::ValuesIn(kEveryFontSize),
                          [](const auto& tested) { return std::to_string(tested.param); });
 
 TEST_F(LayoutTest, AMaximisedPageKeepsItsControlsTogether) {
