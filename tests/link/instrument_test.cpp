@@ -3,7 +3,6 @@
 #include <filesystem>
 
 #include "link/commandsequence.h"
-#include "support/fulldisk.h"
 
 namespace kdx::test {
 namespace {
@@ -246,13 +245,6 @@ TEST_F(InstrumentTest, AFolderInTheLogsPlaceStopsNothing) {
     instrument.log.empty();
     EXPECT_EQ(askCoder("\"RADIO\"\n"), "RADIO");
     EXPECT_TRUE(failures.empty());
-}
-
-TEST_F(InstrumentTest, AFullDiskUnderTheLogStopsNothing) {
-    const FullDisk disk;
-    EXPECT_EQ(askCoder("\"RADIO\"\n"), "RADIO");
-    EXPECT_TRUE(failures.empty());
-    EXPECT_FALSE(instrument.log.isWritable());
 }
 
 }  // namespace

@@ -36,15 +36,6 @@ TEST_F(ReportTest, EveryRowIsInTheFileWhenTheNextThingHappens) {
               "2009-03-05 10:00:00.050,2,note,\"a, b\",,,\r\n");
 }
 
-TEST_F(ReportTest, OnlyAPlainFileIsWritten) {
-    for (const std::filesystem::path& other :
-         {std::filesystem::path("/dev/full"), folder.path(), folder.path() / "nothing" / "report.csv"}) {
-        EXPECT_EQ(Report(other).begin(), "cannot be written") << other;
-    }
-    std::filesystem::create_symlink(folder.data() / "other", folder.data() / "link");
-    EXPECT_EQ(Report(folder.data() / "link").begin(), "cannot be written");
-}
-
 TEST_F(ReportTest, AFileThatIsNoReportStaysAsItIs) {
     for (const char* text : {"[RDS]\r\nPS=RADIO\r\n", "x", "time,step,key,value,command,status,answer"}) {
         folder.write("Datenset3.INI", text);

@@ -1,4 +1,5 @@
 #include "tmc/tmclist.h"
+#include "tmc/tmclisttest.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -8,9 +9,6 @@
 #include <string>
 #include <vector>
 
-#include "support/tempfolder.h"
-#include "support/unprivileged.h"
-
 namespace kdx {
 namespace {
 
@@ -19,25 +17,6 @@ using ::testing::IsEmpty;
 using ::testing::Optional;
 
 namespace fs = std::filesystem;
-
-class TmcListTest : public ::testing::Test {
-protected:
-    [[nodiscard]] fs::path file() const { return m_folder.data() / "Event.txt"; }
-    void write(const std::string& bytes) const { m_folder.write("Event.txt", bytes); }
-    [[nodiscard]] std::string content() const { return m_folder.read("Event.txt"); }
-    /// What loading the file gives.
-    [[nodiscard]] std::optional<std::vector<std::string>> entries() const {
-        const std::optional<TmcList> list = loadTmcList(file());
-        if (!list) return std::nullopt;
-        std::vector<std::string> all;
-        for (std::size_t i = 0; i < list->size(); ++i) all.push_back((*list)[i]);
-        return all;
-    }
-    [[nodiscard]] std::ptrdiff_t filesInFolder() const {
-        return std::distance(fs::directory_iterator(m_folder.data()), fs::directory_iterator());
-    }
-    test::TempFolder m_folder;
-};
 
 TEST(ShownEntryTest, PadsTheTextToFortyTwoCharacters) {
     EXPECT_EQ(shownEntry("Stau;00101"), "Stau" + std::string(38, ' ') + "00101");
@@ -110,32 +89,6 @@ TEST_F(TmcListTest, AppendingKeepsALastLineThatEndsInACarriageReturnOnly) {
     EXPECT_TRUE(appendToTmcList(file(), "Unfall", "00201"));
     EXPECT_EQ(content(), "Stau;00101\r\nUnfall;00201\r\n");
     EXPECT_EQ(entries()->front(), before->front());
-}
-
-TEST_F(TmcListTest, AFileThatCannotBeReplacedKeepsItsContent) {
-    write("Stau;00101\r\n");
-    fs::permissions(m_folder.data(),
-                    fs::perms::owner_read | fs::perms::owner_exec | fs::perms::others_read | fs::perms::others_exec);
-    {
-        const test::Unprivileged user;
-        EXPECT_FALSE(appendToTmcList(file(), "Unfall", "00201"));
-    }
-    fs::permissions(m_folder.data(), fs::perms::owner_all);
-    EXPECT_EQ(content(), "Stau;00101\r\n");
-    EXPECT_EQ(filesInFolder(), 1);
-}
-
-TEST_F(TmcListTest, AFileThatCannotBeReadIsNotReplaced) {
-    write("Stau;00101\r\n");
-    fs::permissions(m_folder.data(), fs::perms::all);
-    fs::permissions(file(), fs::perms::owner_write | fs::perms::others_write);
-    {
-        const test::Unprivileged user;
-        EXPECT_EQ(entries(), std::nullopt);
-        EXPECT_FALSE(appendToTmcList(file(), "Unfall", "00201"));
-    }
-    fs::permissions(file(), fs::perms::owner_all);
-    EXPECT_EQ(content(), "Stau;00101\r\n");
 }
 
 TEST_F(TmcListTest, AppendingFailsWhereTheNameIsAFolder) {

@@ -1,0 +1,59 @@
+#include <gtest/gtest.h>
+#include <sys/stat.h>
+
+#include "settings/datafoldertest.h"
+#include "support/unprivileged.h"
+
+namespace kdx {
+namespace {
+
+namespace fs = std::filesystem;
+
+TEST_F(DataFolderTest, AFileThatCannotBeReadIsNeverReplaced) {
+    if (geteuid() != 0) GTEST_SKIP() << "only the administrator can play two users";
+    m_folder.write("RDS_Allg.INI", "[BUS]\r\nINTERFACE=IEC\r\n");
+    ASSERT_EQ(::chmod((m_folder.data() / "RDS_Allg.INI").c_str(), 0622), 0);
+    ASSERT_EQ(::chmod(m_folder.data().c_str(), 0777), 0);
+    {
+        const test::Unprivileged user;
+        EXPECT_EQ(m_data.ReadIni("BUS", "INTERFACE", kGeneralSettings), "");
+        m_data.WriteIni("BUS", "INTERFACE", "TCPIP", kGeneralSettings);
+        EXPECT_EQ(m_data.unsavedFile(), "RDS_Allg.INI");
+    }
+    EXPECT_EQ(m_folder.read("RDS_Allg.INI"), "[BUS]\r\nINTERFACE=IEC\r\n");
+}
+
+TEST_F(DataFolderTest, AReadOnlyFolderKeepsItsFilesAndIsReported) {
+    m_folder.write("RDS_Allg.INI", "[BUS]\r\nINTERFACE=IEC\r\n");
+    ASSERT_EQ(::chmod((m_folder.data() / "RDS_Allg.INI").c_str(), 0666), 0);
+    ASSERT_EQ(::chmod(m_folder.data().c_str(), 0555), 0);
+    {
+        const test::Unprivileged user;
+        m_data.WriteIni("BUS", "INTERFACE", "TCPIP", kGeneralSettings);
+        EXPECT_EQ(m_data.unsavedFile(), "RDS_Allg.INI");
+        EXPECT_EQ(DataFolder(m_folder.path()).ReadIni("BUS", "INTERFACE", kGeneralSettings), "IEC");
+    }
+    EXPECT_EQ(m_folder.read("RDS_Allg.INI"), "[BUS]\r\nINTERFACE=IEC\r\n");
+}
+
+TEST_F(DataFolderTest, AValueThatStandsThereAlreadyIsNotWrittenAgain) {
+    m_data.WriteIni("RDS", "PS", "RADIO", "Datenset1.INI");
+    struct stat before {};
+    struct stat after {};
+    ASSERT_EQ(::stat(m_data.file("Datenset1.INI").c_str(), &before), 0);
+    m_data.WriteIni("RDS", "PS", "RADIO", "Datenset1.INI");
+    ASSERT_EQ(::stat(m_data.file("Datenset1.INI").c_str(), &after), 0);
+    EXPECT_EQ(before.st_ino, after.st_ino);
+}
+
+TEST_F(DataFolderTest, ALinkedFileIsWrittenWhereItIs) {
+    const fs::path elsewhere = m_folder.path() / "shared.ini";
+    fs::create_symlink(elsewhere, m_folder.data() / "Datenset1.INI");
+    m_data.WriteIni("RDS", "PS", "RADIO", "Datenset1.INI");
+    EXPECT_TRUE(fs::is_regular_file(elsewhere));
+    EXPECT_TRUE(fs::is_symlink(m_folder.data() / "Datenset1.INI"));
+    EXPECT_EQ(m_data.ReadIni("RDS", "PS", "datenset1.ini"), "RADIO");
+}
+
+}  // namespace
+}  // namespace kdx
