@@ -1,6 +1,5 @@
 #include "window/manualview.h"
 
-#include <QFile>
 #include <QFileInfo>
 #include <QLabel>
 #include <QLineEdit>
@@ -13,6 +12,7 @@
 
 #include <utility>
 
+#include "base/paths.h"
 #include "settings/programstate.h"
 #include "ui/layouts.h"
 
@@ -111,7 +111,7 @@ void ManualView::arrange() {
 
 QString ManualView::languageFolder() const {
     const std::filesystem::path language = m_with.state.language == "deutsch" ? "de" : "en";
-    return QFile::decodeName((m_folder / language).string().c_str());
+    return QString::fromStdString(utf8Of(m_folder / language));
 }
 
 void ManualView::label() {

@@ -2,13 +2,13 @@
 
 #include <QBuffer>
 #include <QCoreApplication>
-#include <QFile>
 #include <QPixmap>
 #include <QPushButton>
 #include <QTabWidget>
 
 #include <system_error>
 
+#include "base/paths.h"
 #include "base/printable.h"
 #include "coder/readback.h"
 #include "link/instrument.h"
@@ -80,7 +80,7 @@ QString TourDialogs::fileToSave(const QString& title, const QString& preset, con
 
 QString TourDialogs::fileToOpen(const QString& title, const QString& kind, const QString& /*folder*/) {
     if (m_toOpen.empty()) note(title, kind);
-    return QFile::decodeName(m_toOpen.string().c_str());
+    return QString::fromStdString(utf8Of(m_toOpen));
 }
 
 void TourDialogs::note(const QString& title, const QString& text) {

@@ -165,9 +165,9 @@ void Visitor::listen() const {
 void Visitor::runScenario() const {
     click("Ablauf_Oeffnen");
     click("Ablauf_Start");
-    settle();
+    settle(1s);
     click("Ablauf_Weiter");  // its first pause
-    settle();
+    settle(1s);
 }
 
 void Visitor::openViews() {
