@@ -31,6 +31,7 @@
 #include "window/hmenue.h"
 #include "window/secondprogram.h"
 #include "window/tour.h"
+#include "window/viewstour.h"
 
 namespace {
 
@@ -110,7 +111,9 @@ int main(int argc, char** argv) {
         std::fputs(kdx::helpText().c_str(), stdout);
         return EXIT_SUCCESS;
     }
-    kdx::SystemClock linkClock;
+    kdx::SystemClock systemClock;
+    kdx::TourClock tourClock;  // in which pictures are always the same
+    kdx::Clock& linkClock = options.views ? static_cast<kdx::Clock&>(tourClock) : systemClock;
     kdx::ChosenVisa link = kdx::chooseVisa(options, linkClock);
     if (options.version) {
         print("KDX-RDS " KDX_VERSION "\n" + link.description);
@@ -154,7 +157,8 @@ int main(int argc, char** argv) {
     if (!options.tourFolder && !kdx::goesOnBesideAnother(claim, data, captions, dialogs)) return EXIT_SUCCESS;
     const auto end = [&application] { application.end(); };
     kdx::WorkerVisa worker(std::move(link.visa));
-    kdx::PatientClock clock(worker);
+    kdx::PatientClock patientClock(worker);
+    kdx::Clock& clock = options.views ? linkClock : patientClock;
     kdx::Session session(worker, state, data, captions, clock, end);
     const EndsWithProgram letGo(session, worker);
     kdx::TickerGroup tickers;
@@ -167,8 +171,11 @@ int main(int argc, char** argv) {
     if (options.tourFolder) {
         int result = EXIT_FAILURE;
         application.guarded(window.objectName(), [&] {
-            result =
-                kdx::makeTour(window, session.instrument, tourBoxes, kdx::pathFromUtf8(*options.tourFolder), print);
+            const auto pictures = kdx::pathFromUtf8(*options.tourFolder);
+            result = kdx::makeTour(window, session.instrument, tourBoxes, pictures, print);
+            if (!options.views || result != EXIT_SUCCESS) return;
+            const auto scenarios = kdx::shippedAppFolder(argv[0]) / "Daten" / "Scenarios";
+            result = kdx::makeViewsTour(window, clock, tourBoxes, scenarios / "ta_switch_eon.yaml", pictures, print);
         });
         saveTheRest(data);
         return result;

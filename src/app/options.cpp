@@ -22,14 +22,21 @@ std::unique_ptr<CLI::App> commandLine(Options& options) {
         app->add_option("--visa-library", options.visaLibrary, "use this VISA library to reach the instrument")
             ->type_name("FILE")
             ->take_last();
-    app->add_flag("--simulate", options.simulate, "use the virtual instrument inside the program")
+    auto* simulate = app->add_flag("--simulate", options.simulate, "use the virtual instrument inside the program")
+                         ->disable_flag_override()
+                         ->excludes(library);
+    auto* tour =
+        app->add_option(
+               "--tour", options.tourFolder,
+               "open the session, show every page, leave a picture of each in DIR, ask every value back, print "
+               "the traffic and end; needs no display")
+            ->type_name("DIR")
+            ->take_last();
+    app->add_flag("--views", options.views,
+                  "let the tour go on through menus, views and editors, at a time of its own; needs --simulate")
         ->disable_flag_override()
-        ->excludes(library);
-    app->add_option("--tour", options.tourFolder,
-                    "open the session, show every page, leave a picture of each in DIR, ask every value back, print "
-                    "the traffic and end; needs no display")
-        ->type_name("DIR")
-        ->take_last();
+        ->needs(tour)
+        ->needs(simulate);
     app->add_flag("--version", options.version, "print the version and how instruments are reached")
         ->disable_flag_override();
     app->add_flag("--help", options.help, "print this text")->disable_flag_override();

@@ -14,6 +14,7 @@ struct Options {
     std::optional<std::string> tourFolder;                ///< make the tour and leave the pictures there
     std::optional<std::chrono::milliseconds> answerTime;  ///< how long an answer may take; only kdx-ctl asks for it
     bool simulate = false;
+    bool views = false;  ///< the tour goes on through views and editors
     bool help = false;
     bool version = false;
     std::string error;  ///< what cannot be understood; empty when all can

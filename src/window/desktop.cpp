@@ -45,7 +45,8 @@ Desktop::Desktop(const Surroundings& with, const PageContext& context, Connectio
       m_pages(pages),
       m_sets(context, with.session, with.shipped, nullptr),
       m_indicators(context, m_sets, bar, with.simulated, nullptr),
-      m_setMenu(m_sets, window) {
+      m_setMenu(m_sets, window),
+      m_manual(with.shipped / "manual", context, pages, window) {
     connect(&m_sets, &DataSets::loaded, this, [this] {
         m_indicators.showDataSet();
         emit dataSetLoaded();
@@ -151,6 +152,8 @@ void Desktop::createMenus(MainMenu& info, Views& views) {
     m_window->menuBar()->addAction(Mnu_Einstellungen);
 
     Mnu_Hilfe = menu("Mnu_Hilfe");
+    Mnu_Hilfe_Handbuch = entry("Mnu_Hilfe_Handbuch", Mnu_Hilfe, Qt::Key_F1);
+    connect(Mnu_Hilfe_Handbuch, &QAction::triggered, this, [this] { m_manual.openAt(*m_window); });
     Mnu_Hilfe_Ueber = entry("Mnu_Hilfe_Ueber", Mnu_Hilfe);
     connect(Mnu_Hilfe_Ueber, &QAction::triggered, &info, &MainMenu::Mnu_Info_Ueber_Click);
     createKeys();
@@ -192,6 +195,7 @@ void Desktop::label() {
     const auto text = [this](const Caption& caption) { return captionText(m_with.captions, caption); };
     m_setMenu.label(m_with.captions);
     m_indicators.label();
+    m_manual.label();
     if (m_settings != nullptr) m_settings->label();
     Mnu_Datei->setTitle(text({890, "Da&tei"}));
     Mnu_Datei_Beenden->setText(text({906, "&Beenden"}));
@@ -203,6 +207,7 @@ void Desktop::label() {
     Mnu_Ansicht_Lesen->setText(text({910, "Alles &zurücklesen"}));
     Mnu_Einstellungen->setText(text({908, "Einstellun&gen..."}));
     Mnu_Hilfe->setTitle(text({909, "Hil&fe"}));
+    Mnu_Hilfe_Handbuch->setText(text({1110, "&Handbuch"}));
     Mnu_Hilfe_Ueber->setText(text({1}));
 }
 

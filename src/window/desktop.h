@@ -6,6 +6,7 @@
 #include "window/datasetmenu.h"
 #include "window/datasets.h"
 #include "window/indicators.h"
+#include "window/manual.h"
 #include "window/surroundings.h"
 #include "window/tips.h"
 
@@ -66,6 +67,7 @@ private:
     Indicators m_indicators;
     DataSetMenu m_setMenu;
     Tips m_tips;
+    Manual m_manual;
     QMenu* Mnu_Datei = nullptr;
     QAction* Mnu_Datei_Beenden = nullptr;
     QMenu* Mnu_Ansicht = nullptr;
@@ -77,6 +79,7 @@ private:
     QAction* Mnu_Einstellungen = nullptr;
     SettingsDialog* m_settings = nullptr;  // made when it is first opened
     QMenu* Mnu_Hilfe = nullptr;
+    QAction* Mnu_Hilfe_Handbuch = nullptr;
     QAction* Mnu_Hilfe_Ueber = nullptr;
 };
 

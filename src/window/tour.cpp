@@ -8,6 +8,7 @@
 
 #include <system_error>
 
+#include "base/paths.h"
 #include "base/printable.h"
 #include "coder/readback.h"
 #include "link/instrument.h"
@@ -19,14 +20,6 @@
 namespace kdx {
 
 namespace {
-
-/// To a plain file only: what is behind a link is not the tour's to overwrite, and nobody may be reading a pipe.
-bool savePicture(const QPixmap& picture, const std::filesystem::path& file) {
-    QByteArray bytes;
-    QBuffer buffer(&bytes);
-    if (!buffer.open(QIODevice::WriteOnly) || !picture.save(&buffer, "PNG")) return false;
-    return emptyPlainFile(file) && appendToPlainFile(file, {bytes.constData(), static_cast<std::size_t>(bytes.size())});
-}
 
 /// Prints what is written and read while it lives, and counts the answers and what failed.
 class TrafficPrinter final : public TrafficWatcher {
@@ -85,9 +78,21 @@ QString TourDialogs::fileToSave(const QString& title, const QString& preset, con
     return {};
 }
 
+QString TourDialogs::fileToOpen(const QString& title, const QString& kind, const QString& /*folder*/) {
+    if (m_toOpen.empty()) note(title, kind);
+    return QString::fromStdString(utf8Of(m_toOpen));
+}
+
 void TourDialogs::note(const QString& title, const QString& text) {
     ++m_count;
     m_print("!! " + title.toStdString() + ": " + text.simplified().toStdString());
+}
+
+bool savePicture(const QPixmap& picture, const std::filesystem::path& file) {
+    QByteArray bytes;
+    QBuffer buffer(&bytes);
+    if (!buffer.open(QIODevice::WriteOnly) || !picture.save(&buffer, "PNG")) return false;
+    return emptyPlainFile(file) && appendToPlainFile(file, {bytes.constData(), static_cast<std::size_t>(bytes.size())});
 }
 
 int makeTour(HMenue& window, Instrument& instrument, const TourDialogs& dialogs, const std::filesystem::path& folder,

@@ -8,6 +8,8 @@
 
 #include "ui/dialogs.h"
 
+class QPixmap;
+
 namespace kdx {
 
 class HMenue;
@@ -24,15 +26,23 @@ public:
     bool confirm(const QString& title, const QString& text) override;
     QString input(const QString& prompt, const QString& title, const QString& preset) override;
     QString fileToSave(const QString& title, const QString& preset, const QString& kind) override;
+    QString fileToOpen(const QString& title, const QString& kind, const QString& folder) override;
 
+    /// Which file is chosen from now on where one is asked for.
+    void chooseToOpen(const std::filesystem::path& file) { m_toOpen = file; }
     [[nodiscard]] int count() const { return m_count; }
 
 private:
     void note(const QString& title, const QString& text);
 
     std::function<void(const std::string&)> m_print;
+    std::filesystem::path m_toOpen;
     int m_count = 0;
 };
+
+/// Saves as PNG, to a plain file only: what is behind a link is not the tour's to overwrite, and nobody may be reading
+/// a pipe.
+[[nodiscard]] bool savePicture(const QPixmap& picture, const std::filesystem::path& file);
 
 /// Walks through the whole window as a user does: opens the session (which sends the data set), shows each page and
 /// saves a picture of it, presses every read-back button, and prints everything that passed.

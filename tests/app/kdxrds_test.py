@@ -76,6 +76,14 @@ class Program(unittest.TestCase):
         self.assertIn("-> :STEREO:DIRECT \"PS=MESSTURM\"\n", result.stdout)
         self.assertTrue((self.data / "Sprachen.ini").is_file())
 
+    def testTheTourOfTheViewsLeavesThePicturesOfTheManual(self):
+        result = self.run_("--simulate", "--tour", "pictures", "--views")
+        self.assertEqual(result.returncode, 0, result.stdout[-2000:] + result.stderr)
+        views = {path.name for path in (self.home / "pictures").iterdir() if "_" not in path.name}
+        manual = pathlib.Path(__file__).resolve().parents[2] / "docs" / "manual" / "pictures" / "en"
+        self.assertEqual(views, {path.name for path in manual.iterdir()})
+        self.assertTrue(result.stdout.endswith("18 more pictures, 0 failures\n"), result.stdout[-200:])
+
     def testWhatTheUserHasIsNotOverwritten(self):
         self.data.mkdir(parents=True)
         mine = b"[RDS]\r\nPS=MEINS\r\n"

@@ -42,8 +42,16 @@ TEST(OptionsTest, TwoInstrumentsExcludeEachOther) {
     EXPECT_NE(parseOptions({"--simulate", "--visa-library", "x.so"}).error, "");
 }
 
+TEST(OptionsTest, TheTourOfTheViewsBelongsToATourOnTheVirtualInstrument) {
+    EXPECT_TRUE(parseOptions({"--simulate", "--tour", "/b", "--views"}).views);
+    EXPECT_FALSE(parseOptions({"--simulate", "--tour", "/b"}).views);
+    EXPECT_NE(parseOptions({"--simulate", "--views"}).error, "");
+    EXPECT_NE(parseOptions({"--tour", "/b", "--views"}).error, "") << "its time does not go on by itself";
+}
+
 TEST(OptionsTest, TheHelpNamesEveryOption) {
-    for (const char* option : {"--app-folder", "--visa-library", "--simulate", "--tour", "--version", "--help"}) {
+    for (const char* option :
+         {"--app-folder", "--visa-library", "--simulate", "--tour", "--views", "--version", "--help"}) {
         EXPECT_NE(helpText().find(option), std::string::npos) << option;
     }
     for (const char* option : {"--app-folder=x", "--visa-library=x", "--tour=x", "--simulate", "--version", "--help"}) {
