@@ -49,7 +49,14 @@ constexpr std::array kVersions = {
     ShippedVersion{"Sprachen.ini", 55782, 0x988534a6c66e2079},
     ShippedVersion{"Sprachen.ini", 55782, 0xa8bf663276e23d35},
     ShippedVersion{"Sprachen.ini", 55914, 0x7c098493008808e7},
+    ShippedVersion{"Sprachen.ini", 56025, 0xb809bd1f2f186579},
     ShippedVersion{"Sprachen.ini", 56093, 0xc7d9cdc6b04aef6f},
+    ShippedVersion{"Sprachen.ini", 56469, 0x0c8fa61f15d3114c},
+    ShippedVersion{"Sprachen.ini", 56648, 0xc4b49393d028b6d4},
+    ShippedVersion{"Sprachen.ini", 56759, 0x3c7781f17d039ff2},
+    ShippedVersion{"Sprachen.ini", 56895, 0x3eb6c27e3deb24d5},
+    ShippedVersion{"Sprachen.ini", 57346, 0xd4a56bea6011dcb4},
+    ShippedVersion{"Sprachen.ini", 57482, 0x8317c393d432fb8f},
 };
 // clang-format on
 
