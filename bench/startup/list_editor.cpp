@@ -5,6 +5,7 @@
 #include "link/lanvisa.h"
 #include "tmc/tmclistedit.h"
 #include "ui/application.h"
+#include "ui/keymarks.h"
 #include "ui/statusrow.h"
 
 int main(int argc, char** argv) {
@@ -14,8 +15,9 @@ int main(int argc, char** argv) {
     kdx::BenchedProgram program(argv[1], visa);
     kdx::Session& session = program.session;
     kdx::StatusRow status(nullptr);
+    kdx::KeyMarks marks(session.params, session.instrument, program.state, program.captions);
     kdx::TMC_Listedit editor({session.params, session.instrument, session.profile, program.state, status,
-                              program.captions, program.dialogs, program.data, program.clock, program.tickers},
+                              program.captions, program.dialogs, program.data, program.clock, program.tickers, marks},
                              nullptr);
     editor.show();
     return kdx::endAtFirstPaint(editor);
