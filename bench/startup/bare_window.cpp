@@ -1,6 +1,6 @@
-// The yardstick: a bare window with nine pages and as many controls of each kind as are named on the command line, in
-// frames as controls are, the same style and font; nothing read and nothing wired. Ends at its first paint.
-// Usage: bare_window QLabel=120 QPushButton=60 ...
+// The yardstick: a bare window with nine pages and as many controls of each kind as are named on the command line, as
+// many of them on the page in view as are named behind the stroke, in frames as controls are, the same style and font;
+// nothing read and nothing wired. Ends at its first paint. Usage: bare_window QLabel=120/30 QPushButton=60/8 ...
 #include <QCheckBox>
 #include <QComboBox>
 #include <QDoubleSpinBox>
@@ -29,6 +29,13 @@
 #include "ui/application.h"
 
 namespace {
+
+/// Of one kind.
+struct Count {
+    int all = 0;
+    int inView = 0;
+};
+using Frames = std::vector<QGridLayout*>;
 
 QWidget* make(const std::string& kind, int number, QWidget* page) {
     const QString text = QStringLiteral("Caption %1").arg(number);
@@ -66,29 +73,34 @@ int main(int argc, char** argv) {
         pages.push_back(new QHBoxLayout(page));
         tabs->addTab(page, QStringLiteral("Page %1").arg(i));
     }
-    std::map<QString, int> counts;
+    std::map<QString, Count> counts;
     for (const QString& argument : QCoreApplication::arguments().mid(1)) {
         const auto parts = argument.split(QLatin1Char('='));
-        counts[parts.value(0)] = parts.value(1).toInt();
+        const auto numbers = parts.value(1).split(QLatin1Char('/'));
+        counts[parts.value(0)] = {numbers.value(0).toInt(), numbers.value(1).toInt()};
     }
-    std::vector<QGridLayout*> frames;
-    for (int i = 0; i < std::max(counts[QStringLiteral("QGroupBox")], 9); ++i) {
-        QHBoxLayout* page = pages[static_cast<std::size_t>(i) % pages.size()];
+    Frames inView;
+    Frames hidden;
+    const Count& groups = counts[QStringLiteral("QGroupBox")];
+    for (int i = 0; i < std::max(groups.all, 9); ++i) {
+        const bool seen = i < std::max(groups.inView, 1);
+        QHBoxLayout* page = seen ? pages[0] : pages[1 + static_cast<std::size_t>(i) % (pages.size() - 1)];
         auto* frame = new QGroupBox(QStringLiteral("Frame %1").arg(i), page->parentWidget());
         page->addWidget(frame);
-        frames.push_back(new QGridLayout(frame));
+        (seen ? inView : hidden).push_back(new QGridLayout(frame));
     }
     int made = 0;
     for (const auto& [kind, count] : counts) {
         if (kind == QStringLiteral("QGroupBox") || kind == QStringLiteral("QMenu") || kind == QStringLiteral("QAction"))
             continue;
-        for (int i = 0; i < count; ++i, ++made) {
+        for (int i = 0; i < count.all; ++i, ++made) {
+            const Frames& frames = i < count.inView ? inView : hidden;
             QGridLayout* frame = frames[static_cast<std::size_t>(made) % frames.size()];
             frame->addWidget(make(kind.toStdString(), made, frame->parentWidget()), frame->count() / 2,
                              frame->count() % 2);
         }
     }
-    addMenus(window, counts[QStringLiteral("QMenu")], counts[QStringLiteral("QAction")]);
+    addMenus(window, counts[QStringLiteral("QMenu")].all, counts[QStringLiteral("QAction")].all);
     window.setCentralWidget(tabs);
     window.resize(640, 480);
     window.show();

@@ -17,6 +17,7 @@
 
 #include <cstdio>
 #include <cstring>
+#include <type_traits>
 
 #include "benchedprogram.h"
 #include "firstpaint.h"
@@ -26,23 +27,35 @@
 
 namespace {
 
+/// Prints how many there are, and behind a stroke how many of them are seen at the start.
 template <typename Control>
-int count(const QWidget& window) {
+void print(const char* kind, const QWidget& window) {
     int found = 0;
+    int seen = 0;
     for (const Control* control : window.findChildren<Control*>()) {
-        if (!control->objectName().startsWith(QStringLiteral("qt_"))) ++found;
+        if (control->objectName().startsWith(QStringLiteral("qt_"))) continue;
+        ++found;
+        if constexpr (std::is_base_of_v<QWidget, Control>) seen += control->isVisible() ? 1 : 0;
     }
-    return found;
+    std::printf("%s=%d/%d ", kind, found, seen);
 }
 
 void printCounts(const QWidget& window) {
-    std::printf(
-        "QLabel=%d QPushButton=%d QRadioButton=%d QCheckBox=%d QComboBox=%d QLineEdit=%d QListWidget=%d "
-        "QScrollBar=%d QGroupBox=%d QDoubleSpinBox=%d QProgressBar=%d QScrollArea=%d QMenu=%d QAction=%d\n",
-        count<QLabel>(window), count<QPushButton>(window), count<QRadioButton>(window), count<QCheckBox>(window),
-        count<QComboBox>(window), count<QLineEdit>(window), count<QListWidget>(window), count<QScrollBar>(window),
-        count<QGroupBox>(window), count<QDoubleSpinBox>(window), count<QProgressBar>(window),
-        count<QScrollArea>(window), count<QMenu>(window), count<QAction>(window));
+    print<QLabel>("QLabel", window);
+    print<QPushButton>("QPushButton", window);
+    print<QRadioButton>("QRadioButton", window);
+    print<QCheckBox>("QCheckBox", window);
+    print<QComboBox>("QComboBox", window);
+    print<QLineEdit>("QLineEdit", window);
+    print<QListWidget>("QListWidget", window);
+    print<QScrollBar>("QScrollBar", window);
+    print<QGroupBox>("QGroupBox", window);
+    print<QDoubleSpinBox>("QDoubleSpinBox", window);
+    print<QProgressBar>("QProgressBar", window);
+    print<QScrollArea>("QScrollArea", window);
+    print<QMenu>("QMenu", window);
+    print<QAction>("QAction", window);
+    std::printf("\n");
 }
 
 }  // namespace
@@ -54,10 +67,10 @@ int main(int argc, char** argv) {
     kdx::BenchedProgram program(argv[1], visa);
     kdx::HMenue window(program.surroundings());
     window.startUp();
+    window.show();
     if (argc > 2 && std::strcmp(argv[2], "--count") == 0) {
         printCounts(window);
         return 0;
     }
-    window.show();
     return kdx::endAtFirstPaint(window);
 }
