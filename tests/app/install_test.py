@@ -113,7 +113,9 @@ class Installed(unittest.TestCase):
                             self.prefix / "bin" / program, texts], check=True)
             content = texts.read_bytes()
             self.assertIn(b"--help", content, program)
-            self.assertNotIn(os.fsencode(SOURCE), content, program)
+            if b".Lubsan_data" in content:
+                self.skipTest("what the sanitizer says names the sources")
+            self.assertFalse(os.fsencode(SOURCE) in content, program)
 
 
 if __name__ == "__main__":
