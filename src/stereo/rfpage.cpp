@@ -160,7 +160,7 @@ void RfPage::showJudged(const Value& value) {
 
 Judgement RfPage::judge(const Value& value) const {
     if (value.label->text() == kNothing) return {};
-    const Judgement sent = m_with.marks.judge(value.setting.sendKey);
+    Judgement sent = m_with.marks.judge(value.setting.sendKey);
     if (sent.state != ValueState::InForce) return sent;
     const QString why = whyRefused(m_with, value.setting.sendKey, value.label->text());
     return {why.isEmpty() ? ValueState::InForce : ValueState::Refused, why};

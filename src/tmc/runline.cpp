@@ -48,7 +48,7 @@ QString RunLine::seconds() const {
 }
 
 QString RunLine::shownCode() const {
-    const QString code = toText(m_code);
+    QString code = toText(m_code);
     if (!wrongValue(setting::kTrafficMessage.sendKey, sentMessage(m_code))) return code;
     return QStringLiteral("%1 (%2)").arg(code, captionText(m_with.captions, {1091, "vom Coder abgelehnt"}));
 }

@@ -104,8 +104,8 @@ void MainMenu::Mnu_Info_Ueber_Click() {
     const QStringList about{
         QStringLiteral("KDX-RDS %1").arg(QCoreApplication::applicationVersion()),
         line({916, "Lizenz"}, QStringLiteral("MIT")), line({917, "Verbindung"}, link),
-        line({918, "Bibliotheken"}, QStringLiteral("Qt %1, libtirpc, CLI11, yaml-cpp, liquid-dsp, FFTW, libsndfile")
-                                        .arg(QLatin1String(qVersion())))};
+        line({918, "Bibliotheken"},
+             QStringLiteral("Qt %1, CLI11, yaml-cpp, liquid-dsp, FFTW, libsndfile").arg(QLatin1String(qVersion())))};
     m_with.dialogs.about(QStringLiteral("\nRDS/Stereo Remote Software for KDX-X4\n\n"
                                         "Supported IEEE-Interface: National Instruments\n\n"
                                         "VISA I/O standard\n\n"),
