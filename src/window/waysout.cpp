@@ -2,6 +2,7 @@
 
 #include <QMainWindow>
 #include <QPushButton>
+#include <QTimer>
 
 #include "settings/programstate.h"
 #include "station/session.h"
@@ -60,7 +61,7 @@ WaysOut::~WaysOut() {
 void WaysOut::panic() {
     if (!m_waiting.isWaiting()) return m_s.tickers.automatics().panic();
     m_waiting.giveUp();
-    QMetaObject::invokeMethod(this, &WaysOut::panic, Qt::QueuedConnection);
+    QTimer::singleShot(0, this, &WaysOut::panic);
 }
 
 void WaysOut::label() {
