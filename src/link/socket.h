@@ -11,7 +11,8 @@
 
 namespace kdx {
 
-/// What the LAN client needs of the operating system's network: socket_posix.cpp and socket_windows.cpp.
+/// What the LAN client needs of the operating system's network; what differs is in socket_posix.cpp and
+/// socket_windows.cpp.
 
 /// An IPv4 address as a number in the machine's byte order: 127.0.0.1 is 0x7F000001.
 using Ipv4Address = std::uint32_t;

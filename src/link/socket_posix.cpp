@@ -37,16 +37,6 @@ int number(std::intptr_t handle) {
 
 }  // namespace
 
-Socket::Socket(Socket&& other) noexcept : m_handle(std::exchange(other.m_handle, kNone)) {}
-
-Socket& Socket::operator=(Socket&& other) noexcept {
-    if (this != &other) {
-        close();
-        m_handle = std::exchange(other.m_handle, kNone);
-    }
-    return *this;
-}
-
 void Socket::close() {
     if (isOpen()) ::close(number(std::exchange(m_handle, kNone)));
 }

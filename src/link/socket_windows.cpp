@@ -61,16 +61,6 @@ std::intptr_t freshSocket(int type, int protocol) {
 
 }  // namespace
 
-Socket::Socket(Socket&& other) noexcept : m_handle(std::exchange(other.m_handle, kNone)) {}
-
-Socket& Socket::operator=(Socket&& other) noexcept {
-    if (this != &other) {
-        close();
-        m_handle = std::exchange(other.m_handle, kNone);
-    }
-    return *this;
-}
-
 void Socket::close() {
     if (isOpen()) closesocket(number(std::exchange(m_handle, kNone)));
 }

@@ -1,5 +1,5 @@
 #include "scenariotest.h"
-#include "support/cutvisa.h"
+#include "support/watchedvisa.h"
 
 namespace kdx::test {
 namespace {
@@ -9,14 +9,19 @@ protected:
     ~ScenarioStopTest() override { end(); }
     Visa& instrumentLink() override { return cable; }
 
-    CutVisa cable{link};
+    /// Lets that run for ten seconds.
+    void begin(const std::string& scenario) {
+        openView();
+        load(scenario);
+        click("Ablauf_Start");
+        pass(10s);
+    }
+
+    WatchedVisa cable{link};
 };
 
 TEST_F(ScenarioStopTest, StopBringsBackWhatStoodBefore) {
-    openView();
-    load("restore: true\nsteps: [send: {PS: EINS}, wait: 1 h, send: {PS: ZWEI}]");
-    click("Ablauf_Start");
-    pass(10s);
+    begin("restore: true\nsteps: [send: {PS: EINS}, wait: 1 h, send: {PS: ZWEI}]");
     EXPECT_EQ(taken(), Lines{direct("PS=EINS    ")});
     ASSERT_TRUE(enabled("Ablauf_Stop"));
     click("Ablauf_Stop");
@@ -45,10 +50,7 @@ TEST_F(ScenarioStopTest, StopEndsARunThatIsHeld) {
 }
 
 TEST_F(ScenarioStopTest, LocalBringsBackWhatStoodBeforeAndThenCloses) {
-    openView();
-    load("restore: true\nsteps: [send: {PS: EINS}, wait: 1 h]");
-    click("Ablauf_Start");
-    pass(10s);
+    begin("restore: true\nsteps: [send: {PS: EINS}, wait: 1 h]");
     taken();
     click("GTL_Taste");
     EXPECT_FALSE(view->isRunning());
@@ -57,20 +59,14 @@ TEST_F(ScenarioStopTest, LocalBringsBackWhatStoodBeforeAndThenCloses) {
 }
 
 TEST_F(ScenarioStopTest, TheEndOfTheProgramBringsBackWhatStoodBefore) {
-    openView();
-    load("restore: true\nsteps: [send: {PS: EINS}, wait: 1 h]");
-    click("Ablauf_Start");
-    pass(10s);
+    begin("restore: true\nsteps: [send: {PS: EINS}, wait: 1 h]");
     taken();
     end();
     EXPECT_EQ(taken(), Lines{direct("PS=MESSTURM")});
 }
 
 TEST_F(ScenarioStopTest, ALostLinkEndsTheRunWithOneBox) {
-    openView();
-    load("restore: true\nsteps: [send: {PS: EINS}, wait: 20 s, send: {PS: ZWEI}, wait: 5 s, send: {PS: DREI}]");
-    click("Ablauf_Start");
-    pass(10s);
+    begin("restore: true\nsteps: [send: {PS: EINS}, wait: 20 s, send: {PS: ZWEI}, wait: 5 s, send: {PS: DREI}]");
     cable.cut = true;
     dialogs.expectedMessages = 1;
     passAll();
@@ -80,10 +76,7 @@ TEST_F(ScenarioStopTest, ALostLinkEndsTheRunWithOneBox) {
 }
 
 TEST_F(ScenarioStopTest, ThatItBringsBackIsToldAndStopGivesThatUp) {
-    openView();
-    load("restore: true\nsteps: [send: {PS: EINS}, wait: 1 h]");
-    click("Ablauf_Start");
-    pass(10s);
+    begin("restore: true\nsteps: [send: {PS: EINS}, wait: 1 h]");
     cable.cut = true;
     dialogs.expectedMessages = 1;
     click("Ablauf_Stop");
@@ -133,10 +126,7 @@ TEST_F(ScenarioStopTest, WhileItRunsTheStatusRowIsInDoubt) {
 }
 
 TEST_F(ScenarioStopTest, TheEndOfTheProgramDoesNotWaitForAnInstrumentThatHasGone) {
-    openView();
-    load("restore: true\nsteps: [send: {PS: EINS}, wait: 1 h]");
-    click("Ablauf_Start");
-    pass(10s);
+    begin("restore: true\nsteps: [send: {PS: EINS}, wait: 1 h]");
     cable.cut = true;
     dialogs.expectedMessages = 1;
     clock.sleeps.clear();
@@ -167,10 +157,7 @@ TEST_F(ScenarioStopTest, TheOtherNetworkOfTheWindowIsTheOldOneAfterwards) {
 }
 
 TEST_F(ScenarioStopTest, PanicEndsTheRunAndBringsBackWhatStoodBefore) {
-    openView();
-    load("restore: true\nsteps: [send: {PS: EINS}, wait: 1 h, send: {PS: ZWEI}]");
-    click("Ablauf_Start");
-    pass(10s);
+    begin("restore: true\nsteps: [send: {PS: EINS}, wait: 1 h, send: {PS: ZWEI}]");
     taken();
     ASSERT_TRUE(find("Panik_Taste")->isVisible());
     click("Panik_Taste");
@@ -206,10 +193,7 @@ TEST_F(ScenarioStopTest, PanicEndsAnAnnouncementThatTheScenarioMadeOrBringsBack)
 }
 
 TEST_F(ScenarioStopTest, ClosingTheWindowAsksAndNoLetsTheRunGoOn) {
-    openView();
-    load("restore: true\nsteps: [send: {PS: EINS}, wait: 20 s, send: {PS: ZWEI}, wait: 1 h]");
-    click("Ablauf_Start");
-    pass(10s);
+    begin("restore: true\nsteps: [send: {PS: EINS}, wait: 20 s, send: {PS: ZWEI}, wait: 1 h]");
     taken();
     dialogs.confirmations = {false};
     EXPECT_FALSE(window->close());

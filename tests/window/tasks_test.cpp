@@ -84,8 +84,8 @@ TEST_F(Tasks, StopHalfWay) {
     const std::size_t half = all.size() / 2;
     ASSERT_GT(half, 10U);
     std::size_t messages = 0;
-    cable->beforeWrite = [&](std::string_view message) {
-        if (message.find('?') != std::string_view::npos || ++messages != half) return;
+    cable->beforeWrite = [&](const std::string& message) {
+        if (message.find('?') != std::string::npos || ++messages != half) return;
         std::binary_semaphore pressed{0};
         QMetaObject::invokeMethod(
             window.get(),

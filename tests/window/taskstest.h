@@ -12,7 +12,7 @@
 #include "link/workervisa.h"
 #include "sim/simvisa.h"
 #include "sim/virtualinstrument.h"
-#include "support/cutvisa.h"
+#include "support/watchedvisa.h"
 #include "support/windowtest.h"
 
 namespace kdx::test {
@@ -104,7 +104,7 @@ protected:
 
     sim::VirtualInstrument instrument{clock};
     sim::SimVisa bench{instrument};
-    std::shared_ptr<CutVisa> cable = std::make_shared<CutVisa>(bench);
+    std::shared_ptr<WatchedVisa> cable = std::make_shared<WatchedVisa>(bench);
 
 private:
     WorkerVisa m_worker{cable};
