@@ -6,6 +6,7 @@
 #include "settings/profilefile.h"
 
 #include <charconv>
+#include <stdexcept>
 
 namespace kdx {
 
@@ -25,17 +26,20 @@ Captions::Captions(const DataFolder& data) : m_data(data) {}
 void Captions::load(const std::string& language, const std::string& standard) {
     m_file = m_data.profile(kLanguageFile);
     m_language = language;
-    m_empty = !m_file || !m_file->anyKey(language, isNumber);
-    const char* list = "PTY-Liste_D";
-    if (language != "deutsch") list = standard == "RBDS" ? "PTY-Liste_US" : "PTY-Liste_E";
-    for (std::size_t type = 0; type < m_programmeTypes.size(); ++type) {
-        m_programmeTypes[type] =
-            m_file ? m_file->value(list, rightmost("000" + std::to_string(type), 3)) : std::string();
-    }
+    m_typeList = language == "deutsch" ? "PTY-Liste_D" : standard == "RBDS" ? "PTY-Liste_US" : "PTY-Liste_E";
+}
+
+bool Captions::isEmpty() const {
+    return !m_file || !m_file->anyKey(m_language, isNumber);
 }
 
 std::string Captions::text(int number) const {
     return m_file ? m_file->value(m_language, std::to_string(number)) : std::string();
+}
+
+std::string Captions::programmeType(std::size_t type) const {
+    if (type >= kProgrammeTypes) throw std::out_of_range("no programme type has that number");
+    return m_file ? m_file->value(m_typeList, rightmost("000" + std::to_string(type), 3)) : std::string();
 }
 
 std::string Captions::own(int number, std::string_view design) const {

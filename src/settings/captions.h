@@ -1,6 +1,6 @@
 #pragma once
 
-#include <array>
+#include <cstddef>
 #include <memory>
 #include <string>
 #include <string_view>
@@ -23,7 +23,7 @@ public:
     void load(const std::string& language, const std::string& standard);
 
     /// True when the file had no text at all for the language, or cannot be read.
-    [[nodiscard]] bool isEmpty() const { return m_empty; }
+    [[nodiscard]] bool isEmpty() const;
 
     /// The text of that number; "" where the file has none.
     [[nodiscard]] std::string text(int number) const;
@@ -32,15 +32,15 @@ public:
     /// which is UTF-8.
     [[nodiscard]] std::string own(int number, std::string_view design) const;
 
-    /// Name of a programme type (0 to 31) in the current language and standard; "" where the file has none.
-    [[nodiscard]] const std::string& programmeType(std::size_t type) const { return m_programmeTypes.at(type); }
+    /// Name of a programme type in the current language and standard; "" where the file has none.
+    /// @param type 0 to 31. @throws std::out_of_range
+    [[nodiscard]] std::string programmeType(std::size_t type) const;
 
 private:
     const DataFolder& m_data;
     std::shared_ptr<const ProfileText> m_file;  // as loaded, whatever becomes of the file
     std::string m_language;
-    bool m_empty = true;
-    std::array<std::string, kProgrammeTypes> m_programmeTypes;
+    std::string m_typeList;  ///< section with the names of the programme types
 };
 
 }  // namespace kdx
