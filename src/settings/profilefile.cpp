@@ -138,12 +138,14 @@ bool isUtf16(std::string_view bytes) {
     return bytes.starts_with("\xFF\xFE") || bytes.starts_with("\xFE\xFF");
 }
 
-std::optional<std::string> readFile(const std::filesystem::path& file) {
+std::optional<std::string> readFile(const std::filesystem::path& file, std::uintmax_t most) {
     std::string bytes;
     std::error_code error;
     const std::uintmax_t size = std::filesystem::file_size(file, error);
+    if (!error && size > most) return std::nullopt;
     if (!error) bytes.reserve(size + 1);
     const bool read = readPieces(file, [&](std::string_view piece) {
+        if (piece.size() > most - bytes.size()) return false;
         bytes.append(piece);
         return true;
     });

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <cstdint>
 #include <filesystem>
 #include <functional>
 #include <map>
@@ -55,8 +56,11 @@ private:
 /// Whether the bytes begin with the mark of a UTF-16 text, in which no 8-bit key can be found or put.
 [[nodiscard]] bool isUtf16(std::string_view bytes);
 
-/// The file's bytes, or nothing when it is missing or cannot be read.
-[[nodiscard]] std::optional<std::string> readFile(const std::filesystem::path& file);
+/// So many bytes a file of settings has at most: a larger one is garbage, and would take the machine's memory.
+inline constexpr std::uintmax_t kMostBytes = std::uintmax_t{256} << 20U;
+
+/// The file's bytes, or nothing when it is missing, cannot be read or has more than @p most bytes.
+[[nodiscard]] std::optional<std::string> readFile(const std::filesystem::path& file, std::uintmax_t most = kMostBytes);
 
 /// Whether the file can be read and has these bytes and no more; a large one is compared without being held.
 [[nodiscard]] bool fileHolds(const std::filesystem::path& file, std::string_view bytes);

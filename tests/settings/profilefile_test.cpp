@@ -198,5 +198,16 @@ TEST(ReadToChangeTest, GivesTheBytesOfAFileAndNoneOfOneYetToBeMade) {
     EXPECT_EQ(readToChange(folder.data() / "missing.ini"), "");
 }
 
+TEST(ReadFileTest, TakesNoFileThatNoSettingsCanFill) {
+    const test::TempFolder folder;
+    const auto file = folder.data() / "a.ini";
+    folder.write("a.ini", "[RDS]");
+    EXPECT_EQ(readFile(file, 5), "[RDS]");
+    EXPECT_EQ(readFile(file, 4), std::nullopt);
+    std::filesystem::resize_file(file, kMostBytes + 1);
+    EXPECT_EQ(readFile(file), std::nullopt);
+    EXPECT_EQ(readToChange(file), std::nullopt) << "nobody may write over it";
+}
+
 }  // namespace
 }  // namespace kdx

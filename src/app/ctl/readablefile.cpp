@@ -1,5 +1,8 @@
 #include "app/ctl/readablefile.h"
 
+#include <cstdint>
+#include <limits>
+
 #include "app/ctl/output.h"
 #include "base/paths.h"
 #include "settings/profilefile.h"
@@ -7,7 +10,7 @@
 namespace kdx::ctl {
 
 std::optional<std::string> bytesOf(Output& output, const std::string& file) {
-    auto bytes = readFile(pathFromUtf8(file));
+    auto bytes = readFile(pathFromUtf8(file), std::numeric_limits<std::uintmax_t>::max());  // a log may be long
     if (!bytes) output.problem(file + " cannot be read");
     return bytes;
 }
