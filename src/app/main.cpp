@@ -167,7 +167,8 @@ int main(int argc, char** argv) {
                         options.answerTime.value_or(std::chrono::seconds(2)), link.simulated != nullptr,
                         kdx::shippedAppFolder(argv[0]), options.tourFolder ? std::filesystem::path() : placeFile(),
                         news.kept});
-    application.guarded(window.objectName(), [&] { window.startUp(); });
+    // Half a window would send and store what nobody loaded.
+    if (!application.guarded(window.objectName(), [&] { window.startUp(); })) return EXIT_FAILURE;
     if (options.tourFolder) {
         int result = EXIT_FAILURE;
         application.guarded(window.objectName(), [&] {
