@@ -222,7 +222,7 @@ void ScenarioView::Ablauf_Weiter_Click() {
 
 void ScenarioView::showEnd(const scenario::Outcome& outcome) {
     m_outcome = outcome;
-    m_steps.mark({});
+    m_steps.end(outcome.complete);
 }
 
 QString ScenarioView::endText(const scenario::Outcome& outcome) const {

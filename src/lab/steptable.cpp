@@ -48,7 +48,7 @@ void StepTable::show(const scenario::Scenario& scenario) {
     m_table->setRowCount(0);
     m_rows.clear();
     m_passes.clear();
-    m_marked = -1;
+    m_marked = m_doneRow = -1;
     if (scenario.dataSet) append(scenario::kOpening, 0, "data_set: " + std::to_string(*scenario.dataSet));
     append(scenario.actions, {}, 0);
     if (scenario.restore) append(scenario::kRestoring, 0, "restore: true");
@@ -79,8 +79,19 @@ int StepTable::rowOf(const std::string& step) const {
 }
 
 void StepTable::clearResults() {
+    m_doneRow = -1;
     for (int row = 0; row < m_table->rowCount(); ++row) showCell(m_table, row, Result, {}, false);
     mark({});
+}
+
+void StepTable::end(bool complete) {
+    if (!complete && m_doneRow != rowOf(scenario::kRestoring)) m_doneRow = -1;
+    mark({});
+}
+
+void StepTable::showDone() {
+    if (m_doneRow >= 0) showCell(m_table, m_doneRow, Result, m_done, false);
+    m_doneRow = -1;
 }
 
 void StepTable::mark(const std::string& step) {
@@ -92,6 +103,7 @@ void StepTable::mark(const std::string& step) {
         }
     };
     const int row = rowOf(step);
+    if (row != m_doneRow) showDone();
     if (row != m_marked) {
         setBold(m_marked, false);
         setBold(row, true);
@@ -116,20 +128,22 @@ void StepTable::add(const scenario::Row& row) {
     if (row.step.find('#') != std::string::npos || m_passes.count(withoutPasses(row.step)) != 0) mark(row.step);
     const bool good = isGood(row.status);
     if (good && m_table->item(at, Result)->text().startsWith(kBad)) return;  // what went wrong once stays to be seen
-    QString text = good ? kGood : kBad;
-    const bool unmet = row.status == scenario::kNotMet;
     const QString answer = QString::fromStdString(row.answer);
-    if (unmet) {
-        text += QLatin1Char(' ') + captionText(m_captions, {987, "nicht erfüllt: %1"}).arg(answer);
-    } else if (!good) {
-        text += QLatin1Char(' ') + QString::fromStdString(row.status);
-    } else if (!answer.isEmpty()) {
-        text += QLatin1Char(' ') + answer;
-    } else if (m_passes.count(withoutPasses(row.step)) != 0) {
-        text = m_table->item(at, Result)->text().section(QLatin1Char(':'), 0, 0);
-        if (row.key != scenario::kRepeatRow) text += QLatin1String(": ") + QString::fromStdString(row.value);
+    if (!good) {
+        const QString why = row.status == scenario::kNotMet
+                                ? captionText(m_captions, {987, "nicht erfüllt: %1"}).arg(answer)
+                                : QString::fromStdString(row.status);
+        m_doneRow = m_doneRow == at ? -1 : m_doneRow;
+        return showCell(m_table, at, Result, kBad + QLatin1Char(' ') + why, true);
     }
-    showCell(m_table, at, Result, text, !good);
+    if (answer.isEmpty() && m_passes.count(withoutPasses(row.step)) != 0) {
+        QString text = m_table->item(at, Result)->text().section(QLatin1Char(':'), 0, 0);
+        if (row.key != scenario::kRepeatRow) text += QLatin1String(": ") + QString::fromStdString(row.value);
+        return showCell(m_table, at, Result, text, false);
+    }
+    if (at != m_doneRow) showDone();
+    m_doneRow = at;
+    m_done = answer.isEmpty() ? QString(kGood) : kGood + (QLatin1Char(' ') + answer);
 }
 
 }  // namespace kdx

@@ -21,21 +21,26 @@ public:
     void clearResults();
     /// The step of that number runs now.
     void mark(const std::string& step);
+    /// What went well is shown when the step is over; what an expectation was answered with that was not met, or why a
+    /// command failed, at once, and it stays.
     void add(const scenario::Row& row);
-    /// What an expectation was answered with that was not met, or why a command failed, stays.
+    /// Nothing runs any more. @param complete whether the last step came to its end
+    void end(bool complete);
     [[nodiscard]] QTableWidget* widget() const { return m_table; }
 
 private:
     void append(const std::string& step, int depth, const std::string& what);
     void append(const std::vector<scenario::Action>& actions, const std::string& within, int depth);
     [[nodiscard]] int rowOf(const std::string& step) const;
-    void showResult(int row, const QString& text, bool bad);
+    void showDone();
 
     const Captions& m_captions;
     QTableWidget* m_table;
     std::map<std::string, int> m_rows;            // by their numbers without passes
     std::map<std::string, std::size_t> m_passes;  // of sweeps and repetitions
     int m_marked = -1;
+    int m_doneRow = -1;  // of the step that runs: what is to be shown of it
+    QString m_done;
 };
 
 }  // namespace kdx

@@ -164,6 +164,7 @@ void HMenue::arrange() {
     m_lowerEdge = new ProgressLine(this);
     m_waysOut = new WaysOut(m_s, *m_lowerEdge, this);
     m_waysOut->letTakeFailures([this] { return m_views->takesFailure(); });
+    connect(m_waysOut, &WaysOut::givenUp, this, [this] { m_views->stopScenario(); });
     connect(m_waysOut, &WaysOut::localRequested, this, &HMenue::GTL_Taste_Click);
     auto* middle = new QWidget(this);
     auto* column = new QVBoxLayout(middle);

@@ -94,6 +94,10 @@ void Views::endScenario() {
     if (m_scenarioView != nullptr) m_scenarioView->finish();
 }
 
+void Views::stopScenario() {
+    if (scenarioSends()) m_scenarioView->stop();
+}
+
 bool Views::takesFailure() {
     return m_scenarioView != nullptr && m_scenarioView->takesFailure();
 }

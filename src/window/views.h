@@ -39,6 +39,8 @@ public:
     [[nodiscard]] bool scenarioSends() const;
     /// The session is to be closed: a scenario that runs brings back what stood before.
     void endScenario();
+    /// What goes out right now was given up: if it is a scenario's, the scenario is.
+    void stopScenario();
     /// A command failed. @returns whether nobody need be told any more.
     bool takesFailure();
     /// The lists of events and locations were changed.

@@ -2,7 +2,6 @@
 
 #include <QMainWindow>
 #include <QPushButton>
-#include <QTimer>
 
 #include "settings/programstate.h"
 #include "station/session.h"
@@ -33,7 +32,10 @@ WaysOut::WaysOut(const Surroundings& surroundings, const ProgressLine& lowerEdge
     m_book.text(lowerEdge.panic(), {848, "Alles an&halten"});
     m_book.tip(lowerEdge.panic(), {849, "Hält an, was von selbst sendet, und schaltet TA aus"});
     connect(lowerEdge.stop(), &QPushButton::clicked, &m_waiting, &WaitingLoop::giveUp);
-    connect(&m_waiting, &WaitingLoop::givenUp, this, [&instrument] { instrument.stopSequence(); });
+    connect(&m_waiting, &WaitingLoop::givenUp, this, [this, &instrument] {
+        instrument.stopSequence();
+        emit givenUp();
+    });
     const auto close = [this, window] {
         m_sure = true;
         window->close();
@@ -43,6 +45,7 @@ WaysOut::WaysOut(const Surroundings& surroundings, const ProgressLine& lowerEdge
     Automatics& automatics = m_s.tickers.automatics();
     lowerEdge.panic()->setProperty(kWorksWhileSending, true);
     connect(lowerEdge.panic(), &QPushButton::clicked, this, &WaysOut::panic);
+    connect(this, &WaysOut::panicWanted, this, &WaysOut::panic, Qt::QueuedConnection);
     automatics.onChange([this] { m_lowerEdge.panic()->setVisible(m_s.tickers.automatics().anyRuns()); });
     instrument.onFailure(
         [this](const std::string& text, bool sequenceRuns) { return tellFailure(text, sequenceRuns); });
@@ -61,7 +64,7 @@ WaysOut::~WaysOut() {
 void WaysOut::panic() {
     if (!m_waiting.isWaiting()) return m_s.tickers.automatics().panic();
     m_waiting.giveUp();
-    QTimer::singleShot(0, this, &WaysOut::panic);
+    emit panicWanted();
 }
 
 void WaysOut::label() {

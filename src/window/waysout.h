@@ -36,6 +36,10 @@ public:
 
 signals:
     void localRequested();
+    /// The user has had enough of what goes out.
+    void givenUp();
+    /// Everything is to stop as soon as nobody is waited for.
+    void panicWanted();
 
 private:
     bool tellFailure(const std::string& text, bool sequenceRuns);

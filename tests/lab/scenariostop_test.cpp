@@ -4,6 +4,10 @@
 namespace kdx::test {
 namespace {
 
+using ::testing::Contains;
+using ::testing::HasSubstr;
+using ::testing::Not;
+
 class ScenarioStopTest : public ScenarioTest {
 protected:
     ~ScenarioStopTest() override { end(); }
@@ -86,6 +90,23 @@ TEST_F(ScenarioStopTest, ThatItBringsBackIsToldAndStopGivesThatUp) {
     click("Ablauf_Stop");
     EXPECT_FALSE(view->isRunning());
     EXPECT_TRUE(text("Ablauf_Stand").starts_with("abgebrochen; nicht wie zuvor: PS")) << text("Ablauf_Stand");
+}
+
+TEST_F(ScenarioStopTest, WhoStopsWhatGoesOutStopsTheRun) {
+    openView();
+    load("data_set: 2\nsteps: [send: {PS: ZWEI}, send: {RT: NIE}]");
+    cable.beforeWrite = [this, left = 8](const std::string&) mutable {
+        if (--left == 0) click("Stop_Taste");
+    };
+    click("Ablauf_Start");
+    passAll();
+    cable.beforeWrite = nullptr;
+    const Lines sent = taken();
+    EXPECT_GT(sent.size(), 4U);
+    EXPECT_LT(sent.size(), 9U);
+    EXPECT_THAT(sent, Not(Contains(HasSubstr("ZWEI"))));
+    EXPECT_EQ(text("Ablauf_Stand"), "abgebrochen");
+    EXPECT_EQ(result(0), "") << "the set is not whole";
 }
 
 TEST_F(ScenarioStopTest, EscapeDoesNotCloseTheViewOfARun) {

@@ -110,6 +110,7 @@ TEST_F(ScenarioViewTest, APauseOfTheScenarioWaitsForThePerson) {
     pass(60s);
     EXPECT_EQ(text("Ablauf_Stand"), "Schritt 1; wartet auf Weiter");
     EXPECT_TRUE(enabled("Ablauf_Weiter"));
+    EXPECT_EQ(result(0), "") << "not before it is over";
     EXPECT_EQ(taken(), Lines{});
     click("Ablauf_Weiter");
     passAll();
