@@ -19,6 +19,7 @@
 #include "station/wrongsettings.h"
 #include "ui/dialogs.h"
 #include "ui/layouts.h"
+#include "ui/savefile.h"
 #include "ui/ticker.h"
 
 namespace kdx {
@@ -199,10 +200,10 @@ void ScenarioView::Ablauf_Start_Click() {
     m_step.clear();
     m_outcome.reset();
     m_unmet = 0;
-    if (!report.empty() && !m_with.data.mayWrite(report)) {
+    if (const QString why = report.empty() ? QString() : whyNotSaved(m_with, report); !why.isEmpty()) {
         m_with.dialogs.message(Dialogs::Icon::Critical, caption({313, "Fehler"}),
                                caption({312, "Nicht gespeichert: %1"}).arg(QString::fromStdString(utf8Of(report))),
-                               caption({920, "Nur zum Lesen geöffnet: nichts wird gespeichert"}));
+                               why);
         return;
     }
     const std::string problem = m_run->begin(m_scenario, report);

@@ -1,12 +1,10 @@
 #include "onair/onairview.h"
 
 #include <QClipboard>
-#include <QDir>
 #include <QFile>
 #include <QGuiApplication>
 #include <QLabel>
 #include <QPushButton>
-#include <QSaveFile>
 #include <QScreen>
 #include <QShowEvent>
 #include <QTimer>
@@ -20,8 +18,8 @@
 #include "onair/radioface.h"
 #include "onair/radiotables.h"
 #include "onair/spectrumplot.h"
-#include "ui/dialogs.h"
 #include "ui/layouts.h"
+#include "ui/savefile.h"
 
 namespace kdx {
 
@@ -37,12 +35,6 @@ QByteArray groupLog(const std::deque<air::Sent>& sent) {
             lines += QByteArray::fromStdString(air::logLine(one.what.group, one.end)) + '\n';
     }
     return lines;
-}
-
-bool saveGroups(const std::deque<air::Sent>& sent, const QString& name) {
-    QSaveFile file(name);
-    const QByteArray lines = groupLog(sent);
-    return file.open(QIODevice::WriteOnly) && file.write(lines) == lines.size() && file.commit();
 }
 
 bool saveMultiplex(const std::deque<air::Sent>& sent, const QString& name) {
@@ -161,27 +153,15 @@ void OnAirView::AirTimer_Timer() {
     Air_MPX_Sichern->setEnabled(!m_shadow.sent().empty() && m_shadow.transmission().settings.stereoOn);
 }
 
-QString OnAirView::chosenFile(const char* name, const Caption& kind) const {
-    return m_with.dialogs.fileToSave(windowTitle(), QDir::home().filePath(QString::fromLatin1(name)),
-                                     captionText(m_with.captions, kind));
-}
-
-void OnAirView::tellUnsaved(const QString& file) const {
-    m_with.dialogs.message(Dialogs::Icon::Critical, captionText(m_with.captions, {313, "Fehler"}),
-                           captionText(m_with.captions, {624, "%1 kann nicht gespeichert werden."}).arg(file));
-}
-
 void OnAirView::Air_Gruppen_Sichern_Click() {
     // What is kept goes on while the box is open; meant is what was there at the click.
-    const std::deque<air::Sent> sent = m_shadow.sent();
-    const QString file = chosenFile("groups.txt", {787, "Gruppen (*.txt)"});
-    if (!file.isEmpty() && !saveGroups(sent, file)) tellUnsaved(file);
+    saveToChosenFile(m_with, windowTitle(), "groups.txt", {787, "Gruppen (*.txt)"},
+                     [sent = m_shadow.sent()](const QString& file) { return replaceWith(groupLog(sent), file); });
 }
 
 void OnAirView::Air_MPX_Sichern_Click() {
-    const std::deque<air::Sent> sent = m_shadow.sent();
-    const QString file = chosenFile("multiplex.wav", {788, "Multiplex (*.wav)"});
-    if (!file.isEmpty() && !saveMultiplex(sent, file)) tellUnsaved(file);
+    saveToChosenFile(m_with, windowTitle(), "multiplex.wav", {788, "Multiplex (*.wav)"},
+                     [sent = m_shadow.sent()](const QString& file) { return saveMultiplex(sent, file); });
 }
 
 void OnAirView::Air_Kopieren_Click() {

@@ -45,8 +45,6 @@ private:
     void Air_MPX_Sichern_Click();
     void Air_Kopieren_Click();
     void arrange();
-    [[nodiscard]] QString chosenFile(const char* name, const Caption& kind) const;
-    void tellUnsaved(const QString& file) const;
 
     air::Shadow& m_shadow;
     const Station& m_station;

@@ -57,6 +57,7 @@ constexpr std::array kVersions = {
     ShippedVersion{"Sprachen.ini", 56895, 0x3eb6c27e3deb24d5},
     ShippedVersion{"Sprachen.ini", 57346, 0xd4a56bea6011dcb4},
     ShippedVersion{"Sprachen.ini", 57482, 0x8317c393d432fb8f},
+    ShippedVersion{"Sprachen.ini", 64984, 0x0a0c51f7310d4141},
 };
 // clang-format on
 

@@ -6,9 +6,6 @@
 
 namespace kdx {
 
-/// File of the data folder that keeps the message list.
-inline constexpr const char* kMessageFile = "TMC_Liste.txt";
-
 /// The entries of the file, a line each; lines that are none are passed over, and so is a missing file.
 [[nodiscard]] std::vector<std::string> loadMessages(const std::filesystem::path& file);
 

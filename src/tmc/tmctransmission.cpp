@@ -1,6 +1,7 @@
 #include "tmc/tmctransmission.h"
 
 #include "settings/datafolder.h"
+#include "settings/ownfiles.h"
 #include "settings/programstate.h"
 #include "settings/storedvalue.h"
 #include "tmc/groupcode.h"

@@ -1,12 +1,10 @@
 #include "window/logview.h"
 
 #include <QClipboard>
-#include <QDir>
 #include <QGuiApplication>
 #include <QHeaderView>
 #include <QLineEdit>
 #include <QPushButton>
-#include <QSaveFile>
 #include <QScrollBar>
 #include <QShortcut>
 #include <QSortFilterProxyModel>
@@ -16,9 +14,9 @@
 #include <algorithm>
 
 #include "ui/caption.h"
-#include "ui/dialogs.h"
 #include "ui/layouts.h"
 #include "ui/named.h"
+#include "ui/savefile.h"
 #include "window/trafficlog.h"
 
 namespace kdx {
@@ -136,15 +134,9 @@ void LogView::fit(int first, int last) {
 }
 
 void LogView::Log_Sichern_Click() {
-    const auto caption = [this](const Caption& one) { return captionText(m_with.captions, one); };
-    const QByteArray lines = text().toUtf8();  // what was there at the click
-    const QString name = m_with.dialogs.fileToSave(windowTitle(), QDir::home().filePath(QStringLiteral("log.txt")),
-                                                   caption({998, "Text (*.txt)"}));
-    if (name.isEmpty()) return;
-    QSaveFile file(name);
-    if (file.open(QIODevice::WriteOnly) && file.write(lines) == lines.size() && file.commit()) return;
-    m_with.dialogs.message(Dialogs::Icon::Critical, caption({313, "Fehler"}),
-                           caption({624, "%1 kann nicht gespeichert werden."}).arg(name));
+    // What was there at the click.
+    saveToChosenFile(m_with, windowTitle(), "log.txt", {998, "Text (*.txt)"},
+                     [lines = text().toUtf8()](const QString& file) { return replaceWith(lines, file); });
 }
 
 void LogView::copy() {

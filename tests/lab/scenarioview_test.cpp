@@ -221,5 +221,16 @@ TEST_F(ScenarioViewTest, SpeaksTheLanguageOfTheWindow) {
     EXPECT_EQ(text("Ablauf_Stand"), "Schritt 1; noch 4 s");
 }
 
+TEST_F(ScenarioViewTest, AReportDoesNotReplaceAFileOfTheProgram) {
+    openView();
+    const std::string before = folder.read("Datenset3.INI");
+    load("report: " + folder.data().filename().string() + "/Datenset3.INI\nsteps: [note: a]");
+    dialogs.expectedMessages = 1;
+    click("Ablauf_Start");
+    EXPECT_FALSE(view->isRunning());
+    EXPECT_EQ(folder.read("Datenset3.INI"), before);
+    EXPECT_EQ(dialogs.shown.back().preset.toStdString(), "Diese Datei gehört dem Programm: bitte eine andere wählen.");
+}
+
 }  // namespace
 }  // namespace kdx::test

@@ -2,6 +2,7 @@
 #include <sys/stat.h>
 
 #include "settings/datafoldertest.h"
+#include "settings/ownfiles.h"
 #include "support/unprivileged.h"
 
 namespace kdx {
@@ -53,6 +54,17 @@ TEST_F(DataFolderTest, ALinkedFileIsWrittenWhereItIs) {
     EXPECT_TRUE(fs::is_regular_file(elsewhere));
     EXPECT_TRUE(fs::is_symlink(m_folder.data() / "Datenset1.INI"));
     EXPECT_EQ(m_data.ReadIni("RDS", "PS", "datenset1.ini"), "RADIO");
+}
+
+TEST_F(DataFolderTest, AnOwnFileIsOneByALinkToo) {
+    m_folder.write("RDS_log.txt", "1\n");
+    fs::create_symlink(m_folder.data() / "RDS_log.txt", m_folder.path() / "to-the-log.txt");
+    fs::create_directory_symlink(m_folder.data(), m_folder.path() / "to-the-folder");
+    m_folder.write("../elsewhere.txt", "2\n");
+    fs::create_symlink(m_folder.path() / "elsewhere.txt", m_folder.data() / "Event.txt");
+    EXPECT_TRUE(isOwnFile(m_data, m_folder.path() / "to-the-log.txt"));
+    EXPECT_TRUE(isOwnFile(m_data, m_folder.path() / "to-the-folder" / "Datenset1.INI"));
+    EXPECT_TRUE(isOwnFile(m_data, m_folder.path() / "elsewhere.txt")) << "an own file is a link to it";
 }
 
 }  // namespace

@@ -194,6 +194,31 @@ TEST_F(LogViewTest, ALogThatCannotBeSavedIsTold) {
     EXPECT_EQ(dialogs.shown.back().icon, Dialogs::Icon::Critical);
 }
 
+TEST_F(LogViewTest, TheFilesOfTheProgramAreNotReplaced) {
+    folder.copyShipped();
+    folder.write("opened.ini", "[RDS]\r\nPS=ANDERS\r\n");
+    const auto opened = folder.data() / "opened.ini";
+    setGeneral("ADRESSEN", "Log_Key", "1");
+    start();
+    openSession();
+    action("Mnu_Info_Log")->trigger();
+    state.openedFile = opened.string();
+    ASSERT_NE(folder.read("RDS_log.txt"), "");
+    for (const char* name :
+         {"RDS_log.txt", "Datenset1.INI", "Datenset4.INI", "RDS_Allg.INI", "Sprachen.ini", "Event.txt", "opened.ini"}) {
+        const std::string before = folder.read(name);
+        dialogs.files = {QString::fromStdString((folder.data() / name).string())};
+        dialogs.expectedMessages = 1;
+        click("Log_Sichern");
+        EXPECT_EQ(folder.read(name), before) << name;
+        EXPECT_EQ(dialogs.shown.back().preset.toStdString(),
+                  "Diese Datei gehört dem Programm: bitte eine andere wählen.");
+    }
+    dialogs.files = {QString::fromStdString((folder.data() / "saved.txt").string())};
+    click("Log_Sichern");
+    EXPECT_NE(folder.read("saved.txt"), "");
+}
+
 TEST_F(LogViewTest, NothingIsCutOffInAnyLanguageAtAnySizeOfLetters) {
     folder.copyShipped();
     expectNothingCutOffAnywhere([this](const char* language) -> QWidget& {

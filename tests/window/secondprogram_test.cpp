@@ -22,6 +22,25 @@ protected:
         }
         return found;
     }
+    /// Saves what is shown from every view that saves, into the data folder: none of it comes to be there.
+    void saveIntoTheFolder() {
+        action("Mnu_Info_Log")->trigger();
+        action("Mnu_Ansicht_OnAir")->trigger();
+        clock.advance(std::chrono::seconds{10});
+        ASSERT_TRUE(tick("AirTimer"));
+        for (const char* button : {"Log_Sichern", "Air_Gruppen_Sichern", "Air_MPX_Sichern"}) {
+            for (const char* name : {"saved.txt", "Datenset2.INI", "RDS_log.txt"}) {
+                dialogs.files = {QString::fromStdString((folder.data() / name).string())};
+                dialogs.expectedMessages = 1;
+                click(button);
+                EXPECT_EQ(dialogs.shown.back().preset.toStdString(), "Nur zum Lesen geöffnet: nichts wird gespeichert")
+                    << button << " " << name;
+            }
+            dialogs.files = {QString::fromStdString((folder.path() / button).string())};
+            click(button);
+            EXPECT_TRUE(std::filesystem::exists(folder.path() / button)) << "elsewhere it may";
+        }
+    }
     bool goesOn() { return goesOnBesideAnother(claim, data, captions, dialogs); }
 
     std::optional<FolderClaim> first{std::in_place, folder.data()};
@@ -58,6 +77,7 @@ TEST_F(SecondProgramTest, WritesNothingWhenItGoesOn) {
     EXPECT_EQ(dialogs.shown.back().text.toStdString(), "Nicht gespeichert: Datenset2.INI");
     EXPECT_NE(text("QuietLine").find("Nur zum Lesen geöffnet: nichts wird gespeichert"), std::string::npos)
         << text("QuietLine");
+    saveIntoTheFolder();
     tick("UnsavedTimer");
     end();
     const auto after = everything();
