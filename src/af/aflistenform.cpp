@@ -34,21 +34,29 @@ void AF_Listenform::create() {
     AF_TN = wired<ClickableLabel>("AF_TN", &ClickableLabel::clicked, &AF_Listenform::AF_TN_Click, m_content);
     m_book.tip(AF_TN, {661, "zum Ändern anklicken"});
     m_view.createContent(AF_TN, {653, "Sendefrequenz [MHz]"}, "AF_List1", {654, "AF [MHz]"}, m_book);
+    for (QWidget* option : m_view.options())
+        m_book.tip(option, {1027, "Zeigt diese Liste: zuerst die eigene Frequenz, dann die anderen"});
     AF_List1 = m_view.list();
+    m_book.tip(AF_List1, {1029, "Andere Frequenzen, auf denen dasselbe Programm läuft"});
     AF_List1->setMinimumWidth(fontMetrics().horizontalAdvance(QLatin1Char('0')) * 20);
 
     Text2 = named<QLineEdit>("Text2", m_change);
     m_entryHeading = heading("", {655, "Frequenz [MHz]"}, Text2);
+    m_book.tip(Text2, {1151, "87.5 bis 108.0 MHz; mehrere mit Komma getrennt"});
     Command1 = clicked<QPushButton>("Command1", {656, "&Anhängen"}, m_change, &AF_Listenform::Command1_Click);
+    m_book.tip(Command1, {1152, "Hängt die Frequenz an die Liste an; Return im Feld tut dasselbe"});
     AF_OF_add = clicked<QPushButton>("AF_OF_add", {657, "Einfügen"}, m_change, &AF_Listenform::AF_OF_add_Click);
     m_book.tip(AF_OF_add, {662, "vor der ausgewählten Zeile"});
     Rem_Freq = clicked<QPushButton>("Rem_Freq", {658, "Löschen"}, m_change, &AF_Listenform::Rem_Freq_Click);
+    m_book.tip(Rem_Freq, {1153, "Nimmt die gewählte Frequenz heraus; die Taste Entf tut dasselbe"});
 
     createOrder();
 
     Uebernahme_Knopf =
         clicked<QPushButton>("Uebernahme_Knopf", {659, "Über&nehmen"}, this, &AF_Listenform::Uebernahme_Knopf_Click);
     Ende_Knopf = clicked<QPushButton>("Ende_Knopf", {660, "&Schließen"}, this, &AF_Listenform::Ende_Knopf_Click);
+    m_book.tip(Uebernahme_Knopf, {1156, "Speichert die Liste und schließt; gesendet wird erst auf der Seite"});
+    m_book.tip(Ende_Knopf, {1157, "Zurück zur Seite; nach nicht Übernommenem wird gefragt"});
     // The enter key in the text box appends and never stores or closes by accident.
     for (QPushButton* button : {AF_OF_add, Rem_Freq, AF_Auf, AF_Ab, AF_Sortieren, Uebernahme_Knopf, Ende_Knopf})
         button->setAutoDefault(false);
@@ -60,6 +68,9 @@ void AF_Listenform::createOrder() {
     AF_Ab = clicked<QPushButton>("AF_Ab", {861, "Nach unten"}, m_change, &AF_Listenform::AF_Ab_Click);
     AF_Sortieren =
         clicked<QPushButton>("AF_Sortieren", {862, "Sortieren"}, m_change, &AF_Listenform::AF_Sortieren_Click);
+    for (QPushButton* button : {AF_Auf, AF_Ab})
+        m_book.tip(button, {1154, "Verschiebt die gewählte Frequenz um eine Zeile"});
+    m_book.tip(AF_Sortieren, {1155, "Ordnet die Liste von der kleinsten zur größten Frequenz"});
     m_hint = named<QLabel>("KommaHinweis", m_change);
     m_hint->setWordWrap(true);
     m_hint->setMinimumHeight(2 * m_hint->fontMetrics().lineSpacing());  // room for it, so that nothing moves

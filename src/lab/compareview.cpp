@@ -41,6 +41,7 @@ CompareView::CompareView(const Station& station, const PageContext& with, QWidge
     Vergleich_Stand = named<QLabel>("Vergleich_Stand", this);
     Vergleich_Nur_Unterschiede =
         m_book.captioned<QCheckBox>("Vergleich_Nur_Unterschiede", {966, "&Nur Unterschiede"}, this);
+    m_book.tip(Vergleich_Nur_Unterschiede, {1158, "Blendet aus, was in allen Spalten gleich ist"});
     connect(Vergleich_Nur_Unterschiede, &QCheckBox::toggled, this, [this] { show({}); });
     const auto button = [this](const char* name, const Caption& caption, auto handler) {
         auto* made = m_book.captioned<QPushButton>(name, caption, this);
@@ -57,6 +58,8 @@ CompareView::CompareView(const Station& station, const PageContext& with, QWidge
     m_book.tip(Vergleich_Uebernehmen,
                {972, "Gerät an Fenster und Datei: die ausgewählten Zeilen, ohne Auswahl alle Unterschiede"});
     Vergleich_Schliessen = button("Vergleich_Schliessen", {688, "&Schließen"}, &QDialog::close);
+    m_book.tip(Vergleich_Schliessen, {1121, "Schließt nur diese Ansicht; was läuft, läuft weiter"});
+    m_book.tip(Vergleich_Tabelle, {1159, "Gewählte Zeilen werden gesendet oder übernommen"});
     arrange();
     showSessionOpen(with.instrument.isOpen());
     label();

@@ -57,21 +57,34 @@ ScenarioView::ScenarioView(Session& session, const PageContext& with, QWidget* p
     Ablauf_Titel = named<QLabel>("Ablauf_Titel", this);
     Ablauf_Stand = named<QLabel>("Ablauf_Stand", this);
     for (QLabel* line : {Ablauf_Titel, Ablauf_Stand}) line->setWordWrap(true);
-    const auto button = [this](const char* name, const Caption& caption, auto handler) {
+    const auto button = [this](const char* name, const Caption& caption, const Caption& tip, auto handler) {
         auto* made = m_book.captioned<QPushButton>(name, caption, this);
+        m_book.tip(made, tip);
         made->setAutoDefault(false);
         connect(made, &QPushButton::clicked, this, handler);
         return made;
     };
-    Ablauf_Oeffnen = button("Ablauf_Oeffnen", {975, "Ö&ffnen..."}, &ScenarioView::Ablauf_Oeffnen_Click);
-    Ablauf_Start = button("Ablauf_Start", {976, "St&art"}, &ScenarioView::Ablauf_Start_Click);
-    Ablauf_Pause = button("Ablauf_Pause", {977, "&Pause"}, &ScenarioView::Ablauf_Pause_Click);
+    Ablauf_Oeffnen = button("Ablauf_Oeffnen", {975, "Ö&ffnen..."},
+                            {1122, "Liest und prüft eine Szenariodatei und zeigt ihre Schritte"},
+                            &ScenarioView::Ablauf_Oeffnen_Click);
+    Ablauf_Start =
+        button("Ablauf_Start", {976, "St&art"}, {1123, "Führt die Schritte aus; dazu muss die Verbindung offen sein"},
+               &ScenarioView::Ablauf_Start_Click);
+    Ablauf_Pause =
+        button("Ablauf_Pause", {977, "&Pause"}, {1124, "Hält die Zeit des Ablaufs an, bis noch einmal geklickt wird"},
+               &ScenarioView::Ablauf_Pause_Click);
     Ablauf_Pause->setCheckable(true);
     Ablauf_Pause->setProperty(kWorksWhileSending, true);
-    Ablauf_Stop = button("Ablauf_Stop", {978, "S&topp"}, &ScenarioView::stop);
+    Ablauf_Stop =
+        button("Ablauf_Stop", {978, "S&topp"},
+               {1125, "Bricht ab; was vorher war, kommt wieder, wenn die Datei das vorsieht"}, &ScenarioView::stop);
     Ablauf_Stop->setProperty(kWorksWhileSending, true);
-    Ablauf_Weiter = button("Ablauf_Weiter", {979, "&Weiter"}, &ScenarioView::Ablauf_Weiter_Click);
-    Ablauf_Schliessen = button("Ablauf_Schliessen", {688, "&Schließen"}, &QDialog::close);
+    Ablauf_Weiter =
+        button("Ablauf_Weiter", {979, "&Weiter"}, {1126, "Setzt den Ablauf fort, wo ein Schritt auf Sie wartet"},
+               &ScenarioView::Ablauf_Weiter_Click);
+    Ablauf_Schliessen = button("Ablauf_Schliessen", {688, "&Schließen"},
+                               {1121, "Schließt nur diese Ansicht; was läuft, läuft weiter"}, &QDialog::close);
+    m_book.tip(m_steps.widget(), {1127, "Die Schritte der Datei und, sobald sie ausgeführt sind, ihr Ergebnis"});
     connect(m_run, &ScenarioRun::stepBegan, this, [this](const std::string& step) {
         m_step = step;
         m_steps.mark(step);

@@ -84,7 +84,9 @@ OnAirView::OnAirView(air::Shadow& shadow, const Station& station, const PageCont
     Air_MPX_Sichern = button("Air_MPX_Sichern", {786, "&Multiplex sichern..."}, &OnAirView::Air_MPX_Sichern_Click);
     m_book.tip(Air_MPX_Sichern, {784, "Das Multiplexsignal zu den letzten Gruppen als WAV-Datei"});
     Air_Kopieren = button("Air_Kopieren", {686, "&Kopieren"}, &OnAirView::Air_Kopieren_Click);
+    m_book.tip(Air_Kopieren, {1141, "Legt alles Gezeigte als Text in die Zwischenablage"});
     Air_Schliessen = m_book.captioned<QPushButton>("Air_Schliessen", {688, "&Schließen"}, this);
+    m_book.tip(Air_Schliessen, {1121, "Schließt nur diese Ansicht; was läuft, läuft weiter"});
     Air_Schliessen->setAutoDefault(false);
     connect(Air_Schliessen, &QPushButton::clicked, this, &QDialog::close);
     arrange();

@@ -63,7 +63,13 @@ void TMC_Listedit::create() {
         clicked<QPushButton>("Eintrag_Loeschen", {877, "Eintrag löschen"}, this, &TMC_Listedit::Eintrag_Loeschen_Click);
     for (QPushButton* button : {Event_Hinzu, Loc_Hinzu, Eintrag_Aendern, Eintrag_Loeschen, Zuruek_Knopf})
         button->setAutoDefault(false);
+    m_book.tip(Zuruek_Knopf, {1146, "Zurück zum Fenster; was geändert wurde, ist schon gespeichert"});
+    m_book.tip(Eintrag_Aendern, {1149, "Fragt nach neuem Text und neuer Nummer für den gewählten"});
+    m_book.tip(Eintrag_Loeschen, {1150, "Nimmt den gewählten nach einer Frage aus der Datei"});
+    for (QPushButton* button : {Event_Hinzu, Loc_Hinzu})
+        m_book.tip(button, {1148, "Hängt Text und Nummer an die Datei an, wenn beide dastehen"});
     for (QListView* list : {List1, List2}) {
+        m_book.tip(list, {1147, "Ein gewählter Eintrag lässt sich ändern oder löschen"});
         connect(list->selectionModel(), &QItemSelectionModel::selectionChanged, this,
                 [this, list] { chooseOnlyIn(list); });
     }

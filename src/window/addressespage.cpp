@@ -42,6 +42,10 @@ void AddressesPage::label() {
     m_heading->setText(text({930, "Früher benutzt oder im Netz gefunden"}));
     Adressen_Suchen->setText(text({931, "Im Netz &suchen"}));
     Adressen_Verwenden->setText(text({932, "&Verwenden"}));
+    Adressen_Suchen->setToolTip(text({1143, "Fragt, welche Geräte im eigenen Netz antworten; nichts wird verstellt"}));
+    for (QWidget* way : {static_cast<QWidget*>(Adressen_Liste), static_cast<QWidget*>(Adressen_Verwenden)})
+        way->setToolTip(
+            text({1144, "Macht den gewählten Eintrag zur Adresse, wie ein Doppelklick; nur ohne Verbindung"}));
 }
 
 void AddressesPage::show(const QStringList& usedBefore) {

@@ -76,6 +76,8 @@ CorrectionsPage::CorrectionsPage(const PageContext& with, QWidget* parent) : QWi
 
 void CorrectionsPage::label() {
     Alle_Berichtigungen->setText(captionText(m_with.captions, {934, "&Alle Berichtigungen"}));
+    Alle_Berichtigungen->setToolTip(
+        captionText(m_with.captions, {1145, "Schaltet alle ein oder, wenn sie ein sind, alle aus"}));
     for (std::size_t i = 0; i < kTexts.size(); ++i) {
         const QString text = captionText(m_with.captions, kTexts[i]);
         const QString title = text.section(QStringLiteral(": "), 0, 0);

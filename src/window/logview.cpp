@@ -12,6 +12,7 @@
 #include <QTableView>
 
 #include <algorithm>
+#include <utility>
 
 #include "ui/caption.h"
 #include "ui/layouts.h"
@@ -118,6 +119,16 @@ void LogView::label() {
     m_copy->setText(text({686, "&Kopieren"}));
     m_clear->setText(text({687, "&Leeren"}));
     m_close->setText(text({688, "&Schließen"}));
+    const std::pair<QWidget*, Caption> tips[] = {
+        {Log_Filter, {1128, "Zeigt nur Zeilen mit diesem Text; groß und klein gilt gleich"}},
+        {Log_Liste, {1129, "Was an das Gerät ging und was es antwortete"}},
+        {Log_Pause, {1130, "Hält die Anzeige an; was inzwischen kommt, erscheint danach"}},
+        {Log_Umbruch, {1131, "Zeigt lange Befehle ganz, in mehreren Zeilen"}},
+        {Log_Sichern, {1132, "Schreibt alle gezeigten Zeilen in eine Textdatei"}},
+        {m_copy, {1133, "Legt die gewählten Zeilen in die Zwischenablage, ohne Auswahl alle"}},
+        {m_clear, {1134, "Entfernt alle Zeilen der Anzeige; RDS_log.txt bleibt"}},
+        {m_close, {1121, "Schließt nur diese Ansicht; was läuft, läuft weiter"}}};
+    for (const auto& [control, tip] : tips) control->setToolTip(text(tip));
 }
 
 void LogView::Log_Umbruch_Click(bool wrapped) {

@@ -81,14 +81,18 @@ ManualView::ManualView(std::filesystem::path folder, const PageContext& with, QW
     connect(Handbuch_Text, &QTextBrowser::backwardAvailable, Handbuch_Zurueck, &QWidget::setEnabled);
     connect(Handbuch_Text, &QTextBrowser::forwardAvailable, Handbuch_Vor, &QWidget::setEnabled);
     Handbuch_Inhalt = button("Handbuch_Inhalt", {1113, "&Inhalt"}, this, [this] { open({}); });
+    for (QPushButton* way : {Handbuch_Zurueck, Handbuch_Vor, Handbuch_Inhalt})
+        m_book.tip(way, {1142, "Zurück und Vor: Kapitel, die schon offen waren; Inhalt: alle Kapitel"});
     Handbuch_Suche = named<QLineEdit>("Handbuch_Suche", this);
     Handbuch_Suche->setClearButtonEnabled(true);
-    m_book.spoken(Handbuch_Suche, {1114, "Im Kapitel suchen"});
+    m_book.describe(Handbuch_Suche, {1114, "Im Kapitel suchen"});
     connect(Handbuch_Suche, &QLineEdit::returnPressed, this, &ManualView::Handbuch_Suche_Return);
     connect(Handbuch_Suche, &QLineEdit::textEdited, this, [this] { Handbuch_Stand->clear(); });
     Handbuch_Weiter = button("Handbuch_Weiter", {1115, "Weiter&suchen"}, this, &ManualView::Handbuch_Suche_Return);
+    m_book.tip(Handbuch_Weiter, {1114, "Im Kapitel suchen"});
     Handbuch_Stand = named<QLabel>("Handbuch_Stand", this);
     Handbuch_Schliessen = button("Handbuch_Schliessen", {688, "&Schließen"}, this, &QDialog::close);
+    m_book.tip(Handbuch_Schliessen, {1121, "Schließt nur diese Ansicht; was läuft, läuft weiter"});
     const auto* find = new QShortcut(QKeySequence::Find, this);
     connect(find, &QShortcut::activated, Handbuch_Suche, [this] {
         Handbuch_Suche->setFocus();

@@ -44,6 +44,7 @@ SettingsDialog::SettingsDialog(const PageContext& with, AddressesPage::Find find
     m_tabs->addTab(m_corrections, QString());
     connect(m_corrections, &CorrectionsPage::changed, this, &SettingsDialog::correctionsChanged);
     m_close = m_book.captioned<QPushButton>("Einstellungen_Schliessen", {688, "&Schließen"}, this);
+    m_book.tip(m_close, {1146, "Zurück zum Fenster; was geändert wurde, ist schon gespeichert"});
     m_close->setAutoDefault(false);
     connect(m_close, &QPushButton::clicked, this, &QDialog::close);
     layOut(this, column({{m_tabs, 1}, row({kRoom, m_close})}), 2 * kGap);
@@ -55,20 +56,24 @@ SettingsDialog::SettingsDialog(const PageContext& with, AddressesPage::Find find
 QWidget* SettingsDialog::createProgramPage() {
     auto* page = new QWidget(m_tabs);
     Log_Schalter = m_book.captioned<QCheckBox>("Log_Schalter", {925, "Befehle in RDS_log.txt schreiben"}, page);
+    m_book.tip(Log_Schalter, {1135, "Die Datei steht im Datenordner und beginnt mit jedem Start neu"});
     connect(Log_Schalter, &QCheckBox::clicked, this, &SettingsDialog::Log_Schalter_Click);
     Auto_Schalter =
         m_book.captioned<QCheckBox>("Auto_Schalter", {926, "Beim Start verbinden und den Datensatz senden"}, page);
+    m_book.tip(Auto_Schalter, {1136, "Gilt ab dem nächsten Start des Programms"});
     connect(Auto_Schalter, &QCheckBox::clicked, this, &SettingsDialog::Auto_Schalter_Click);
 
     Sprache_Wahl = named<QComboBox>("Sprache_Wahl", page);
     connect(Sprache_Wahl, &QComboBox::activated, this, &SettingsDialog::Sprache_Wahl_Click);
     auto* language = m_book.captioned<QLabel>("", {2}, page);
     m_book.head(language, Sprache_Wahl);
+    m_book.tip(Sprache_Wahl, {1137, "Sprache aller Texte; gilt sofort"});
     RDS_RBDS_Wahl = named<QComboBox>("RDS_RBDS_Wahl", page);
     for (const char* standard : kStandards) RDS_RBDS_Wahl->addItem(QString::fromLatin1(standard));
     connect(RDS_RBDS_Wahl, &QComboBox::activated, this, &SettingsDialog::RDS_RBDS_Wahl_Click);
     auto* standard = m_book.captioned<QLabel>("", {929, "Programmarten"}, page);
     m_book.head(standard, RDS_RBDS_Wahl);
+    m_book.tip(RDS_RBDS_Wahl, {1138, "Namen der 32 Arten: RDS in Europa, RBDS in Nordamerika"});
 
     PS_Dyn_Zahl = named<QSpinBox>("PS_Dyn_Zahl", page);
     PS_Dyn_Zahl->setRange(0, Ticker::kLongestInterval);
@@ -79,6 +84,7 @@ QWidget* SettingsDialog::createProgramPage() {
     });
     auto* interval = m_book.captioned<QLabel>("", {927, "Abstand des dynamischen PS [ms]"}, page);
     m_book.head(interval, PS_Dyn_Zahl);
+    m_book.tip(PS_Dyn_Zahl, {1139, "0 bis 65535 ms von einem Namen zum nächsten; 0 hält an"});
 
     auto* frame = m_book.captioned<QGroupBox>("", {922, "Grenzen der Eingabe, ausschließlich"}, page);
     constexpr std::array kNames = {"FM_Ulim_Zahl", "FM_Olim_Zahl", "NF_Ulim_Zahl", "NF_Olim_Zahl"};
@@ -108,6 +114,7 @@ QDoubleSpinBox* SettingsDialog::createLimit(const char* name, const Place& place
     box->setDecimals(3);
     box->setRange(0, kLargest);
     box->setKeyboardTracking(false);
+    m_book.tip(box, {1140, "Bis 10000; angenommen wird nur, was zwischen beiden Grenzen liegt"});
     connect(box, &QDoubleSpinBox::valueChanged, this,
             [this, place](double value) { m_with.profile.write(place, shortestDecimal(value)); });
     return box;
