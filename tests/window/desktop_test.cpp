@@ -3,10 +3,10 @@
 
 #include <QMenu>
 #include <QMenuBar>
-#include <QShortcut>
 
 #include <set>
 
+#include "support/realkey.h"
 #include "support/windowtest.h"
 
 namespace kdx::test {
@@ -15,16 +15,7 @@ namespace {
 class DesktopTest : public WindowTest {
 protected:
     DesktopTest() { folder.copyShipped(); }
-    /// Presses a key of the whole window.
-    void key(const QKeySequence& keys) {
-        for (QShortcut* shortcut : window->findChildren<QShortcut*>()) {
-            if (shortcut->key() == keys) return emit shortcut->activated();
-        }
-        for (QAction* entry : window->findChildren<QAction*>()) {
-            if (entry->shortcut() == keys) return entry->trigger();
-        }
-        ADD_FAILURE() << "nothing hears " << keys.toString().toStdString();
-    }
+    void key(const QKeySequence& keys) { pressKey(*window, keys); }
     QMenu* menu(const char* name) { return window->findChild<QMenu*>(QString::fromLatin1(name)); }
     int page() { return find<QTabWidget>("SSTab1")->currentIndex(); }
 };
@@ -140,20 +131,6 @@ TEST_F(DesktopTest, APlaceThatCannotBeReadIsPassedOver) {
     start();
     EXPECT_EQ(page(), 0);
     EXPECT_EQ(window->size(), QSize(640, 480));
-}
-
-TEST_F(DesktopTest, EveryControlHasATip) {
-    for (const char* language : {"deutsch", "english", "english US"}) {
-        setGeneral("Sprache", "Sprache", language);
-        start();
-        for (const QWidget* control : find("Frame7")->findChildren<QWidget*>()) {
-            if (control->focusPolicy() == Qt::NoFocus || control->objectName().isEmpty() ||
-                control->objectName().startsWith(QStringLiteral("qt_")) || control->inherits("QToolButton") ||
-                control->objectName() == QStringLiteral("SSTab1"))
-                continue;
-            EXPECT_FALSE(control->toolTip().isEmpty()) << language << " " << control->objectName().toStdString();
-        }
-    }
 }
 
 }  // namespace

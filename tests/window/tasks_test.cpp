@@ -7,6 +7,7 @@
 #include <semaphore>
 #include <set>
 
+#include "support/realkey.h"
 #include "window/taskstest.h"
 
 namespace kdx::test {
@@ -263,12 +264,7 @@ TEST_F(Tasks, CycleTmcMessagesAndStop) {
 TEST_F(Tasks, ReadEverythingBack) {
     workOn(kStereoPage);
     ask(direct("PS=FREMD"));
-    for (QShortcut* shortcut : window->findChildren<QShortcut*>()) {
-        if (shortcut->key() == QKeySequence(Qt::Key_F5)) emit shortcut->activated();
-    }
-    for (QAction* entry : window->findChildren<QAction*>()) {
-        if (entry->shortcut() == QKeySequence(Qt::Key_F5)) entry->trigger();
-    }
+    pressKey(*window, Qt::Key_F5);
     EXPECT_TRUE(find("gelesen")->isVisible());
     for (const char* value : {"FREMD", "D7A1", "98.5 MHz", "0A,2A,0A,8A", "FM Hub: 75000 Hz", "TALWELLE"})
         EXPECT_THAT(text("gelesen"), HasSubstr(value));
