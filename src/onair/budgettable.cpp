@@ -60,7 +60,7 @@ void BudgetTable::addWarnings(std::vector<TableRow>& rows, const air::Shadow& sh
                               const air::GroupBudget& budget) const {
     const auto add = [&](const std::vector<std::string>& warnings) {
         for (const std::string& warning : warnings) {
-            const QString text = warningText(m_with.captions, warning);
+            const QString text = warningText(warning, m_with.captions, m_with.state);
             rows.push_back({{QStringLiteral("! ") + text}, false, text});
         }
     };

@@ -144,12 +144,8 @@ void RadioFace::showValues(const air::Shadow& shadow) {
 QString RadioFace::reasonOf(const AirDifference& difference) const {
     const QString entry = QLatin1Char('"') + toText(difference.entry) + QLatin1Char('"');
     switch (difference.why) {
-        case AirDifference::Why::Refused: {
-            const QString why = caption({791, "Der Coder nimmt %1 nicht an"}).arg(entry);
-            return difference.entry.find('"') == std::string::npos
-                       ? why
-                       : withRemedy(why, &Corrections::quotes, m_with.captions, m_with.state);
-        }
+        case AirDifference::Why::Refused:
+            return refusalText(difference.entry, entry, m_with.captions, m_with.state);
         case AirDifference::Why::Cut:
             return caption({792, "Für die Anzeige gekürzt; eingegeben ist %1"}).arg(entry);
         case AirDifference::Why::Padded:

@@ -133,9 +133,9 @@ QString RadioTables::whyMarked(const air::ReceivedNetwork& network, const air::S
     }
     for (std::size_t i = 0; i < kPsLength; ++i) {
         if (network.ps.at(i) == rdsCode(i < ps.size() ? ps[i] : ' ')) continue;
-        return (shadow.isRefused("EON-PS " + digits, ps) ? caption({791, "Der Coder nimmt %1 nicht an"})
-                                                         : caption({790, "Eingegeben ist %1"}))
-            .arg(toText(entered.ps));
+        const QString shown = toText(entered.ps);
+        return shadow.isRefused("EON-PS " + digits, ps) ? refusalText(ps, shown, m_with.captions, m_with.state)
+                                                        : caption({790, "Eingegeben ist %1"}).arg(shown);
     }
     const auto differs = [](const std::string& flag, std::optional<bool> on) {
         return on && flag != (*on ? "1" : "0");

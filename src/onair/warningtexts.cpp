@@ -68,10 +68,12 @@ std::optional<QStringList> partsOf(const QString& warning, const char* form) {
     return match.capturedTexts().mid(1);
 }
 
-}  // namespace
+/// A traffic message is refused as long as nobody chose its T field: its code begins with a "-".
+bool isOfUnchosenFields(const QString& warning) {
+    return warning.startsWith(QLatin1String("refused: ")) && warning.contains(QLatin1String("\"8A=02,-"));
+}
 
-QString warningText(const Captions& captions, const std::string& warning) {
-    QString text = QString::fromStdString(warning);
+QString inWords(const QString& text, const Captions& captions) {
     for (const WarningRow& row : kWarnings) {
         const auto parts = partsOf(text, row.warning);
         if (!parts) continue;
@@ -83,6 +85,20 @@ QString warningText(const Captions& captions, const std::string& warning) {
         return shown;
     }
     return text;
+}
+
+}  // namespace
+
+QString warningText(const std::string& warning, const Captions& captions, const ProgramState& state) {
+    const QString text = QString::fromStdString(warning);
+    const QString shown = inWords(text, captions);
+    return isOfUnchosenFields(text) ? withRemedy(shown, &Corrections::trafficFields, captions, state) : shown;
+}
+
+QString refusalText(std::string_view entry, const QString& shown, const Captions& captions, const ProgramState& state) {
+    const QString why = captionText(captions, {791, "Der Coder nimmt %1 nicht an"}).arg(shown);
+    const bool isQuoted = entry.find('"') != std::string_view::npos;
+    return isQuoted ? withRemedy(why, &Corrections::quotes, captions, state) : why;
 }
 
 QString withRemedy(const QString& why, bool Corrections::*correction, const Captions& captions,

@@ -7,6 +7,7 @@ namespace {
 
 using namespace std::chrono_literals;
 using ::testing::HasSubstr;
+using ::testing::Not;
 
 TEST_F(OnAirViewTest, ARowIsMarkedWhereTheRadioShowsSomethingElse) {
     open();
@@ -142,6 +143,46 @@ TEST_F(OnAirViewTest, AnotherNetworksProgrammeTypeIsMarkedWithItsCorrection) {
     select("EON_PTY_Combo", 4);
     listen(30s);
     EXPECT_EQ(remark("D7A2"), "");
+}
+
+TEST_F(OnAirViewTest, AnotherNetworksQuoteIsMarkedWithItsCorrection) {
+    open();
+    listen(30s);
+    type("EON_PS_Text", "A\"B");
+    click("EON_PS_Taste");
+    listen(30s);
+    EXPECT_EQ(remark("D7A2"), "Der Coder nimmt A\"B nicht an. Die Berichtigung Anfuehrung behebt das");
+    state.corrections.quotes = true;
+    listen();
+    EXPECT_EQ(remark("D7A2"), "Der Coder nimmt A\"B nicht an") << "not sent again yet";
+    click("EON_PS_Taste");
+    listen(30s);
+    EXPECT_EQ(remark("D7A2").find("Der Coder"), std::string::npos) << remark("D7A2");
+}
+
+TEST_F(OnAirViewTest, ATrafficMessageRefusedForAnUnchosenFieldIsToldWithItsCorrection) {
+    open();
+    select("TMC_Event_Combo", 0);
+    click("TMC_Gr8_apply");
+    click("TMC_Senden_Taste");
+    ASSERT_TRUE(tick("TMC_Sende_Timer"));
+    listen();
+    EXPECT_THAT(cells("Air_Budget"), HasSubstr("Nicht angenommen: "));
+    EXPECT_THAT(cells("Air_Budget"), HasSubstr(". Die Berichtigung TMC_Felder behebt das|"));
+    state.corrections.trafficFields = true;
+    session->params.SendParam("RT", "X");  // what is told is told anew after a command
+    listen();
+    EXPECT_THAT(cells("Air_Budget"), HasSubstr("Nicht angenommen: "));
+    EXPECT_THAT(cells("Air_Budget"), Not(HasSubstr("TMC_Felder")));
+}
+
+TEST_F(OnAirViewTest, AnotherRefusedCommandIsToldWithoutACorrection) {
+    open();
+    type("PI_T", "XYZ1");
+    click("Command3");
+    listen();
+    EXPECT_THAT(cells("Air_Budget"), HasSubstr("Nicht angenommen: "));
+    EXPECT_THAT(cells("Air_Budget"), Not(HasSubstr("Berichtigung")));
 }
 
 }  // namespace
