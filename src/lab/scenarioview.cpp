@@ -265,10 +265,10 @@ void ScenarioView::showState() {
         if (m_outcome) state += endText(*m_outcome);
     } else if (m_run->isRestoring()) {
         state += caption({1090, "was vorher war, wird wiederhergestellt"});
-    } else if (m_step.empty()) {
+    } else if (m_step.empty() && m_scenario.restore) {
         state += caption({989, "was vorher war, wird gelesen und kommt danach wieder"});
     } else {
-        state += caption({993, "Schritt %1"}).arg(QString::fromStdString(m_step));
+        if (!m_step.empty()) state += caption({993, "Schritt %1"}).arg(QString::fromStdString(m_step));
         if (m_run->asks()) state += caption({999, "wartet auf Weiter"});
         if (m_run->left().count() > 0) state += caption({983, "noch %1"}).arg(durationText(m_run->left()));
         if (m_run->isHeld()) state += caption({984, "angehalten"});

@@ -221,6 +221,23 @@ TEST_F(ScenarioViewTest, SpeaksTheLanguageOfTheWindow) {
     EXPECT_EQ(text("Ablauf_Stand"), "Schritt 1; noch 4 s");
 }
 
+TEST_F(ScenarioViewTest, OnlyAFileThatRestoresIsSaidToBringBackWhatWasBefore) {
+    openView();
+    load("restore: true\nsteps: [wait: 10 s]");
+    click("Ablauf_Start");
+    EXPECT_EQ(text("Ablauf_Stand"), "was vorher war, wird gelesen und kommt danach wieder");
+    passAll();
+    load("restore: false\nsteps: [wait: 10 s]");
+    click("Ablauf_Start");
+    EXPECT_EQ(text("Ablauf_Stand"), "");
+    click("Ablauf_Pause");
+    EXPECT_EQ(text("Ablauf_Stand"), "angehalten");
+    click("Ablauf_Pause");
+    pass(1s);
+    EXPECT_EQ(text("Ablauf_Stand"), "Schritt 1; noch 10 s");
+    passAll();
+}
+
 TEST_F(ScenarioViewTest, AReportDoesNotReplaceAFileOfTheProgram) {
     openView();
     const std::string before = folder.read("Datenset3.INI");
