@@ -212,6 +212,26 @@ TEST_F(TmcBuilderTest, TheBitDisplayIsShownAndHiddenByItsButton) {
     EXPECT_EQ(text("TMC_Gr8_Label"), "0810013039");
 }
 
+TEST_F(TmcBuilderTest, TheButtonOfTheBitDisplayHasItsCaptionBesideIt) {
+    for (const char* language : {"deutsch", "english", "english US"}) {
+        useLanguage(language);
+        page->label();
+        page->show();
+        QCoreApplication::processEvents();
+        const QWidget* button = find("TMCInfoOnOff");
+        const QLabel* caption = nullptr;
+        for (const QLabel* label : page->findChildren<QLabel*>())
+            if (label->buddy() == button) caption = label;
+        ASSERT_NE(caption, nullptr);
+        EXPECT_EQ(caption->text(), QStringLiteral("Bits")) << language;
+        EXPECT_TRUE(caption->isVisible());
+        const auto place = [this](const QWidget& of) { return QRect(of.mapTo(page.get(), QPoint()), of.size()); };
+        EXPECT_LT(place(*caption).left() - place(*button).right(), 20);
+        EXPECT_GT(place(*caption).left(), place(*button).right());
+        EXPECT_LT(std::abs(place(*caption).bottom() - place(*button).bottom()), 5) << "in one row";
+    }
+}
+
 TEST_F(TmcBuilderTest, EveryBitLabelHasItsHeadingAboveIt) {
     page->resize(620, 322);
     page->show();

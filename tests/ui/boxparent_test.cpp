@@ -4,6 +4,7 @@
 
 #include <QApplication>
 #include <QDialog>
+#include <QFileDialog>
 #include <QInputDialog>
 #include <QMainWindow>
 #include <QMessageBox>
@@ -47,7 +48,39 @@ TEST_F(BoxParentTest, EveryBoxBelongsToTheMainWindowAlsoWhenItIsNotActive) {
     EXPECT_EQ(parentOf([&] { dialogs.message(Dialogs::Icon::None, text, text); }), &window);
     EXPECT_EQ(parentOf([&] { dialogs.messageOrStop(text, text); }), &window);
     EXPECT_EQ(parentOf([&] { dialogs.confirm(text, text); }), &window);
+    EXPECT_EQ(parentOf([&] { dialogs.confirmLoss(text, text); }), &window);
     EXPECT_EQ(parentOf([&] { dialogs.input(text, text, text); }), &window);
+    EXPECT_EQ(parentOf([&] { dialogs.about(text, text, text); }), &window);
+    EXPECT_EQ(parentOf([&] { dialogs.fileToSave(text, QStringLiteral("a.txt"), text); }), &window);
+    EXPECT_EQ(parentOf([&] { dialogs.fileToOpen(text, text); }), &window);
+}
+
+TEST_F(BoxParentTest, TheQuestionBeforeAFileIsReplacedBelongsToTheViewThatSaves) {
+    window.show();
+    QDialog view(&window);
+    view.show();
+    QApplication::setActiveWindow(&view);
+    folder.write("taken.txt", "1");
+    const QString taken = QString::fromStdString((folder.data() / "taken.txt").string());
+    const QWidget* fileBox = nullptr;
+    const QWidget* question = nullptr;
+    QTimer::singleShot(0, qApp, [&] {
+        auto* box = qobject_cast<QFileDialog*>(QApplication::activeModalWidget());
+        ASSERT_NE(box, nullptr);
+        fileBox = box->parentWidget();
+        QTimer::singleShot(0, qApp, [&question, box] {
+            auto* asked = qobject_cast<QMessageBox*>(QApplication::activeModalWidget());
+            ASSERT_NE(asked, nullptr);
+            question = asked->parentWidget();
+            QTimer::singleShot(0, box, &QDialog::reject);  // it is there again then
+            asked->reject();
+        });
+        box->selectFile(taken);
+        static_cast<QDialog*>(box)->accept();
+    });
+    EXPECT_EQ(dialogs.fileToSave(QStringLiteral("Title"), taken, QStringLiteral("All (*)")), QString());
+    EXPECT_EQ(fileBox, &view);
+    EXPECT_EQ(question, &view);
 }
 
 TEST_F(BoxParentTest, ABoxOfAnEditorBelongsToTheEditor) {

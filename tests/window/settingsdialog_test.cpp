@@ -9,6 +9,7 @@
 #include <QSpinBox>
 
 #include <chrono>
+#include <set>
 #include <thread>
 
 #include "settings/corrections.h"
@@ -111,6 +112,35 @@ TEST_F(SettingsDialogTest, EachCorrectionHasASwitchWithASentence) {
         EXPECT_EQ(state.corrections.*isOn, !before) << key;
         click(box(key).c_str());
         EXPECT_EQ(state.corrections.*isOn, before) << key;
+    }
+}
+
+TEST_F(SettingsDialogTest, EachSentenceSaysWhatHappensWithoutAndWithTheCorrection) {
+    struct Words {
+        const char* language;
+        const char* without;
+        const char* with;
+    };
+    for (const auto& [language, without, with] :
+         {Words{"deutsch", "Ohne ", " mit "}, Words{"english", "Without, ", "; with, "},
+          Words{"english US", "Without, ", "; with, "}}) {
+        setGeneral("Sprache", "Sprache", language);
+        start();
+        open();
+        std::set<QString> titles;
+        for (const auto& [key, isOn] : kCorrectionKeys) {
+            const auto* correction = find<QCheckBox>(box(key).c_str());
+            const QString sentence = correction->toolTip();
+            EXPECT_TRUE(sentence.startsWith(QLatin1String(without))) << language << " " << sentence.toStdString();
+            const auto at = sentence.indexOf(QLatin1String(with));
+            EXPECT_GT(at, 10) << language << " " << sentence.toStdString();
+            EXPECT_GT(sentence.size() - at, 9) << language << " " << sentence.toStdString();
+            EXPECT_TRUE(titles.insert(correction->text()).second) << language << " " << key;
+            const auto labels = correction->parentWidget()->findChildren<QLabel*>();
+            EXPECT_TRUE(
+                std::any_of(labels.begin(), labels.end(), [&](auto* label) { return label->text() == sentence; }))
+                << language << " " << key << " shows another";
+        }
     }
 }
 
