@@ -2,6 +2,7 @@
 
 #include <QPainter>
 
+#include <algorithm>
 #include <array>
 
 #include "link/instrument.h"
@@ -46,6 +47,13 @@ private:
 /// The commands that switch the RF output.
 constexpr std::array kOutputs = {":OUTPUT:STAT OFF", ":OUTPUT:STAT ON"};
 
+constexpr VisaStatus kNoListeners = -1073807265;  // BFFF005F: a library finds nobody on the bus
+
+/// What says that there is nobody at the other end. A call that was stopped, a device that another program holds and
+/// one that is slow to answer do not.
+constexpr std::array kLosses = {visa::kConnectionLost, visa::kInputOutput, visa::kResourceNotFound,
+                                visa::kInvalidObject,  visa::kSystemError, kNoListeners};
+
 }  // namespace
 
 Indicators::Indicators(const PageContext& with, const DataSets& sets, ConnectionBar& bar, bool simulated,
@@ -80,9 +88,11 @@ void Indicators::label() {
 
 void Indicators::passed(const Traffic& traffic) {
     if (traffic.kind == Traffic::Kind::Logged) return;
-    m_lost = traffic.status < 0;
+    const bool failed = traffic.status < 0;
+    if (!failed) m_lost = false;
+    if (std::find(kLosses.begin(), kLosses.end(), traffic.status) != kLosses.end()) m_lost = true;
     showConnection();
-    for (std::size_t i = 0; i < kOutputs.size() && !m_lost; ++i) {
+    for (std::size_t i = 0; i < kOutputs.size() && !failed; ++i) {
         if (traffic.text != kOutputs[i]) continue;
         m_output = i == 0 ? Output::Off : Output::On;
         showOutput();

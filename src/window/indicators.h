@@ -14,8 +14,8 @@ class ConnectionBar;
 class DataSets;
 
 /// What the window tells beside the values: the set at work, whether there is an instrument at the other end, and
-/// whether its RF output is on. The latter two are what its commands tell: a failed one means that the connection is
-/// lost, until the next one that succeeds.
+/// whether its RF output is on. The latter two are what its commands tell: one whose status says that nobody is
+/// there any more means that the connection is lost, until the next one that succeeds.
 class Indicators : public QObject, public TrafficWatcher {
     Q_OBJECT
 public:

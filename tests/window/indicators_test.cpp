@@ -20,6 +20,7 @@ protected:
 };
 
 constexpr VisaStatus kConnectionLost = -1073807194;
+constexpr VisaStatus kNoListeners = -1073807265;
 
 TEST_F(IndicatorsTest, TheConnectionIsToldInWords) {
     start();
@@ -48,6 +49,39 @@ TEST_F(IndicatorsTest, ALinkThatIsLostIsToldUntilTheNextCommandThatSucceeds) {
     EXPECT_EQ(connection(), "Verbindung verloren");
     click("Command3");
     EXPECT_EQ(connection(), "verbunden: 127.0.0.1");
+}
+
+TEST_F(IndicatorsTest, EveryStatusThatSaysThatNobodyIsThereIsALoss) {
+    start();
+    openSession();
+    for (const VisaStatus status : {kConnectionLost, visa::kInputOutput, visa::kResourceNotFound, visa::kInvalidObject,
+                                    visa::kSystemError, kNoListeners}) {
+        failWith(status);
+        EXPECT_EQ(connection(), "Verbindung verloren") << status;
+        EXPECT_EQ(mark(), connection());
+        click("Command3");
+        EXPECT_EQ(connection(), "verbunden: 127.0.0.1") << status;
+    }
+}
+
+TEST_F(IndicatorsTest, AStoppedCallAHeldDeviceAndASlowAnswerAreNoLoss) {
+    start();
+    openSession();
+    for (const VisaStatus status : {visa::kAborted, visa::kResourceLocked, visa::kTimeout}) {
+        failWith(status);
+        EXPECT_EQ(connection(), "verbunden: 127.0.0.1") << status;
+        EXPECT_EQ(mark(), connection());
+    }
+}
+
+TEST_F(IndicatorsTest, ALostLinkStaysLostWhenTheNextCommandIsStoppedOrSilent) {
+    start();
+    openSession();
+    failWith(kConnectionLost);
+    for (const VisaStatus status : {visa::kAborted, visa::kResourceLocked, visa::kTimeout}) {
+        failWith(status);
+        EXPECT_EQ(connection(), "Verbindung verloren") << status;
+    }
 }
 
 TEST_F(IndicatorsTest, LocalAndAnOpeningEndALostLink) {
@@ -92,10 +126,12 @@ TEST_F(IndicatorsTest, TheRfOutputIsToldBesideTheLevel) {
 TEST_F(IndicatorsTest, AnOutputThatCouldNotBeSwitchedIsNotToldAsSwitched) {
     start();
     openSession();
-    visa.writeStatus = kConnectionLost;
-    dialogs.expectedMessages = 1;
-    click("HfOnOffState");
-    EXPECT_EQ(text("HF_Anzeige"), "ein");
+    for (const VisaStatus status : {kConnectionLost, visa::kTimeout}) {
+        visa.writeStatus = status;
+        dialogs.expectedMessages = 1;
+        click("HfOnOffState");
+        EXPECT_EQ(text("HF_Anzeige"), "ein");
+    }
 }
 
 TEST_F(IndicatorsTest, TheTitleShowsControlCharactersAsBlanksAndIsTheProgramsAgainAfterLocal) {

@@ -102,6 +102,7 @@ TEST_F(Tasks, StopHalfWay) {
     EXPECT_THAT(dialogs.shown, IsEmpty()) << "who pressed it knows";
     EXPECT_FALSE(find("Stop_Taste")->isVisible());
     EXPECT_TRUE(find("SSTab1")->isEnabled()) << "the session stays open";
+    EXPECT_EQ(text("Verbindung_Anzeige"), "verbunden: 127.0.0.1") << "who stops it has lost nothing";
     cable->beforeWrite = nullptr;
     got();
     click("Btn_SetRdsStereo");

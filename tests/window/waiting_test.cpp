@@ -18,6 +18,7 @@ TEST_F(WaitingTest, StopEndsARunAtOnceAlsoWhenTheCallCannotBeEnded) {
         EXPECT_EQ(sent().size(), 1U) << "the rest is not sent";
         EXPECT_FALSE(find("Stop_Taste")->isVisible());
         EXPECT_TRUE(find("SSTab1")->isEnabled()) << "the session stays open";
+        EXPECT_EQ(text("Verbindung_Anzeige"), "verbunden: 127.0.0.1") << "who stops it has lost nothing";
         slow->goOn();
         click("Store_Taste_0");
         EXPECT_EQ(sent(), Lines{direct("STORE=1")});

@@ -48,6 +48,22 @@ TEST_F(WaysOutTest, ClosingWhileSomethingRunsByItselfAsksOnceAndStopsIt) {
     EXPECT_EQ(dialogs.shown[0].text, QStringLiteral("Es läuft noch: TA, TMC. Anhalten und das Programm beenden?"));
 }
 
+TEST_F(WaysOutTest, ClosingAsksBeforeTheDynamicPsEnds) {
+    startAndOpen();
+    click("Taste_PS_Auto");
+    expectClosingAsksAbout(QStringLiteral("PS dyn."));
+    EXPECT_FALSE(checked("Taste_PS_Auto"));
+    EXPECT_FALSE(tick("PS_Timer"));
+}
+
+TEST_F(WaysOutTest, ClosingAsksBeforeAnAnnouncementOfTheOtherNetworkEnds) {
+    startAndOpen();
+    announceOnTheOtherNetwork();
+    expectClosingAsksAbout(QStringLiteral("EON TA"));
+    EXPECT_FALSE(checked("EON_TA_Schalter"));
+    EXPECT_FALSE(tick("EON_TA_Zeit"));
+}
+
 TEST_F(WaysOutTest, TheClockThatIsSentDoesNotCountAsRunning) {
     startAndOpen();
     ASSERT_TRUE(checked("Zeit_Taste"));
@@ -134,11 +150,7 @@ TEST_F(WaysOutTest, PanicAndStopReachATimerThatWaitsForASlowInstrument) {
 
 TEST_F(WaysOutTest, PanicEndsAnAnnouncementByHandAndOneOfTheOtherNetwork) {
     startAndOpen();
-    if (!checked("Check1")) click("Check1");
-    click("TA_Check");
-    click("Check1");
-    if (!checked("EON_TP_Check")) click("EON_TP_Check");
-    click("EON_TA_Schalter");
+    announceOnTheOtherNetwork();
     sent();
     click("Panik_Taste");
     const Lines lines = sent();
@@ -195,6 +207,7 @@ TEST_F(TimerBoxTest, TheClock) {
     ASSERT_TRUE(checked("Zeit_Taste"));
     expectOneClickIsEnough("Timer1", QStringLiteral("Uhr &stoppen"));
     expectItIsOff("Timer1");
+    EXPECT_FALSE(checked("Zeit_Taste"));
 }
 
 TEST_F(TimerBoxTest, TheDynamicPs) {
@@ -202,27 +215,21 @@ TEST_F(TimerBoxTest, TheDynamicPs) {
     click("Taste_PS_Auto");
     expectOneClickIsEnough("PS_Timer", QStringLiteral("PS dyn. &stoppen"));
     expectItIsOff("PS_Timer");
+    EXPECT_FALSE(checked("Taste_PS_Auto"));
     EXPECT_FALSE(find("Panik_Taste")->isVisible());
 }
 
 TEST_F(TimerBoxTest, TheAnnouncementOfTheOtherNetwork) {
     startAndOpen();
-    if (!checked("Check1")) click("Check1");
-    click("TA_Check");
-    click("Check1");
-    if (!checked("EON_TP_Check")) click("EON_TP_Check");
-    click("EON_TA_Schalter");
+    announceOnTheOtherNetwork();
     expectOneClickIsEnough("EON_TA_Zeit", QStringLiteral("EON TA &stoppen"));
     expectItIsOff("EON_TA_Zeit");
+    EXPECT_FALSE(checked("EON_TA_Schalter"));
 }
 
 TEST_F(TimerBoxTest, ARefusalOfTheOtherNetworkCanBeEndedToo) {
     startAndOpen();
-    if (!checked("Check1")) click("Check1");
-    click("TA_Check");
-    click("Check1");
-    if (!checked("EON_TP_Check")) click("EON_TP_Check");
-    click("EON_TA_Schalter");
+    announceOnTheOtherNetwork();
     click("Check1");
     sent();
     dialogs.stopAtFailure = true;
@@ -282,18 +289,27 @@ TEST_F(WaysOutTest, ATimeIsWrittenAsTheLanguageDoes) {
 
 INSTANTIATE_TEST_SUITE_P(
     Statuses, FailureMeaningTest,
-    ::testing::Values(Meaning{"Silence", visa::kTimeout,
-                              "Keine Antwort innerhalb von 2 s: Ist das Gerät eingeschaltet und stimmt die Adresse?",
-                              "No answer within 2 s: is the instrument switched on and the address right?"},
-                      Meaning{"Loss", visa::kConnectionLost,
-                              "Die Verbindung ist abgerissen: Kabel prüfen, dann \"Local\" und neu öffnen.",
-                              "The connection was lost: check the cable, then press \"Local\" and open again."},
-                      Meaning{"Lock", visa::kResourceLocked,
-                              "Ein anderes Programm hält das Gerät belegt: dort freigeben, dann noch einmal versuchen.",
-                              "Another program has locked the instrument: release it there, then try again."},
-                      Meaning{"Other", -42,
-                              "Die Übertragung ist fehlgeschlagen: Verbindung prüfen und noch einmal versuchen.",
-                              "The transfer failed: check the connection and try again."}),
+    ::testing::Values(
+        Meaning{"Silence", visa::kTimeout,
+                "Keine Antwort innerhalb von 2 s: Ist das Gerät eingeschaltet und stimmt die Adresse?",
+                "No answer within 2 s: is the instrument switched on and the address right?"},
+        Meaning{"Loss", visa::kConnectionLost,
+                "Die Verbindung ist abgerissen: Kabel prüfen, dann \"Local\" und neu öffnen.",
+                "The connection was lost: check the cable, then press \"Local\" and open again."},
+        Meaning{"Lock", visa::kResourceLocked,
+                "Ein anderes Programm hält das Gerät belegt: dort freigeben, dann noch einmal versuchen.",
+                "Another program has locked the instrument: release it there, then try again."},
+        Meaning{"Address", visa::kInvalidResourceName, "Die Adresse lässt sich nicht lesen: bitte ändern.",
+                "The address cannot be read: please change it."},
+        Meaning{"Stopped", visa::kAborted, "Der Vorgang wurde abgebrochen: bei Bedarf noch einmal senden.",
+                "The operation was aborted: send again if need be."},
+        Meaning{"NoSession", visa::kInvalidObject, "Es ist keine Verbindung offen: \"Local\" und neu öffnen.",
+                "No session is open: press \"Local\" and open again."},
+        Meaning{"NoLibrary", visa::kLibraryNotFound,
+                "Für diese Schnittstelle fehlt die VISA-Bibliothek: installieren oder TCPIP wählen.",
+                "This interface needs a VISA library: install one or choose TCPIP."},
+        Meaning{"Other", -42, "Die Übertragung ist fehlgeschlagen: Verbindung prüfen und noch einmal versuchen.",
+                "The transfer failed: check the connection and try again."}),
     [](const auto& one) { return one.param.name; });
 
 TEST_F(WaysOutTest, AnAddressWhereNobodyAnswersIsExplained) {

@@ -90,6 +90,27 @@ protected:
         if (!checked("Check1")) click("Check1");
         click("TA_Option_1");
     }
+    /// An announcement by hand, so that there is one of the other network to refer to.
+    void announceOnTheOtherNetwork() {
+        if (!checked("Check1")) click("Check1");
+        click("TA_Check");
+        click("Check1");
+        if (!checked("EON_TP_Check")) click("EON_TP_Check");
+        click("EON_TA_Schalter");
+    }
+    /// No keeps the window and what runs, Yes ends both.
+    void expectClosingAsksAbout(const QString& running) {
+        dialogs.confirmations = {false};
+        EXPECT_FALSE(window->close());
+        EXPECT_TRUE(window->isVisible());
+        EXPECT_TRUE(find("Panik_Taste")->isVisible()) << "it goes on";
+        dialogs.confirmations = {true};
+        EXPECT_TRUE(window->close());
+        ASSERT_EQ(dialogs.shown.size(), 2U);
+        for (const auto& box : dialogs.shown)
+            EXPECT_EQ(box.text, QStringLiteral("Es läuft noch: %1. Anhalten und das Programm beenden?").arg(running));
+        EXPECT_EQ(closings(), 1);
+    }
 
     std::shared_ptr<HangingVisa> slow = std::make_shared<HangingVisa>();
     std::chrono::steady_clock::time_point stopped;
