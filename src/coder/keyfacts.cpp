@@ -17,20 +17,7 @@ namespace kdx {
 
 namespace {
 
-enum class Kind {
-    Ignored,         ///< the value does not matter
-    Word,            ///< one of the words
-    Whole,           ///< a whole number within the limits
-    Number,          ///< a decimal number within the limits
-    Text,            ///< at most `highest` characters that RDS has
-    Identifier,      ///< a PI: four hexadecimal digits
-    Frequencies,     ///< "N," or "+," and a list of MHz
-    PlainList,       ///< a list of MHz
-    Groups,          ///< "0A,2A"
-    Message,         ///< two digits, a comma and ten hexadecimal digits
-    TrafficMessage,  ///< the same, the first hexadecimal digit a single bit
-    Clock,           ///< "OFF", "AUS" or anything else
-};
+using Kind = ValueKind;
 
 struct Row {
     std::string_view key;
@@ -254,7 +241,11 @@ const std::vector<KeyFacts>& keyFacts() {
         std::vector<KeyFacts> facts;
         facts.reserve(kRows.size());
         for (const Row& row : kRows)
-            facts.push_back({row.key, row.meaning, range(row), row.kind == Kind::Whole || row.kind == Kind::Number});
+            facts.push_back({row.key,
+                             row.meaning,
+                             range(row),
+                             row.kind == Kind::Whole || row.kind == Kind::Number,
+                             {row.kind, row.lowest, row.highest, row.unit, row.words}});
         return facts;
     }();
     return all;

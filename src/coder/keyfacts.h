@@ -9,12 +9,38 @@
 
 namespace kdx {
 
+/// What kind of values a key takes.
+enum class ValueKind {
+    Ignored,         ///< the value does not matter
+    Word,            ///< one of the words
+    Whole,           ///< a whole number within the limits
+    Number,          ///< a decimal number within the limits
+    Text,            ///< at most `highest` characters that RDS has
+    Identifier,      ///< a PI: four hexadecimal digits
+    Frequencies,     ///< "N," or "+," and a list of MHz
+    PlainList,       ///< a list of MHz
+    Groups,          ///< "0A,2A"
+    Message,         ///< two digits, a comma and ten hexadecimal digits
+    TrafficMessage,  ///< the same, the first hexadecimal digit a single bit
+    Clock,           ///< "OFF", "AUS" or anything else
+};
+
+/// Which values a key takes, for whoever says it in another language.
+struct LegalValues {
+    ValueKind kind = ValueKind::Ignored;
+    double lowest = 0;
+    double highest = 0;
+    std::string_view unit = {};
+    std::string_view words = {};  ///< separated by blanks
+};
+
 /// What a key of the key table stands for and which values the instrument takes for it, in words.
 struct KeyFacts {
     std::string_view key;
     std::string_view meaning;
     std::string range;      ///< "0 to 31"; "" for a key whose value does not matter
     bool isNumber = false;  ///< whether its values are numbers that can be counted up
+    LegalValues legal = {};
 };
 
 /// The facts of every key, in the order of the key table.

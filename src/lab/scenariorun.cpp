@@ -47,10 +47,11 @@ ScenarioRun::~ScenarioRun() {
     finish();
 }
 
-std::string ScenarioRun::begin(const scenario::Scenario& scenario, const std::filesystem::path& report) {
+std::optional<scenario::ReportFault> ScenarioRun::begin(const scenario::Scenario& scenario,
+                                                        const std::filesystem::path& report) {
     m_report = scenario::Report(report);
     if (!report.empty()) {
-        if (std::string problem = m_report.begin(); !problem.empty()) return problem;
+        if (const auto fault = m_report.begin()) return fault;
     }
     m_scenario = scenario;
     m_stopped = m_failed = m_finishes = m_hurries = m_pressed = m_asks = m_asked = m_panics = false;
@@ -67,7 +68,7 @@ std::string ScenarioRun::begin(const scenario::Scenario& scenario, const std::fi
     m_timer->setPeriod(1);
     m_timer->setEnabled(true);
     emit changed();
-    return {};
+    return std::nullopt;
 }
 
 /// The window keeps what it shows: only the instrument gets the set, as a program that was just started would send it.

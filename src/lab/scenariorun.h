@@ -4,6 +4,7 @@
 
 #include <map>
 #include <memory>
+#include <optional>
 
 #include "lab/heldclock.h"
 #include "scenario/report.h"
@@ -22,8 +23,9 @@ public:
     ~ScenarioRun() override;
 
     /// Runs it from its beginning. @param report file that keeps what happens; empty for none.
-    /// @returns what keeps it from being run, as "cannot be written"; "" when it runs.
-    [[nodiscard]] std::string begin(const scenario::Scenario& scenario, const std::filesystem::path& report);
+    /// @returns why the report cannot be begun; nothing when it runs.
+    [[nodiscard]] std::optional<scenario::ReportFault> begin(const scenario::Scenario& scenario,
+                                                             const std::filesystem::path& report);
     /// It stands still, or goes on.
     void setHeld(bool held);
     /// Ends it after the running command; what stood before comes back first. The second time that is given up, too,

@@ -9,6 +9,7 @@
 
 #include "base/paths.h"
 #include "base/split.h"
+#include "lab/mistaketext.h"
 #include "lab/scenariorun.h"
 #include "rds/settings.h"
 #include "scenario/reader.h"
@@ -50,7 +51,7 @@ ScenarioView::ScenarioView(Session& session, const PageContext& with, QWidget* p
               return caption({974, "Ablauf"});
           },
           [this] { m_run->stop(); }, [this] { m_run->panic(); }),
-      m_steps("Ablauf_Liste", with.captions, this),
+      m_steps("Ablauf_Liste", with, this),
       m_sessionOpen(session.instrument.isOpen()) {
     setObjectName(QStringLiteral("ScenarioView"));
     m_book.text(this, {974, "Ablauf"});
@@ -171,9 +172,11 @@ void ScenarioView::open(const QString& file) {
         problems += caption({593, "%1 kann nicht gelesen werden."}).arg(file);
     } else {
         reading = scenario::readScenario(*bytes, false, m_with.state.corrections);
-        for (const auto& [line, at, sentence] : reading.problems) {
-            problems +=
-                caption({991, "Zeile %1, Spalte %2: %3"}).arg(line).arg(at).arg(QString::fromStdString(sentence));
+        for (const scenario::Problem& problem : reading.problems) {
+            problems += caption({991, "Zeile %1, Spalte %2: %3"})
+                            .arg(problem.line)
+                            .arg(problem.column)
+                            .arg(mistakeText(m_with, problem));
         }
         if (problems.isEmpty()) problems = problemsOf(reading.scenario);
     }
@@ -200,7 +203,7 @@ QStringList ScenarioView::problemsOf(const scenario::Scenario& scenario) const {
     if (!source.hasSectionOf(setting::kPi.place))
         return {caption({593, "%1 kann nicht gelesen werden."}).arg(QString::fromStdString(name))};
     QStringList problems;
-    for (const std::string& sentence : wrongSettings(source)) problems += QString::fromStdString(sentence);
+    for (const WrongSetting& wrong : wrongSettings(source)) problems += mistakeText(m_with, wrong);
     return problems;
 }
 
@@ -219,11 +222,14 @@ void ScenarioView::Ablauf_Start_Click() {
                                why);
         return;
     }
-    const std::string problem = m_run->begin(m_scenario, report);
-    if (problem.empty()) return;
-    m_with.dialogs.message(Dialogs::Icon::Critical, caption({313, "Fehler"}),
-                           caption({994, "Der Bericht %1 %2"})
-                               .arg(QString::fromStdString(utf8Of(report)), QString::fromStdString(problem)));
+    const auto fault = m_run->begin(m_scenario, report);
+    if (!fault) return;
+    const QString name = QString::fromStdString(utf8Of(report));
+    m_with.dialogs.message(
+        Dialogs::Icon::Critical, caption({313, "Fehler"}),
+        *fault == scenario::ReportFault::Foreign
+            ? caption({1236, "%1 ist schon da und ist kein Bericht, der neu geschrieben werden darf."}).arg(name)
+            : caption({1237, "Der Bericht %1 kann nicht geschrieben werden."}).arg(name));
 }
 
 void ScenarioView::Ablauf_Pause_Click() {

@@ -2,6 +2,7 @@
 
 #include <QFont>
 
+#include "lab/steptext.h"
 #include "lab/viewtable.h"
 #include "ui/caption.h"
 
@@ -33,15 +34,16 @@ bool isGood(const std::string& status) {
 
 }  // namespace
 
-StepTable::StepTable(const char* name, const Captions& captions, QWidget* parent)
-    : m_captions(captions), m_table(newViewTable(name, ColumnCount, parent)) {
+StepTable::StepTable(const char* name, const PageContext& with, QWidget* parent)
+    : m_with(with), m_table(newViewTable(name, ColumnCount, parent)) {
     m_table->setSelectionMode(QAbstractItemView::NoSelection);
 }
 
 void StepTable::label() {
-    const auto text = [this](const Caption& caption) { return captionText(m_captions, caption); };
+    const auto text = [this](const Caption& caption) { return captionText(m_with.captions, caption); };
     m_table->setHorizontalHeaderLabels({text({980, "Schritt"}), text({981, "Was"}), text({982, "Ergebnis"})});
     m_table->setAccessibleName(text({974, "Ablauf"}));
+    describe();
 }
 
 void StepTable::show(const scenario::Scenario& scenario) {
@@ -49,28 +51,45 @@ void StepTable::show(const scenario::Scenario& scenario) {
     m_rows.clear();
     m_passes.clear();
     m_marked = m_doneRow = -1;
-    if (scenario.dataSet) append(scenario::kOpening, 0, "data_set: " + std::to_string(*scenario.dataSet));
-    append(scenario.actions, {}, 0);
-    if (scenario.restore) append(scenario::kRestoring, 0, "restore: true");
+    m_scenario = scenario;
+    if (scenario.dataSet) append(scenario::kOpening);
+    append(scenario.actions, {});
+    if (scenario.restore) append(scenario::kRestoring);
+    describe();
 }
 
-void StepTable::append(const std::vector<scenario::Action>& actions, const std::string& within, int depth) {
+void StepTable::append(const std::vector<scenario::Action>& actions, const std::string& within) {
     for (std::size_t at = 0; at < actions.size(); ++at) {
         const std::string step = within + std::to_string(at + 1);
-        append(step, depth, describe(actions[at]));
+        append(step);
         if (passesOf(actions[at]) > 0) m_passes[step] = passesOf(actions[at]);
-        append(actions[at].actions, step + ".", depth + 1);
+        append(actions[at].actions, step + ".");
     }
 }
 
-void StepTable::append(const std::string& step, int depth, const std::string& what) {
+void StepTable::append(const std::string& step) {
     const int row = m_table->rowCount();
     m_rows[step] = row;
     m_table->insertRow(row);
     const bool numbered = step != scenario::kOpening && step != scenario::kRestoring;
     showCell(m_table, row, Number, numbered ? QString::fromStdString(step) : QString(), false);
-    showCell(m_table, row, What, QString(qsizetype{4} * depth, QLatin1Char(' ')) + QString::fromStdString(what), false);
-    showCell(m_table, row, Result, {}, false);
+    for (const Column column : {What, Result}) showCell(m_table, row, column, {}, false);
+}
+
+void StepTable::describe() {
+    int row = 0;
+    if (m_scenario.dataSet) showCell(m_table, row++, What, openingText(m_with, *m_scenario.dataSet), false);
+    row = describe(m_scenario.actions, row, 0);
+    if (m_scenario.restore) showCell(m_table, row, What, restoringText(m_with), false);
+}
+
+int StepTable::describe(const std::vector<scenario::Action>& actions, int row, int depth) {
+    for (const scenario::Action& action : actions) {
+        showCell(m_table, row++, What, QString(qsizetype{4} * depth, QLatin1Char(' ')) + stepText(m_with, action),
+                 false);
+        row = describe(action.actions, row, depth + 1);
+    }
+    return row;
 }
 
 int StepTable::rowOf(const std::string& step) const {
@@ -131,7 +150,7 @@ void StepTable::add(const scenario::Row& row) {
     const QString answer = QString::fromStdString(row.answer);
     if (!good) {
         const QString why = row.status == scenario::kNotMet
-                                ? captionText(m_captions, {987, "nicht erfüllt: %1"}).arg(answer)
+                                ? captionText(m_with.captions, {987, "nicht erfüllt: %1"}).arg(answer)
                                 : QString::fromStdString(row.status);
         m_doneRow = m_doneRow == at ? -1 : m_doneRow;
         return showCell(m_table, at, Result, kBad + QLatin1Char(' ') + why, true);

@@ -13,7 +13,7 @@ namespace kdx {
 /// The steps of a scenario as a table, with what came of each.
 class StepTable {
 public:
-    StepTable(const char* name, const Captions& captions, QWidget* parent);
+    StepTable(const char* name, const PageContext& with, QWidget* parent);
 
     void label();
     void show(const scenario::Scenario& scenario);
@@ -29,12 +29,16 @@ public:
     [[nodiscard]] QTableWidget* widget() const { return m_table; }
 
 private:
-    void append(const std::string& step, int depth, const std::string& what);
-    void append(const std::vector<scenario::Action>& actions, const std::string& within, int depth);
+    void append(const std::string& step);
+    /// What the steps do, from the row on, in the current language.
+    void describe();
+    int describe(const std::vector<scenario::Action>& actions, int row, int depth);
+    void append(const std::vector<scenario::Action>& actions, const std::string& within);
     [[nodiscard]] int rowOf(const std::string& step) const;
     void showDone();
 
-    const Captions& m_captions;
+    PageContext m_with;
+    scenario::Scenario m_scenario;
     QTableWidget* m_table;
     std::map<std::string, int> m_rows;            // by their numbers without passes
     std::map<std::string, std::size_t> m_passes;  // of sweeps and repetitions

@@ -16,13 +16,14 @@ constexpr std::string_view kAllowedControls = "\t\n\r";
 
 }  // namespace
 
-void Problems::add(std::size_t at, const std::string& sentence) {
+void Problems::add(std::size_t at, Mistake mistake, std::vector<std::string> words) {
     if (m_found.size() >= kMostProblems) return;
     const std::string_view before = m_text.substr(0, std::min(at, m_text.size()));
     const std::size_t lineBegin = before.rfind('\n') + 1;  // 0 in the first line: npos + 1
     const auto lines = std::count(before.begin(), before.end(), '\n');
     const std::size_t column = characterCount(before.substr(lineBegin)) + 1;
-    m_found.push_back({static_cast<std::size_t>(lines) + 1, column, printable(sentence, '.')});
+    for (std::string& word : words) word = printable(word, '.');
+    m_found.push_back({static_cast<std::size_t>(lines) + 1, column, sentence(mistake, words), mistake, words});
 }
 
 std::vector<Problem> Problems::inOrder() const {
@@ -39,13 +40,13 @@ void addForeignBytes(Problems& problems) {
     for (std::size_t at = 0; at < text.size();) {
         const std::size_t length = characterLength(text.substr(at));
         if (length == 0) {
-            problems.add(at, "this is not UTF-8");
+            problems.add(at, Mistake::NotUtf8);
             return;
         }
         if (isControl(text[at]) && kAllowedControls.find(text[at]) == std::string_view::npos)
-            problems.add(at, "a control character");
+            problems.add(at, Mistake::ControlCharacter);
         if (indents && text[at] == '\t') {
-            problems.add(at, "a tab indents this line; YAML wants blanks");
+            problems.add(at, Mistake::TabIndents);
             indents = false;
         }
         if (kIndentation.find(text[at]) == std::string_view::npos) indents = text[at] == '\n';

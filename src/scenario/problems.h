@@ -5,13 +5,17 @@
 #include <string_view>
 #include <vector>
 
+#include "scenario/mistake.h"
+
 namespace kdx::scenario {
 
-/// A mistake and where it stands; lines and columns (in characters) count from 1. The sentence is UTF-8.
+/// A mistake and where it stands; lines and columns (in characters) count from 1. Texts are UTF-8.
 struct Problem {
     std::size_t line = 1;
     std::size_t column = 1;
-    std::string sentence;
+    std::string sentence;  ///< of kdx-ctl
+    Mistake mistake = {};
+    std::vector<std::string> words = {};  ///< what its sentence names
 };
 
 inline constexpr std::string_view kUtf8Mark = "\uFEFF";  ///< what a file in UTF-8 may begin with
@@ -23,7 +27,7 @@ public:
     explicit Problems(std::string_view utf8) : m_text(utf8) {}
 
     /// @param at the byte of the text at which the mistake stands.
-    void add(std::size_t at, const std::string& sentence);
+    void add(std::size_t at, Mistake mistake, std::vector<std::string> words = {});
     [[nodiscard]] bool empty() const { return m_found.empty(); }
     /// All of them in the order of their places.
     [[nodiscard]] std::vector<Problem> inOrder() const;

@@ -25,7 +25,7 @@ void readMember(const std::string& name, const YamlNode& value, Scenario& scenar
         scenario.restore = values.choice(value, name).value_or(false);
     } else {
         const auto file = values.text(value, name);
-        if (file && file->empty()) values.wrong(value, "report needs the name of a file");
+        if (file && file->empty()) values.wrong(value, Mistake::ReportName);
         scenario.report = file.value_or("");
     }
 }
@@ -36,7 +36,7 @@ Reading readScenario(std::string_view utf8, bool force, const Corrections& corre
     Reading reading;
     Problems problems(utf8.starts_with(kUtf8Mark) ? utf8.substr(kUtf8Mark.size()) : utf8);
     if (utf8.size() > kLargestFile) {
-        problems.add(0, "a scenario has " + std::to_string(kLargestFile / 1024) + " KiB at most");
+        problems.add(0, Mistake::TooLarge, {std::to_string(kLargestFile / 1024)});
         return {{}, problems.inOrder()};
     }
     const YamlNode root = readYaml(problems);
@@ -46,12 +46,12 @@ Reading readScenario(std::string_view utf8, bool force, const Corrections& corre
             if (isOneOf(kWords, name.text)) {
                 readMember(name.text, value, reading.scenario, values);
             } else {
-                values.wrong(name, unknownWord(name.text, kWords));
+                values.wrong(name, Mistake::UnknownWord, {name.text, listed(kWords)});
             }
         }
-        if (memberOf(root, "steps") == nullptr && problems.empty()) values.wrong(root, "there are no steps");
+        if (memberOf(root, "steps") == nullptr && problems.empty()) values.wrong(root, Mistake::NoSteps);
     } else if (problems.empty()) {
-        values.wrong(root, "a scenario is written as names with values: title, steps and so on");
+        values.wrong(root, Mistake::NoScenario);
     }
     reading.problems = problems.inOrder();
     return reading;

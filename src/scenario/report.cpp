@@ -44,7 +44,12 @@ std::string csvLine(const Row& row) {
     return line + "\r\n";
 }
 
-std::string Report::begin() const {
+std::string faultWords(ReportFault fault) {
+    return fault == ReportFault::Foreign ? "is there, and is no report that could be written anew"
+                                         : "cannot be written";
+}
+
+std::optional<ReportFault> Report::begin() const {
     const Row columns{"time", "step", "key", "value", "command", "status", "answer"};
     std::string there(csvLine(columns).size(), '\0');
     std::ifstream file;
@@ -52,8 +57,9 @@ std::string Report::begin() const {
     if (std::filesystem::is_regular_file(m_file, error)) file.open(m_file, std::ios::binary);
     file.read(there.data(), static_cast<std::streamsize>(there.size()));
     const bool isEmpty = file.gcount() == 0;
-    if (!isEmpty && there != csvLine(columns)) return "is there, and is no report that could be written anew";
-    return emptyPlainFile(m_file) && add(columns) ? "" : "cannot be written";
+    if (!isEmpty && there != csvLine(columns)) return ReportFault::Foreign;
+    if (!emptyPlainFile(m_file) || !add(columns)) return ReportFault::Unwritable;
+    return std::nullopt;
 }
 
 bool Report::add(const Row& row) const {

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <filesystem>
+#include <optional>
 #include <string>
 
 namespace kdx {
@@ -39,6 +40,15 @@ inline constexpr const char* kRestoring = "restore";
 /// The fields as a line of a CSV file (RFC 4180), its end included.
 [[nodiscard]] std::string csvLine(const Row& row);
 
+/// Why a report cannot be begun.
+enum class ReportFault {
+    Foreign,  ///< the file is there, and is no report
+    Unwritable,
+};
+
+/// The same in words of kdx-ctl, which follow the file's name.
+[[nodiscard]] std::string faultWords(ReportFault fault);
+
 /// A CSV file of rows. Each is in the file before anything else happens, so that a run that is cut off has left all it
 /// did. Only a plain file is written.
 class Report {
@@ -46,8 +56,8 @@ public:
     explicit Report(std::filesystem::path file) : m_file(std::move(file)) {}
 
     /// Begins the file anew with the names of the columns. A file that is there and is no report stays as it is.
-    /// @returns why it cannot be done, as "cannot be written"; "" when it is.
-    [[nodiscard]] std::string begin() const;
+    /// @returns why it cannot be done; nothing when it is.
+    [[nodiscard]] std::optional<ReportFault> begin() const;
     /// False when the row is not in the file, or in part only.
     [[nodiscard]] bool add(const Row& row) const;
     [[nodiscard]] const std::filesystem::path& file() const { return m_file; }

@@ -19,19 +19,21 @@ std::size_t passesOf(const Action& action) {
     return action.kind == Action::Kind::Sweep ? action.points.size() : action.passes;
 }
 
+std::string listed(const Action& action) {
+    std::vector<std::string> all;
+    for (const auto& [key, value] : action.settings) all.push_back(key + "=" + toUtf8(value));
+    for (const auto& [name, values] : action.expected) all.push_back(name + "=" + toUtf8(joined(values, ",")));
+    return joined(all, " ");
+}
+
 std::string describe(const Action& action) {
     switch (action.kind) {
-        case Action::Kind::Send: {
-            std::string text = "send";
-            for (const auto& [key, value] : action.settings) text.append(" ").append(key).append("=" + toUtf8(value));
-            return text;
-        }
+        case Action::Kind::Send:
+            return "send " + listed(action);
         case Action::Kind::Wait:
             return "wait " + timeWords(action.time);
         case Action::Kind::Expect: {
-            std::string text = "expect";
-            for (const auto& [name, values] : action.expected)
-                text.append(" ").append(name).append("=" + toUtf8(joined(values, ",")));
+            const std::string text = "expect " + listed(action);
             return action.time.count() == 0 ? text : text + " within " + timeWords(action.time);
         }
         case Action::Kind::Sweep:

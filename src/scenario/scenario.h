@@ -60,6 +60,9 @@ struct Scenario {
 /// How often a sweep or a repetition goes through its actions at most; 0 for every other kind.
 [[nodiscard]] std::size_t passesOf(const Action& action);
 
+/// What a step sends or expects, as "PS=MESSTURM TP=1".
+[[nodiscard]] std::string listed(const Action& action);
+
 /// The action in a few words, as "send PS=MESSTURM TP=1".
 [[nodiscard]] std::string describe(const Action& action);
 

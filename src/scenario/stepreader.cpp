@@ -55,10 +55,6 @@ std::vector<std::string_view> wordsBeside(const KindWord& kind) {
     return words;
 }
 
-std::string noSuchKey(const std::string& key) {
-    return "there is no key " + key + "; kdx-ctl list keys names them";
-}
-
 }  // namespace
 
 const YamlNode* memberOf(const YamlNode& map, std::string_view name) {
@@ -70,11 +66,11 @@ const YamlNode* memberOf(const YamlNode& map, std::string_view name) {
 std::vector<Action> StepReader::steps(const YamlNode& list) {
     std::vector<Action> actions;
     if (list.kind != YamlNode::Kind::List) {
-        m_values.wrong(list, "steps are a list: each begins with a dash, as - wait: 2 s");
+        m_values.wrong(list, Mistake::NoList);
     } else if (list.items.empty()) {
-        m_values.wrong(list, "there are no steps in this list");
+        m_values.wrong(list, Mistake::EmptyList);
     } else if (m_depth >= kDeepestNesting) {
-        m_values.wrong(list, "steps are nested " + std::to_string(kDeepestNesting) + " deep at most");
+        m_values.wrong(list, Mistake::Nesting, {std::to_string(kDeepestNesting)});
     } else {
         ++m_depth;
         for (const YamlNode& item : list.items) actions.push_back(step(item));
@@ -86,21 +82,22 @@ std::vector<Action> StepReader::steps(const YamlNode& list) {
 Action StepReader::step(const YamlNode& node) {
     Action action;
     if (node.kind != YamlNode::Kind::Map || node.members.empty()) {
-        m_values.wrong(node, "a step is a word, a colon and what belongs to it, as wait: 2 s");
+        m_values.wrong(node, Mistake::NoStep);
         return action;
     }
     const auto said = std::find_if(node.members.begin(), node.members.end(),
                                    [](const auto& member) { return kindOf(member.first.text) != nullptr; });
     if (said == node.members.end()) {
-        m_values.wrong(node.members.front().first, unknownWord(node.members.front().first.text, kindWords()));
+        const YamlNode& first = node.members.front().first;
+        m_values.wrong(first, Mistake::UnknownWord, {first.text, listed(kindWords())});
         return action;
     }
     const KindWord& kind = *kindOf(said->first.text);
     for (const auto& [name, value] : node.members) {
         if (kindOf(name.text) != nullptr && name.text != kind.word) {
-            m_values.wrong(name, "a step does one thing; " + name.text + " needs a dash of its own");
+            m_values.wrong(name, Mistake::TwoThings, {name.text});
         } else if (const auto words = wordsBeside(kind); !isOneOf(words, name.text)) {
-            m_values.wrong(name, unknownWord(name.text, words));
+            m_values.wrong(name, Mistake::UnknownWord, {name.text, listed(words)});
         }
     }
     const YamlNode& value = said->second;
@@ -134,7 +131,7 @@ Action StepReader::step(const YamlNode& node) {
 
 bool StepReader::isNames(const YamlNode& node, std::string_view word, std::string_view example) {
     if (node.kind == YamlNode::Kind::Map && !node.members.empty()) return true;
-    m_values.wrong(node, std::string(word) + " takes names with values, as " + std::string(example));
+    m_values.wrong(node, Mistake::NoNames, {std::string(word), std::string(example)});
     return false;
 }
 
@@ -142,7 +139,7 @@ void StepReader::send(const YamlNode& map, Action& action) {
     if (!isNames(map, "send", "send: {PS: MESSTURM, TP: 1}")) return;
     for (const auto& [name, value] : map.members) {
         if (factsOf(name.text) == nullptr) {
-            m_values.wrong(name, noSuchKey(name.text));
+            m_values.wrong(name, Mistake::NoSuchKey, {name.text});
         } else if (const auto legal = m_values.keyValue(value, name.text)) {
             action.settings.emplace_back(name.text, *legal);
         }
@@ -159,21 +156,21 @@ void StepReader::expect(const YamlNode& map, Action& action) {
         }
     }
     if (map.members.size() == 1 && map.members.front().first.text == kWithin)
-        m_values.wrong(map, "nothing is expected here");
+        m_values.wrong(map, Mistake::NothingExpected);
 }
 
 void StepReader::expectation(const std::string& name, const YamlNode& at, const YamlNode& value, Action& action) {
     const auto question = questionOf(name, {});
     if (!question) {
-        m_values.wrong(at, "there is no read-back and no question " + name + "; kdx-ctl list questions names them");
+        m_values.wrong(at, Mistake::NoQuestion, {name});
         return;
     }
     const std::size_t wanted = question->queries.size();
     const std::span<const YamlNode> given =
         value.kind == YamlNode::Kind::List ? std::span(value.items) : std::span(&value, 1);
     if (given.size() != wanted) {
-        m_values.wrong(value, name + " has " + std::to_string(wanted) + (wanted == 1 ? " answer" : " answers") +
-                                  "; expected are " + std::to_string(given.size()));
+        m_values.wrong(value, wanted == 1 ? Mistake::OneAnswer : Mistake::Answers,
+                       {name, std::to_string(wanted), std::to_string(given.size())});
         return;
     }
     Action::Expectation expectation{name, {}};
@@ -185,17 +182,16 @@ void StepReader::sweep(const YamlNode& node, const YamlNode& key, Action& action
     const auto name = m_values.text(key, "sweep");
     const KeyFacts* facts = name ? factsOf(*name) : nullptr;
     if (name && facts == nullptr) {
-        m_values.wrong(key, noSuchKey(*name));
+        m_values.wrong(key, Mistake::NoSuchKey, {*name});
     } else if (name && !facts->isNumber) {
-        m_values.wrong(key, *name + " is no number that could be swept");
+        m_values.wrong(key, Mistake::NoNumberToSweep, {*name});
     } else if (name) {
         action.key = *name;
     }
     pointsOf(node, action);
     if (const YamlNode* dwell = memberOf(node, "dwell"))
         action.time = m_values.time(*dwell, "dwell").value_or(action.time);
-    if (memberOf(node, "dwell") == nullptr && memberOf(node, "steps") == nullptr)
-        m_values.wrong(node, "a sweep needs dwell or steps, or both");
+    if (memberOf(node, "dwell") == nullptr && memberOf(node, "steps") == nullptr) m_values.wrong(node, Mistake::NoPace);
     loop(node, action);
 }
 
@@ -206,14 +202,14 @@ void StepReader::pointsOf(const YamlNode& node, Action& action) {
     if (points == nullptr) {
         range(node, action);
     } else if (ranged) {
-        m_values.wrong(*points, "a sweep has points, or from, to and step; not both");
+        m_values.wrong(*points, Mistake::PointsAndRange);
     } else if (points->kind != YamlNode::Kind::List || points->items.empty()) {
-        m_values.wrong(*points, "points are a list of numbers, as [60, 40, 20]");
+        m_values.wrong(*points, Mistake::NoPoints);
     } else if (points->items.size() > kMostPoints) {
-        m_values.wrong(*points, "a sweep has " + std::to_string(kMostPoints) + " points at most");
+        m_values.wrong(*points, Mistake::MostPoints, {std::to_string(kMostPoints)});
     } else if (fits(*points, points->items.size())) {
         for (const YamlNode& point : points->items) {
-            const auto number = m_values.number(point, "a point");
+            const auto number = m_values.number(point, kPointName);
             if (number && (action.key.empty() || m_values.isLegal(point, action.key, point.text)))
                 action.points.push_back(point.text);
         }
@@ -223,7 +219,7 @@ void StepReader::pointsOf(const YamlNode& node, Action& action) {
 bool StepReader::fits(const YamlNode& node, std::size_t points) {
     m_points += points;
     if (m_points <= kMostPoints) return true;
-    m_values.wrong(node, "all sweeps together have " + std::to_string(kMostPoints) + " points at most");
+    m_values.wrong(node, Mistake::MostPointsOfAll, {std::to_string(kMostPoints)});
     return false;
 }
 
@@ -232,7 +228,7 @@ void StepReader::range(const YamlNode& node, Action& action) {
     const YamlNode* const to = memberOf(node, "to");
     const YamlNode* const step = memberOf(node, "step");
     if (from == nullptr || to == nullptr || step == nullptr) {
-        m_values.wrong(node, "a sweep needs from, to and step, or points");
+        m_values.wrong(node, Mistake::NoRange);
         return;
     }
     const auto first = m_values.number(*from, "from");
@@ -241,13 +237,12 @@ void StepReader::range(const YamlNode& node, Action& action) {
     if (!first || !last || !one) return;
     const bool upwards = last->millionths > first->millionths;
     if (one->millionths == 0) {
-        m_values.wrong(*step, "with a step of 0 the sweep never ends");
+        m_values.wrong(*step, Mistake::StepZero);
     } else if (*first != *last && upwards != (one->millionths > 0)) {
-        m_values.wrong(*step, "the step leads away from the end: " + from->text + " to " + to->text + " needs " +
-                                  (upwards ? "a step above 0" : "a step below 0"));
+        m_values.wrong(*step, upwards ? Mistake::StepUpwards : Mistake::StepDownwards, {from->text, to->text});
     } else if (countPoints(*first, *last, *one) > kMostPoints) {
-        m_values.wrong(*step, "a sweep has " + std::to_string(kMostPoints) + " points at most, this one " +
-                                  std::to_string(countPoints(*first, *last, *one)));
+        m_values.wrong(*step, Mistake::TooManyPoints,
+                       {std::to_string(kMostPoints), std::to_string(countPoints(*first, *last, *one))});
     } else if (action.key.empty() || (m_values.isLegal(*from, action.key, decimalText(*first)) &&
                                       m_values.isLegal(*to, action.key, decimalText(*last)))) {
         if (fits(*step, countPoints(*first, *last, *one))) action.points = sweepPoints(*first, *last, *one);
@@ -259,7 +254,7 @@ void StepReader::range(const YamlNode& node, Action& action) {
 
 void StepReader::repeat(const YamlNode& node, const YamlNode& count, Action& action) {
     action.passes = m_values.whole(count, "repeat", 1, kMostPasses).value_or(1);
-    if (memberOf(node, "steps") == nullptr) m_values.wrong(node, "repeat needs steps");
+    if (memberOf(node, "steps") == nullptr) m_values.wrong(node, Mistake::NothingToRepeat);
     loop(node, action);
 }
 
@@ -269,7 +264,7 @@ void StepReader::loop(const YamlNode& node, Action& action) {
     if (until == nullptr) return;
     const auto what = m_values.text(*until, kUntil);
     action.untilReturn = what == "Return";
-    if (what && !action.untilReturn) m_values.wrong(*until, "until knows Return only, not \"" + *what + "\"");
+    if (what && !action.untilReturn) m_values.wrong(*until, Mistake::Until, {*what});
 }
 
 void StepReader::message(const YamlNode& code, Action& action) {
@@ -277,8 +272,7 @@ void StepReader::message(const YamlNode& code, Action& action) {
     if (!digits) return;
     action.text = *digits;
     if (digits->size() != kGroupCodeLength || !isHex(*digits) || digits->front() > '1') {
-        m_values.wrong(code,
-                       "tmc takes ten hexadecimal digits, the first 0 or 1, as 0B90E400CC; not \"" + *digits + "\"");
+        m_values.wrong(code, Mistake::NoMessage, {*digits});
     }
 }
 

@@ -6,6 +6,7 @@
 #include <string_view>
 #include <vector>
 
+#include "base/split.h"
 #include "scenario/scenario.h"
 #include "scenario/values.h"
 
@@ -19,12 +20,10 @@ template <typename Words>
     return std::find(words.begin(), words.end(), word) != words.end();
 }
 
-/// The sentence about a word that none of the known ones is.
+/// The words with commas between.
 template <typename Words>
-[[nodiscard]] std::string unknownWord(std::string_view word, const Words& known) {
-    std::string text = "unknown word \"" + std::string(word) + "\"; known here:";
-    for (const std::string_view name : known) text.append(text.ends_with(':') ? " " : ", ").append(name);
-    return text;
+[[nodiscard]] std::string listed(const Words& words) {
+    return joined({words.begin(), words.end()}, ", ");
 }
 
 /// Reads lists of steps; what is wrong with them goes to the values' problems.

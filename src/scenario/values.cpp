@@ -13,29 +13,24 @@ namespace kdx::scenario {
 
 namespace {
 
-constexpr std::string_view kTimes = "500 ms, 2 s, 1.5 min or 1 h";
 constexpr std::int64_t kOne = 1'000'000;  // of a decimal
-
-std::string quoted(std::string_view text) {
-    return "\"" + std::string(text) + "\"";
-}
 
 }  // namespace
 
 std::optional<std::string> Values::text(const YamlNode& node, std::string_view name) {
     const std::string subject(name);
     if (node.kind == YamlNode::Kind::Nothing) {
-        wrong(node, subject + R"( has no value; an empty text is written "", a word like null in quotation marks)");
+        wrong(node, Mistake::NoValue, {subject});
         return std::nullopt;
     }
     if (node.kind != YamlNode::Kind::Text) {
-        wrong(node, subject + " takes one value, no list and no further names");
+        wrong(node, Mistake::OneValue, {subject});
         return std::nullopt;
     }
     std::string text = node.text;
     if (text.ends_with('\n')) text.pop_back();  // a text over several lines ends so
     if (std::any_of(text.begin(), text.end(), isControl)) {
-        wrong(node, subject + " holds a line end or another control character");
+        wrong(node, Mistake::ControlInText, {subject});
         return std::nullopt;
     }
     return text;
@@ -50,7 +45,8 @@ std::optional<std::string> Values::instrumentText(const YamlNode& node, std::str
     const auto at = static_cast<std::size_t>(foreign.data() - utf8->data());
     const std::string_view before = std::string_view(*utf8).substr(0, at);
     const bool literal = m_problems.text().substr(std::min(node.at, m_problems.text().size())).starts_with(before);
-    m_problems.add(literal ? node.at + at : node.at, std::string(name) + ": " + noSuchCharacter(foreign));
+    m_problems.add(literal ? node.at + at : node.at, Mistake::NoCharacter,
+                   {std::string(name), noSuchCharacter(foreign), std::string(foreign)});
     return std::nullopt;
 }
 
@@ -69,10 +65,9 @@ std::optional<std::chrono::milliseconds> Values::time(const YamlNode& node, std:
     const auto time = parseDuration(*written);
     if (!time) {
         const bool unitMissing = parseDuration(*written + "s").has_value();
-        wrong(node, std::string(name) + (unitMissing ? " needs a unit: " : " is a time: ") + std::string(kTimes) +
-                        ", not " + quoted(*written));
+        wrong(node, unitMissing ? Mistake::NoUnit : Mistake::NoTime, {std::string(name), *written});
     } else if (time->count() < 1 || *time > kLongestTime) {
-        wrong(node, std::string(name) + " is 1 ms at least and 168 h at most, not " + quoted(*written));
+        wrong(node, Mistake::TimeLimits, {std::string(name), *written});
     } else {
         return time;
     }
@@ -85,8 +80,7 @@ std::optional<unsigned> Values::whole(const YamlNode& node, std::string_view nam
     const auto value = isDecimal(*written) ? readDecimal(*written) : std::nullopt;
     if (value && value->millionths >= lowest * kOne && value->millionths <= highest * kOne)
         return static_cast<unsigned>(value->millionths / kOne);
-    wrong(node, std::string(name) + " is a whole number, " + std::to_string(lowest) + " to " + std::to_string(highest) +
-                    ", not " + quoted(*written));
+    wrong(node, Mistake::NoWhole, {std::string(name), std::to_string(lowest), std::to_string(highest), *written});
     return std::nullopt;
 }
 
@@ -94,7 +88,7 @@ std::optional<bool> Values::choice(const YamlNode& node, std::string_view name) 
     const auto written = text(node, name);
     if (!written) return std::nullopt;
     if (*written == "true" || *written == "false") return *written == "true";
-    wrong(node, std::string(name) + " is true or false, not " + quoted(*written));
+    wrong(node, Mistake::NoChoice, {std::string(name), *written});
     return std::nullopt;
 }
 
@@ -104,8 +98,7 @@ std::optional<Decimal> Values::number(const YamlNode& node, std::string_view nam
     const auto value = readDecimal(*written);
     if (!value) {
         const bool comma = written->find(',') != std::string::npos;
-        wrong(node, std::string(name) + (comma ? " is a number with a decimal point, not " : " is a number, not ") +
-                        quoted(*written));
+        wrong(node, comma ? Mistake::Comma : Mistake::NoNumber, {std::string(name), *written});
     }
     return value;
 }
@@ -113,7 +106,7 @@ std::optional<Decimal> Values::number(const YamlNode& node, std::string_view nam
 bool Values::isLegal(const YamlNode& node, const std::string& key, const std::string& value) {
     if (m_force) return true;
     const auto why = wrongValue(key, value, m_corrections);
-    if (why) wrong(node, *why);
+    if (why) wrong(node, Mistake::Value, {key, toUtf8(value), *why});
     return !why;
 }
 

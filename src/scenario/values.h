@@ -5,6 +5,8 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <utility>
+#include <vector>
 
 #include "scenario/decimal.h"
 #include "scenario/problems.h"
@@ -13,6 +15,8 @@
 
 namespace kdx::scenario {
 
+inline constexpr std::string_view kPointName = "a point";  ///< what a number of a sweep's list is called
+
 /// Reads single values of a document; what is wrong with them is added to the problems.
 class Values {
 public:
@@ -20,7 +24,9 @@ public:
     Values(Problems& problems, bool force, const Corrections& corrections)
         : m_problems(problems), m_force(force), m_corrections(corrections) {}
 
-    void wrong(const YamlNode& node, const std::string& sentence) { m_problems.add(node.at, sentence); }
+    void wrong(const YamlNode& node, Mistake mistake, std::vector<std::string> words = {}) {
+        m_problems.add(node.at, mistake, std::move(words));
+    }
 
     /// A text as it is written, one line. @param name what it is the value of.
     [[nodiscard]] std::optional<std::string> text(const YamlNode& node, std::string_view name);

@@ -33,7 +33,7 @@ public:
     bool begun = false;
 
     void OnDocumentStart(const YAML::Mark& mark) override {
-        if (begun) refuse(mark, "a file holds one scenario; a second one begins here");
+        if (begun) refuse(mark, Mistake::SecondScenario);
         begun = true;
     }
     void OnDocumentEnd() override {}
@@ -41,16 +41,14 @@ public:
     void OnNull(const YAML::Mark& mark, YAML::anchor_t anchor) override {
         add(made(YamlNode::Kind::Nothing, mark, {}, anchor));
     }
-    void OnAlias(const YAML::Mark& mark, YAML::anchor_t /*anchor*/) override {
-        refuse(mark, "references (*) are not taken; repeat does things again");
-    }
+    void OnAlias(const YAML::Mark& mark, YAML::anchor_t /*anchor*/) override { refuse(mark, Mistake::Reference); }
     void OnScalar(const YAML::Mark& mark, const std::string& tag, YAML::anchor_t anchor,
                   const std::string& value) override {
         YamlNode node = made(YamlNode::Kind::Text, mark, tag, anchor);
         node.text = value;
         const std::string_view source = m_problems.text().substr(std::min(node.at, m_problems.text().size()));
         if (tag == "!" && (source.starts_with('"') || source.starts_with('\''))) {
-            if (!isClosed(source)) refuse(mark, "a quotation mark is opened here and never closed");
+            if (!isClosed(source)) refuse(mark, Mistake::OpenQuote);
             ++node.at;
         }
         add(std::move(node));
@@ -74,15 +72,14 @@ private:
         std::set<std::string> names = {};
     };
 
-    [[noreturn]] void refuse(const YAML::Mark& mark, const char* sentence) {
-        m_problems.add(placeOf(mark), sentence);
+    [[noreturn]] void refuse(const YAML::Mark& mark, Mistake mistake) {
+        m_problems.add(placeOf(mark), mistake);
         throw Unreadable();
     }
 
     YamlNode made(YamlNode::Kind kind, const YAML::Mark& mark, const std::string& tag, YAML::anchor_t anchor) {
-        if (anchor != YAML::NullAnchor)
-            refuse(mark, "names for references (&) are not taken; repeat does things again");
-        if (!tag.empty() && tag != "?" && tag != "!") refuse(mark, "tags (!) are not taken; every value is a text");
+        if (anchor != YAML::NullAnchor) refuse(mark, Mistake::ReferenceName);
+        if (!tag.empty() && tag != "?" && tag != "!") refuse(mark, Mistake::Tag);
         YamlNode node;
         node.kind = kind;
         node.at = placeOf(mark);
@@ -90,7 +87,7 @@ private:
     }
 
     void open(YamlNode::Kind kind, const YAML::Mark& mark, const std::string& tag, YAML::anchor_t anchor) {
-        if (m_open.size() >= kDeepest) refuse(mark, "this is nested too deeply");
+        if (m_open.size() >= kDeepest) refuse(mark, Mistake::TooDeep);
         m_open.push_back({made(kind, mark, tag, anchor)});
     }
 
@@ -120,9 +117,9 @@ private:
 
     void lookAtName(Open& open, const YamlNode& name) {
         if (name.kind != YamlNode::Kind::Text) {
-            m_problems.add(name.at, "a name belongs here");
+            m_problems.add(name.at, Mistake::NameMissing);
         } else if (!open.names.insert(name.text).second) {
-            m_problems.add(name.at, name.text + " stands here twice");
+            m_problems.add(name.at, Mistake::Twice, {name.text});
         }
     }
 
@@ -157,8 +154,7 @@ YamlNode readYaml(Problems& problems) {
         }
     } catch (const Unreadable&) {  // told where it was found
     } catch (const YAML::ParserException& error) {
-        problems.add(placeOf(error.mark),
-                     "this is not YAML: " + error.msg + "; a text with special characters needs quotation marks");
+        problems.add(placeOf(error.mark), Mistake::NoYaml, {error.msg});
     }
     return std::move(builder.root);
 }

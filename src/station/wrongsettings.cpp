@@ -105,20 +105,31 @@ std::optional<std::string> wrong(const Row& row, const std::string& stored, cons
     return std::nullopt;
 }
 
+LegalValues legalValues(const Row& row) {
+    const KeyFacts* const facts = factsOf(row.setting.sendKey);
+    LegalValues legal = facts == nullptr ? LegalValues() : facts->legal;
+    if (row.judged == Judged::PilotPhase) {
+        legal.lowest = kLowestPilotPhase;
+        legal.highest = kHighestPilotPhase;
+    }
+    return legal;
+}
+
 }  // namespace
 
-std::vector<std::string> wrongSettings(const Profile& source) {
+std::vector<WrongSetting> wrongSettings(const Profile& source) {
     const Corrections corrections = readCorrections(source);
-    std::vector<std::string> sentences;
+    std::vector<WrongSetting> found;
     for (const Row& row : kRows) {
         const Place& place = row.setting.place;
         const std::string stored = source.read(place);
         if (const auto sentence = wrong(row, stored, corrections)) {
-            sentences.push_back(*sentence + " It stands in " + source.fileOf(place) + ", [" + place.section + "] " +
-                                place.key + "=" + toUtf8(stored) + ".");
+            found.push_back({row.setting.sendKey, stored, legalValues(row), source.fileOf(place), place,
+                             *sentence + " It stands in " + source.fileOf(place) + ", [" + place.section + "] " +
+                                 place.key + "=" + toUtf8(stored) + "."});
         }
     }
-    return sentences;
+    return found;
 }
 
 }  // namespace kdx

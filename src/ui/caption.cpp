@@ -4,6 +4,7 @@
 #include <QGroupBox>
 #include <QLabel>
 
+#include "base/filled.h"
 #include "settings/captions.h"
 #include "ui/text.h"
 
@@ -31,6 +32,10 @@ QString captionText(const Captions& captions, const Caption& caption) {
     const std::string text =
         caption.number < kFirstOwnNumber ? captions.text(caption.number) : captions.own(caption.number, caption.design);
     return toText(text) + caption.after;
+}
+
+QString captionText(const Captions& captions, const Caption& caption, const std::vector<std::string>& words) {
+    return QString::fromStdString(filled(captionText(captions, caption).toStdString(), words));
 }
 
 QString shownText(const QWidget* control) {

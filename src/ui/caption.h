@@ -2,6 +2,7 @@
 
 #include <QString>
 
+#include <string>
 #include <type_traits>
 #include <vector>
 
@@ -24,6 +25,9 @@ struct Caption {
 
 /// The text in the current language.
 [[nodiscard]] QString captionText(const Captions& captions, const Caption& caption);
+/// The same with the words, in UTF-8, in the places of %1 to %9.
+[[nodiscard]] QString captionText(const Captions& captions, const Caption& caption,
+                                  const std::vector<std::string>& words);
 
 /// What a label or button shows, or the title of a frame.
 [[nodiscard]] QString shownText(const QWidget* control);

@@ -136,7 +136,7 @@ class TroubleTest(unittest.TestCase):
         found = 0
         makers = {
             r"\b(problem|warning|ValidationError)\(": ("app/ctl",),
-            r"\b(wrong|add)\(": ("scenario",),
+            r"\b(Wording)\{": ("scenario",),
             r"\b(m_tell|runtime_error|ValidationError)\(": ("simserver",),
             r"std::(fprintf|fputs)\(": ("app",),
         }
@@ -146,7 +146,7 @@ class TroubleTest(unittest.TestCase):
                 if call in ("fprintf", "fputs") and "stderr" not in told:
                     continue
                 for _, text in literals(told):
-                    for piece in re.split(r"%[sdzu]+|\n|kdx-(?:rds|ctl|sim): ", text):
+                    for piece in re.split(r"%[sdzu\d]+|\n|kdx-(?:rds|ctl|sim): ", text):
                         piece = piece.strip(" \".,;:()'\033[K\r-")
                         if len(piece.split()) > 2:
                             found += 1

@@ -12,9 +12,9 @@ TEST_F(ScenarioViewTest, ListsTheStepsOfAScenario) {
     load("title: Probe\nsteps: [send: {PS: RADIO}, {repeat: 3, steps: [wait: 1 s, note: half]}, pause: ready]");
     EXPECT_EQ(table->rowCount(), 5);
     EXPECT_EQ(cell(0, 0), "1");
-    EXPECT_EQ(cell(0, 1), "send PS=RADIO");
+    EXPECT_EQ(cell(0, 1), "senden PS=RADIO");
     EXPECT_EQ(cell(2, 0), "2.1");
-    EXPECT_EQ(cell(2, 1), "    wait 1 s");
+    EXPECT_EQ(cell(2, 1), "    warten: 1 s");
     EXPECT_EQ(text("Ablauf_Titel"), "Probe  (test.yaml)");
     EXPECT_TRUE(enabled("Ablauf_Start"));
     EXPECT_EQ(taken(), Lines{});
@@ -178,7 +178,7 @@ TEST_F(ScenarioViewTest, ADataSetGoesOutFirstAndTheWindowKeepsWhatItShows) {
     setProfile("Datenset3.INI", "RDS", "PS", "DREI");
     setProfile("Datenset3.INI", "RDS", "PI", "3333");
     load("data_set: 3\nsteps: [wait: 1 s]");
-    EXPECT_EQ(cell(0, 1), "data_set: 3");
+    EXPECT_EQ(cell(0, 1), "Datensatz 3 senden");
     click("Ablauf_Start");
     passAll();
     EXPECT_EQ(value("PS"), "DREI");

@@ -13,10 +13,10 @@ using scenario::Report;
 TEST_F(ReportTest, OnlyAPlainFileIsWritten) {
     for (const std::filesystem::path& other :
          {std::filesystem::path("/dev/full"), folder.path(), folder.path() / "nothing" / "report.csv"}) {
-        EXPECT_EQ(Report(other).begin(), "cannot be written") << other;
+        EXPECT_EQ(Report(other).begin(), scenario::ReportFault::Unwritable) << other;
     }
     std::filesystem::create_symlink(folder.data() / "other", folder.data() / "link");
-    EXPECT_EQ(Report(folder.data() / "link").begin(), "cannot be written");
+    EXPECT_EQ(Report(folder.data() / "link").begin(), scenario::ReportFault::Unwritable);
 }
 
 }  // namespace

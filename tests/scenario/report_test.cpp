@@ -26,7 +26,7 @@ TEST_F(ReportTest, EveryRowIsInTheFileWhenTheNextThingHappens) {
     const Report file(folder.data() / "report.csv");
     report = &file;
     folder.write("report.csv", "time,step,key,value,command,status,answer\r\nof the last run");
-    ASSERT_EQ(file.begin(), "");
+    ASSERT_EQ(file.begin(), std::nullopt);
     EXPECT_EQ(folder.read("report.csv"), "time,step,key,value,command,status,answer\r\n");
     clock.set(36000);
     play("steps: [send: {PS: Süd}, note: \"a, b\"]");
@@ -39,12 +39,11 @@ TEST_F(ReportTest, EveryRowIsInTheFileWhenTheNextThingHappens) {
 TEST_F(ReportTest, AFileThatIsNoReportStaysAsItIs) {
     for (const char* text : {"[RDS]\r\nPS=RADIO\r\n", "x", "time,step,key,value,command,status,answer"}) {
         folder.write("Datenset3.INI", text);
-        EXPECT_EQ(Report(folder.data() / "Datenset3.INI").begin(),
-                  "is there, and is no report that could be written anew");
+        EXPECT_EQ(Report(folder.data() / "Datenset3.INI").begin(), scenario::ReportFault::Foreign);
         EXPECT_EQ(folder.read("Datenset3.INI"), text);
     }
     folder.write("Datenset3.INI", "");
-    EXPECT_EQ(Report(folder.data() / "Datenset3.INI").begin(), "");
+    EXPECT_EQ(Report(folder.data() / "Datenset3.INI").begin(), std::nullopt);
 }
 
 }  // namespace

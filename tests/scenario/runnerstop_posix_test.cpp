@@ -9,7 +9,7 @@ using RunnerStopTest = PlayTest;
 TEST_F(RunnerStopTest, AFullDiskUnderTheReportIsToldOnceAndEndsTheRunRestored) {
     const scenario::Report file(folder.path() / "report.csv");
     report = &file;
-    ASSERT_EQ(file.begin(), "");
+    ASSERT_EQ(file.begin(), std::nullopt);
     const FullDisk full;
     const auto outcome = play("restore: true\nsteps: [send: {TA: 1}, send: {TA: 0}]");
     EXPECT_TRUE(outcome.reportLost);

@@ -21,6 +21,12 @@ struct Stored {
     const char* legal;
 };
 
+std::vector<std::string> sentencesAbout(const Profile& source) {
+    std::vector<std::string> sentences;
+    for (const WrongSetting& wrong : wrongSettings(source)) sentences.push_back(wrong.sentence);
+    return sentences;
+}
+
 class WrongSettingsTest : public ::testing::TestWithParam<Stored>, protected Bench {
 protected:
     /// What is wrong with a whole set-up that has this value and a PI.
@@ -29,7 +35,7 @@ protected:
         const std::size_t end = place.find("] ") + 1;
         const std::string section = place.substr(0, end) + "\r\n" + place.substr(end + 1) + "=" + value + "\r\n";
         folder.write("Lab.INI", section + "[RDS]\r\nPI=D3C1\r\n[FM]\r\nARI=0\r\n");
-        return wrongSettings(Profile::ofFile(data, "Lab.INI"));
+        return sentencesAbout(Profile::ofFile(data, "Lab.INI"));
     }
 };
 
@@ -58,7 +64,7 @@ TEST_F(WrongDataSetTest, EachValueOfTheDataSetIsNamedInTheOrderOfSending) {
                  "[RDS]\r\nGR_FOLGE=0A,2A\r\nEON_AFB5=1\r\nEON_PS=123456789\r\nEON_TP=2\r\nEON_TA=x\r\nEON_PI=12\r\n"
                  "PTY=77\r\nAF_LISTE1=98.5,\r\nRTA=\x99\r\nMS=Q\r\nPS=123456789\r\nPI=xyz\r\n");
     const auto in2 = [](const std::string& key) { return EndsWith(" Datenset2.INI, [RDS] " + key + "."); };
-    EXPECT_THAT(wrongSettings(Profile::ofFile(data, "Datenset2.INI")),
+    EXPECT_THAT(sentencesAbout(Profile::ofFile(data, "Datenset2.INI")),
                 ElementsAre(EndsWith(" RDS_Allg.INI, [FM] PILOT=x."), in2("PI=xyz"), in2("PS=123456789"), in2("MS=Q"),
                             in2("RTA=™"), in2("AF_LISTE1=98.5,"), in2("PTY=77"), in2("EON_PI=12"), in2("EON_TA=x"),
                             in2("EON_TP=2"), in2("EON_PS=123456789"), in2("EON_AFB5=1"), in2("GR_Folge=0A,2A")));
@@ -67,14 +73,14 @@ TEST_F(WrongDataSetTest, EachValueOfTheDataSetIsNamedInTheOrderOfSending) {
 TEST_F(WrongDataSetTest, OnlyThePiMustNotBeMissing) {
     folder.write("Datenset2.INI", "[RDS]\r\nPS=\r\n");
     EXPECT_THAT(
-        wrongSettings(Profile::ofFile(data, "Datenset2.INI")),
+        sentencesAbout(Profile::ofFile(data, "Datenset2.INI")),
         ElementsAre("PI cannot be \"\". Legal: four hexadecimal digits. It stands in Datenset2.INI, [RDS] PI=."));
 }
 
 TEST_F(WrongDataSetTest, NothingIsWrongInTheShippedOnesAndAllTheySendIsLegal) {
     DataFolder shipped{sourceFolder()};
     for (const char* number : {"1", "2", "3", "4", "5"}) {
-        EXPECT_THAT(wrongSettings(Profile::ofFile(shipped, dataSetFile(number))), ElementsAre());
+        EXPECT_THAT(sentencesAbout(Profile::ofFile(shipped, dataSetFile(number))), ElementsAre());
         for (const Step& step : openingSteps(loadStation(shipped, number))) {
             std::string value = step.value;
             if (step.kind != Step::Kind::Parameter || value.empty()) continue;

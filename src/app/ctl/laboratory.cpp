@@ -171,7 +171,7 @@ bool Laboratory::mayBeSent(const std::string& key, const std::string& utf8) {
 bool Laboratory::mayBeSent(const Profile& source) {
     if (m_call.force) return true;
     const auto wrong = wrongSettings(source);
-    for (const std::string& sentence : wrong) m_output.problem(sentence);
+    for (const WrongSetting& setting : wrong) m_output.problem(setting.sentence);
     return wrong.empty();
 }
 

@@ -147,9 +147,9 @@ int play(Laboratory& laboratory, const Play& what) {
     const scenario::Report report(pathFromUtf8(what.report.empty() ? scenario->report : what.report));
     laboratory.hasten(what.speed);
     if (!laboratory.open()) return kNoConnection;
-    const std::string problem = report.file().empty() ? "" : report.begin();
-    if (!problem.empty()) {
-        laboratory.output().problem("the report " + utf8Of(report.file()) + " " + problem);
+    const auto fault = report.file().empty() ? std::nullopt : report.begin();
+    if (fault) {
+        laboratory.output().problem("the report " + utf8Of(report.file()) + " " + faultWords(*fault));
         laboratory.close();
         return kWrongCall;
     }
