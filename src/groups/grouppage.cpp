@@ -4,6 +4,7 @@
 #include "groups/settings.h"
 #include "settings/programstate.h"
 #include "ui/dialogs.h"
+#include "ui/elided.h"
 #include "ui/layouts.h"
 #include "ui/text.h"
 
@@ -38,7 +39,8 @@ void GroupPage::create() {
         m_book.tip(button, {874, "Verschiebt die markierte Gruppe; ein Klick auf eine Gruppe markiert sie."});
     connect(Label10, &SequenceLabel::clickedAt, this, &GroupPage::choose);
     Gruppe_Anteile = named<QLabel>("Gruppe_Anteile", this);
-    Gruppe_Anteile->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Preferred);  // shows what fits; the tip has all
+    Gruppe_Anteile->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Preferred);  // a long line does not widen the page
+    elideLongText(*Gruppe_Anteile);
     GS_Senden = clicked<QPushButton>("GS_Senden", {82}, this, &GroupPage::GS_Senden_Click);
 }
 

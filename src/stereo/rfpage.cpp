@@ -9,6 +9,7 @@
 #include "stereo/carrier.h"
 #include "stereo/steppedlabel.h"
 #include "ui/dialogs.h"
+#include "ui/elided.h"
 #include "ui/keymarks.h"
 #include "ui/layouts.h"
 #include "ui/text.h"
@@ -58,6 +59,7 @@ void RfPage::createValue(Value& value, const char* name, const char* frame, cons
     value.label->setFont(font);
     // A text of any length may be entered: it must not push the frames about.
     value.label->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Preferred);
+    elideLongText(*value.label);
     layOut(value.frame, column({value.label}));
 }
 

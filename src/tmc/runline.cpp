@@ -6,12 +6,14 @@
 #include "tmc/groupcode.h"
 #include "tmc/settings.h"
 #include "ui/caption.h"
+#include "ui/elided.h"
 #include "ui/text.h"
 
 namespace kdx {
 
 RunLine::RunLine(const PageContext& with, QWidget* parent) : QLabel(parent), m_with(with) {
-    setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Preferred);  // shows what fits; the tip has all
+    setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Preferred);  // a long line does not widen the page
+    elideLongText(*this);
 }
 
 void RunLine::label() {

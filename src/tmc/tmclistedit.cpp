@@ -4,6 +4,7 @@
 #include "tmc/shownlist.h"
 #include "tmc/tmclist.h"
 #include "ui/dialogs.h"
+#include "ui/elided.h"
 #include "ui/layouts.h"
 #include "ui/text.h"
 
@@ -162,6 +163,7 @@ QBoxLayout* TMC_Listedit::arrangeList(QLabel* columns, QListView* list, QLabel* 
         input->setMinimumHeight(add->sizeHint().height());
     }
     text->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Preferred);  // a long text does not widen the window
+    elideLongText(*text);
     code->setFixedWidth(list->fontMetrics().horizontalAdvance(QStringLiteral("0000000")) + 8);
 
     return column({columns, {list, 1}, row({{text, 1}, code, add})});

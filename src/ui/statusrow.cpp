@@ -6,6 +6,7 @@
 
 #include "settings/captions.h"
 #include "ui/controls.h"
+#include "ui/elided.h"
 #include "ui/named.h"
 #include "ui/text.h"
 
@@ -70,6 +71,7 @@ void StatusRow::addPair(int column, QLabel* heading, QLabel* value, int widest, 
     const QFontMetrics letters = value->fontMetrics();
     value->setMinimumWidth(std::max(letters.horizontalAdvance(sample), letters.horizontalAdvance(value->text())) + 6);
     value->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Fixed);
+    elideLongText(*value);
     auto* grid = static_cast<QGridLayout*>(layout());
     grid->addWidget(heading, 0, column);
     grid->addWidget(value, 1, column);

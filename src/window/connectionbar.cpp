@@ -10,6 +10,7 @@
 #include "settings/programstate.h"
 #include "ui/clickablelabel.h"
 #include "ui/dialogs.h"
+#include "ui/elided.h"
 #include "ui/layouts.h"
 #include "ui/text.h"
 
@@ -54,6 +55,7 @@ ConnectionBar::ConnectionBar(const PageContext& with, QWidget* parent) : QWidget
     Verbindung_Anzeige = named<QLabel>("Verbindung_Anzeige", this);
     Verbindung_Anzeige->setSizePolicy(QSizePolicy::Ignored,
                                       QSizePolicy::Fixed);  // a host name may be long: see the tip
+    elideLongText(*Verbindung_Anzeige);
     Verbindung_Anzeige->setMinimumWidth(
         Verbindung_Anzeige->fontMetrics().horizontalAdvance(QStringLiteral("verbunden: 000.000.000.000")));
     auto* state = column({row({Ende_Taste, kRoom}), Verbindung_Anzeige});

@@ -5,6 +5,7 @@
 #include <QProgressBar>
 #include <QPushButton>
 
+#include "ui/elided.h"
 #include "ui/named.h"
 
 namespace kdx {
@@ -18,6 +19,7 @@ constexpr int kButtonRoom = 6;  // above and below a caption, in pixels at 96 dp
 ProgressLine::ProgressLine(QWidget* parent) : QWidget(parent) {
     m_text = named<QLabel>("QuietLine", this);
     m_text->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Fixed);
+    elideLongText(*m_text);
     m_bar = named<QProgressBar>("ProgressBar", this);
     m_bar->setTextVisible(false);
     m_bar->setFixedSize(160, m_text->fontMetrics().height() - 3);

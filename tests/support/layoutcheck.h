@@ -13,6 +13,8 @@
 #include <QStyleOptionGroupBox>
 #include <QWidget>
 
+#include "ui/elided.h"
+
 namespace kdx::test {
 
 /// Fails for every visible label, button, combo box and frame below `root` that is smaller than its text needs, and
@@ -24,7 +26,11 @@ inline void expectNothingCutOff(const QWidget& root, const std::string& where) {
         QSize need;
         QString text;
         if (const auto* label = qobject_cast<const QLabel*>(widget); label && !label->text().isEmpty()) {
-            if (label->sizePolicy().horizontalPolicy() == QSizePolicy::Ignored) continue;  // shows what fits
+            if (label->sizePolicy().horizontalPolicy() == QSizePolicy::Ignored && !label->wordWrap()) {
+                EXPECT_TRUE(visibleText(*label) == label->text() || elidesLongText(*label))
+                    << name << " cuts off \"" << label->text().toStdString() << '"';
+                continue;
+            }
             need = label->wordWrap() ? QSize(0, label->heightForWidth(label->width())) : label->minimumSizeHint();
             text = label->text();
         } else if (const auto* button = qobject_cast<const QAbstractButton*>(widget);

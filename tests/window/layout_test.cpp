@@ -2,12 +2,19 @@
 
 #include <gtest/gtest.h>
 
+#include <QAbstractSpinBox>
 #include <QGroupBox>
+#include <QHelpEvent>
 #include <QTabBar>
+#include <QToolButton>
+#include <QToolTip>
 
 #include <cstdlib>
+#include <map>
+#include <set>
 
 #include "support/windowtest.h"
+#include "ui/clickablelabel.h"
 
 namespace kdx::test {
 namespace {
@@ -28,6 +35,30 @@ protected:
             showPage(page);
             QCoreApplication::processEvents();
             look(page);
+        }
+    }
+
+    /// Every tab shows its whole caption, if need be after presses of the buttons that scroll the tabs.
+    void expectEveryTabCanBeReached(const std::string& where) {
+        const auto* bar = find<QTabWidget>("SSTab1")->tabBar();
+        auto* left = bar->findChild<QToolButton*>(QStringLiteral("ScrollLeftButton"));
+        auto* right = bar->findChild<QToolButton*>(QStringLiteral("ScrollRightButton"));
+        ASSERT_TRUE(left != nullptr && right != nullptr);
+        QRect open = bar->rect();
+        if (left->isVisible()) open.setRight(left->x() - 1);
+        const auto press = [&](QToolButton& button) {
+            for (int times = 0; times < bar->count() && button.isVisible() && button.isEnabled(); ++times)
+                button.click();
+        };
+        press(*left);
+        for (int tab = 0; tab < bar->count(); ++tab) {
+            const auto inside = [&] {
+                return bar->tabRect(tab).left() >= open.left() && bar->tabRect(tab).right() <= open.right();
+            };
+            while (!inside() && right->isVisible() && right->isEnabled()) right->click();
+            EXPECT_TRUE(inside()) << where << ": tab " << tab << " cannot be reached";
+            EXPECT_GE(bar->tabRect(tab).width(), bar->fontMetrics().horizontalAdvance(bar->tabText(tab)) + 8)
+                << where << ": tab " << tab;
         }
     }
 
@@ -160,6 +191,33 @@ class FontTest : public LayoutTest, public ::testing::WithParamInterface<int> {
 protected:
     ~FontTest() override { end(); }
 
+    /// What each label has to show at the most.
+    void showLongest(const char* language) {
+        type("PS_T", "WWWWWWWW");
+        click("PS_Taste");
+        for (int group = 0; group < 16; ++group) click(("Gruppe" + std::to_string(group)).c_str());
+        dialogs.inputs.push_back(QStringLiteral("98.5 und noch viel mehr, als in den Rahmen passt"));
+        emit find<ClickableLabel>("Input_HF_Freq_Label")->clicked();
+        click("optMultiMessage");
+        click("TMC_Senden_Taste");
+        tick("TMC_Sende_Timer");
+        visa.writeStatus = visa::kTimeout;
+        dialogs.expectedMessages = 1;
+        click("Command3");
+        visa.writeStatus = 0;
+        find<QLabel>("QuietLine")
+            ->setText(QStringLiteral("/home/messplatz/") + QString(80, QLatin1Char('x')) +
+                      QString::fromLatin1(language));
+    }
+    static QString tipOf(QLabel& label) {
+        QToolTip::hideText();
+        QHelpEvent event(QEvent::ToolTip, QPoint(1, 1), label.mapToGlobal(QPoint(1, 1)));
+        QApplication::sendEvent(&label, &event);
+        return QToolTip::text();
+    }
+
+    std::set<std::string> m_cut;  ///< the labels whose text did not fit in some language
+
 private:
     FontSize m_font{GetParam()};
 };
@@ -174,11 +232,53 @@ TEST_P(FontTest, NothingIsCutOffOrOutOfReachAtTheLeastSize) {
             const QWidget* page = find<QTabWidget>("SSTab1")->widget(index);
             EXPECT_LE(page->minimumSizeHint().width(), page->width()) << where;
             EXPECT_LE(page->minimumSizeHint().height(), page->height()) << where;
-            const auto* bar = find<QTabWidget>("SSTab1")->tabBar();
-            EXPECT_TRUE(bar->usesScrollButtons() || bar->sizeHint().width() <= bar->width()) << where;
+            expectEveryTabCanBeReached(where);
             savePicture(where);
         });
     }
+}
+
+TEST_P(FontTest, ALongTextIsCutWithDotsAndWholeInTheTip) {
+    const QString host = QStringLiteral("messplatz-7.ukw-labor.sendernetz.example.org");
+    for (const char* language : kEveryLanguage) {
+        setGeneral("ADRESSEN", "KDX_TCPIP", host.toStdString());
+        walk(language, [](int) {});
+        showLongest(language);
+        window->resize(1, 1);
+        for (const auto& [name, page] : std::map<std::string, int>{{"Verbindung_Anzeige", 1},
+                                                                   {"Status_3", 1},
+                                                                   {"Status_4", 1},
+                                                                   {"Status_17", 8},
+                                                                   {"Datensatz_Anzeige", 1},
+                                                                   {"HF_Anzeige", 1},
+                                                                   {"QuietLine", 1},
+                                                                   {"Gruppe_Anteile", 3},
+                                                                   {"TMC_Lauf", 7},
+                                                                   {"Input_HF_Freq_Label", 8}}) {
+            showPage(page);
+            QCoreApplication::processEvents();
+            auto* label = find<QLabel>(name.c_str());
+            const std::string where = std::string(language) + " " + name;
+            ASSERT_FALSE(label->text().isEmpty()) << where;
+            if (visibleText(*label) == label->text()) continue;
+            EXPECT_TRUE(elidesLongText(*label)) << where;
+            EXPECT_TRUE(visibleText(*label).endsWith(QChar(0x2026))) << where;
+            EXPECT_TRUE(tipOf(*label).contains(label->text())) << where << ": " << tipOf(*label).toStdString();
+            m_cut.insert(name);
+        }
+    }
+    for (const char* name : {"QuietLine", "Input_HF_Freq_Label"})
+        EXPECT_EQ(m_cut.count(name), 1U) << name << " was meant to be too long";
+}
+
+TEST_F(LayoutTest, TheManualIsNotCutOff) {
+    expectNothingCutOffAnywhere([this](const char* language) -> QWidget& {
+        folder.copyShipped();
+        setGeneral("Sprache", "Sprache", language);
+        start();
+        action("Mnu_Hilfe_Handbuch")->trigger();
+        return *window->findChild<QWidget*>(QStringLiteral("ManualView"));
+    });
 }
 
 INSTANTIATE_TEST_SUITE_P(Points, FontTest, ::testing::ValuesIn(kEveryFontSize),
@@ -188,12 +288,21 @@ TEST_F(LayoutTest, AMaximisedPageKeepsItsControlsTogether) {
     startShipped();
     openSession();
     window->resize(3000, 1500);
-    for (int page = 0; page < 9; ++page) {
-        showPage(page);
+    for (int index = 0; index < 9; ++index) {
+        showPage(index);
         QCoreApplication::processEvents();
-        for (const QWidget* control : find<QTabWidget>("SSTab1")->widget(page)->findChildren<QWidget*>()) {
-            EXPECT_LE(control->width(), 1300) << control->objectName().toStdString();
+        const QWidget* page = find<QTabWidget>("SSTab1")->widget(index);
+        const int line = page->fontMetrics().height();
+        QRect all;
+        for (const QWidget* control : page->findChildren<QWidget*>()) {
+            if (!control->isVisibleTo(page) || control->window() != page->window()) continue;
+            all |= QRect(control->mapTo(page, QPoint()), control->size());
+            const bool single = qobject_cast<const QAbstractButton*>(control) != nullptr ||
+                                qobject_cast<const QAbstractSpinBox*>(control) != nullptr;
+            EXPECT_LE(control->width(), (single ? 40 : 90) * line) << control->objectName().toStdString();
         }
+        EXPECT_LE(all.width(), 90 * line) << "page " << index << ": the eye has to cross it";
+        EXPECT_NEAR(all.center().x(), page->rect().center().x(), 4 * line) << "page " << index;
     }
 }
 
