@@ -90,7 +90,7 @@ void RfPage::label() {
 void RfPage::stepGoesOut(const Step& step) {
     if (step.kind == Step::Kind::Identify) m_carrier.everOpened = true;  // the first step of an opening
     if (step.key == setting::kRfOutput) showOutput(step.value == outputText(true));
-    for (const Value* value : values()) {
+    for (Value* value : values()) {
         if (step.key == value->setting.sendKey) showValue(*value, toText(step.value));
     }
 }
@@ -100,7 +100,7 @@ void RfPage::HfOnOffState_Click() {
     m_with.params.SendParam(setting::kRfOutput, outputText(m_carrier.outputOn));
 }
 
-void RfPage::enter(const Value& value) {
+void RfPage::enter(Value& value) {
     const std::string lowest = this->lowest(value);
     const std::string highest = this->highest(value);
     QString answer = toText(m_with.profile.read(value.setting.place));
@@ -114,16 +114,18 @@ void RfPage::enter(const Value& value) {
     take(value, answer);
 }
 
-void RfPage::take(const Value& value, const QString& number) {
+void RfPage::take(Value& value, const QString& number) {
     showValue(value, number);
     m_with.params.SendParam(value.setting.sendKey, toBytes(number));
     // What is not kept is gone with the next opening, which sends what data set 1 holds.
     if (m_with.state.corrections.rfValues) m_with.profile.write(value.setting.place, toBytes(number));
 }
 
-/// Goes from the value that is shown, or else from the one that is kept. A step beyond the limits is none.
-void RfPage::step(const Value& value, int steps) {
+/// Goes from the value that is shown, or else from the one that is kept. A step beyond the limits is none,
+/// and from a value that the instrument refused there is none either: it would start from one that is not in force.
+void RfPage::step(Value& value, int steps) {
     const bool nothing = value.label->text() == kNothing;
+    if (!nothing && !refusal(value).isEmpty()) return;
     const std::string from = nothing ? m_with.profile.read(value.setting.place) : toBytes(value.label->text());
     constexpr double kFinest = 1e6;  // what the sum of two decimal numbers has below that is no digit of theirs
     const double sum = std::round((leadingNumber(from) + steps * value.step) * kFinest) / kFinest;
@@ -149,8 +151,9 @@ QString RfPage::checked(QString& answer, const std::string& lowest, const std::s
            caption({634, "%1 liegt nicht zwischen %2 und %3."}).arg(answer, toText(lowest), toText(highest));
 }
 
-void RfPage::showValue(const Value& value, const QString& text) {
+void RfPage::showValue(Value& value, const QString& text) {
     value.label->setText(text);
+    value.shownUnder = m_with.state.corrections;
     showJudged(value);
 }
 
@@ -160,11 +163,16 @@ void RfPage::showJudged(const Value& value) {
     label();
 }
 
+/// Why the instrument did not take the value that is shown. A rule that is changed later does not put it in force.
+QString RfPage::refusal(const Value& value) const {
+    return whyRefused(m_with, value.setting.sendKey, value.label->text(), value.shownUnder);
+}
+
 Judgement RfPage::judge(const Value& value) const {
     if (value.label->text() == kNothing) return {};
     Judgement sent = m_with.marks.judge(value.setting.sendKey);
     if (sent.state != ValueState::InForce) return sent;
-    const QString why = whyRefused(m_with, value.setting.sendKey, value.label->text());
+    const QString why = refusal(value);
     return {why.isEmpty() ? ValueState::InForce : ValueState::Refused, why};
 }
 

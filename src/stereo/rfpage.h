@@ -4,6 +4,7 @@
 
 #include <array>
 
+#include "settings/corrections.h"
 #include "stereo/settings.h"
 #include "ui/clickablelabel.h"
 #include "ui/page.h"
@@ -33,6 +34,7 @@ private:
         StatusSlot slot;
         const Place* lowest = nullptr;  ///< where the limits are kept; nullptr for fixed ones
         const Place* highest = nullptr;
+        Corrections shownUnder = {};  ///< what was corrected when the value that is shown went out
         ClickableLabel* label = nullptr;
         QGroupBox* frame = nullptr;
     };
@@ -46,14 +48,15 @@ private:
     void createValue(Value& value, const char* name, const char* frame, const Caption& title,
                      void (RfPage::*handler)());
     void arrange();
-    void enter(const Value& value);
-    void step(const Value& value, int steps);
-    void take(const Value& value, const QString& number);
+    void enter(Value& value);
+    void step(Value& value, int steps);
+    void take(Value& value, const QString& number);
     [[nodiscard]] std::string lowest(const Value& value) const;
     [[nodiscard]] std::string highest(const Value& value) const;
     [[nodiscard]] QString checked(QString& answer, const std::string& lowest, const std::string& highest) const;
-    void showValue(const Value& value, const QString& text);
+    void showValue(Value& value, const QString& text);
     void showJudged(const Value& value);
+    [[nodiscard]] QString refusal(const Value& value) const;
     [[nodiscard]] Judgement judge(const Value& value) const;
     void showOutput(bool on);
     [[nodiscard]] std::array<Value*, 3> values() {

@@ -126,6 +126,10 @@ void showWarning(QWidget& control, const QString& tip) {
 }
 
 QString whyRefused(const PageContext& with, const char* key, const QString& entry) {
+    return whyRefused(with, key, entry, with.state.corrections);
+}
+
+QString whyRefused(const PageContext& with, const char* key, const QString& entry, const Corrections& corrections) {
     const auto say = [&](const Caption& caption) { return captionText(with.captions, caption); };
     const std::string_view name = key;
     const std::string bytes = toBytes(entry);
@@ -135,7 +139,6 @@ QString whyRefused(const PageContext& with, const char* key, const QString& entr
             if (kept[at] != entry[at]) return say({852, "RDS kennt das Zeichen %1 nicht."}).arg(entry[at]);
         }
     }
-    const Corrections& corrections = with.state.corrections;
     if (!wrongValue(name, bytes, corrections)) return {};
     if (name == "PI" || name == "EON_PI") return say({850, "Die PI muss aus vier hexadezimalen Ziffern bestehen."});
     if (isCarriedText(name)) {

@@ -8,6 +8,7 @@ class QWidget;
 
 namespace kdx {
 
+struct Corrections;
 struct PageContext;
 
 /// Whether a value that is shown is the one that the instrument has.
@@ -38,5 +39,8 @@ void showJudgement(QWidget& control, const Judgement& judgement);
 
 /// Why the coder does not take the entry for the key, in the current language; "" when it does.
 [[nodiscard]] QString whyRefused(const PageContext& with, const char* key, const QString& entry);
+/// The same by other corrections than those at work: the ones that it went out under.
+[[nodiscard]] QString whyRefused(const PageContext& with, const char* key, const QString& entry,
+                                 const Corrections& corrections);
 
 }  // namespace kdx

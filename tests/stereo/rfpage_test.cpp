@@ -82,6 +82,46 @@ TEST_F(RfPageTest, TheArrowKeysStepTheValueThatIsShown) {
     EXPECT_EQ(sent(), (Lines{"FREQ 97.6MHZ", ":POW 89DBUV", ":STEREO:AUDIO:FREQ 2.1KHZ"}));
 }
 
+TEST_F(RfPageTest, ThereIsNoStepFromAValueThatTheInstrumentRefused) {
+    const struct {
+        const char *label, *refused, *good, *stepped;
+    } rows[] = {{"Input_HF_Freq_Label", "98,7", "98.7", "FREQ 98.8MHZ"},
+                {"Input_HF_Pegel_Label", "66,5", "66.5", ":POW 67.5DBUV"},
+                {"Input_AF_Freq_Label", "2,4", "2.4", ":STEREO:AUDIO:FREQ 2.5KHZ"}};
+    for (const auto& row : rows) {
+        answer({row.refused});
+        clickLabel(row.label);
+        ASSERT_EQ(stateOf(row.label), "abgelehnt") << row.label;
+        sent();
+        for (const Qt::Key key : {Qt::Key_Up, Qt::Key_Down}) press(row.label, key);
+        EXPECT_EQ(sent(), Lines{});
+        EXPECT_EQ(text(row.label), row.refused);
+        answer({row.good});
+        clickLabel(row.label);
+        sent();
+        press(row.label, Qt::Key_Up);
+        EXPECT_EQ(sent(), Lines{row.stepped});
+    }
+}
+
+TEST_F(RfPageTest, ARefusedValueStaysMarkedWhenItsCommaIsCorrectedFromNowOn) {
+    answer({"98,7"});
+    clickLabel("Input_HF_Freq_Label");
+    state.corrections.decimalComma = true;
+    page.label();
+    EXPECT_EQ(stateOf("Input_HF_Freq_Label"), "abgelehnt");
+    EXPECT_EQ(stateOf(StatusSlot::RfFrequency), "abgelehnt");
+    EXPECT_FALSE(find("Input_HF_Freq_Label")->accessibleDescription().isEmpty()) << "why";
+    sent();
+    press("Input_HF_Freq_Label", Qt::Key_Up);
+    EXPECT_EQ(sent(), Lines{});
+    answer({"98,7"});
+    clickLabel("Input_HF_Freq_Label");
+    EXPECT_EQ(sent(), Lines{"FREQ 98.7MHZ"});
+    EXPECT_EQ(stateOf("Input_HF_Freq_Label"), "");
+    EXPECT_EQ(stateOf(StatusSlot::RfFrequency), "");
+}
+
 TEST_F(RfPageTest, AStepStaysWithinTheLimitsAndStartsFromWhatIsKept) {
     press("Input_HF_Freq_Label", Qt::Key_Up);  // nothing was sent yet
     EXPECT_EQ(sent(), Lines{"FREQ 98.6MHZ"});
