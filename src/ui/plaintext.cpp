@@ -32,7 +32,10 @@ public:
 void markQuote(QLineEdit& entry) {
     QPalette palette = entry.palette();
     const bool quoted = entry.text().contains(QLatin1Char('"')) && !entry.window()->property(kQuotesDoubled).toBool();
-    palette.setColor(QPalette::Text, quoted ? QColor(Qt::red) : QApplication::palette(&entry).color(QPalette::Text));
+    const QPalette usual = QApplication::palette(&entry);
+    // One that cannot be used looks so still, but a quote is to be seen before the session that would send it.
+    for (const auto group : {QPalette::Active, QPalette::Inactive, QPalette::Disabled})
+        palette.setColor(group, QPalette::Text, quoted ? QColor(Qt::red) : usual.color(group, QPalette::Text));
     entry.setPalette(palette);
 }
 

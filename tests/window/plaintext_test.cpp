@@ -100,6 +100,25 @@ TEST_F(PlainTextTest, ToolTips) {
     QToolTip::hideText();
 }
 
+TEST_F(PlainTextTest, AnEntryThatCannotBeUsedLooksSoWhateverWasTyped) {
+    showPage(1);
+    QCoreApplication::processEvents();
+    const auto letters = [this](QPalette::ColorGroup group) {
+        return find("PS_T")->palette().color(group, QPalette::Text).name().toStdString();
+    };
+    const std::string usual = letters(QPalette::Active);
+    const std::string grey =
+        QApplication::palette(find("PS_T")).color(QPalette::Disabled, QPalette::Text).name().toStdString();
+    ASSERT_NE(usual, grey);
+    type("PS_T", "RADIO");
+    EXPECT_EQ(letters(QPalette::Disabled), grey);
+    type("PS_T", "RA\"DIO");
+    EXPECT_EQ(letters(QPalette::Disabled), "#ff0000") << "seen before the session that would send it";
+    type("PS_T", "RADIO");
+    click("GTL_Taste");
+    EXPECT_EQ(letters(QPalette::Disabled), grey);
+}
+
 TEST_F(PlainTextTest, NoPictureIsFetchedForACaption) {
     QImage picture(400, 400, QImage::Format_RGB32);
     picture.fill(Qt::red);
