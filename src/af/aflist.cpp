@@ -77,19 +77,41 @@ std::string withCommas(std::string_view text) {
     return list;
 }
 
+/// Two whole numbers with a comma between them may be one.
+bool mayBeDecimal(std::string_view text, std::size_t entries) {
+    return entries == 2 && text.find('.') == std::string_view::npos && text.find(',') != std::string_view::npos;
+}
+
+/// The number that the entry of a list is; nothing when it is no allowed AF.
+std::optional<std::string> frequencyOf(std::string_view entry) {
+    auto number = decimalNumber(entry);
+    return number && isAlternativeFrequency(*number) ? number : std::nullopt;
+}
+
 }  // namespace
 
 std::vector<std::string> pastedFrequencies(std::string_view text) {
     std::vector<std::string> frequencies;
     const std::string commaList = withCommas(text);
     for (const std::string_view piece : split(commaList, ",")) {
-        auto number = decimalNumber(piece);
-        if (!number || !isAlternativeFrequency(*number)) return {};
-        frequencies.push_back(std::move(*number));
+        auto frequency = frequencyOf(piece);
+        if (!frequency) return {};
+        frequencies.push_back(std::move(*frequency));
     }
-    const bool maybeDecimal =
-        frequencies.size() == 2 && text.find('.') == std::string_view::npos && text.find(',') != std::string_view::npos;
-    return maybeDecimal ? std::vector<std::string>() : frequencies;
+    return mayBeDecimal(text, frequencies.size()) ? std::vector<std::string>() : frequencies;
+}
+
+std::optional<std::string_view> wrongFrequency(std::string_view text) {
+    constexpr std::string_view kBetween = ",; \t\r\n";
+    std::optional<std::string_view> wrong;
+    std::size_t entries = 0;
+    for (std::size_t at = text.find_first_not_of(kBetween); at < text.size(); ++entries) {
+        const std::size_t end = std::min(text.find_first_of(kBetween, at), text.size());
+        const std::string_view entry = text.substr(at, end - at);
+        if (!wrong && !frequencyOf(entry)) wrong = entry;
+        at = text.find_first_not_of(kBetween, end);
+    }
+    return entries < 2 || mayBeDecimal(text, entries) ? std::nullopt : wrong;
 }
 
 void sortFrequencies(std::vector<std::string>& frequencies) {

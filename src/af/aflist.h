@@ -60,6 +60,10 @@ struct AfList {
 /// list. A single comma between whole numbers is none: it may be a decimal one.
 [[nodiscard]] std::vector<std::string> pastedFrequencies(std::string_view text);
 
+/// The first entry of such a list that is no allowed AF, as a part of the text; nothing where the text is no list or
+/// each entry is one.
+[[nodiscard]] std::optional<std::string_view> wrongFrequency(std::string_view text);
+
 /// The frequencies from the lowest to the highest.
 void sortFrequencies(std::vector<std::string>& frequencies);
 

@@ -71,9 +71,11 @@ void AF_Listenform::createOrder() {
     for (QPushButton* button : {AF_Auf, AF_Ab})
         m_book.tip(button, {1154, "Verschiebt die gewählte Frequenz um eine Zeile"});
     m_book.tip(AF_Sortieren, {1155, "Ordnet die Liste von der kleinsten zur größten Frequenz"});
-    m_hint = named<QLabel>("KommaHinweis", m_change);
+    m_hint = named<QLabel>("KommaHinweis", this);
     m_hint->setWordWrap(true);
-    m_hint->setMinimumHeight(2 * m_hint->fontMetrics().lineSpacing());  // room for it, so that nothing moves
+    // It takes the room that is kept for it, so that nothing moves.
+    m_hint->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Fixed);
+    m_hint->setFixedHeight(2 * m_hint->fontMetrics().lineSpacing());
     m_hint->setAlignment(Qt::AlignLeft | Qt::AlignTop);
     AF_Zaehler = named<AfCounter>("AF_Zaehler", m_with, AF_List1, m_content);
     connect(Text2, &QLineEdit::textChanged, this, &AF_Listenform::showHint);
@@ -83,10 +85,10 @@ void AF_Listenform::createOrder() {
 void AF_Listenform::arrange() {
     layOut(m_choice, m_view.optionColumn());
     layOut(m_content, kdx::add(m_view.contentColumn(), {AF_Zaehler}));
-    layOut(m_change, column({m_entryHeading, Text2, m_hint, Command1, AF_OF_add, space(2 * kGap), Rem_Freq,
-                             space(2 * kGap), AF_Auf, AF_Ab, AF_Sortieren, kRoom}));
+    layOut(m_change, column({m_entryHeading, Text2, Command1, AF_OF_add, space(2 * kGap), Rem_Freq, space(2 * kGap),
+                             AF_Auf, AF_Ab, AF_Sortieren, kRoom}));
     auto* frames = row({m_choice, {m_content, 1}, m_change});
-    layOut(this, column({{frames, 1}, row({kRoom, Uebernahme_Knopf, Ende_Knopf})}), 2 * kGap);
+    layOut(this, column({{frames, 1}, m_hint, row({kRoom, Uebernahme_Knopf, Ende_Knopf})}), 2 * kGap);
 }
 
 void AF_Listenform::Form_Load() {
@@ -229,8 +231,18 @@ QStringList AF_Listenform::checkedEntries() {
         if (entry != Text2->text()) Text2->setText(entry);
         return {entry};
     }
-    refuse(164);
+    refuseEntry();
     return {};
+}
+
+/// What cannot be taken is selected: what is typed next replaces it.
+void AF_Listenform::refuseEntry() {
+    const std::string entry = toBytes(Text2->text());
+    const auto wrong = wrongFrequency(entry);
+    refuse(164, wrong ? caption({1250, "Nicht angenommen: %1"}).arg(toText(*wrong)) : QString());
+    Text2->setFocus();
+    if (!wrong) return Text2->selectAll();
+    Text2->setSelection(static_cast<int>(wrong->data() - entry.data()), static_cast<int>(wrong->size()));
 }
 
 /// Where numbers are checked, makes the text the number that it is; false when it is none.
@@ -241,8 +253,8 @@ bool AF_Listenform::takeNumber(QString& text) const {
     return number.has_value();
 }
 
-void AF_Listenform::refuse(int reason) {
-    m_with.dialogs.message(Dialogs::Icon::Exclamation, caption({161}), caption({reason}));
+void AF_Listenform::refuse(int reason, const QString& details) {
+    m_with.dialogs.message(Dialogs::Icon::Exclamation, caption({161}), caption({reason}), details);
 }
 
 }  // namespace kdx

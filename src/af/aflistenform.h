@@ -56,7 +56,8 @@ private:
     void move(int rows);
     [[nodiscard]] AfList shownList() const;
     void showHint();
-    void refuse(int reason);
+    void refuse(int reason, const QString& details = {});
+    void refuseEntry();
 
     AfListView m_view;                // AFList_Opt, AF_TN, AF_List1
     ClickableLabel* AF_TN = nullptr;  // tuned frequency; a click asks for a new one

@@ -165,6 +165,16 @@ TEST(PastedFrequencies, TakesAWholeListOfAllowedOnes) {
     EXPECT_EQ(pastedFrequencies("90.1 94.3 200.1"), List{});
 }
 
+TEST(PastedFrequencies, TellTheFirstEntryThatCannotBeTaken) {
+    EXPECT_EQ(wrongFrequency("90.1,200.1; x"), "200.1");
+    EXPECT_EQ(wrongFrequency("abc 90.1"), "abc");
+    EXPECT_EQ(wrongFrequency("90.1,94.3"), std::nullopt);
+    EXPECT_EQ(wrongFrequency("200.1"), std::nullopt) << "no list";
+    EXPECT_EQ(wrongFrequency("87,6"), std::nullopt) << "may be a decimal comma";
+    EXPECT_EQ(wrongFrequency(" ,; "), std::nullopt);
+    EXPECT_EQ(wrongFrequency(""), std::nullopt);
+}
+
 TEST(SortFrequencies, GoesByTheNumberAndKeepsEqualOnesInOrder) {
     std::vector<std::string> frequencies{"100.1", "90.10", "90.1", "88"};
     sortFrequencies(frequencies);

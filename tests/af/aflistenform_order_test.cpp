@@ -60,6 +60,58 @@ TEST_F(EditorTest, ACommaThatSeparatesIsToldAsItIsTyped) {
     EXPECT_EQ(text("KommaHinweis"), "");
 }
 
+TEST_F(EditorTest, TheHintOfACommaMovesNothing) {
+    for (const char* language : {"deutsch", "english", "english US"}) {
+        useLanguage(language);
+        open();
+        QApplication::processEvents();
+        const auto places = [this] {
+            QApplication::processEvents();
+            std::vector<std::pair<QWidget*, QRect>> all{{&*editor, editor->rect()}};
+            for (QWidget* control : editor->findChildren<QWidget*>()) {
+                if (control->window() == &*editor && control->isVisible())
+                    all.emplace_back(control, control->geometry());
+            }
+            return all;
+        };
+        type("Text2", "90");
+        const auto before = places();
+        for (const char* entry : {"90,1", "90.1, 94.3, 100.1"}) {
+            type("Text2", entry);
+            const auto* hint = find<QLabel>("KommaHinweis");
+            EXPECT_FALSE(hint->text().isEmpty()) << entry;
+            const auto after = places();
+            ASSERT_EQ(after.size(), before.size());
+            for (std::size_t i = 0; i < after.size(); ++i)
+                EXPECT_EQ(after[i].second, before[i].second)
+                    << language << ' ' << after[i].first->objectName().toStdString();
+            EXPECT_LE(hint->heightForWidth(hint->width()), hint->height()) << language << " is cut off";
+        }
+    }
+}
+
+TEST_F(EditorTest, WhatCannotBeTakenIsNamedAndSelected) {
+    open();
+    auto* entry = find<QLineEdit>("Text2");
+    const auto refused = [&](const char* typed) {
+        type("Text2", typed);
+        entry->deselect();
+        dialogs.expectedMessages = 1;
+        click("Command1");
+        expectRefusal(dialogs.shown.size() - 1, 164);
+        return dialogs.shown.back().preset.toStdString();
+    };
+    EXPECT_EQ(refused("200.1, 90.1"), "Nicht angenommen: 200.1");
+    EXPECT_EQ(entry->selectedText().toStdString(), "200.1");
+    state.corrections.decimalComma = true;  // then a list is checked to its end
+    EXPECT_EQ(refused("100.5, 94.3, 0.5, x"), "Nicht angenommen: 0.5");
+    EXPECT_EQ(entry->selectionStart(), 13) << "not the end of the first";
+    EXPECT_EQ(entry->selectedText().toStdString(), "0.5");
+    EXPECT_EQ(refused("110,5"), "") << "one number";
+    EXPECT_EQ(entry->selectedText().toStdString(), "110,5");
+    EXPECT_EQ(rows(), Lines({"90.1", "94.3"}));
+}
+
 TEST_F(EditorTest, CountsTheFrequencies) {
     open();
     EXPECT_EQ(text("AF_Zaehler"), "2 von 25 (A), 12 (B)");
