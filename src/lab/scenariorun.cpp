@@ -122,7 +122,10 @@ void ScenarioRun::happened(const scenario::Row& row) {
 }
 
 void ScenarioRun::endAnnouncements() {
-    for (const auto& [end, key] : std::exchange(m_announcements, {})) m_session.params.sendCommand(key, end);
+    for (const auto& [end, key] : std::exchange(m_announcements, {})) {
+        m_session.params.sendCommand(key, end);
+        m_silenced.push_back(key);
+    }
 }
 
 void ScenarioRun::close() {
@@ -130,7 +133,10 @@ void ScenarioRun::close() {
     m_clock.setHeld(false);
     m_with.state.eonIdentifier = m_identifier;
     m_asks = false;
-    const scenario::Outcome outcome = m_runner->outcome();
+    scenario::Outcome outcome = m_runner->outcome();
+    // Panic is the last word, also over an announcement that was brought back.
+    const std::vector<std::string> silenced = std::exchange(m_silenced, {});
+    if (m_scenario.restore) outcome.changed.insert(outcome.changed.end(), silenced.begin(), silenced.end());
     m_runner.reset();
     emit over(outcome);
     emit changed();

@@ -5,6 +5,7 @@
 #include <map>
 #include <memory>
 #include <optional>
+#include <vector>
 
 #include "lab/heldclock.h"
 #include "scenario/report.h"
@@ -88,6 +89,7 @@ private:
     std::unique_ptr<scenario::Runner> m_runner;
     std::chrono::steady_clock::time_point m_until;
     std::map<std::string, std::string> m_announcements;  // on the air: the command that ends each, and its key
+    std::vector<std::string> m_silenced;                 // keys of those that panic ended
     std::string m_identifier;                            // of the other network at work before
     bool m_inside = false, m_stopped = false, m_failed = false, m_finishes = false, m_hurries = false;
     bool m_pressed = false, m_asked = false, m_asks = false, m_panics = false;

@@ -40,7 +40,7 @@ QString durationText(std::chrono::nanoseconds duration) {
 
 }  // namespace
 
-ScenarioView::ScenarioView(Session& session, const PageContext& with, QWidget* parent)
+ScenarioView::ScenarioView(Session& session, const PageContext& with, std::filesystem::path shipped, QWidget* parent)
     : QDialog(parent),
       m_session(session),
       m_with(with),
@@ -52,6 +52,7 @@ ScenarioView::ScenarioView(Session& session, const PageContext& with, QWidget* p
           },
           [this] { m_run->stop(); }, [this] { m_run->panic(); }),
       m_steps("Ablauf_Liste", with, this),
+      m_shipped(std::move(shipped)),
       m_sessionOpen(session.instrument.isOpen()) {
     setObjectName(QStringLiteral("ScenarioView"));
     m_book.text(this, {974, "Ablauf"});
@@ -158,10 +159,22 @@ bool ScenarioView::leftNothing() const {
 }
 
 void ScenarioView::Ablauf_Oeffnen_Click() {
-    const QString folder = m_file.isEmpty() ? QString::fromStdString(utf8Of(m_with.data.file("Scenarios")))
-                                            : QFileInfo(m_file).absolutePath();
-    const QString file = m_with.dialogs.fileToOpen(windowTitle(), caption({990, "Szenario (*.yaml *.yml)"}), folder);
-    if (!file.isEmpty()) open(file);
+    const QString file =
+        m_with.dialogs.fileToOpen(windowTitle(), caption({990, "Szenario (*.yaml *.yml)"}), folderToOpen());
+    if (file.isEmpty()) return;
+    m_folder = QFileInfo(file).absolutePath();
+    open(file);
+}
+
+/// Where scenarios are to be found; a folder that is not there would be taken for the name of a file.
+QString ScenarioView::folderToOpen() const {
+    QStringList places{m_folder};
+    for (const auto& place : {m_shipped, m_with.data.file("Scenarios")})
+        places += QString::fromStdString(utf8Of(place));
+    for (const QString& place : places) {
+        if (!place.isEmpty() && QFileInfo(place).isDir()) return place;
+    }
+    return {};
 }
 
 void ScenarioView::open(const QString& file) {
@@ -251,6 +264,7 @@ QString ScenarioView::endText(const scenario::Outcome& outcome) const {
     std::vector<std::string> other = outcome.changed;
     other.insert(other.end(), outcome.untold.begin(), outcome.untold.end());
     if (other.empty() && !outcome.restored) other.emplace_back("?");
+    if (!outcome.complete && leftNothing()) end += caption({1255, "wie zuvor"});
     if (!other.empty()) end += caption({988, "nicht wie zuvor: %1"}).arg(QString::fromStdString(joined(other, ", ")));
     return end.join(QStringLiteral("; "));
 }

@@ -2,6 +2,7 @@
 
 #include <QDialog>
 
+#include <filesystem>
 #include <optional>
 
 #include "lab/steptable.h"
@@ -24,7 +25,8 @@ struct Session;
 class ScenarioView : public QDialog {
     Q_OBJECT
 public:
-    ScenarioView(Session& session, const PageContext& with, QWidget* parent);
+    /// @param shipped folder of the scenarios that come with the program.
+    ScenarioView(Session& session, const PageContext& with, std::filesystem::path shipped, QWidget* parent);
     ~ScenarioView() override;
 
     void label();
@@ -58,6 +60,7 @@ private:
     void open(const QString& file);
     void showState();
     void showEnd(const scenario::Outcome& outcome);
+    [[nodiscard]] QString folderToOpen() const;
     [[nodiscard]] QString endText(const scenario::Outcome& outcome) const;
     [[nodiscard]] QStringList problemsOf(const scenario::Scenario& scenario) const;
     [[nodiscard]] QString caption(const Caption& caption) const { return captionText(m_with.captions, caption); }
@@ -76,6 +79,8 @@ private:
     QPushButton* Ablauf_Stop = nullptr;
     QPushButton* Ablauf_Weiter = nullptr;  // what Return is at the command line
     QPushButton* Ablauf_Schliessen = nullptr;
+    std::filesystem::path m_shipped;
+    QString m_folder;  // of the file that was chosen last
     QString m_file;
     scenario::Scenario m_scenario;
     std::string m_step;                          // that runs

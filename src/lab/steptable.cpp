@@ -37,6 +37,8 @@ bool isGood(const std::string& status) {
 StepTable::StepTable(const char* name, const PageContext& with, QWidget* parent)
     : m_with(with), m_table(newViewTable(name, ColumnCount, parent)) {
     m_table->setSelectionMode(QAbstractItemView::NoSelection);
+    m_table->setWordWrap(
+        false);  // one line a step: a long value is cut within, not left out as a word that does not fit
 }
 
 void StepTable::label() {

@@ -6,6 +6,7 @@
 #include <QIcon>
 #include <QMouseEvent>
 #include <QPushButton>
+#include <QScopeGuard>
 #include <QShortcut>
 #include <QTabBar>
 #include <QTabWidget>
@@ -68,12 +69,15 @@ HMenue::HMenue(const Surroundings& surroundings)
                 m_marks} {
     setObjectName(QStringLiteral("HMenue"));
     setWindowIcon(QPixmap(QStringLiteral(":/kdx-rds-64.png")));  // read once for all that show it
-    m_views = std::make_unique<Views>(m_context, m_s.session, this, [this] {
-        m_s.session.load();
-        const CommandSequence silent(m_s.session.instrument);  // what is shown anew is no setting that goes out
-        m_s.session.instrument.stopSequence();
-        loadPages();
-    });
+    m_views = std::make_unique<Views>(
+        m_context, m_s.session, this,
+        [this] {
+            m_s.session.load();
+            const CommandSequence silent(m_s.session.instrument);  // what is shown anew is no setting that goes out
+            m_s.session.instrument.stopSequence();
+            loadPages();
+        },
+        m_s.shipped.empty() ? m_s.shipped : m_s.shipped / "Daten" / "Scenarios");
     m_connection = new ConnectionBar(m_context, this);
     connect(m_connection, &ConnectionBar::openRequested, this, &HMenue::INIT_Taste_Click);
     // Every setting was stored when it changed: nothing is left to do at the end.
@@ -245,8 +249,11 @@ void HMenue::INIT_Taste_Click() {
     Session& session = m_s.session;
     m_s.state.InterfaceKind = session.profile.read(setting::kInterface);
     const CommandSequence run(session.instrument);  // the opening can be stopped, too
+    m_lowerEdge->showWait(captionText(m_s.captions, {1256, "Wartet auf %1"}).arg(m_connection->openAddress()));
+    const auto over = qScopeGuard([this] { m_lowerEdge->endProgress(); });
     const VisaStatus status = session.open(m_s.state.InterfaceKind, m_connection->address());
     if (status != 0) {
+        m_lowerEdge->endProgress();
         m_waysOut->tellOpening(status);
         return;
     }

@@ -50,9 +50,15 @@ void ProgressLine::setNotice(const QString& notice) {
     if (!m_counting) m_text->setText(notice);
 }
 
+void ProgressLine::showWait(const QString& text) {
+    m_counting = true;
+    m_text->setText(text);
+    m_text->repaint();
+}
+
 void ProgressLine::showProgress(const QString& pattern, std::size_t number, std::size_t total) {
-    if (!m_counting) {
-        m_counting = true;
+    m_counting = true;
+    if (m_bar->isHidden()) {
         m_bar->show();
         layout()->activate();  // no event will do it before the end
     }

@@ -21,6 +21,8 @@ public:
 
     /// What the line says while nothing is being sent.
     void setNotice(const QString& notice);
+    /// Says what is waited for before the first command.
+    void showWait(const QString& text);
     /// Says that command `number` of `total` goes out. @param pattern the text, with %1 and %2 for the two.
     void showProgress(const QString& pattern, std::size_t number, std::size_t total);
     /// Back to the notice.

@@ -26,11 +26,13 @@ void bringToFront(QWidget& view) {
 
 }  // namespace
 
-Views::Views(const PageContext& with, Session& session, QWidget* window, std::function<void()> reload)
+Views::Views(const PageContext& with, Session& session, QWidget* window, std::function<void()> reload,
+             std::filesystem::path scenarios)
     : m_with(with),
       m_session(session),
       m_window(window),
       m_reload(std::move(reload)),
+      m_scenarios(std::move(scenarios)),
       m_trafficLog(new TrafficLog(with.instrument, with.clock, window)),
       m_shadow(with.clock) {
     m_with.params.onComposed([this](const std::string& command) {
@@ -72,7 +74,7 @@ void Views::openCompare() {
 
 void Views::openScenario() {
     if (m_scenarioView == nullptr) {
-        m_scenarioView = std::make_unique<ScenarioView>(m_session, m_with, m_window);
+        m_scenarioView = std::make_unique<ScenarioView>(m_session, m_with, m_scenarios, m_window);
         QObject::connect(m_scenarioView.get(), &ScenarioView::runningChanged, m_window, [this](bool running) {
             if (running) m_with.status.doubt(captionText(m_with.captions, kScenarioSends));
             if (!running && m_scenarioView->leftNothing()) m_with.status.trust();

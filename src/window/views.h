@@ -1,5 +1,6 @@
 #pragma once
 
+#include <filesystem>
 #include <functional>
 #include <memory>
 
@@ -22,7 +23,9 @@ class TrafficLog;
 class Views {
 public:
     /// @param reload shows the data set anew when its files were changed.
-    Views(const PageContext& with, Session& session, QWidget* window, std::function<void()> reload);
+    /// @param scenarios folder of those that come with the program.
+    Views(const PageContext& with, Session& session, QWidget* window, std::function<void()> reload,
+          std::filesystem::path scenarios);
     ~Views();
     Views(const Views&) = delete;
     Views& operator=(const Views&) = delete;
@@ -51,6 +54,7 @@ private:
     Session& m_session;
     QWidget* m_window;
     std::function<void()> m_reload;
+    std::filesystem::path m_scenarios;
     TrafficLog* m_trafficLog;
     air::Shadow m_shadow;
     LogView* m_logView = nullptr;

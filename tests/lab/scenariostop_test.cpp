@@ -32,7 +32,7 @@ TEST_F(ScenarioStopTest, StopBringsBackWhatStoodBefore) {
     pass(200ms);
     EXPECT_FALSE(view->isRunning());
     EXPECT_EQ(taken(), Lines{direct("PS=MESSTURM")});
-    EXPECT_EQ(text("Ablauf_Stand"), "abgebrochen");
+    EXPECT_EQ(text("Ablauf_Stand"), "abgebrochen; wie zuvor");
     EXPECT_EQ(value("PS"), "MESSTURM");
     EXPECT_EQ(result(3), "\u2713");  // the row of what comes back
     EXPECT_FALSE(enabled("Ablauf_Stop"));
@@ -51,6 +51,7 @@ TEST_F(ScenarioStopTest, StopEndsARunThatIsHeld) {
     EXPECT_FALSE(view->isRunning());
     EXPECT_FALSE(checked("Ablauf_Pause"));
     EXPECT_EQ(taken(), Lines{});
+    EXPECT_EQ(text("Ablauf_Stand"), "abgebrochen") << "nothing was to be brought back";
 }
 
 TEST_F(ScenarioStopTest, LocalBringsBackWhatStoodBeforeAndThenCloses) {
@@ -185,7 +186,7 @@ TEST_F(ScenarioStopTest, PanicEndsTheRunAndBringsBackWhatStoodBefore) {
     pass(200ms);
     EXPECT_FALSE(view->isRunning());
     EXPECT_EQ(taken(), Lines{direct("PS=MESSTURM")});
-    EXPECT_EQ(text("Ablauf_Stand"), "abgebrochen");
+    EXPECT_EQ(text("Ablauf_Stand"), "abgebrochen; wie zuvor");
     EXPECT_FALSE(find("Panik_Taste")->isVisible());
     pass(2h);
     EXPECT_EQ(taken(), Lines{});
@@ -211,6 +212,7 @@ TEST_F(ScenarioStopTest, PanicEndsAnAnnouncementThatTheScenarioMadeOrBringsBack)
     click("Panik_Taste");
     pass(200ms);
     EXPECT_EQ(value("TA"), "0") << "on before, but panic is the last word";
+    EXPECT_EQ(text("Ablauf_Stand"), "abgebrochen; nicht wie zuvor: TA");
 }
 
 TEST_F(ScenarioStopTest, ClosingTheWindowAsksAndNoLetsTheRunGoOn) {

@@ -29,6 +29,42 @@ TEST_F(ScenarioViewTest, EveryShippedScenarioCanBeOpened) {
     }
 }
 
+TEST_F(ScenarioViewTest, BeginsToLookWhereScenariosAre) {
+    const auto folderShown = [this](const std::filesystem::path& chosen) {
+        dialogs.files.push_back(QString::fromStdString(chosen.string()));
+        click("Ablauf_Oeffnen");
+        return dialogs.shown.back().preset.toStdString();
+    };
+    const auto own = folder.data() / "Scenarios";
+    openView();
+    EXPECT_EQ(folderShown({}), own.string()) << "none are shipped";
+    std::filesystem::remove_all(own);
+    EXPECT_EQ(folderShown({}), "") << "no folder that is not there";
+    shipped = folder.path() / "shipped";
+    const auto theirs = shipped / "Daten" / "Scenarios";
+    std::filesystem::create_directories(theirs);
+    openView();
+    EXPECT_EQ(folderShown({}), theirs.string());
+    std::filesystem::create_directories(folder.path() / "mine");
+    const auto mine = folder.path() / "mine" / "a.yaml";
+    std::ofstream(mine) << "steps: [note: a]";
+    EXPECT_EQ(folderShown(mine), theirs.string());
+    EXPECT_EQ(folderShown({}), (folder.path() / "mine").string());
+}
+
+TEST_F(ScenarioViewTest, OfALongValueThereIsAsMuchToBeSeenAsFits) {
+    openView();
+    const auto pictureOf = [this](char letter) {
+        const std::string value(60, letter);
+        load("steps: [send: {RT: \"" + value + "\"}]");
+        EXPECT_TRUE(table->item(0, 1)->toolTip().endsWith(QString::fromStdString(value)));
+        QApplication::processEvents();
+        return table->viewport()->grab(table->visualItemRect(table->item(0, 1))).toImage();
+    };
+    view->resize(500, 300);
+    EXPECT_NE(pictureOf('0'), pictureOf('W'));
+}
+
 TEST_F(ScenarioViewTest, AFileWithMistakesIsToldWithTheirPlacesAndTheOldOneStays) {
     openView();
     load("steps: [note: a]");

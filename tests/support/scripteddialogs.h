@@ -76,8 +76,8 @@ public:
         return file;
     }
 
-    QString fileToOpen(const QString& title, const QString& kind, const QString& /*folder*/ = {}) override {
-        return fileToSave(title, {}, kind);
+    QString fileToOpen(const QString& title, const QString& kind, const QString& folder = {}) override {
+        return fileToSave(title, folder, kind);
     }
     [[nodiscard]] bool canAsk() const override { return !ending; }
 

@@ -34,9 +34,16 @@ TEST_F(WaitingTest, EscapeIsStop) {
 
 TEST_F(WaitingTest, StopEndsAnOpeningThatFindsNobody) {
     startShipped();
-    hangAnd([this] { stop(); });
+    std::string waitsFor;
+    hangAnd([this, &waitsFor] {
+        waitsFor = text("QuietLine");
+        stop();
+    });
+    const std::string quiet = text("QuietLine");
     openSession();
     EXPECT_LT(sinceStop(), kAtOnce);
+    EXPECT_EQ(waitsFor, "Wartet auf " + text("Adr1_Label"));
+    EXPECT_EQ(text("QuietLine"), quiet);
     EXPECT_TRUE(dialogs.shown.empty()) << "the user knows";
     EXPECT_FALSE(find("SSTab1")->isEnabled());
     EXPECT_TRUE(find("INIT_Taste")->isEnabled());
