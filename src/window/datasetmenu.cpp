@@ -11,6 +11,7 @@ namespace kdx {
 DataSetMenu::DataSetMenu(DataSets& sets, QWidget* window) : QObject(window), m_sets(sets) {
     Mnu_Datensatz = named<QMenu>("Mnu_Datensatz", window);
     Mnu_Datensatz_Sichern = named<QMenu>("Mnu_Datensatz_Sichern", window);
+    m_savingHeading = Mnu_Datensatz_Sichern->addSection(QString());
     for (std::size_t i = 0; i < kSets; ++i) {
         const int set = static_cast<int>(i) + 1;
         m_choices[i] = element<QAction>("Mnu_Datensatz", i + 1, Mnu_Datensatz);
@@ -53,6 +54,7 @@ void DataSetMenu::label(const Captions& captions) {
     Mnu_Datensatz->setTitle(text({891, "&Datensatz"}));
     Mnu_Datensatz_Oeffnen->setText(text({892, "&Öffnen..."}));
     Mnu_Datensatz_Sichern->setTitle(text({893, "&Sichern als Satz"}));
+    m_savingHeading->setText(Mnu_Datensatz_Sichern->title().remove(QLatin1Char('&')));
     Mnu_Datensatz_Sichern_unter->setText(text({894, "Sichern u&nter..."}));
     Mnu_Datensatz_Umbenennen->setText(text({895, "&Umbenennen..."}));
     Mnu_Datensatz_Auslieferung->setText(text({896, "&Auslieferungszustand..."}));

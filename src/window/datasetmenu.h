@@ -33,6 +33,7 @@ private:
     std::array<QAction*, kSets> m_choices{};  // Mnu_Datensatz_1 to _5
     QAction* Mnu_Datensatz_Oeffnen = nullptr;
     QMenu* Mnu_Datensatz_Sichern = nullptr;
+    QAction* m_savingHeading = nullptr;       // says what it is where it pops up by its key
     std::array<QAction*, kSets> m_targets{};  // Mnu_Datensatz_Sichern_1 to _5
     QAction* Mnu_Datensatz_Sichern_unter = nullptr;
     QAction* Mnu_Datensatz_Umbenennen = nullptr;

@@ -1,6 +1,7 @@
 #include "window/desktop.h"
 
 #include <QAction>
+#include <QCoreApplication>
 #include <QMainWindow>
 #include <QMenu>
 #include <QMenuBar>
@@ -46,7 +47,9 @@ Desktop::Desktop(const Surroundings& with, const PageContext& context, Connectio
       m_sets(context, with.session, with.shipped, nullptr),
       m_indicators(context, m_sets, bar, with.simulated, nullptr),
       m_setMenu(m_sets, window),
+      m_keyNames(with.captions),
       m_manual(with.shipped / "manual", context, pages, window) {
+    QCoreApplication::installTranslator(&m_keyNames);
     connect(&m_sets, &DataSets::loaded, this, [this] {
         m_indicators.showDataSet();
         emit dataSetLoaded();
@@ -164,9 +167,10 @@ void Desktop::createKeys() {
         const auto* key = new QShortcut(QKeySequence(Qt::CTRL | static_cast<Qt::Key>(Qt::Key_1 + page)), m_window);
         connect(key, &QShortcut::activated, &m_pages, [this, page] { m_pages.setCurrentIndex(page); });
     }
-    const auto* save = new QShortcut(QKeySequence(Qt::CTRL | Qt::Key_S), m_window);
-    connect(save, &QShortcut::activated, this,
-            [this] { popUp(m_setMenu.savingMenu(), m_indicators.Datensatz_Anzeige); });
+    // The submenu's own key: so it is shown beside its title.
+    QAction* save = m_setMenu.savingMenu()->menuAction();
+    save->setShortcut(Qt::CTRL | Qt::Key_S);
+    connect(save, &QAction::triggered, this, [this] { popUp(m_setMenu.savingMenu(), m_indicators.Datensatz_Anzeige); });
 }
 
 void Desktop::showTips() {
@@ -200,10 +204,10 @@ void Desktop::label() {
     Mnu_Datei->setTitle(text({890, "Da&tei"}));
     Mnu_Datei_Beenden->setText(text({906, "&Beenden"}));
     Mnu_Ansicht->setTitle(text({907, "Ansi&cht"}));
-    Mnu_Info_Log->setText(text({680, "Log"}));
-    Mnu_Ansicht_OnAir->setText(text({720, "Auf Sendung"}));
-    Mnu_Ansicht_Vergleich->setText(text({957, "Vergleich"}));
-    Mnu_Ansicht_Ablauf->setText(text({974, "Ablauf"}));
+    Mnu_Info_Log->setText(text({1251, "&Log"}));
+    Mnu_Ansicht_OnAir->setText(text({1252, "A&uf Sendung"}));
+    Mnu_Ansicht_Vergleich->setText(text({1253, "&Vergleich"}));
+    Mnu_Ansicht_Ablauf->setText(text({1254, "A&blauf"}));
     Mnu_Ansicht_Lesen->setText(text({910, "Alles &zurücklesen"}));
     Mnu_Einstellungen->setText(text({908, "Einstellun&gen..."}));
     Mnu_Hilfe->setTitle(text({909, "Hil&fe"}));

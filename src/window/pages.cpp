@@ -64,15 +64,15 @@ Page* makeRf(const PageContext& with, Station& station, HMenue& window) {
     return new RfPage(with, station.carrier, &window);
 }
 
-constexpr std::array<MakePage, 9> kPages = {makeStereo,  makeRds,   makeAf,  makeGroups, makeEon,
-                                            makeQueries, makeStore, makeTmc, makeRf};
+constexpr std::array<MakePage, 9> kMakers = {makeStereo,  makeRds,   makeAf,  makeGroups, makeEon,
+                                             makeQueries, makeStore, makeTmc, makeRf};
 
 }  // namespace
 
 std::vector<Page*> makePages(const PageContext& with, Station& station, HMenue& window) {
     std::vector<Page*> pages;
-    pages.reserve(kPages.size());
-    for (const MakePage make : kPages) pages.push_back(make(with, station, window));
+    pages.reserve(kMakers.size());
+    for (const MakePage make : kMakers) pages.push_back(make(with, station, window));
     return pages;
 }
 

@@ -64,7 +64,39 @@ TEST_F(DesktopTest, CtrlSShowsTheSetsToSaveAs) {
     start();
     key(QKeySequence(Qt::CTRL | Qt::Key_S));
     EXPECT_TRUE(menu("Mnu_Datensatz_Sichern")->isVisible());
+    EXPECT_EQ(menu("Mnu_Datensatz_Sichern")->actions().at(0)->text().toStdString(), "Sichern als Satz");
     menu("Mnu_Datensatz_Sichern")->hide();
+}
+
+TEST_F(DesktopTest, TheKeysOfTheMenusAreNamedAsOnTheKeyboard) {
+    for (const auto& [language, open, save] : {std::tuple("deutsch", "Strg+O", "Strg+S"),
+                                               {"english", "Ctrl+O", "Ctrl+S"},
+                                               {"english US", "Ctrl+O", "Ctrl+S"}}) {
+        setGeneral("Sprache", "Sprache", language);
+        start();
+        const auto shown = [](const QAction* entry) {
+            return entry->shortcut().toString(QKeySequence::NativeText).toStdString();
+        };
+        EXPECT_EQ(shown(action("Mnu_Datensatz_Oeffnen")), open);
+        EXPECT_EQ(shown(menu("Mnu_Datensatz_Sichern")->menuAction()), save);
+    }
+    EXPECT_EQ(QKeySequence(Qt::SHIFT | Qt::Key_F1).toString(QKeySequence::NativeText), QStringLiteral("Shift+F1"));
+    action("Mnu_Info_Sprache_D")->trigger();
+    EXPECT_EQ(QKeySequence(Qt::SHIFT | Qt::Key_F1).toString(QKeySequence::NativeText), QStringLiteral("Umschalt+F1"));
+}
+
+TEST_F(DesktopTest, EveryEntryOfTheViewMenuHasAMnemonicOfItsOwn) {
+    for (const char* language : {"deutsch", "english", "english US"}) {
+        setGeneral("Sprache", "Sprache", language);
+        start();
+        std::set<QString> taken;
+        for (const QAction* entry : menu("Mnu_Ansicht")->actions()) {
+            if (entry->isSeparator()) continue;
+            const QString key = QKeySequence::mnemonic(entry->text()).toString();
+            EXPECT_FALSE(key.isEmpty()) << language << ' ' << entry->text().toStdString();
+            EXPECT_TRUE(taken.insert(key).second) << language << ' ' << entry->text().toStdString();
+        }
+    }
 }
 
 TEST_F(DesktopTest, AClickOnTheNumberOfTheSetShowsAllSets) {

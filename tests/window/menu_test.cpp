@@ -81,7 +81,7 @@ TEST_F(MenuTest, TheTreeHasItsEntries) {
                                                            {"Mnu_Info_RDS_RBDS", "RDS /RBDS"},
                                                            {"Mnu_Info_RS232", "RS232_Set"},
                                                            {"Mnu_TMC_Edit", "TMC Edit"},
-                                                           {"Mnu_Info_Log", "Log"}};
+                                                           {"Mnu_Info_Log", "&Log"}};
     for (const auto& [name, caption] : entries) EXPECT_EQ(action(name)->text().toStdString(), caption) << name;
     const auto entriesOf = [this](const char* menu) {
         Lines names;
