@@ -102,6 +102,7 @@ void saveTheRest(kdx::DataFolder& data) {
 }  // namespace
 
 int main(int argc, char** argv) {
+    kdx::useTerminal();
     const kdx::Options options = kdx::parseOptions({argv + 1, argv + argc});
     if (!options.error.empty()) {
         std::fprintf(stderr, "kdx-rds: %s\nTry kdx-rds --help.\n", kdx::shownText(options.error).c_str());

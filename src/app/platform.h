@@ -46,6 +46,10 @@ void surviveBrokenPipes();
 /// and get what is printed. Writing to such an output fails still.
 void openStandardStreams();
 
+/// Where a program with windows begins without the terminal that it was started from, it gets it back to print to, and
+/// terminals take texts as UTF-8; where all that is so anyway, nothing happens.
+void useTerminal();
+
 /// Whether something that was printed is lost, and not since its reader has gone away.
 [[nodiscard]] bool outputIsLost();
 

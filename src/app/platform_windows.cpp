@@ -60,6 +60,21 @@ int endRequests() {
 
 void openStandardStreams() {}  // there a closed one is none: nothing takes its place
 
+void useTerminal() {
+    const auto isMissing = [](DWORD stream) {
+        const HANDLE handle = GetStdHandle(stream);
+        return handle == nullptr || handle == INVALID_HANDLE_VALUE;
+    };
+    // What the caller sends elsewhere stays there.
+    const bool output = isMissing(STD_OUTPUT_HANDLE), error = isMissing(STD_ERROR_HANDLE);
+    if ((output || error) && AttachConsole(ATTACH_PARENT_PROCESS)) {
+        if (output && std::freopen("CONOUT$", "w", stdout) == nullptr) std::clearerr(stdout);
+        if (error && std::freopen("CONOUT$", "w", stderr) == nullptr) std::clearerr(stderr);
+    }
+    SetConsoleOutputCP(CP_UTF8);
+    SetConsoleCP(CP_UTF8);
+}
+
 bool outputIsLost() {
     return std::fflush(stdout) != 0 || std::ferror(stdout) != 0;
 }

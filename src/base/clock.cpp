@@ -35,8 +35,12 @@ std::chrono::steady_clock::time_point SystemClock::steadyNow() const {
 }
 
 void SystemClock::sleep(std::chrono::nanoseconds duration) {
+    using std::chrono::steady_clock;
     // To an absolute point of the steady clock: an interrupted or late sleep does not add up.
-    std::this_thread::sleep_until(std::chrono::steady_clock::now() + duration);
+    const auto end = steady_clock::now() + duration;
+    std::this_thread::sleep_until(end);
+    // Some systems sleep whole milliseconds only and come back early.
+    while (steady_clock::now() < end) std::this_thread::sleep_for(std::chrono::milliseconds(1));
 }
 
 std::string timeText(const Clock& clock) {

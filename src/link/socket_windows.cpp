@@ -98,7 +98,7 @@ bool Socket::waitFor(Ready ready, std::chrono::milliseconds time) const {
     FD_SET(number(m_handle), &failed);
     const auto whole = std::chrono::duration_cast<std::chrono::seconds>(time);
     const auto rest = std::chrono::duration_cast<std::chrono::microseconds>(time - whole);
-    const timeval most{static_cast<long>(whole.count()), static_cast<long>(rest.count())};
+    timeval most{static_cast<long>(whole.count()), static_cast<long>(rest.count())};
     return select(0, ready == Ready::ToRead ? &wanted : nullptr, ready == Ready::ToWrite ? &wanted : nullptr, &failed,
                   &most) > 0;
 }

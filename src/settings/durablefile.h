@@ -7,8 +7,7 @@
 
 namespace kdx {
 
-/// What reading and replacing files needs of the operating system: durablefile_posix.cpp and durablefile_windows.cpp,
-/// and durablefile_portable.cpp elsewhere.
+/// What reading and replacing files needs of the operating system: durablefile_posix.cpp and durablefile_windows.cpp.
 
 /// Tells whether a file is still the one it was: as far as the system knows, another file in its place or a change of
 /// its content changes one of these. Times are nanoseconds.

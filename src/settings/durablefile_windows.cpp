@@ -49,9 +49,10 @@ std::uint64_t joined(DWORD high, DWORD low) {
     return std::uint64_t{high} << 32U | low;
 }
 
-std::int64_t nanoseconds(const FILETIME& time) {
-    constexpr std::int64_t kStep = 100;
-    return static_cast<std::int64_t>(joined(time.dwHighDateTime, time.dwLowDateTime)) * kStep;
+/// Since 1970: the system counts steps of 100 nanoseconds since 1601, which would be too many nanoseconds.
+std::int64_t nanoseconds(std::int64_t steps) {
+    constexpr std::int64_t kBefore1970 = 116'444'736'000'000'000;
+    return (steps - kBefore1970) * 100;
 }
 
 }  // namespace
@@ -59,21 +60,26 @@ std::int64_t nanoseconds(const FILETIME& time) {
 std::optional<FileIdentity> identityOf(const std::filesystem::path& file) {
     const File opened(file, FILE_READ_ATTRIBUTES, OPEN_EXISTING, FILE_FLAG_BACKUP_SEMANTICS);  // folders too
     BY_HANDLE_FILE_INFORMATION facts;
-    if (!opened.isOpen() || GetFileInformationByHandle(opened.handle(), &facts) == 0) return std::nullopt;
-    FileIdentity identity;
-    identity.device = facts.dwVolumeSerialNumber;
-    identity.number = joined(facts.nFileIndexHigh, facts.nFileIndexLow);
-    identity.size = joined(facts.nFileSizeHigh, facts.nFileSizeLow);
-    identity.modified = nanoseconds(facts.ftLastWriteTime);
-    identity.changed = nanoseconds(facts.ftCreationTime);
-    return identity;
+    FILE_BASIC_INFO times;
+    if (!opened.isOpen() || GetFileInformationByHandle(opened.handle(), &facts) == 0 ||
+        GetFileInformationByHandleEx(opened.handle(), FileBasicInfo, &times, sizeof times) == 0) {
+        return std::nullopt;
+    }
+    return FileIdentity{facts.dwVolumeSerialNumber, joined(facts.nFileIndexHigh, facts.nFileIndexLow),
+                        joined(facts.nFileSizeHigh, facts.nFileSizeLow), nanoseconds(times.LastWriteTime.QuadPart),
+                        nanoseconds(times.ChangeTime.QuadPart)};
 }
 
 bool isSettled(const FileIdentity& identity) {
-    constexpr std::int64_t kCoarseSteps = 2'000'000'000;
+    constexpr std::int64_t kSecond = 1'000'000'000;
+    constexpr std::int64_t kFineSteps = kSecond / 10;
+    constexpr std::int64_t kCoarseSteps = 2 * kSecond;
+    // A change at a whole second, to the nanosecond, means a disk that keeps no finer times.
+    const bool coarse = identity.modified % kSecond == 0;
     FILETIME now;
     GetSystemTimeAsFileTime(&now);
-    return nanoseconds(now) - std::max(identity.modified, identity.changed) > kCoarseSteps;
+    const auto steps = static_cast<std::int64_t>(joined(now.dwHighDateTime, now.dwLowDateTime));
+    return nanoseconds(steps) - std::max(identity.modified, identity.changed) > (coarse ? kCoarseSteps : kFineSteps);
 }
 
 bool userMayWrite(const std::filesystem::path& file) {

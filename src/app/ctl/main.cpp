@@ -125,6 +125,7 @@ int called(int argc, const char* const* argv) {
 
 int main(int argc, char** argv) {
     kdx::openStandardStreams();
+    kdx::useTerminal();
     // Who does not want to read on stops nothing that is half sent.
     kdx::surviveBrokenPipes();
     try {

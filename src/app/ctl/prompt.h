@@ -9,7 +9,8 @@
 
 namespace kdx::ctl {
 
-/// Lines typed at a terminal, with a prompt, their history and completion.
+/// Lines typed at a terminal, with a prompt, their history and completion: prompt_posix.cpp. On Windows the console has
+/// a history of its own, and there is no completion: prompt_windows.cpp.
 class PromptedLines final : public LineSource {
 public:
     /// Gives what the last word of a line that was begun may become.
