@@ -210,6 +210,7 @@ TEST_F(InstrumentTest, AnObserverHearsOfEveryLineEvenWithLoggingOff) {
 }
 
 TEST_F(InstrumentTest, TheLogIsFoundInAnyLetterCaseAndEmptied) {
+    if (!folder.tellsLetterCaseApart()) GTEST_SKIP() << "names of files have no letter case here";
     folder.write("RDS_Log.txt", "old\r\n");
     instrument.WriteLog("PTY", "1", "");
     EXPECT_EQ(folder.read("RDS_Log.txt"), "old\r\n            PTY= 1\r\n");

@@ -85,6 +85,8 @@ protected:
 
 TEST_P(ProfileCases, AreReadAndWrittenAsRecorded) {
     const json& content = GetParam().content;
+    if (content.contains("extra_file") && !m_folder.tellsLetterCaseApart())
+        GTEST_SKIP() << "names of files have no letter case here";
     m_fileName = content.value("file_name", m_fileName);
     if (content.contains("make_folder")) {
         std::filesystem::create_directory(m_folder.data() / content.at("make_folder").get<std::string>());

@@ -165,5 +165,14 @@ TEST_F(ReplaceFilePosixTest, AFullDiskLeavesTheOldFileAndNothingElse) {
     EXPECT_EQ(entries(), 1);
 }
 
+TEST_F(ReplaceFilePosixTest, WritesBesideTheFileSoThatAnOpenReaderKeepsTheOldContent) {
+    m_folder.write("a.ini", "old");
+    std::ifstream reader(path("a.ini"), std::ios::binary);
+    EXPECT_TRUE(replaceFile(path("a.ini"), "new"));
+    std::string content;
+    reader >> content;
+    EXPECT_EQ(content, "old");
+}
+
 }  // namespace
 }  // namespace kdx

@@ -31,15 +31,6 @@ TEST_F(ReplaceFileTest, ReplacesTheWholeContent) {
     EXPECT_EQ(entries(), 1);
 }
 
-TEST_F(ReplaceFileTest, WritesBesideTheFileSoThatAnOpenReaderKeepsTheOldContent) {
-    m_folder.write("a.ini", "old");
-    std::ifstream reader(path("a.ini"), std::ios::binary);
-    EXPECT_TRUE(replaceFile(path("a.ini"), "new"));
-    std::string content;
-    reader >> content;
-    EXPECT_EQ(content, "old");
-}
-
 TEST_F(ReplaceFileTest, WritesMegabytes) {
     const std::string bytes(3 << 20, 'x');
     EXPECT_TRUE(replaceFile(path("a.ini"), bytes));

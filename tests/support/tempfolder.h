@@ -26,6 +26,11 @@ public:
     ~TempFolder() {
         std::error_code ignored;
         std::filesystem::permissions(data(), std::filesystem::perms::owner_all, ignored);
+        // Where a file that is marked read-only cannot be removed.
+        for (const auto& entry : std::filesystem::directory_iterator(data(), ignored)) {
+            if (entry.is_regular_file(ignored) && !entry.is_symlink(ignored))
+                std::filesystem::permissions(entry.path(), std::filesystem::perms::owner_all, ignored);
+        }
         std::filesystem::remove_all(m_path, ignored);
     }
     TempFolder(const TempFolder&) = delete;
@@ -39,6 +44,13 @@ public:
     [[nodiscard]] std::string read(const std::string& name) const {
         std::ifstream file(data() / name, std::ios::binary);
         return {std::istreambuf_iterator<char>(file), {}};
+    }
+    /// Whether files can be there whose names differ in letter case only.
+    [[nodiscard]] bool tellsLetterCaseApart() const {
+        write("kdx-case", "");
+        const bool apart = !std::filesystem::exists(data() / "KDX-CASE");
+        std::filesystem::remove(data() / "kdx-case");
+        return apart;
     }
     /// Copies the shipped data folder.
     void copyShipped() const {
