@@ -1,12 +1,10 @@
 #include <gtest/gtest.h>
 
-#include <cstdlib>
-
 #include "ui/application.h"
 
 // Test programs with windows: the program's own application, so that fonts and style are the ones users see.
 int main(int argc, char** argv) {
-    setenv("QT_QPA_PLATFORM", "offscreen", 0);
+    if (!qEnvironmentVariableIsSet("QT_QPA_PLATFORM")) qputenv("QT_QPA_PLATFORM", "offscreen");
     testing::InitGoogleTest(&argc, argv);
     const kdx::Application application(argc, argv);
     return RUN_ALL_TESTS();

@@ -47,9 +47,9 @@ public:
     }
     /// Whether files can be there whose names differ in letter case only.
     [[nodiscard]] bool tellsLetterCaseApart() const {
-        write("kdx-case", "");
-        const bool apart = !std::filesystem::exists(data() / "KDX-CASE");
-        std::filesystem::remove(data() / "kdx-case");
+        std::ofstream(m_path / "kdx-case") << "";
+        const bool apart = !std::filesystem::exists(m_path / "KDX-CASE");
+        std::filesystem::remove(m_path / "kdx-case");
         return apart;
     }
     /// Copies the shipped data folder.

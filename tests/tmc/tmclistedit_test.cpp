@@ -1,51 +1,13 @@
 #include "tmc/tmclistedit.h"
 
 #include "support/everyfont.h"
-#include "support/pagetest.h"
-#include "support/unprivileged.h"
+#include "tmc/tmclistedittest.h"
 #include "ui/application.h"
 
 #include <QListView>
-#include <QMouseEvent>
 
 namespace kdx::test {
 namespace {
-
-class TmcListeditTest : public PageTest {
-protected:
-    TmcListeditTest() {
-        folder.write("Event.txt", "Stau;00101\r\nUnfall;00201\r\n");
-        folder.write("Location.txt", "Musterstadt;12345\r\n");
-        open();
-    }
-    void open() {
-        editor = std::make_unique<TMC_Listedit>(context, nullptr);
-        editor->show();
-    }
-    QWidget& root() override { return *editor; }
-
-    Lines entries(const char* name) {
-        Lines lines;
-        const QAbstractItemModel& shown = *find<QListView>(name)->model();
-        for (int row = 0; row < shown.rowCount(); ++row)
-            lines.push_back(shown.index(row, 0).data().toString().toStdString());
-        return lines;
-    }
-    /// Clicks an input label and answers the box that it opens.
-    void enter(const char* name, const char* answer) {
-        dialogs.inputs.push_back(QString::fromUtf8(answer));
-        auto* label = find(name);
-        const QPointF at(2, 2);
-        QMouseEvent release(QEvent::MouseButtonRelease, at, label->mapToGlobal(at), Qt::LeftButton, Qt::NoButton,
-                            Qt::NoModifier);
-        QApplication::sendEvent(label, &release);
-    }
-    static std::string entry(const std::string& text, const std::string& code) {
-        return text + std::string(42 - text.size(), ' ') + code;
-    }
-
-    std::unique_ptr<TMC_Listedit> editor;
-};
 
 TEST_F(TmcListeditTest, AnEntryCanBeChanged) {
     EXPECT_FALSE(enabled("Eintrag_Aendern"));
@@ -215,23 +177,6 @@ TEST_F(TmcListeditTest, AddingToAMissingFileCreatesIt) {
     click("Event_Hinzu");
     EXPECT_EQ(folder.read("Event.txt"), "Nebel;01332\r\n");
     EXPECT_EQ(entries("List1"), Lines{entry("Nebel", "01332")});
-}
-
-TEST_F(TmcListeditTest, AnEntryThatCannotBeSavedIsToldAndStaysInItsLabels) {
-    enter("Event_Input_TXT", "Nebel");
-    enter("Event_Input_Nr", "01332");
-    const auto readable = std::filesystem::perms::owner_read | std::filesystem::perms::owner_exec |
-                          std::filesystem::perms::others_read | std::filesystem::perms::others_exec;
-    std::filesystem::permissions(folder.data(), readable);
-    dialogs.expectedMessages = 1;
-    {
-        const Unprivileged user;
-        click("Event_Hinzu");
-    }
-    EXPECT_EQ(dialogs.shown.back().text.toStdString(), "Event.txt kann nicht gespeichert werden.");
-    EXPECT_EQ(text("Event_Input_TXT"), "Nebel");
-    EXPECT_EQ(text("Event_Input_Nr"), "01332");
-    EXPECT_EQ(folder.read("Event.txt"), "Stau;00101\r\nUnfall;00201\r\n");
 }
 
 TEST_F(TmcListeditTest, NothingIsCutOffInAnyLanguageAtAnySizeOfLetters) {

@@ -4,28 +4,10 @@
 #include <QListWidget>
 #include <QMenu>
 
-#include "support/windowtest.h"
+#include "window/datasetstest.h"
 
 namespace kdx::test {
 namespace {
-
-class DataSetsTest : public WindowTest {
-protected:
-    DataSetsTest() { folder.copyShipped(); }
-    void choose(int set) { action(("Mnu_Datensatz_" + std::to_string(set)).c_str())->trigger(); }
-    std::string stored(int set, const std::string& key) const {
-        return data.ReadIni("RDS", key, dataSetFile(std::to_string(set)));
-    }
-    std::string atLarge(const char* file, const std::string& key) const {
-        return data.ReadIni("RDS", key, (folder.path() / file).string());
-    }
-    QString file(const char* name) const { return QString::fromStdString((folder.path() / name).string()); }
-    /// A start that knows the folder the program was shipped with.
-    void startWithShipped() {
-        shipped = sourceFolder();
-        start();
-    }
-};
 
 TEST_F(DataSetsTest, TheMenuTellsEachSetByItsNumberPsAndPi) {
     start();
@@ -252,20 +234,6 @@ TEST_F(DataSetsTest, AFileOpenedInVainIsNoLastingProblem) {
     for (int i = 0; i < 2; ++i) action("Mnu_Datensatz_Oeffnen")->trigger();
     EXPECT_EQ(dialogs.shown.back().text.toStdString(), "In huge.INI ist kein Datensatz.");
     EXPECT_EQ(text("QuietLine"), "");
-}
-
-TEST_F(DataSetsTest, AFolderThatIsOnlyReadIsNotWrittenThroughALinkEither) {
-    start();
-    data.setReadOnly();
-    const std::string before = folder.read("Datenset2.INI");
-    std::filesystem::create_symlink(folder.data() / "Datenset2.INI", folder.path() / "link.INI");
-    std::filesystem::create_directory(folder.data() / "below");
-    dialogs.files = {file("link.INI"), file("Daten/below/new.INI"), file("own.INI")};
-    dialogs.expectedMessages = 2;
-    for (int i = 0; i < 3; ++i) action("Mnu_Datensatz_Sichern_unter")->trigger();
-    EXPECT_EQ(folder.read("Datenset2.INI"), before);
-    EXPECT_FALSE(std::filesystem::exists(folder.data() / "below" / "new.INI"));
-    EXPECT_TRUE(std::filesystem::exists(folder.path() / "own.INI")) << "elsewhere it is the user's own";
 }
 
 TEST_F(DataSetsTest, WhatTheWindowHoldsCanBeSavedToAnyFile) {

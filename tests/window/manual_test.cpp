@@ -27,7 +27,7 @@ protected:
     /// What is shown, as "de/index.md".
     std::string shown() {
         const auto file = std::filesystem::path(browser().source().toLocalFile().toStdString());
-        return file.parent_path().filename() / file.filename();
+        return (file.parent_path().filename() / file.filename()).generic_string();
     }
     QTextBrowser& browser() { return *find<QTextBrowser>("Handbuch_Text"); }
     std::string plainText() { return browser().toPlainText().toStdString(); }
@@ -191,7 +191,7 @@ TEST_F(ManualTest, EveryLinkAndPictureOfEveryChapterIsThere) {
     for (const char* language : {"de", "en"}) {
         const auto chapters = shipped / "manual" / language;
         for (const auto& entry : std::filesystem::directory_iterator(chapters)) {
-            const std::string name = entry.path().filename();
+            const std::string name = entry.path().filename().string();
             browser().setSource(QUrl::fromLocalFile(QString::fromStdString(entry.path().string())));
             ASSERT_GT(plainText().size(), 100U) << name;
             for (QTextBlock block = browser().document()->begin(); block.isValid(); block = block.next()) {

@@ -1,42 +1,16 @@
 // What the quiet line at the lower edge tells beside what could not be saved.
 #include <gtest/gtest.h>
 
-#include <sys/stat.h>
-
 #include <optional>
 
-#include "settings/shownpath.h"
-#include "support/windowtest.h"
+#include "window/noticetest.h"
 
 namespace kdx::test {
 namespace {
 
-class NoticeTest : public WindowTest {
-protected:
-    NoticeTest() { folder.copyShipped(); }
-    std::string notice() { return text("QuietLine"); }
-    void waitForRetry() {
-        EXPECT_EQ(window->findChild<QTimer*>(QStringLiteral("UnsavedTimer"))->interval(), 10'000);
-        tick("UnsavedTimer");
-    }
-};
-
 TEST_F(NoticeTest, ThereIsNoneWhenAllIsWell) {
     start();
     openSession();
-    EXPECT_EQ(notice(), "");
-}
-
-TEST_F(NoticeTest, ALogThatLeadsElsewhereIsToldAlsoWithLoggingOff) {
-    const auto thesis = folder.path() / "thesis.txt";
-    folder.write("../thesis.txt", "ten years");
-    std::filesystem::create_symlink(thesis, folder.data() / kCommandLog);
-    setGeneral("ADRESSEN", "Log_Key", "0");
-    start();
-    EXPECT_EQ(notice(), "Nicht gespeichert: RDS_log.txt");
-    EXPECT_EQ(folder.read("../thesis.txt"), "ten years");
-    std::filesystem::remove(folder.data() / kCommandLog);
-    waitForRetry();
     EXPECT_EQ(notice(), "");
 }
 
@@ -60,19 +34,6 @@ TEST_F(NoticeTest, SettingsAndALogThatCannotBeWrittenAreBothTold) {
     openSession();
     click("PS_Taste");
     EXPECT_EQ(notice(), "Nicht gespeichert: Datenset1.INI  -  Nicht gespeichert: RDS_log.txt");
-}
-
-TEST_F(NoticeTest, PipesInThePlaceOfFilesDelayNothing) {
-    for (const char* file : {kCommandLog, kPictureOn, kPictureOff, kEventList, "Datenset1.INI"}) {
-        std::filesystem::remove(folder.data() / file);
-        ASSERT_EQ(mkfifo((folder.data() / file).c_str(), 0600), 0);
-    }
-    start();
-    openSession();
-    showPage(1);
-    QCoreApplication::processEvents();
-    EXPECT_NE(notice().find("Nicht lesbar: Datenset1.INI"), std::string::npos) << notice();
-    EXPECT_NE(notice().find("Nicht gespeichert: RDS_log.txt"), std::string::npos) << notice();
 }
 
 TEST_F(NoticeTest, SettingsInAnotherEncodingAreToldAndLeftAlone) {

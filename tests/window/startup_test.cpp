@@ -1,32 +1,9 @@
 #include <gtest/gtest.h>
 
-#include "support/unprivileged.h"
-#include "support/windowtest.h"
+#include "window/startuptest.h"
 
 namespace kdx::test {
 namespace {
-
-class StartUpTest : public WindowTest {
-protected:
-    /// Opens the session, sends a new PS, asks something back, shows every page and closes.
-    void expectToWork() {
-        visa.answersTo[":STEREO:DIRECT? \"PS\""] = "\"ANDERES \"\n";
-        openSession();
-        EXPECT_EQ(window->windowTitle().trimmed(), QStringLiteral("KDX,TEST"));
-        for (int page = 0; page < 9; ++page) {
-            showPage(page);
-            QCoreApplication::processEvents();
-        }
-        sent();
-        type("PS_T", "ANDERES");
-        click("PS_Taste");
-        click("Command5");
-        EXPECT_EQ(sent(), (Lines{":STEREO:DIRECT \"PS=ANDERES \"", ":STEREO:DIRECT? \"PS\""}));
-        EXPECT_NE(text("gelesen").find("ANDERES"), std::string::npos);
-        click("GTL_Taste");
-        EXPECT_TRUE(find("INIT_Taste")->isEnabled());
-    }
-};
 
 TEST_F(StartUpTest, ShowsTheProgramsTitleWithItsBlanks) {
     startShipped();
@@ -223,35 +200,6 @@ TEST_F(StartUpTest, AMissingDataFolderIsNamedAndTheWindowWorksWithoutIt) {
     EXPECT_FALSE(std::filesystem::exists(folder.data()));
 }
 
-TEST_F(StartUpTest, ADataFolderThatCannotBeReadIsToldAndTheWindowWorksWithoutIt) {
-    folder.copyShipped();
-    std::filesystem::permissions(folder.data(), std::filesystem::perms::none);
-    const Unprivileged ordinary;
-    start();
-    EXPECT_EQ(text("QuietLine"), "Nicht gefunden / not found: " + (folder.data() / kLanguageFile).string() +
-                                     "  -  Nicht lesbar: Datenset1.INI  -  "
-                                     "Nicht gespeichert: RDS_Allg.INI  -  Nicht gespeichert: RDS_log.txt");
-    expectToWork();
-}
-
-TEST_F(StartUpTest, ADataFolderThatCannotBeWrittenLosesNothingAndIsTold) {
-    folder.copyShipped();
-    const std::string before = folder.read("Datenset1.INI");
-    std::filesystem::permissions(folder.path(), std::filesystem::perms::all);
-    using std::filesystem::perms;
-    std::filesystem::permissions(folder.data(),
-                                 perms::owner_read | perms::owner_exec | perms::others_read | perms::others_exec);
-    {
-        const Unprivileged ordinary;
-        start();
-        EXPECT_EQ(text("PS_T"), "MESSTURM");
-        EXPECT_EQ(text("QuietLine"), "Nicht gespeichert: RDS_log.txt");
-        expectToWork();
-        EXPECT_EQ(text("QuietLine"), "Nicht gespeichert: Datenset1.INI  -  Nicht gespeichert: RDS_log.txt");
-    }
-    EXPECT_EQ(folder.read("Datenset1.INI"), before);
-}
-
 TEST_F(StartUpTest, AnUnknownLanguageIsTold) {
     folder.copyShipped();
     setGeneral("Sprache", "Sprache", "francais");
@@ -304,16 +252,6 @@ TEST_F(StartUpTest, AValueThatCouldNotBeSavedIsTriedAgainByItselfAndAtTheEnd) {
     folder.write("Datenset1.INI", content);
     window.reset();
     EXPECT_NE(folder.read("Datenset1.INI").find("PS=ZULETZT"), std::string::npos);
-}
-
-TEST_F(StartUpTest, AMissingFolderWhoseNameIsNoUtf8IsTold) {
-    DataFolder odd(folder.path() / "J\xFCrgen");
-    captions.load("deutsch", "RDS");
-    Session other(visa, state, odd, captions, clock, [] {});
-    TickerGroup group;
-    HMenue shown({other, state, odd, captions, clock, dialogs, group, claim, QString(), QString(), [] {}});
-    shown.startUp();
-    EXPECT_TRUE(shown.findChild<QLabel*>(QStringLiteral("QuietLine"))->text().contains(QStringLiteral("\\xFCrgen")));
 }
 
 TEST_F(StartUpTest, ASettingThatCannotBeSavedIsNamedUntilItCan) {

@@ -4,40 +4,10 @@
 
 #include <QImage>
 
-#include "settings/captions.h"
-#include "settings/folderlock.h"
-#include "sim/simvisa.h"
-#include "sim/virtualinstrument.h"
-#include "support/windowtest.h"
-
-#include <sys/stat.h>
+#include "window/tourtest.h"
 
 namespace kdx::test {
 namespace {
-
-class TourTest : public ::testing::Test {
-protected:
-    TourTest() { folder.copyShipped(); }
-
-    int tour(Visa& visa) {
-        Session session(visa, state, data, captions, clock, [] {});
-        TickerGroup tickers;
-        const FolderClaim claim(data.path());
-        HMenue window({session, state, data, captions, clock, dialogs, tickers, claim, QString(), QString(), [] {}});
-        window.startUp();
-        return makeTour(window, session.instrument, dialogs, pictures, print);
-    }
-
-    TempFolder folder;
-    std::filesystem::path pictures = folder.path() / "pictures";
-    DataFolder data{folder.path()};
-    FakeClock clock;
-    ProgramState state;
-    Captions captions{data};
-    Lines printed;
-    std::function<void(const std::string&)> print = [this](const std::string& line) { printed.push_back(line); };
-    TourDialogs dialogs{print};
-};
 
 TEST_F(TourTest, LeavesNinePicturesAndEveryQuestionAnswered) {
     sim::VirtualInstrument instrument(clock);
@@ -94,26 +64,6 @@ TEST_F(TourTest, EndsEarlyWhenItsWindowIsClosed) {
     };
     EXPECT_EQ(tour(visa), 1);
     EXPECT_TRUE(printed.back().starts_with("0 pictures, ")) << printed.back();
-}
-
-TEST_F(TourTest, WhatStandsBehindALinkOrAPipeInAPicturesPlaceIsLeftAlone) {
-    std::filesystem::create_directories(pictures);
-    folder.write("../thesis.txt", "ten years");
-    std::filesystem::create_symlink(folder.path() / "thesis.txt", pictures / "page_0.png");
-    ASSERT_EQ(mkfifo((pictures / "page_1.png").c_str(), 0600), 0);
-    sim::VirtualInstrument instrument(clock);
-    sim::SimVisa visa(instrument);
-    EXPECT_EQ(tour(visa), 1);
-    EXPECT_EQ(folder.read("../thesis.txt"), "ten years");
-    EXPECT_EQ(printed.back(), "7 pictures, 40 answers, 2 failures");
-}
-
-TEST_F(TourTest, AFolderWhoseNameIsNoUtf8GetsThePictures) {
-    pictures = folder.path() / "J\xFCrgen" / "tour";
-    sim::VirtualInstrument instrument(clock);
-    sim::SimVisa visa(instrument);
-    EXPECT_EQ(tour(visa), 0);
-    EXPECT_TRUE(std::filesystem::exists(pictures / "page_8.png"));
 }
 
 TEST_F(TourTest, AFolderThatCannotBeMadeIsAFailure) {
