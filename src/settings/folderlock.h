@@ -6,8 +6,8 @@
 
 namespace kdx {
 
-/// What several programs on one data folder need of the operating system: folderlock_posix.cpp, and
-/// folderlock_portable.cpp elsewhere.
+/// What several programs on one data folder need of the operating system: folderlock_posix.cpp; on Windows
+/// folderlock_portable.cpp and folderclaim_windows.cpp.
 
 /// Runs the work while no other program runs such work for the same folder; it should take milliseconds. Where the
 /// folder cannot be locked at all (it is missing, the disk has no locks) the work runs all the same.

@@ -36,12 +36,4 @@ bool underFolderLock(const fs::path& folder, const std::function<void()>& work) 
     return true;
 }
 
-// The standard library knows no other programs: nobody is ever told of one.
-struct FolderClaim::Held {};
-FolderClaim::FolderClaim(const fs::path&) {}
-FolderClaim::~FolderClaim() = default;
-bool FolderClaim::isShared() const {
-    return false;
-}
-
 }  // namespace kdx

@@ -1,10 +1,10 @@
+// Claims of programs that are killed, through links and without rights.
 #include <gtest/gtest.h>
 #include <sys/wait.h>
 
 #include <array>
 #include <csignal>
 
-#include "settings/datafolder.h"
 #include "settings/folderlock.h"
 #include "support/tempfolder.h"
 #include "support/unprivileged.h"
@@ -46,13 +46,6 @@ private:
     pid_t m_process = 0;
 };
 
-TEST(FolderClaimTest, AloneTheFolderIsNotShared) {
-    const test::TempFolder folder;
-    const FolderClaim claim(folder.data());
-    EXPECT_FALSE(claim.isShared());
-    EXPECT_TRUE(fs::is_empty(folder.data()));
-}
-
 TEST(FolderClaimTest, AnotherLivingProgramIsNoticedAndACrashedOneIsNot) {
     const test::TempFolder folder;
     OtherProgram other(folder.data());
@@ -64,16 +57,6 @@ TEST(FolderClaimTest, AnotherLivingProgramIsNoticedAndACrashedOneIsNot) {
     const OtherProgram later(folder.data());
     EXPECT_TRUE(claim.isShared()) << "and one that came later";
     EXPECT_TRUE(fs::is_empty(folder.data()));
-}
-
-TEST(FolderClaimTest, AClaimOutlivesWritesToTheFolder) {
-    const test::TempFolder folder;
-    const FolderClaim claim(folder.data());
-    DataFolder data(folder.path());
-    data.WriteIni("M", "a", "1", "a.ini");
-    EXPECT_EQ(data.unsavedFile(), std::nullopt) << "the own claim is in nobody's way";
-    const FolderClaim second(folder.data());
-    EXPECT_TRUE(second.isShared());
 }
 
 TEST(FolderClaimTest, AFolderUnderAnotherNameIsTheSame) {
@@ -97,10 +80,6 @@ TEST(FolderClaimTest, AReadOnlyFolderCanBeClaimed) {
     const OtherProgram other(folder.data());
     const test::Unprivileged user;
     EXPECT_TRUE(FolderClaim(folder.data()).isShared());
-}
-
-TEST(FolderClaimTest, AMissingFolderIsNotShared) {
-    EXPECT_FALSE(FolderClaim("/nowhere/at/all").isShared());
 }
 
 }  // namespace
