@@ -3,6 +3,7 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include "base/paths.h"
 #include "link/commandsequence.h"
 #include "readoutfixture.h"
 #include "station/comparison.h"
@@ -150,7 +151,7 @@ TEST_F(ReadoutTest, WhatWasNotReadIsNotTakenForEmpty) {
 TEST_F(ReadoutTest, WhatAFileLacksComesFromTheGeneralSettings) {
     folder.write("Halb.INI", "[FM]\r\nMPX_SOURCE=1\r\n[RDS]\r\nPI=ABCD\r\n");
     setProfile("RDS_Allg.INI", "FM", "MPX_DEV", "06000");
-    lab.apply(Profile::ofFile(data, folder.data() / "Halb.INI"));
+    lab.apply(Profile::ofFile(data, utf8Of(folder.data() / "Halb.INI")));
     EXPECT_EQ(valueOf(lab.readout(), "MPX_SOURCE"), "1");
     EXPECT_EQ(valueOf(lab.readout(), "MPX_HUB"), "6000");
     EXPECT_EQ(valueOf(lab.readout(), "HF-Frequenz"), "98.5");

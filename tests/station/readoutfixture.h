@@ -4,6 +4,7 @@
 
 #include <string>
 
+#include "base/paths.h"
 #include "settings/profilefile.h"
 #include "sim/simvisa.h"
 #include "sim/virtualinstrument.h"
@@ -68,7 +69,7 @@ protected:
         ProfileText text(before);
         keep(readout, text);
         folder.write("Gelesen.INI", text.bytes());
-        return Profile::ofFile(data, folder.data() / "Gelesen.INI");
+        return Profile::ofFile(data, utf8Of(folder.data() / "Gelesen.INI"));
     }
 
     Laboratory lab{data, captions};

@@ -1,5 +1,6 @@
 #include <gtest/gtest.h>
 
+#include "base/paths.h"
 #include "station/session.h"
 #include "station/wholedataset.h"
 
@@ -103,7 +104,7 @@ TEST_F(SendingTest, TheLogHoldsALineForEveryCommand) {
 
 TEST_F(SendingTest, ADataSetFromAnotherFileIsSentWithItsOwnLists) {
     folder.write("Anderswo.INI", "[RDS]\r\nPS=FREMD\r\nAF_LISTE1=99.9,100.1\r\nEON_PI=F00D\r\nEON_AFB1=88.8,89.9\r\n");
-    session.load(Profile::ofFile(data, folder.data() / "Anderswo.INI"));
+    session.load(Profile::ofFile(data, utf8Of(folder.data() / "Anderswo.INI")));
     EXPECT_EQ(session.open("TCPIP", "10.0.0.1"), 0);
     EXPECT_TRUE(session.sendDataSet());
     const Lines commands = sent();

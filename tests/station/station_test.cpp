@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include "base/paths.h"
 #include "support/linkfixture.h"
 
 namespace kdx::test {
@@ -72,7 +73,7 @@ TEST_F(StationTest, DataSet2GivesItsStepsWithTheCarrierOfDataSet1) {
 TEST_F(StationTest, AnyFileCanTakeThePlaceOfADataSet) {
     folder.write("Anderswo.INI", kDataSet2);
     Station station;
-    station.load(Profile::ofFile(data, folder.data() / "Anderswo.INI"));
+    station.load(Profile::ofFile(data, utf8Of(folder.data() / "Anderswo.INI")));
     EXPECT_EQ(lines(dataSetSteps(station)), kStepsOfDataSet2);
 }
 
