@@ -58,6 +58,8 @@ constexpr std::array kVersions = {
     ShippedVersion{"Sprachen.ini", 57346, 0xd4a56bea6011dcb4},
     ShippedVersion{"Sprachen.ini", 57482, 0x8317c393d432fb8f},
     ShippedVersion{"Sprachen.ini", 64984, 0x0a0c51f7310d4141},
+    ShippedVersion{"Sprachen.ini", 75613, 0x6e4cdde404679022},
+    ShippedVersion{"Sprachen.ini", 76041, 0x414bdb7ab0455e5a},
 };
 // clang-format on
 
