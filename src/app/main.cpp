@@ -168,8 +168,7 @@ int main(int argc, char** argv) {
                         options.answerTime.value_or(std::chrono::seconds(2)), link.simulated != nullptr,
                         kdx::shippedAppFolder(argv[0]), options.tourFolder ? std::filesystem::path() : placeFile(),
                         news.kept});
-    // Half a window would send and store what nobody loaded.
-    if (!application.guarded(window.objectName(), [&] { window.startUp(); })) return EXIT_FAILURE;
+    application.guarded(window.objectName(), [&] { window.startUp(); });
     if (options.tourFolder) {
         int result = EXIT_FAILURE;
         application.guarded(window.objectName(), [&] {
