@@ -240,12 +240,13 @@ const std::vector<KeyFacts>& keyFacts() {
     static const std::vector<KeyFacts> all = [] {
         std::vector<KeyFacts> facts;
         facts.reserve(kRows.size());
-        for (const Row& row : kRows)
+        for (const Row& row : kRows) {
             facts.push_back({row.key,
                              row.meaning,
                              range(row),
                              row.kind == Kind::Whole || row.kind == Kind::Number,
                              {row.kind, row.lowest, row.highest, row.unit, row.words}});
+        }
         return facts;
     }();
     return all;

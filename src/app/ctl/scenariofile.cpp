@@ -23,9 +23,10 @@ std::optional<scenario::Scenario> readScenarioFile(Laboratory& laboratory, const
     const auto bytes = bytesOf(laboratory.output(), file);
     if (!bytes) return std::nullopt;
     scenario::Reading reading = scenario::readScenario(*bytes, laboratory.call().force, laboratory.state().corrections);
-    for (const scenario::Problem& problem : reading.problems)
+    for (const scenario::Problem& problem : reading.problems) {
         laboratory.output().problem(
             joined({file, std::to_string(problem.line), std::to_string(problem.column), " " + problem.sentence}, ":"));
+    }
     if (!reading.problems.empty()) return std::nullopt;
     if (reading.scenario.dataSet && !loadDataSet(laboratory, *reading.scenario.dataSet)) return std::nullopt;
     return std::move(reading.scenario);
