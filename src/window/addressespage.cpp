@@ -43,9 +43,10 @@ void AddressesPage::label() {
     Adressen_Suchen->setText(text({931, "Im Netz &suchen"}));
     Adressen_Verwenden->setText(text({932, "&Verwenden"}));
     Adressen_Suchen->setToolTip(text({1143, "Fragt, welche Geräte im eigenen Netz antworten; nichts wird verstellt"}));
-    for (QWidget* way : {static_cast<QWidget*>(Adressen_Liste), static_cast<QWidget*>(Adressen_Verwenden)})
+    for (QWidget* way : {static_cast<QWidget*>(Adressen_Liste), static_cast<QWidget*>(Adressen_Verwenden)}) {
         way->setToolTip(
             text({1144, "Macht den gewählten Eintrag zur Adresse, wie ein Doppelklick; nur ohne Verbindung"}));
+    }
 }
 
 void AddressesPage::show(const QStringList& usedBefore) {
