@@ -84,8 +84,8 @@ const std::array kWordings = {
     Wording{Mistake::NoChoice, {1210, R"(%1 ist true oder false, nicht "%2")"}},
     Wording{Mistake::Comma, {1211, R"(%1 ist eine Zahl mit Dezimalpunkt, nicht "%2")"}},
     Wording{Mistake::NoNumber, {1212, R"(%1 ist eine Zahl, nicht "%2")"}},
-    Wording{Mistake::Value, {1213, R"(%1 kann nicht "%2" sein.)"}},
 };
+const Caption kWrongValue{1213, R"(%1 kann nicht "%2" sein.)"};
 
 QString withWords(const PageContext& with, const Caption& caption, const std::vector<std::string>& words) {
     return captionText(with.captions, caption, words);
@@ -141,7 +141,7 @@ QString legalText(const PageContext& with, const LegalValues& legal) {
 
 /// That the key cannot have the value, why, and what is legal.
 QString valueText(const PageContext& with, const std::string& key, const std::string& utf8, const LegalValues& legal) {
-    QString text = withWords(with, kWordings.back().caption, {key, utf8});
+    QString text = withWords(with, kWrongValue, {key, utf8});
     const QString why = whyRefused(with, key.c_str(), QString::fromStdString(utf8));
     const QString values = legalText(with, legal);
     if (!why.isEmpty()) text += QLatin1Char(' ') + why;
