@@ -6,6 +6,7 @@
 
 #include "air/characters.h"
 #include "air/frequencies.h"
+#include "air/group14.h"
 #include "air/hexword.h"
 
 namespace kdx::air {
@@ -13,15 +14,7 @@ namespace kdx::air {
 namespace {
 
 constexpr int kBurst = 8;  // the standard's most; at four groups the last receiver has noticed
-constexpr std::uint8_t kTp = 0x10;
-constexpr std::uint8_t kTaOf14B = 0x08;
-
-// Variants of 14A.
-constexpr unsigned kMethodA = 4;
-constexpr unsigned kFirstPair = 5;
-constexpr unsigned kPairVariants = 4;
-constexpr unsigned kTypeAndTa = 13;
-constexpr unsigned kPtyPlace = 11;
+constexpr unsigned kPairVariants = group14::kLastPair - group14::kFirstPair + 1;
 
 }  // namespace
 
@@ -60,7 +53,7 @@ void Networks::follow(const std::vector<Network>& networks, bool bursts) {
 void Networks::append(const sim::OtherNetwork& network, std::uint16_t pi, Warnings& warnings) {
     const std::string name = "EON " + network.pi;
     const auto addPart = [&](unsigned variant, std::uint16_t block3) {
-        m_parts.push_back({static_cast<std::uint8_t>((network.tp ? kTp : 0U) | variant), block3, pi});
+        m_parts.push_back({static_cast<std::uint8_t>((network.tp ? group14::kTp : 0U) | variant), block3, pi});
     };
     const auto add = [&](unsigned variant, std::uint16_t block3) {
         addPart(variant, block3);
@@ -71,17 +64,18 @@ void Networks::append(const sim::OtherNetwork& network, std::uint16_t pi, Warnin
     for (std::size_t i = 0; i < ps.size() / 2; ++i)
         add(static_cast<unsigned>(i), pairOf(ps.at(2 * i), ps.at(2 * i + 1)));
     const auto list = methodA(network.methodA, name + " AF method A", warnings);
-    for (const std::uint16_t codes : list) addPart(kMethodA, codes);
+    for (const std::uint16_t codes : list) addPart(group14::kMethodA, codes);
     if (!list.empty()) m_lengths.push_back(list.size());
     unsigned number = 0;
     for (const std::uint16_t pair : mappedPairs(network.lists, name + " AF", warnings))
-        add(kFirstPair + number++ % kPairVariants, pair);
-    add(kTypeAndTa,
-        static_cast<std::uint16_t>(static_cast<unsigned>(network.pty) << kPtyPlace | (network.ta ? 1U : 0U)));
+        add(group14::kFirstPair + number++ % kPairVariants, pair);
+    add(group14::kTypeAndTa,
+        static_cast<std::uint16_t>(static_cast<unsigned>(network.pty) << group14::kPtyPlace | (network.ta ? 1U : 0U)));
 }
 
 Networks::Part Networks::stateOf(const Network& network) {
-    return {static_cast<std::uint8_t>((network.tp ? kTp : 0U) | (network.ta ? kTaOf14B : 0U)), 0, network.pi};
+    return {static_cast<std::uint8_t>((network.tp ? group14::kTp : 0U) | (network.ta ? group14::kTaOf14B : 0U)), 0,
+            network.pi};
 }
 
 Networks::Part Networks::nextOf14A() {

@@ -2,24 +2,11 @@
 
 #include <algorithm>
 
+#include "air/group14.h"
+
 namespace kdx::air {
 
 namespace {
-
-constexpr unsigned kTp = 0x10;
-constexpr unsigned kTaOf14B = 0x08;
-constexpr unsigned kVariant = 0x0F;
-
-// Variants of 14A (IEC 62106, 6.1.5.20).
-constexpr unsigned kLastOfPs = 3;
-constexpr unsigned kMethodA = 4;
-constexpr unsigned kFirstPair = 5;
-constexpr unsigned kLastPair = 8;
-constexpr unsigned kAmPair = 9;
-constexpr unsigned kLinkage = 12;
-constexpr unsigned kTypeAndTa = 13;
-constexpr unsigned kItemNumber = 14;
-constexpr unsigned kPtyPlace = 11;
 
 // No country has so many programmes to be heard at one place; what is beyond was not received as it was sent.
 constexpr std::size_t kMostNetworks = 256;
@@ -47,10 +34,10 @@ std::size_t ReceivedNetworks::placeOf(std::uint16_t pi, std::uint64_t group) {
 void ReceivedNetworks::take14A(unsigned bits, std::optional<std::uint16_t> block3, std::uint16_t pi,
                                std::uint64_t group) {
     const std::size_t place = placeOf(pi, group);
-    m_networks[place].tp = (bits & kTp) != 0;
-    const unsigned variant = bits & kVariant;
+    m_networks[place].tp = (bits & group14::kTp) != 0;
+    const unsigned variant = bits & group14::kVariant;
     if (variant == 0) beginTurn(place);
-    if (variant == kMethodA) {
+    if (variant == group14::kMethodA) {
         m_beside[place].lists.take(block3);
         m_networks[place].frequencies = m_beside[place].lists.latest();
     } else if (block3) {
@@ -63,19 +50,19 @@ void ReceivedNetworks::takeVariant(std::size_t place, unsigned variant, std::uin
     ReceivedNetwork& network = m_networks[place];
     const unsigned upper = word >> 8U;
     const unsigned lower = word & kByte;
-    if (variant <= kLastOfPs) {
+    if (variant <= group14::kLastOfPs) {
         network.ps.at(std::size_t{2} * variant) = static_cast<std::uint8_t>(upper);
         network.ps.at(std::size_t{2} * variant + 1) = static_cast<std::uint8_t>(lower);
-    } else if (variant >= kFirstPair && variant <= kLastPair) {
+    } else if (variant >= group14::kFirstPair && variant <= group14::kLastPair) {
         takePair(place, {vhfKilohertz(upper), vhfKilohertz(lower)});
-    } else if (variant == kAmPair) {
+    } else if (variant == group14::kAmPair) {
         takePair(place, {vhfKilohertz(upper), amKilohertz(lower)});
-    } else if (variant == kLinkage) {
+    } else if (variant == group14::kLinkage) {
         network.linkage = word;
-    } else if (variant == kTypeAndTa) {
-        network.pty = static_cast<int>(word >> kPtyPlace);
+    } else if (variant == group14::kTypeAndTa) {
+        network.pty = static_cast<int>(word >> group14::kPtyPlace);
         network.ta = (word & 1U) != 0;
-    } else if (variant == kItemNumber) {
+    } else if (variant == group14::kItemNumber) {
         network.itemNumber = word;
     }
 }
@@ -108,8 +95,8 @@ void ReceivedNetworks::beginTurn(std::size_t place) {
 
 void ReceivedNetworks::take14B(unsigned bits, std::uint16_t pi, std::uint64_t group) {
     ReceivedNetwork& network = m_networks[placeOf(pi, group)];
-    network.tp = (bits & kTp) != 0;
-    network.ta = (bits & kTaOf14B) != 0;
+    network.tp = (bits & group14::kTp) != 0;
+    network.ta = (bits & group14::kTaOf14B) != 0;
 }
 
 }  // namespace kdx::air

@@ -168,7 +168,7 @@ constexpr bool keysAreUnique(const Table& table) {
     return true;
 }
 
-constexpr const ParamRow* rowOf(std::string_view key) {
+constexpr const ParamRow* paramRow(std::string_view key) {
     for (const ParamRow& row : kParamTable) {
         if (row.key == key) return &row;
     }
@@ -177,7 +177,7 @@ constexpr const ParamRow* rowOf(std::string_view key) {
 
 constexpr bool choicesBelongToTheirRows() {
     return std::all_of(kChoiceTable.begin(), kChoiceTable.end(), [](const ChoiceRow& choice) {
-        const ParamRow* row = rowOf(choice.key);
+        const ParamRow* row = paramRow(choice.key);
         return row != nullptr && row->format == Format::Choice;
     });
 }
@@ -247,11 +247,11 @@ std::string dateText(const Date& date) {
 }  // namespace
 
 bool isParameter(std::string_view key) {
-    return rowOf(key) != nullptr;
+    return paramRow(key) != nullptr;
 }
 
 std::optional<std::string> composeCommand(std::string_view key, std::string& value, const ParamContext& context) {
-    const ParamRow* row = rowOf(key);
+    const ParamRow* row = paramRow(key);
     if (row == nullptr) return std::nullopt;
     std::string command(row->command);
     if (row->route == Route::Eon) command.append(context.eonIdentifier).append(",");

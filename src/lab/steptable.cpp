@@ -10,7 +10,7 @@ namespace kdx {
 
 namespace {
 
-enum Column { Number, What, Result, ColumnCount };
+enum StepColumn { Number, What, Result, StepColumnCount };
 
 constexpr QChar kGood{u'\u2713'};
 constexpr QChar kBad{u'\u2717'};
@@ -35,7 +35,7 @@ bool isGood(const std::string& status) {
 }  // namespace
 
 StepTable::StepTable(const char* name, const PageContext& with, QWidget* parent)
-    : m_with(with), m_table(newViewTable(name, ColumnCount, parent)) {
+    : m_with(with), m_table(newViewTable(name, StepColumnCount, parent)) {
     m_table->setSelectionMode(QAbstractItemView::NoSelection);
     m_table->setWordWrap(
         false);  // one line a step: a long value is cut within, not left out as a word that does not fit
@@ -75,7 +75,7 @@ void StepTable::append(const std::string& step) {
     m_table->insertRow(row);
     const bool numbered = step != scenario::kOpening && step != scenario::kRestoring;
     showCell(m_table, row, Number, numbered ? QString::fromStdString(step) : QString(), false);
-    for (const Column column : {What, Result}) showCell(m_table, row, column, {}, false);
+    for (const StepColumn column : {What, Result}) showCell(m_table, row, column, {}, false);
 }
 
 void StepTable::describe() {
@@ -117,7 +117,7 @@ void StepTable::showDone() {
 
 void StepTable::mark(const std::string& step) {
     const auto setBold = [this](int row, bool bold) {
-        for (int column = 0; row >= 0 && column < ColumnCount; ++column) {
+        for (int column = 0; row >= 0 && column < StepColumnCount; ++column) {
             QFont font = m_table->font();
             font.setBold(bold);
             m_table->item(row, column)->setFont(font);

@@ -11,7 +11,6 @@ namespace {
 
 constexpr std::size_t kMostDigits = 9;
 constexpr std::size_t kDecimals = 6;
-constexpr std::int64_t kOne = 1'000'000;
 
 std::int64_t number(std::string_view digits) {
     std::int64_t value = 0;
@@ -27,7 +26,7 @@ std::optional<Decimal> readDecimal(std::string_view text) {
     const std::size_t point = text.find('.');
     const std::string_view whole = text.substr(0, point);
     if (!isDecimal(whole) || whole.size() > kMostDigits) return std::nullopt;
-    std::int64_t value = number(whole) * kOne;
+    std::int64_t value = number(whole) * Decimal::kOne;
     if (point != std::string_view::npos) {
         std::string decimals(text.substr(point + 1));
         if (!isDecimal(decimals) || decimals.size() > kDecimals) return std::nullopt;
@@ -39,9 +38,9 @@ std::optional<Decimal> readDecimal(std::string_view text) {
 
 std::string decimalText(Decimal number) {
     const std::int64_t size = std::abs(number.millionths);
-    std::string text = (number.millionths < 0 ? "-" : "") + std::to_string(size / kOne);
-    if (size % kOne == 0) return text;
-    const std::string decimals = std::to_string(size % kOne);
+    std::string text = (number.millionths < 0 ? "-" : "") + std::to_string(size / Decimal::kOne);
+    if (size % Decimal::kOne == 0) return text;
+    const std::string decimals = std::to_string(size % Decimal::kOne);
     text.append(".").append(kDecimals - decimals.size(), '0').append(decimals);
     text.erase(text.find_last_not_of('0') + 1);
     return text;

@@ -11,6 +11,7 @@ namespace kdx::scenario {
 
 /// A decimal number counted in millionths: what is written as 0.1 is 0.1, however often it is added.
 struct Decimal {
+    static constexpr std::int64_t kOne = 1'000'000;
     std::int64_t millionths = 0;
 
     friend bool operator==(const Decimal&, const Decimal&) = default;

@@ -8,12 +8,12 @@ namespace kdx::scenario {
 
 namespace {
 
-constexpr std::size_t kMostDigits = 7;
+constexpr std::size_t kMostCountDigits = 7;
 
 /// Takes a count off the text's beginning; 0 when there is none.
 std::size_t takeCount(std::string_view& text) {
     const std::size_t digits = std::min(text.find_first_not_of("0123456789"), text.size());
-    if (digits > kMostDigits) return 0;
+    if (digits > kMostCountDigits) return 0;
     std::size_t count = 0;
     for (const char digit : text.substr(0, digits)) count = count * 10 + static_cast<std::size_t>(digit - '0');
     text.remove_prefix(digits);

@@ -11,12 +11,6 @@
 
 namespace kdx::scenario {
 
-namespace {
-
-constexpr std::int64_t kOne = 1'000'000;  // of a decimal
-
-}  // namespace
-
 std::optional<std::string> Values::text(const YamlNode& node, std::string_view name) {
     const std::string subject(name);
     if (node.kind == YamlNode::Kind::Nothing) {
@@ -78,8 +72,8 @@ std::optional<unsigned> Values::whole(const YamlNode& node, std::string_view nam
     const auto written = text(node, name);
     if (!written) return std::nullopt;
     const auto value = isDecimal(*written) ? readDecimal(*written) : std::nullopt;
-    if (value && value->millionths >= lowest * kOne && value->millionths <= highest * kOne)
-        return static_cast<unsigned>(value->millionths / kOne);
+    if (value && value->millionths >= lowest * Decimal::kOne && value->millionths <= highest * Decimal::kOne)
+        return static_cast<unsigned>(value->millionths / Decimal::kOne);
     wrong(node, Mistake::NoWhole, {std::string(name), std::to_string(lowest), std::to_string(highest), *written});
     return std::nullopt;
 }

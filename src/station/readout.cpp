@@ -89,8 +89,6 @@ constexpr std::array kNetworkRows = {
     Row{"EON_AFB5", "EON-AFB", Form::AfList},
 };
 
-constexpr std::string_view kNetwork = "EON_PI";
-
 const Row* rowOf(std::string_view key) {
     const auto in = [key](const auto& rows) {
         const auto row = std::find_if(rows.begin(), rows.end(), [key](const Row& r) { return r.key == key; });
@@ -150,7 +148,7 @@ public:
     }
     void readNetworks() {
         const auto answer = coder("EON-PI");
-        if (!answer) m_readout.push_back({std::string(kNetwork), {}, std::nullopt});
+        if (!answer) m_readout.push_back({std::string(kNetworkKey), {}, std::nullopt});
         for (const std::string& pi : networksIn(answer.value_or(""))) readNetwork(pi);
     }
     [[nodiscard]] Readout take() { return std::move(m_readout); }
@@ -159,7 +157,7 @@ private:
     static constexpr const char* kName = "*IDN?";
 
     void readNetwork(const std::string& pi) {
-        m_readout.push_back({std::string(kNetwork), pi, pi});
+        m_readout.push_back({std::string(kNetworkKey), pi, pi});
         for (const Row& row : kNetworkRows) {
             std::string question = std::string(row.question) + "," + pi;
             if (row.form == Form::AfList) question += "," + std::to_string(listNumber(row.key));
@@ -256,7 +254,7 @@ public:
         }
     }
     void addWholeNetwork(const std::string& network) {
-        add(std::string(kNetwork), network);
+        add(std::string(kNetworkKey), network);
         for (const Row& row : kNetworkRows) addNetworkValue(std::string(row.key), network);
     }
     [[nodiscard]] SettingCommands take() { return std::move(m_commands); }
@@ -308,19 +306,19 @@ Readout unanswered(const Readout& readout) {
 
 Differences differences(const Readout& wanted, const Readout& present) {
     Differences differing;
-    const bool networksKnown = find(wanted, kNetwork, {}) == nullptr && find(present, kNetwork, {}) == nullptr;
+    const bool networksKnown = find(wanted, kNetworkKey, {}) == nullptr && find(present, kNetworkKey, {}) == nullptr;
     for (const Reading& one : wanted) {
         if (!one.network.empty() && !networksKnown) continue;
         const Reading* other = find(present, one.key, one.network);
         if (other == nullptr) {
-            if (networksKnown && one.key == kNetwork)
+            if (networksKnown && one.key == kNetworkKey)
                 differing.push_back({one.key, one.network, one.value, std::nullopt});
         } else if (one.value && other->value && one.value != other->value) {
             differing.push_back({one.key, one.network, one.value, other->value});
         }
     }
     for (const Reading& other : present) {
-        if (networksKnown && other.key == kNetwork && find(wanted, kNetwork, other.network) == nullptr)
+        if (networksKnown && other.key == kNetworkKey && find(wanted, kNetworkKey, other.network) == nullptr)
             differing.push_back({other.key, other.network, std::nullopt, other.value});
     }
     return differing;
@@ -331,14 +329,14 @@ SettingCommands commandsFor(const Differences& differing, const Readout& wanted,
     // Networks that go make room for those that come: the coder holds a limited number.
     std::set<std::string> whole;
     for (const Difference& difference : differing) {
-        const bool goes = difference.key == kNetwork ? !difference.wanted : mustBeginAnew(difference);
+        const bool goes = difference.key == kNetworkKey ? !difference.wanted : mustBeginAnew(difference);
         if (difference.network.empty() || !goes || !whole.insert(difference.network).second) continue;
         commands.add("EON_DEL", difference.network);
-        if (difference.key != kNetwork) commands.addWholeNetwork(difference.network);
+        if (difference.key != kNetworkKey) commands.addWholeNetwork(difference.network);
     }
     for (const Difference& difference : differing) {
         if (difference.network.empty() || whole.count(difference.network) != 0) continue;
-        if (difference.key == kNetwork) {
+        if (difference.key == kNetworkKey) {
             commands.addWholeNetwork(difference.network);
         } else {
             commands.addNetworkValue(difference.key, difference.network);
@@ -353,7 +351,7 @@ SettingCommands commandsFor(const Differences& differing, const Readout& wanted,
 bool setsReading(const std::string& sent, const std::string& key) {
     if (key == "FM" || key == "AM") return sent == key + "_EIN" || sent == key + "_AUS";
     if (key == "RT" || key == "RT_N") return sent == "RT" || sent == "DEL_RT";
-    if (key.starts_with("EON_")) return sent == "EON_PI" || sent == "EON_DEL" || sent == key;
+    if (key.starts_with("EON_")) return sent == kNetworkKey || sent == "EON_DEL" || sent == key;
     return sent == key || (key.starts_with("AF") && sent.starts_with("AF"));
 }
 

@@ -2,6 +2,7 @@
 
 #include <optional>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "settings/corrections.h"
@@ -9,6 +10,9 @@
 namespace kdx {
 
 class Instrument;
+
+/// The key that a whole other network is known by.
+inline constexpr std::string_view kNetworkKey = "EON_PI";
 
 /// One value that the instrument was asked for. All texts are 8-bit Windows-1252.
 struct Reading {
@@ -39,7 +43,7 @@ struct SettingCommand {
 using SettingCommands = std::vector<SettingCommand>;
 
 /// Asks for everything, as one sequence: one failure ends all of it. Questions that one instrument or another does not
-/// know stay without a value, the one for the other networks under "EON_PI".
+/// know stay without a value, the one for the other networks under kNetworkKey.
 [[nodiscard]] Readout readOut(Instrument& instrument);
 
 /// What of it the instrument gave no answer to.

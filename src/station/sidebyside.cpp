@@ -18,8 +18,6 @@ namespace {
 
 using Column = std::optional<std::string> SettingSideBySide::*;
 
-constexpr const char* kNetwork = "EON_PI";
-
 /// Where what a set-up file keeps is kept by the window.
 constexpr std::array<std::pair<const char*, KeptIn>, 3> kSections{
     {{"RDS", KeptIn::DataSet}, {"FM", KeptIn::General}, {"VRN", KeptIn::DataSet1}}};
@@ -45,12 +43,12 @@ Readout sentOf(Readout readout, const SentValues& sent) {
 
 bool knowsNetworks(const Readout& readout) {
     return std::none_of(readout.begin(), readout.end(),
-                        [](const Reading& r) { return r.key == kNetwork && r.network.empty(); });
+                        [](const Reading& r) { return r.key == kNetworkKey && r.network.empty(); });
 }
 
 bool differ(const SettingSideBySide& row, bool present) {
     // A network counts as one: that its values are not there says nothing more than that it is not.
-    const bool wholeNetwork = row.key == kNetwork && !row.network.empty();
+    const bool wholeNetwork = row.key == kNetworkKey && !row.network.empty();
     if (wholeNetwork && row.window != row.file) return true;
     if (wholeNetwork && present && row.window != row.instrument) return true;
     const std::array columns{row.window, row.file, row.instrument};
@@ -72,7 +70,7 @@ void showRefused(std::vector<SettingSideBySide>& rows, const Station& entered, c
 }
 
 /// Without it no networks would mean that there are none.
-const Reading kOtherNetworksUnknown{kNetwork, {}, std::nullopt};
+const Reading kOtherNetworksUnknown{std::string(kNetworkKey), {}, std::nullopt};
 
 /// @returns whether a file keeps anything of it.
 bool write(Profile& into, const Readout& taken) {
@@ -115,7 +113,7 @@ SettingCommands commandsForWindow(const std::vector<SettingSideBySide>& settings
                                   const Corrections& corrections) {
     Differences differing;
     for (const SettingSideBySide& row : settings) {
-        const bool wholeNetwork = row.key == kNetwork && !row.network.empty();
+        const bool wholeNetwork = row.key == kNetworkKey && !row.network.empty();
         const bool known = !row.refused && (wholeNetwork || (row.window && row.instrument));
         if (known && row.window != row.instrument)
             differing.push_back({row.key, row.network, row.window, row.instrument});
@@ -128,7 +126,7 @@ std::size_t takeOver(const std::vector<SettingSideBySide>& settings, Profile& in
     std::string network;
     bool goes = false;
     for (const SettingSideBySide& row : settings) {
-        if (row.key != kNetwork) continue;
+        if (row.key != kNetworkKey) continue;
         if (row.instrument && network.empty()) network = row.network;
         if (!row.instrument && row.window) goes = true;
     }

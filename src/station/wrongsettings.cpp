@@ -30,47 +30,47 @@ enum class Judged {
     Sequence,    ///< a group sequence: its last comma is not sent
 };
 
-struct Row {
+struct SettingToJudge {
     Setting setting;
     Judged judged = Judged::AsStored;
 };
 
 // In the order of sending. Not sent with a data set: the type of the other network, decoder information, stereo mode,
 // ARI details, RDS phase.
-constexpr std::array kRows = {
-    Row{setting::kTotalDeviation},
-    Row{setting::kSource},
-    Row{setting::kImpedance, Judged::Impedance},
-    Row{setting::kPreemphasis},
-    Row{setting::kPilot},
-    Row{setting::kPilotDeviation},
-    Row{setting::kPilotPhase, Judged::PilotPhase},
-    Row{setting::kAri},
-    Row{setting::kRds},
-    Row{setting::kRdsDeviation},
-    Row{setting::kPi, Judged::Required},
-    Row{setting::kPs},
-    Row{setting::kMusicSpeech},
-    Row{setting::kRadiotext},
-    Row{setting::kAfLists[0], Judged::List},
-    Row{setting::kAfLists[1], Judged::List},
-    Row{setting::kAfLists[2], Judged::List},
-    Row{setting::kAfLists[3], Judged::List},
-    Row{setting::kAfLists[4], Judged::List},
-    Row{{setting::kPty.sendKey, setting::kPtyOfDataSet}},
-    Row{setting::kEonPi},
-    Row{setting::kEonTa},
-    Row{setting::kEonTp},
-    Row{setting::kEonPs},
-    Row{setting::kEonAfLists[0], Judged::List},
-    Row{setting::kEonAfLists[1], Judged::List},
-    Row{setting::kEonAfLists[2], Judged::List},
-    Row{setting::kEonAfLists[3], Judged::List},
-    Row{setting::kEonAfLists[4], Judged::List},
-    Row{setting::kGroupSequence, Judged::Sequence},
-    Row{setting::kRfFrequency, Judged::Carrier},
-    Row{setting::kRfLevel, Judged::Carrier},
-    Row{setting::kAudioFrequency, Judged::Carrier},
+constexpr std::array kSettingsToJudge = {
+    SettingToJudge{setting::kTotalDeviation},
+    SettingToJudge{setting::kSource},
+    SettingToJudge{setting::kImpedance, Judged::Impedance},
+    SettingToJudge{setting::kPreemphasis},
+    SettingToJudge{setting::kPilot},
+    SettingToJudge{setting::kPilotDeviation},
+    SettingToJudge{setting::kPilotPhase, Judged::PilotPhase},
+    SettingToJudge{setting::kAri},
+    SettingToJudge{setting::kRds},
+    SettingToJudge{setting::kRdsDeviation},
+    SettingToJudge{setting::kPi, Judged::Required},
+    SettingToJudge{setting::kPs},
+    SettingToJudge{setting::kMusicSpeech},
+    SettingToJudge{setting::kRadiotext},
+    SettingToJudge{setting::kAfLists[0], Judged::List},
+    SettingToJudge{setting::kAfLists[1], Judged::List},
+    SettingToJudge{setting::kAfLists[2], Judged::List},
+    SettingToJudge{setting::kAfLists[3], Judged::List},
+    SettingToJudge{setting::kAfLists[4], Judged::List},
+    SettingToJudge{{setting::kPty.sendKey, setting::kPtyOfDataSet}},
+    SettingToJudge{setting::kEonPi},
+    SettingToJudge{setting::kEonTa},
+    SettingToJudge{setting::kEonTp},
+    SettingToJudge{setting::kEonPs},
+    SettingToJudge{setting::kEonAfLists[0], Judged::List},
+    SettingToJudge{setting::kEonAfLists[1], Judged::List},
+    SettingToJudge{setting::kEonAfLists[2], Judged::List},
+    SettingToJudge{setting::kEonAfLists[3], Judged::List},
+    SettingToJudge{setting::kEonAfLists[4], Judged::List},
+    SettingToJudge{setting::kGroupSequence, Judged::Sequence},
+    SettingToJudge{setting::kRfFrequency, Judged::Carrier},
+    SettingToJudge{setting::kRfLevel, Judged::Carrier},
+    SettingToJudge{setting::kAudioFrequency, Judged::Carrier},
 };
 
 std::optional<std::string> wrongPhase(const std::string& stored) {
@@ -84,7 +84,7 @@ std::optional<std::string> wrongPhase(const std::string& stored) {
     return wrong;
 }
 
-std::optional<std::string> wrong(const Row& row, const std::string& stored, const Corrections& corrections) {
+std::optional<std::string> wrong(const SettingToJudge& row, const std::string& stored, const Corrections& corrections) {
     const char* const key = row.setting.sendKey;
     if (stored.empty() && row.judged != Judged::Required) return std::nullopt;
     switch (row.judged) {
@@ -105,7 +105,7 @@ std::optional<std::string> wrong(const Row& row, const std::string& stored, cons
     return std::nullopt;
 }
 
-LegalValues legalValues(const Row& row) {
+LegalValues legalValues(const SettingToJudge& row) {
     const KeyFacts* const facts = factsOf(row.setting.sendKey);
     LegalValues legal = facts == nullptr ? LegalValues() : facts->legal;
     if (row.judged == Judged::PilotPhase) {
@@ -120,7 +120,7 @@ LegalValues legalValues(const Row& row) {
 std::vector<WrongSetting> wrongSettings(const Profile& source) {
     const Corrections corrections = readCorrections(source);
     std::vector<WrongSetting> found;
-    for (const Row& row : kRows) {
+    for (const SettingToJudge& row : kSettingsToJudge) {
         const Place& place = row.setting.place;
         const std::string stored = source.read(place);
         if (const auto sentence = wrong(row, stored, corrections)) {

@@ -7,20 +7,20 @@ namespace {
 
 using namespace std::chrono_literals;
 
-struct Sent {
+struct SentGroup {
     int number = 0;  ///< of the group, from 1
     std::string group;
-    bool operator==(const Sent&) const = default;
+    bool operator==(const SentGroup&) const = default;
 };
-void PrintTo(const Sent& sent, std::ostream* out) {
+void PrintTo(const SentGroup& sent, std::ostream* out) {
     *out << sent.number << ": " << sent.group;
 }
 
 class ClockGroups : public AirTest {
 protected:
     /// The clock groups among the next ones.
-    std::vector<Sent> clocks(int groups) {
-        std::vector<Sent> found;
+    std::vector<SentGroup> clocks(int groups) {
+        std::vector<SentGroup> found;
         for (int number = 1; number <= groups; ++number) {
             const std::string group = next();
             if (group.substr(5, 3) == "400") found.push_back({number, group});
@@ -34,25 +34,25 @@ TEST_F(ClockGroups, ComeAtEachFullMinuteAndNotAtTheStart) {
     // 179.975 s, the 2740th at 239.966 s; the 3426th at 300.045 s is further from it than the 3425th, at 299.958 s.
     // 1 January 2026 is MJD 61041, 01 and 110 1110 0111 0001; 12:01 is 0 1100 and 000001.
     coder("CT=12:00:00,01.01.26");
-    EXPECT_EQ(clocks(3500), (std::vector<Sent>{{685, "1000 4001 DCE2 C040"},
-                                               {1370, "1000 4001 DCE2 C080"},
-                                               {2055, "1000 4001 DCE2 C0C0"},
-                                               {2740, "1000 4001 DCE2 C100"},
-                                               {3425, "1000 4001 DCE2 C140"}}));
+    EXPECT_EQ(clocks(3500), (std::vector<SentGroup>{{685, "1000 4001 DCE2 C040"},
+                                                    {1370, "1000 4001 DCE2 C080"},
+                                                    {2055, "1000 4001 DCE2 C0C0"},
+                                                    {2740, "1000 4001 DCE2 C100"},
+                                                    {3425, "1000 4001 DCE2 C140"}}));
 }
 
 TEST_F(ClockGroups, GoByTheCodersClock) {
     // Half a minute ahead: the 343rd group ends at 30.040 s, the 1028th at 90.031 s. 08:31 is 0 1000 and 011111.
     coder("CT=08:30:30,01.01.26");
-    EXPECT_EQ(clocks(1100), (std::vector<Sent>{{343, "1000 4001 DCE2 87C0"}, {1028, "1000 4001 DCE2 8800"}}));
+    EXPECT_EQ(clocks(1100), (std::vector<SentGroup>{{343, "1000 4001 DCE2 87C0"}, {1028, "1000 4001 DCE2 8800"}}));
 }
 
 TEST_F(ClockGroups, AreNotSentWhileTheClockIsOff) {
-    EXPECT_EQ(clocks(700), std::vector<Sent>{});
+    EXPECT_EQ(clocks(700), std::vector<SentGroup>{});
     coder("CT=12:00:59,01.01.26");
     EXPECT_EQ(clocks(20).size(), 1U);
     coder("CT=off");
-    EXPECT_EQ(clocks(1400), std::vector<Sent>{});
+    EXPECT_EQ(clocks(1400), std::vector<SentGroup>{});
 }
 
 TEST_F(ClockGroups, ArePutInWhileTheSequenceWaits) {
@@ -80,7 +80,7 @@ class ClockDates : public ClockGroups, public ::testing::WithParamInterface<Date
 
 TEST_P(ClockDates, HaveTheModifiedJulianDayOfTheMinuteThatBegins) {
     coder(std::string("CT=") + GetParam().clock);
-    EXPECT_EQ(clocks(20), (std::vector<Sent>{{11, GetParam().group}}));
+    EXPECT_EQ(clocks(20), (std::vector<SentGroup>{{11, GetParam().group}}));
 }
 
 // Days counted from 1 January 2000, MJD 51544. Block 2 ends in the upper two of its 17 bits, block 3 holds the others
