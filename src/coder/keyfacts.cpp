@@ -111,12 +111,6 @@ bool isWithin(std::string_view text, double lowest, double highest) {
     return number && *number >= lowest && *number <= highest;
 }
 
-bool isGroup(std::string_view group) {
-    if (group.empty() || (group.back() != 'A' && group.back() != 'B')) return false;
-    group.remove_suffix(1);
-    return isDecimal(group) && group.size() <= 2 && isWithin(group, 0, kHighestGroup);
-}
-
 /// The tuned frequency may lie below the band of the alternatives, also where method B repeats it.
 bool isFrequencyList(std::string_view text) {
     const auto frequencies = split(text, ",");
@@ -208,7 +202,7 @@ std::optional<std::string> problem(const Row& row, std::string_view value, const
             return unless(isFrequencyList(value));
         case Kind::Groups: {
             const auto groups = split(value, ",");
-            return unless(groups.size() <= kMostGroups && std::all_of(groups.begin(), groups.end(), isGroup));
+            return unless(groups.size() <= kMostGroups && std::all_of(groups.begin(), groups.end(), isGroupType));
         }
         case Kind::Message:
             return unless(isMessage(value));
@@ -250,6 +244,12 @@ const std::vector<KeyFacts>& keyFacts() {
         return facts;
     }();
     return all;
+}
+
+bool isGroupType(std::string_view group) {
+    if (group.empty() || (group.back() != 'A' && group.back() != 'B')) return false;
+    group.remove_suffix(1);
+    return isDecimal(group) && group.size() <= 2 && isWithin(group, 0, kHighestGroup);
 }
 
 const KeyFacts* factsOf(std::string_view key) {

@@ -43,6 +43,9 @@ struct KeyFacts {
     LegalValues legal = {};
 };
 
+/// Whether the text is a type of group, from 0A to 15B.
+[[nodiscard]] bool isGroupType(std::string_view group);
+
 /// The facts of every key, in the order of the key table.
 [[nodiscard]] const std::vector<KeyFacts>& keyFacts();
 

@@ -25,6 +25,7 @@ constexpr VisaStatus kInvalidResourceName = -1073807342;  // BFFF0012: the resou
 constexpr VisaStatus kTimeout = -1073807339;              // BFFF0015
 constexpr VisaStatus kAborted = -1073807312;              // BFFF0030
 constexpr VisaStatus kInputOutput = -1073807298;          // BFFF003E
+constexpr VisaStatus kNoListeners = -1073807265;          // BFFF005F: nobody on the bus; only a library says so
 constexpr VisaStatus kLibraryNotFound = -1073807202;      // BFFF009E: no library can serve the resource
 constexpr VisaStatus kConnectionLost = -1073807194;       // BFFF00A6
 }  // namespace visa

@@ -5,6 +5,7 @@
 #include "base/codepage.h"
 #include "base/numbers.h"
 #include "coder/fieldsizes.h"
+#include "coder/keyfacts.h"
 #include "sim/parameters.h"
 #include "sim/scpi.h"
 
@@ -13,12 +14,6 @@ namespace kdx::sim {
 namespace {
 
 constexpr int kHighestRadiotextNumber = 255;
-
-bool isGroup(std::string_view group) {
-    if (group.empty() || (group.back() != 'A' && group.back() != 'B')) return false;
-    const std::string_view digits = group.substr(0, group.size() - 1);
-    return isDecimal(digits) && digits.size() <= 2 && readWhole(digits) <= kHighestGroup;
-}
 
 // Two digits, a comma and ten characters, which is what 3A and 8A have in common; gives the ten characters.
 std::optional<std::string_view> groupContents(std::string_view value) {
@@ -151,7 +146,7 @@ ScpiError Coder::setGroupSequence(std::string_view value) {
     const std::vector<std::string_view> groups = splitOutsideQuotes(sequence, ',');
     if (groups.size() > kMostGroups) return ScpiError::TooMuchData;
     for (const std::string_view group : groups) {
-        if (!isGroup(group)) return ScpiError::IllegalValue;
+        if (!isGroupType(group)) return ScpiError::IllegalValue;
     }
     m_settings.groupSequence = sequence;
     return ScpiError::None;

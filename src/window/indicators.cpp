@@ -47,12 +47,10 @@ private:
 /// The commands that switch the RF output.
 constexpr std::array kOutputs = {":OUTPUT:STAT OFF", ":OUTPUT:STAT ON"};
 
-constexpr VisaStatus kNoListeners = -1073807265;  // BFFF005F: a library finds nobody on the bus
-
 /// What says that there is nobody at the other end. A call that was stopped, a device that another program holds and
 /// one that is slow to answer do not.
 constexpr std::array kLosses = {visa::kConnectionLost, visa::kInputOutput, visa::kResourceNotFound,
-                                visa::kInvalidObject,  visa::kSystemError, kNoListeners};
+                                visa::kInvalidObject,  visa::kSystemError, visa::kNoListeners};
 
 }  // namespace
 

@@ -1,12 +1,9 @@
 // What replacing a file promises where owners, links and devices are known.
 #include <gtest/gtest.h>
-#include <sys/resource.h>
 #include <sys/stat.h>
-#include <sys/wait.h>
-
-#include <csignal>
 
 #include "settings/profilefile.h"
+#include "support/fulldisk.h"
 #include "support/tempfolder.h"
 #include "support/unprivileged.h"
 
@@ -147,20 +144,10 @@ TEST_F(ReplaceFilePosixTest, FailsOnLinksThatRunInACircle) {
 
 TEST_F(ReplaceFilePosixTest, AFullDiskLeavesTheOldFileAndNothingElse) {
     m_folder.write("a.ini", "old");
-    const pid_t child = fork();
-    ASSERT_GE(child, 0);
-    if (child == 0) {
-        // The disk takes 4096 more bytes: the write beside the file gets stuck half-way.
-        std::signal(SIGXFSZ, SIG_IGN);
-        const rlimit limit{4096, 4096};
-        const bool limited = ::setrlimit(RLIMIT_FSIZE, &limit) == 0;
-        const bool replaced = replaceFile(path("a.ini"), std::string(10000, 'x'));
-        _exit(limited && !replaced ? 0 : 1);
+    {
+        const test::FullDisk disk(4096);  // the write beside the file gets stuck half-way
+        EXPECT_FALSE(replaceFile(path("a.ini"), std::string(10000, 'x')));
     }
-    int status = 0;
-    ASSERT_EQ(::waitpid(child, &status, 0), child);
-    EXPECT_TRUE(WIFEXITED(status));
-    EXPECT_EQ(WEXITSTATUS(status), 0);
     EXPECT_EQ(m_folder.read("a.ini"), "old");
     EXPECT_EQ(entries(), 1);
 }

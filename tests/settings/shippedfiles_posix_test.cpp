@@ -1,11 +1,8 @@
 // Shipped files in folders without rights and on a full disk.
 #include <gtest/gtest.h>
-#include <sys/resource.h>
-#include <sys/wait.h>
-
-#include <csignal>
 
 #include "settings/shippedfilestest.h"
+#include "support/fulldisk.h"
 #include "support/unprivileged.h"
 
 namespace kdx::test {
@@ -42,17 +39,10 @@ TEST_F(ShippedFilesTest, InAFolderThatCannotBeWrittenAChangedFileIsToldAgain) {
 TEST_F(ShippedFilesTest, OnAFullDiskTheEarlierVersionStaysWhole) {
     ship("Event.txt", std::string(10000, 'x'));
     base.write("Event.txt", kEarlier);
-    const pid_t child = fork();
-    ASSERT_GE(child, 0);
-    if (child == 0) {
-        std::signal(SIGXFSZ, SIG_IGN);
-        const rlimit limit{4096, 4096};  // a file takes no more: writing gets stuck half-way
-        const bool limited = ::setrlimit(RLIMIT_FSIZE, &limit) == 0;
-        _exit(limited && start().problem.find("Event.txt") != std::string::npos ? 0 : 1);
+    {
+        const FullDisk disk(4096);  // writing gets stuck half-way
+        EXPECT_NE(start().problem.find("Event.txt"), std::string::npos);
     }
-    int status = 0;
-    ASSERT_EQ(::waitpid(child, &status, 0), child);
-    EXPECT_EQ(status, 0);
     EXPECT_EQ(base.read("Event.txt"), kEarlier);
     start();  // with room again
     EXPECT_EQ(base.read("Event.txt"), std::string(10000, 'x'));

@@ -5,13 +5,13 @@
 
 namespace kdx::test {
 
-/// While it lives no file of this process can grow, as on a full disk.
+/// While it lives no file of this process can grow, as on a full disk; where there is room left, beyond so many bytes.
 class FullDisk {
 public:
-    FullDisk() {
+    explicit FullDisk(rlim_t room = 0) {
         getrlimit(RLIMIT_FSIZE, &m_before);
-        const rlimit none{0, m_before.rlim_max};
-        setrlimit(RLIMIT_FSIZE, &none);
+        const rlimit limit{room, m_before.rlim_max};
+        setrlimit(RLIMIT_FSIZE, &limit);
     }
     ~FullDisk() {
         setrlimit(RLIMIT_FSIZE, &m_before);
