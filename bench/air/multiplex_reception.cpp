@@ -26,6 +26,7 @@ void append(const OnAir& sent, std::vector<bool>& bits) {
 int main(int argc, char** argv) {
     if (argc < 3) return 2;
     const int rate = std::atoi(argv[1]);
+    if (rate <= 0) return 2;
     const auto start = parseAirTime("2026-01-01 12:00:00");
     if (!start) return 1;
     Broadcast broadcast(*start, {});

@@ -10,6 +10,8 @@ InstallDirRegKey HKCU "Software\KDX-RDS" "Folder"
 RequestExecutionLevel user
 SetCompressor /SOLID lzma
 
+!include FileFunc.nsh
+!include LogicLib.nsh
 !include MUI2.nsh
 !define MUI_ICON "${ICON}"
 !define UNINSTALL "Software\Microsoft\Windows\CurrentVersion\Uninstall\KDX-RDS"
@@ -29,10 +31,17 @@ VIAddVersionKey /LANG=0 "FileDescription" "KDX-RDS set-up"
 VIAddVersionKey /LANG=0 "LegalCopyright" "MIT licence"
 
 Section
+    ; A folder of its own, whatever was chosen: it is removed later, and nobody else's files are to go with it.
+    ${GetFileName} "$INSTDIR" $0
+    ${If} $0 != "KDX-RDS"
+        StrCpy $INSTDIR "$INSTDIR\KDX-RDS"
+    ${EndIf}
     ; What an earlier version had and this one has not is not to stay.
-    RMDir /r "$INSTDIR\bin"
-    RMDir /r "$INSTDIR\share\kdx-rds"
-    RMDir /r "$INSTDIR\licences"
+    ${If} ${FileExists} "$INSTDIR\uninstall.exe"
+        RMDir /r "$INSTDIR\bin"
+        RMDir /r "$INSTDIR\share\kdx-rds"
+        RMDir /r "$INSTDIR\licences"
+    ${EndIf}
     SetOutPath "$INSTDIR"
     File /r "${FILES}/*"
     WriteUninstaller "$INSTDIR\uninstall.exe"
@@ -49,7 +58,7 @@ Section
 SectionEnd
 
 Section "Uninstall"
-    ; Only what came with the set-up: the folder may have been one with other things in it.
+    ; Only what came with the set-up: whoever put other things beside it keeps them.
     RMDir /r "$INSTDIR\bin"
     RMDir /r "$INSTDIR\share\kdx-rds"
     RMDir "$INSTDIR\share"

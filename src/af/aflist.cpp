@@ -5,12 +5,13 @@
 
 #include "base/numbers.h"
 #include "base/split.h"
+#include "coder/listlead.h"
 #include "settings/storedvalue.h"
 
 namespace kdx {
 
 std::string newOrFurtherList(int number) {
-    return number == 1 ? "N," : "+,";
+    return std::string(number == 1 ? kNewListLead : kFurtherListLead);
 }
 
 std::size_t afCount(std::string_view list) {

@@ -11,6 +11,7 @@
 #include "air/receiverfrequencies.h"
 #include "air/receivernetworks.h"
 #include "air/receivertrafficchannel.h"
+#include "coder/fieldsizes.h"
 
 namespace kdx::air {
 
@@ -27,12 +28,12 @@ struct RadioState {
     };
     std::uint64_t groups = 0;
     std::optional<std::uint16_t> pi;
-    std::array<std::uint8_t, 8> ps{' ', ' ', ' ', ' ', ' ', ' ', ' ', ' '};  ///< as the display stands now
+    std::array<std::uint8_t, kPsLength> ps{' ', ' ', ' ', ' ', ' ', ' ', ' ', ' '};  ///< as the display stands now
     std::optional<int> pty;
     std::optional<bool> tp, ta, music;
     std::array<std::optional<bool>, 4> decoderInfo;  ///< d3 first
     std::optional<bool> radiotextB;                  ///< the flag
-    std::array<std::uint8_t, 64> radiotext{};
+    std::array<std::uint8_t, kRadiotextLength> radiotext{};
     std::uint64_t radiotextHeard = 0;  ///< a bit for each character that came since the flag changed
     std::vector<FrequencyList> frequencies;
     std::optional<ClockTime> clock;

@@ -4,6 +4,7 @@
 
 #include "air/receivercharacters.h"
 #include "air/receiverfrequencies.h"
+#include "base/numbers.h"
 
 namespace kdx::air {
 
@@ -76,9 +77,9 @@ std::string time(unsigned code) {
     constexpr unsigned kHours = 96;
     constexpr unsigned kDays = 201;
     constexpr unsigned kMonths = 232;
-    const auto twoDigits = [](unsigned value) { return (value < 10 ? "0" : "") + number(value); };
-    if (code < kHours) return twoDigits(code / 4) + ":" + twoDigits(code % 4 * 15);
-    if (code < kDays) return twoDigits((code - kHours) % 24) + ":00, days later " + number((code - kHours) / 24);
+    const auto digits = [](unsigned value) { return twoDigits(static_cast<int>(value)); };
+    if (code < kHours) return digits(code / 4) + ":" + digits(code % 4 * 15);
+    if (code < kDays) return digits((code - kHours) % 24) + ":00, days later " + number((code - kHours) / 24);
     if (code < kMonths) return "day of the month " + number(code - kDays + 1);
     const bool end = (code - kMonths) % 2 == 1;
     return std::string(end ? "end" : "middle") + " of month " + number((code - kMonths) / 2 + 1);

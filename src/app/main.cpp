@@ -143,6 +143,7 @@ int main(int argc, char** argv) {
     kdx::DataFolder data(kdx::appFolder(options, argv[0], !options.tourFolder, news));
     if (!news.problem.empty()) std::fprintf(stderr, "kdx-rds: %s\n", news.problem.c_str());
     for (const auto& shipped : news.kept) std::fprintf(stderr, "kdx-rds: %s\n", kdx::keptFileText(shipped).c_str());
+    if (!options.tourFolder) kdx::leaveTerminal();
     kdx::sweepLeftovers(data.path());
     const kdx::FolderClaim claim(data.path());
     kdx::ProgramState state;

@@ -38,8 +38,10 @@ void waitReadable(int descriptor, std::chrono::milliseconds time);
 /// From now on writing to a pipe that nobody reads any more fails, instead of ending the program.
 void surviveBrokenPipes();
 
-/// From now on the system's requests to end the program (SIGTERM, SIGINT, SIGHUP) no longer end it at once: they make
-/// the descriptor that this gives readable. -1 when they cannot be had so.
+/// From now on the system's requests to end the program (SIGTERM, SIGINT, SIGHUP; on Windows Ctrl+C, Ctrl+Break and the
+/// closing of the console) no longer end it at once: they make the descriptor that this gives readable, for the calls
+/// here. -1 when they cannot be had so: to a program with windows on Windows nobody says it, and what is broken off at
+/// the console that it was started from does not concern it.
 [[nodiscard]] int endRequests();
 
 /// Opens what of standard input, output and error the caller has closed: else the next file opened would take its place
@@ -49,6 +51,10 @@ void openStandardStreams();
 /// Where a program with windows begins without the terminal that it was started from, it gets it back to print to, and
 /// terminals take texts as UTF-8; where all that is so anyway, nothing happens.
 void useTerminal();
+
+/// A program with windows goes on without that terminal: closing it ends nothing. Nothing can be printed any more
+/// there; elsewhere nothing happens.
+void leaveTerminal();
 
 /// Whether something that was printed is lost, and not since its reader has gone away.
 [[nodiscard]] bool outputIsLost();

@@ -126,6 +126,8 @@ void openStandardStreams() {
 
 void useTerminal() {}
 
+void leaveTerminal() {}
+
 bool outputIsLost() {
     if (std::fflush(stdout) == 0 && std::ferror(stdout) == 0) return false;
     pollfd asked{STDOUT_FILENO, POLLOUT, 0};

@@ -13,7 +13,7 @@ std::string printable(std::string_view text) {
             result += "\\n";
         } else if (c == '\r') {
             result += "\\r";
-        } else if (byte < 0x20 || byte >= 0x7F) {
+        } else if (isControl(c) || byte >= 0x80) {
             result += {'\\', 'x', kDigits[byte >> 4U], kDigits[byte & 0xFU]};
         } else {
             result += c;

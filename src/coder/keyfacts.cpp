@@ -9,6 +9,7 @@
 #include "base/numbers.h"
 #include "base/split.h"
 #include "coder/fieldsizes.h"
+#include "coder/listlead.h"
 #include "coder/rdscharacters.h"
 #include "settings/captions.h"
 #include "settings/storedvalue.h"
@@ -121,7 +122,8 @@ bool isFrequencyList(std::string_view text) {
 }
 
 bool isLedFrequencyList(std::string_view text) {
-    return (text.starts_with("N,") || text.starts_with("+,")) && isFrequencyList(text.substr(2));
+    const auto list = afterListLead(text);
+    return list && isFrequencyList(*list);
 }
 
 bool isMessage(std::string_view text) {

@@ -9,6 +9,7 @@
 #include "base/clock.h"
 #include "base/codepage.h"
 #include "base/numbers.h"
+#include "coder/fieldsizes.h"
 #include "link/instrument.h"
 #include "settings/programstate.h"
 
@@ -212,11 +213,11 @@ std::string formatted(const ParamRow& row, std::string& value, const ParamContex
         case Format::AsGiven:
             return value;
         case Format::Pad8:
-            return padRight(value, 8);
+            return padRight(value, kPsLength);
         case Format::Pad4:
-            return padRight(value, 4);
+            return padRight(value, kPiLength);
         case Format::Pad4WriteBack:
-            value = padRight(value, 4);
+            value = padRight(value, kPiLength);
             return value;
         case Format::TwoDigits:
             return rightmost("00" + value, 2);

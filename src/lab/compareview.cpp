@@ -10,6 +10,7 @@
 #include <algorithm>
 
 #include "base/printable.h"
+#include "coder/listlead.h"
 #include "coder/sendparam.h"
 #include "lab/settingnames.h"
 #include "lab/viewtable.h"
@@ -193,8 +194,8 @@ void CompareView::showRow(int row, const SettingSideBySide& setting) {
     const QString network = setting.network.empty() ? QString() : QLatin1String("  ") + toText(setting.network);
     const auto shown = [](const std::optional<std::string>& value) {
         if (!value) return QStringLiteral("\u2013");
-        const bool list = value->starts_with("N,") || value->starts_with("+,");  // how it is sent is no part of it
-        return toText(printableLine(list ? value->substr(2) : *value, '\xB7'));
+        // How a list is sent is no part of it.
+        return toText(printableLine(afterListLead(*value).value_or(*value), '\xB7'));
     };
     const bool silent = !setting.instrument && !m_present.empty() && setting.network.empty();
     const QStringList cells{

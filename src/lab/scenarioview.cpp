@@ -163,7 +163,7 @@ void ScenarioView::Ablauf_Oeffnen_Click() {
         m_with.dialogs.fileToOpen(windowTitle(), caption({990, "Szenario (*.yaml *.yml)"}), folderToOpen());
     if (file.isEmpty()) return;
     m_folder = QFileInfo(file).absolutePath();
-    open(file);
+    openFile(file);
 }
 
 /// Where scenarios are to be found; a folder that is not there would be taken for the name of a file.
@@ -177,7 +177,7 @@ QString ScenarioView::folderToOpen() const {
     return {};
 }
 
-void ScenarioView::open(const QString& file) {
+void ScenarioView::openFile(const QString& file) {
     const auto bytes = readFile(QFileInfo(file).filesystemFilePath());
     QStringList problems;
     scenario::Reading reading;

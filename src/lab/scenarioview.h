@@ -57,7 +57,7 @@ private:
     void Ablauf_Pause_Click();
     void Ablauf_Weiter_Click();
     void arrange();
-    void open(const QString& file);
+    void openFile(const QString& file);
     void showState();
     void showEnd(const scenario::Outcome& outcome);
     [[nodiscard]] QString folderToOpen() const;

@@ -198,7 +198,7 @@ void RdsPage::Timer1_Timer() {
     showClock(toText(timeText(m_with.clock)));
     m_clockShowsWord = false;
     const Tick tick(m_with, caption({836, "Uhr"}), [this] { Zeit_Taste_Click(); });
-    m_with.params.SendParam(setting::kClock, toBytes(Uhr_Zeit->text()));
+    m_with.params.SendParam(setting::kClock, m_with.state.shownClock);
 }
 
 void RdsPage::Uhr_Zeit_DblClick() {

@@ -1,14 +1,14 @@
 #include "settings/corrections.h"
 
-#include "base/numbers.h"
 #include "settings/profile.h"
+#include "settings/storedvalue.h"
 
 namespace kdx {
 
 Corrections readCorrections(const Profile& profile) {
     Corrections corrections;
     for (const auto& [key, isOn] : kCorrectionKeys) {
-        corrections.*isOn = leadingNumber(profile.read({KeptIn::General, kCorrectionSection, key})) == 1;
+        corrections.*isOn = isSwitchedOn(profile.read({KeptIn::General, kCorrectionSection, key}));
     }
     return corrections;
 }

@@ -4,6 +4,7 @@
 #include <filesystem>
 #include <optional>
 #include <string_view>
+#include <system_error>
 
 namespace kdx {
 
@@ -47,6 +48,10 @@ struct FileIdentity {
 
 /// Whether another living process may still be writing the file, which the one of that number has begun.
 [[nodiscard]] bool mayStillBeWritten(const std::filesystem::path& file, std::uint64_t process);
+
+/// Renames a file onto another one. The error is permission_denied where a third program holds one of both at the
+/// moment.
+void renameFile(const std::filesystem::path& from, const std::filesystem::path& to, std::error_code& error);
 
 /// Makes a rename in the folder last through a power cut, where the system can promise that.
 void flushFolder(const std::filesystem::path& folder);

@@ -105,6 +105,10 @@ bool mayStillBeWritten(const std::filesystem::path&, std::uint64_t process) {
     return ::kill(static_cast<pid_t>(process), 0) == 0 || errno != ESRCH;
 }
 
+void renameFile(const std::filesystem::path& from, const std::filesystem::path& to, std::error_code& error) {
+    std::filesystem::rename(from, to, error);
+}
+
 void flushFolder(const std::filesystem::path& folder) {
     const FileDescriptor descriptor(::open(folder.empty() ? "." : folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC));
     if (descriptor.isOpen()) ::fsync(descriptor.number());

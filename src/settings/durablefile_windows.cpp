@@ -83,7 +83,8 @@ bool isSettled(const FileIdentity& identity) {
 }
 
 bool userMayWrite(const std::filesystem::path& file) {
-    return File(file, FILE_APPEND_DATA, OPEN_EXISTING).isOpen();
+    // Whoever holds it at the moment says nothing about rights.
+    return File(file, FILE_APPEND_DATA, OPEN_EXISTING).isOpen() || GetLastError() == ERROR_SHARING_VIOLATION;
 }
 
 bool writeNewFile(const std::filesystem::path& file, std::string_view bytes, const std::filesystem::path& /*model*/) {
@@ -115,6 +116,14 @@ bool mayStillBeWritten(const std::filesystem::path&, std::uint64_t process) {
     const bool lives = WaitForSingleObject(found, 0) == WAIT_TIMEOUT;
     CloseHandle(found);
     return lives;
+}
+
+void renameFile(const std::filesystem::path& from, const std::filesystem::path& to, std::error_code& error) {
+    error.clear();
+    if (MoveFileExW(from.c_str(), to.c_str(), MOVEFILE_REPLACE_EXISTING | MOVEFILE_WRITE_THROUGH) != 0) return;
+    const DWORD why = GetLastError();
+    const bool held = why == ERROR_ACCESS_DENIED || why == ERROR_SHARING_VIOLATION || why == ERROR_LOCK_VIOLATION;
+    error = std::make_error_code(held ? std::errc::permission_denied : std::errc::io_error);
 }
 
 void flushFolder(const std::filesystem::path&) {}  // the system keeps a log of names by itself

@@ -45,10 +45,7 @@ bool replaceFile(const fs::path& file, std::string_view bytes) {
     std::error_code error;
     if (writeNewFile(beside, bytes, *target)) {
         SystemClock clock;
-        const auto rename = [](const fs::path& from, const fs::path& to, std::error_code& why) {
-            fs::rename(from, to, why);
-        };
-        if (renameOver(beside, *target, clock, rename)) {
+        if (renameOver(beside, *target, clock, renameFile)) {
             flushFolder(target->parent_path());
             return true;
         }

@@ -5,6 +5,7 @@
 #include <limits>
 #include <string>
 
+#include "base/codepage.h"
 #include "base/numbers.h"
 #include "settings/profilelines.h"
 
@@ -45,6 +46,14 @@ int storedEntry(std::string_view text, int count) {
 
 std::string storedFlag(std::string_view text) {
     return text == "1" ? "1" : "0";
+}
+
+bool isSwitchedOn(std::string_view text) {
+    return leadingNumber(text) == 1;
+}
+
+bool opensAtStart(std::string_view text) {
+    return equalNoCase(text, "AUTO");
 }
 
 std::string quotedWhereNeeded(const std::string& text) {

@@ -21,6 +21,12 @@ namespace kdx {
 /// The text of a flag: "1" for a stored "1", else "0".
 [[nodiscard]] std::string storedFlag(std::string_view text);
 
+/// Whether a switch of the general settings is on: the stored text begins with the number 1.
+[[nodiscard]] bool isSwitchedOn(std::string_view text);
+
+/// Whether the stored text wants the session opened at the start: "AUTO" in any letter case.
+[[nodiscard]] bool opensAtStart(std::string_view text);
+
 /// The text as it is to be written so that the same text is read: reading takes off blanks at the edges, and one pair
 /// of quotes.
 [[nodiscard]] std::string quotedWhereNeeded(const std::string& text);

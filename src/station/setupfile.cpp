@@ -7,6 +7,7 @@
 #include "af/settings.h"
 #include "base/numbers.h"
 #include "coder/keyfacts.h"
+#include "coder/listlead.h"
 #include "groups/settings.h"
 #include "rds/settings.h"
 #include "settings/profilefile.h"
@@ -79,8 +80,7 @@ public:
     void keep(const std::string& key, const std::string& value) {
         if (const Setting* setting = settingOf(kAsRead, key)) {
             // What leads a list tells the coder which one it is; the file tells it by the key.
-            const bool list = value.starts_with("N,") || value.starts_with("+,");
-            write(setting->place, list ? value.substr(2) : value);
+            write(setting->place, std::string(afterListLead(value).value_or(value)));
         } else if (const Setting* text = settingOf(kTexts, key)) {
             write(text->place, quotedWhereNeeded(value));
         } else if (key == setting::kGroupSequence.sendKey) {

@@ -84,8 +84,7 @@ void Multiplex::appendSteps(Steps& steps, const Corrections& corrections) const 
     appendStep(steps, setting::kPilotDeviation.sendKey, pilotDeviation);
     appendStep(steps, setting::kPilotPhase.sendKey, pilotPhase);
     appendStep(steps, setting::kAri.sendKey, ari);
-    // These three are spelled otherwise than the dispatcher's keys ("ARI-HUB", "ARI-ID", "ARI-BK"), so none becomes a
-    // step: a whole data set leaves the ARI details of the instrument as they are.
+    // On purpose no keys of the dispatcher (stereo/settings.h).
     appendStep(steps, "ARI_HUB", ariDeviation);
     appendStep(steps, "ARI_ID", ariType);
     appendStep(steps, "AR_BK", ariArea);

@@ -18,6 +18,8 @@ inline constexpr Setting kPilot{"PILOT", {KeptIn::General, "FM", "PILOT"}};
 inline constexpr Setting kPilotDeviation{"PILOT_HUB", {KeptIn::General, "FM", "PILOT_HUB"}};
 inline constexpr Setting kPilotPhase{"PILOT_PHASE", {KeptIn::General, "FM", "PILOT_PHASE"}};
 inline constexpr Setting kAri{"ARI", {KeptIn::General, "FM", "ARI"}};
+// A whole data set names these three "ARI_HUB", "ARI_ID" and "AR_BK", which the dispatcher does not know: it leaves the
+// ARI details of the instrument as they are.
 inline constexpr Setting kAriDeviation{"ARI-HUB", {KeptIn::General, "FM", "ARI_HUB"}};
 inline constexpr Setting kAriType{"ARI-ID", {KeptIn::General, "FM", "ARI_ID"}};
 // Stored with a hyphen as a letter, read with an underscore as a number: a choice does not come back at the next start.

@@ -7,6 +7,7 @@
 #include <string_view>
 
 #include "base/codepage.h"
+#include "base/printable.h"
 
 namespace kdx {
 
@@ -18,10 +19,14 @@ namespace kdx {
     return text;
 }
 
+/// Whether the character is a control character of ASCII.
+[[nodiscard]] inline bool isControl(QChar c) {
+    return c < QChar(0x80) && isControl(c.toLatin1());
+}
+
 /// An entered text as it can be sent and kept in one line: control characters become blanks, CR LF a single one; those
 /// at either end are left out. Blanks stay as typed.
 [[nodiscard]] inline QString withoutControls(QStringView text) {
-    const auto isControl = [](QChar c) { return c < QChar(0x20) || c == QChar(0x7F); };
     while (!text.isEmpty() && isControl(text.front())) text = text.sliced(1);
     while (!text.isEmpty() && isControl(text.back())) text.chop(1);
     QString plain;
@@ -35,7 +40,7 @@ namespace kdx {
 /// A text as a title shows it: each control character as a blank.
 [[nodiscard]] inline QString withBlanks(QString text) {
     for (QChar& c : text) {
-        if (c < QChar(0x20) || c == QChar(0x7F)) c = QLatin1Char(' ');
+        if (isControl(c)) c = QLatin1Char(' ');
     }
     return text;
 }

@@ -14,13 +14,12 @@
 
 #include <chrono>
 
-#include "base/codepage.h"
-#include "base/numbers.h"
 #include "link/commandsequence.h"
 #include "settings/captions.h"
 #include "settings/datafolder.h"
 #include "settings/generalsettings.h"
 #include "settings/programstate.h"
+#include "settings/storedvalue.h"
 #include "tmc/tmclistedit.h"
 #include "ui/controls.h"
 #include "ui/dialogs.h"
@@ -199,7 +198,7 @@ void HMenue::startUp() {
     m_s.state.InterfaceKind = profile.read(setting::kInterface);
     m_connection->Schnittstellen_Toggle();
     m_s.state.InstrumentOnline = false;
-    m_s.state.LogEnabled = leadingNumber(profile.read(setting::kCommandLogOn)) == 1;
+    m_s.state.LogEnabled = isSwitchedOn(profile.read(setting::kCommandLogOn));
     showSessionOpen(false);
     Beschrifter();
     m_s.state.CurrentDataSet = "1";
@@ -208,7 +207,7 @@ void HMenue::startUp() {
     loadPages();
     m_desktop->restorePlace();
     m_s.session.instrument.log.empty();
-    if (upperCase(profile.read(setting::kOpenAtStart)) == "AUTO") INIT_Taste_Click();
+    if (opensAtStart(profile.read(setting::kOpenAtStart))) INIT_Taste_Click();
 }
 
 void HMenue::loadPages() {

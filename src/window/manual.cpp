@@ -67,15 +67,15 @@ void Manual::openAt(const QWidget& control) {
     if (asking->isModal()) {  // which lets nothing be used but its own windows
         auto* view = asking->findChild<ManualView*>(QString(), Qt::FindDirectChildrenOnly);
         if (view == nullptr) view = new ManualView(m_folder, m_with, asking);
-        view->open(place);
+        view->openAt(place);
         return;
     }
     if (auto* view = qobject_cast<ManualView*>(asking)) {  // also one that belongs to an editor
-        view->open(place);
+        view->openAt(place);
         return;
     }
     if (m_view == nullptr) m_view = new ManualView(m_folder, m_with, m_window);
-    m_view->open(place);
+    m_view->openAt(place);
 }
 
 void Manual::label() {

@@ -1,5 +1,6 @@
 #include "window/manualview.h"
 
+#include <QDir>
 #include <QFileInfo>
 #include <QLabel>
 #include <QLineEdit>
@@ -80,7 +81,7 @@ ManualView::ManualView(std::filesystem::path folder, const PageContext& with, QW
     for (QPushButton* way : {Handbuch_Zurueck, Handbuch_Vor}) way->setEnabled(false);
     connect(Handbuch_Text, &QTextBrowser::backwardAvailable, Handbuch_Zurueck, &QWidget::setEnabled);
     connect(Handbuch_Text, &QTextBrowser::forwardAvailable, Handbuch_Vor, &QWidget::setEnabled);
-    Handbuch_Inhalt = button("Handbuch_Inhalt", {1113, "&Inhalt"}, this, [this] { open({}); });
+    Handbuch_Inhalt = button("Handbuch_Inhalt", {1113, "&Inhalt"}, this, [this] { openAt({}); });
     for (QPushButton* way : {Handbuch_Zurueck, Handbuch_Vor, Handbuch_Inhalt})
         m_book.tip(way, {1142, "Zurück und Vor: Kapitel, die schon offen waren; Inhalt: alle Kapitel"});
     Handbuch_Suche = named<QLineEdit>("Handbuch_Suche", this);
@@ -126,7 +127,7 @@ void ManualView::label() {
     if (m_language != languageFolder() && !shown.isEmpty()) showChapter(shown);
 }
 
-void ManualView::open(const ManualPlace& place) {
+void ManualView::openAt(const ManualPlace& place) {
     showChapter(QString::fromLatin1(place.chapter));
     show();
     raise();
@@ -142,7 +143,8 @@ void ManualView::showChapter(const QString& chapter) {
         return;
     }
     Handbuch_Text->setSource(QUrl());  // so that the chapter is read anew when it is there
-    Handbuch_Text->setPlainText(captionText(m_with.captions, {1116, "Das Handbuch fehlt. Gesucht wurde %1"}).arg(file));
+    Handbuch_Text->setPlainText(captionText(m_with.captions, {1116, "Das Handbuch fehlt. Gesucht wurde %1"})
+                                    .arg(QDir::toNativeSeparators(file)));
 }
 
 /// From its heading on; a chapter that has no such picture is left as it is.

@@ -27,7 +27,7 @@ public:
     /// @param folder the manual's, with a folder of chapters for each of its languages.
     ManualView(std::filesystem::path folder, const PageContext& with, QWidget* parent);
 
-    void open(const ManualPlace& place);
+    void openAt(const ManualPlace& place);
     /// Captions the view, and shows the same chapter in the language of now.
     void label();
 

@@ -11,12 +11,12 @@
 
 #include <algorithm>
 
-#include "base/codepage.h"
 #include "base/numbers.h"
 #include "rds/settings.h"
 #include "settings/captions.h"
 #include "settings/generalsettings.h"
 #include "settings/programstate.h"
+#include "settings/storedvalue.h"
 #include "stereo/settings.h"
 #include "ui/layouts.h"
 #include "ui/text.h"
@@ -140,7 +140,7 @@ void SettingsDialog::label() {
 
 void SettingsDialog::load() {
     Log_Schalter->setChecked(m_with.state.LogEnabled);
-    Auto_Schalter->setChecked(upperCase(m_with.profile.read(setting::kOpenAtStart)) == "AUTO");
+    Auto_Schalter->setChecked(opensAtStart(m_with.profile.read(setting::kOpenAtStart)));
     const auto stored = [this](const Place& place) { return leadingNumber(m_with.profile.read(place)); };
     {
         const QSignalBlocker quiet(PS_Dyn_Zahl);

@@ -82,9 +82,10 @@ TEST_F(EditorTest, TheHintOfACommaMovesNothing) {
             EXPECT_FALSE(hint->text().isEmpty()) << entry;
             const auto after = places();
             ASSERT_EQ(after.size(), before.size());
-            for (std::size_t i = 0; i < after.size(); ++i)
+            for (std::size_t i = 0; i < after.size(); ++i) {
                 EXPECT_EQ(after[i].second, before[i].second)
                     << language << ' ' << after[i].first->objectName().toStdString();
+            }
             EXPECT_LE(hint->heightForWidth(hint->width()), hint->height()) << language << " is cut off";
         }
     }

@@ -71,11 +71,12 @@ TEST(ReadLoggedCommandsTest, NamesEachCommandThatIsNotWhole) {
 TEST(ReadLoggedCommandsTest, AnAnswerThatDoesNotEndIsNamedAndSwallowsNoCommand) {
     for (const std::string end : {"\n", "\r\n"}) {
         const std::string good = "             TP= \"TP ON\"" + end;
-        for (const std::string cut : {"Answer \"", "Answer \"98"}) {
-            const auto logged = readLoggedCommands("           FREQ= " + cut + end + good);
+        for (const std::string answer : {"Answer \"", "Answer \"98"}) {
+            const std::string cut = "           FREQ= " + answer;
+            const auto logged = readLoggedCommands(std::string(cut).append(end).append(good));
             EXPECT_EQ(logged.unreadableLines, Numbers{1});
             EXPECT_EQ(logged.commands, (Commands{{"TP", "TP ON"}}));
-            EXPECT_EQ(readLoggedCommands(good + "           FREQ= " + cut).unreadableLines, Numbers{2});
+            EXPECT_EQ(readLoggedCommands(good + cut).unreadableLines, Numbers{2});
         }
     }
 }

@@ -1,3 +1,5 @@
+#include <QPushButton>
+
 #include "scenariotest.h"
 #include "support/everyfont.h"
 
@@ -33,23 +35,23 @@ TEST_F(ScenarioViewTest, BeginsToLookWhereScenariosAre) {
     const auto folderShown = [this](const std::filesystem::path& chosen) {
         dialogs.files.push_back(QString::fromStdString(chosen.string()));
         click("Ablauf_Oeffnen");
-        return dialogs.shown.back().preset.toStdString();
+        return std::filesystem::path(dialogs.shown.back().preset.toStdString());
     };
     const auto own = folder.data() / "Scenarios";
     openView();
-    EXPECT_EQ(folderShown({}), own.string()) << "none are shipped";
+    EXPECT_EQ(folderShown({}), own) << "none are shipped";
     std::filesystem::remove_all(own);
     EXPECT_EQ(folderShown({}), "") << "no folder that is not there";
     shipped = folder.path() / "shipped";
     const auto theirs = shipped / "Daten" / "Scenarios";
     std::filesystem::create_directories(theirs);
     openView();
-    EXPECT_EQ(folderShown({}), theirs.string());
+    EXPECT_EQ(folderShown({}), theirs);
     std::filesystem::create_directories(folder.path() / "mine");
     const auto mine = folder.path() / "mine" / "a.yaml";
     std::ofstream(mine) << "steps: [note: a]";
-    EXPECT_EQ(folderShown(mine), theirs.string());
-    EXPECT_EQ(folderShown({}), (folder.path() / "mine").string());
+    EXPECT_EQ(folderShown(mine), theirs);
+    EXPECT_EQ(folderShown({}), folder.path() / "mine");
 }
 
 TEST_F(ScenarioViewTest, OfALongValueThereIsAsMuchToBeSeenAsFits) {

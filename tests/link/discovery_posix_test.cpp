@@ -153,6 +153,7 @@ TEST(Discovery, AnswersThatAreNoneAreNoInstruments) {
     };
     const Mappers mappers({"127.0.0.1"}, [&](const std::string&, std::uint32_t question) {
         std::vector<std::string> datagrams;
+        datagrams.reserve(garbage.size());
         for (const auto& make : garbage) datagrams.push_back(make(question));
         return datagrams;
     });

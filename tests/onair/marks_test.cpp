@@ -1,5 +1,7 @@
 #include "onairviewtest.h"
 
+#include <gmock/gmock.h>
+
 #include <chrono>
 
 namespace kdx::test {

@@ -4,6 +4,8 @@
 #include <QFile>
 #include <QGuiApplication>
 
+#include <regex>
+
 #include "onairviewtest.h"
 
 namespace kdx::test {
@@ -174,7 +176,8 @@ TEST_F(OnAirViewTest, TheSpectrumAndThePeakDeviationFollowTheMultiplex) {
     };
     session->params.SendParam("PILOT", "1");
     const QImage withPilot = shown();
-    EXPECT_THAT(text("Air_Spitzenhub"), ::testing::MatchesRegex("Spitzenhub [0-9]+[.][0-9] kHz"));
+    const std::string deviation = text("Air_Spitzenhub");
+    EXPECT_TRUE(std::regex_match(deviation, std::regex("Spitzenhub [0-9]+[.][0-9] kHz"))) << deviation;
     session->params.SendParam("PILOT", "0");
     const QImage without = shown();
     EXPECT_NE(withPilot, without);

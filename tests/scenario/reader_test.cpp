@@ -114,7 +114,7 @@ TEST(ReaderTest, ForcedValuesNeedNotBeLegalButKeysMustBeThere) {
 
 TEST(ReaderTest, EightStepsWithinEachOtherAreTaken) {
     std::string inner = "note: x";
-    for (int depth = 1; depth < 8; ++depth) inner = "{repeat: 2, steps: [" + inner + "]}";
+    for (int depth = 1; depth < 8; ++depth) inner.insert(0, "{repeat: 2, steps: [").append("]}");
     EXPECT_EQ(reads("steps: [" + inner + "]").actions.size(), 1U);
 }
 

@@ -74,8 +74,8 @@ TEST_F(ProfileIndexTest, FindsWhatIsWrittenOneAfterTheOther) {
     for (int round = 0; round < 200; ++round) {
         ProfileText text(anyFile());
         for (int written = 0; written < 6; ++written) {
-            const std::string section = kNames[below(kNames.size())];
-            const std::string key = kNames[below(kNames.size())];
+            const std::string& section = kNames[below(kNames.size())];
+            const std::string& key = kNames[below(kNames.size())];
             text.setValue(section, key, std::to_string(written + 10));
             ASSERT_EQ(text.value(section, key), std::to_string(written + 10)) << text.bytes();
             expectReadsLineByLine(text);

@@ -77,6 +77,16 @@ TEST(StoredFlag, IsOnForAPlainOneOnly) {
     for (const char* off : {"", "0", "1.0", " 1", "x"}) EXPECT_EQ(storedFlag(off), "0") << off;
 }
 
+TEST(IsSwitchedOn, ForTheNumberOneWhateverFollowsIt) {
+    for (const char* on : {"1", " 1", "1.0", "01", "1 x"}) EXPECT_TRUE(isSwitchedOn(on)) << on;
+    for (const char* off : {"", "0", "2", "-1", "1.5", "10", "x", "ON"}) EXPECT_FALSE(isSwitchedOn(off)) << off;
+}
+
+TEST(OpensAtStart, ForItsWordInAnyLetterCase) {
+    for (const char* yes : {"AUTO", "auto", "Auto"}) EXPECT_TRUE(opensAtStart(yes)) << yes;
+    for (const char* no : {"", "MANUAL", "AUTO ", "AUT", "AUTOS", "1"}) EXPECT_FALSE(opensAtStart(no)) << no;
+}
+
 struct LimitCase {
     const char* entered;
     const char* lower;

@@ -125,6 +125,8 @@ TEST_F(PortMapperTest, AnswersWhatIsAskedOfEverybodyInItsNetwork) {
 
 TEST(PortMapper, TakesAPortThatIsFreeForBothProtocols) {
     constexpr rlim_t kSocketsAndMore = 6000;
+    constexpr std::size_t kInTheWay = 5000;
+    constexpr std::size_t kMappers = 40;
     rlimit files{};
     ASSERT_EQ(::getrlimit(RLIMIT_NOFILE, &files), 0);
     files.rlim_cur = std::max(files.rlim_cur, std::min(files.rlim_max, kSocketsAndMore));
@@ -132,9 +134,11 @@ TEST(PortMapper, TakesAPortThatIsFreeForBothProtocols) {
     if (files.rlim_cur < kSocketsAndMore) GTEST_SKIP() << "this machine allows too few open sockets";
     PollLoop loop;
     std::vector<std::unique_ptr<PortMapper>> mappers;
+    mappers.reserve(kMappers);
     std::vector<FileDescriptor> inTheWay;
-    for (int count = 0; count < 5000; ++count) inTheWay.push_back(bindUdp(kQuietAddress, 0));
-    for (int count = 0; count < 40; ++count) {
+    inTheWay.reserve(kInTheWay);
+    for (std::size_t count = 0; count < kInTheWay; ++count) inTheWay.push_back(bindUdp(kQuietAddress, 0));
+    for (std::size_t count = 0; count < kMappers; ++count) {
         mappers.push_back(std::make_unique<PortMapper>(loop, std::vector<PortMapping>(), kQuietAddress, 0));
     }
 }

@@ -6,6 +6,7 @@
 int main(int argc, char** argv) {
     if (!qEnvironmentVariableIsSet("QT_QPA_PLATFORM")) qputenv("QT_QPA_PLATFORM", "offscreen");
     testing::InitGoogleTest(&argc, argv);
+    QCoreApplication::setAttribute(Qt::AA_DontUseNativeDialogs);  // no test can press the keys of the system's own
     const kdx::Application application(argc, argv);
     return RUN_ALL_TESTS();
 }

@@ -57,6 +57,7 @@ public:
         std::filesystem::copy(
             sourceFolder() / "Daten", data(),
             std::filesystem::copy_options::recursive | std::filesystem::copy_options::overwrite_existing);
+        std::filesystem::remove(data() / "RDS_log.txt");  // of whoever tried the programs on that folder
     }
 
 private:

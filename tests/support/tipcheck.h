@@ -50,9 +50,9 @@ inline std::set<std::string> expectATipOnEveryControl(const QWidget& window, con
     for (const QWidget* control : window.findChildren<QWidget*>()) {
         if (control->focusPolicy() == Qt::NoFocus || isPartOfControl(*control) || onlyShows(*control)) continue;
         const std::string name = control->objectName().toStdString();
-        const std::string what = where + ": " + control->metaObject()->className() + " " + name;
-        EXPECT_FALSE(control->toolTip().isEmpty()) << what;
-        EXPECT_NE(control->toolTip(), shownText(control).remove(QLatin1Char('&'))) << what;
+        const std::string what = where + ": " + control->metaObject()->className();
+        EXPECT_FALSE(control->toolTip().isEmpty()) << what << ' ' << name;
+        EXPECT_NE(control->toolTip(), shownText(control).remove(QLatin1Char('&'))) << what << ' ' << name;
         found.insert(name);
     }
     return found;

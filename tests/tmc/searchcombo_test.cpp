@@ -21,9 +21,10 @@ protected:
     Lines found() {
         const auto* list = find<QAbstractItemView>("TMC_Event_Combo_Treffer");
         Lines rows;
-        for (int row = 0; row < list->model()->rowCount(); ++row)
+        for (int row = 0; row < list->model()->rowCount(); ++row) {
             rows.push_back(
                 list->model()->index(row, 0).data().toString().section(QLatin1Char(' '), 0, 0).toStdString());
+        }
         return rows;
     }
 };

@@ -125,10 +125,11 @@ TEST_F(KilledWindowTest, EveryFileIsWholeAndEachValueOldOrNew) {
     EXPECT_EQ(m_seen.size(), 2 * kChanged.size()) << "the kills have to have come at work, or they show nothing";
 
     sweepLeftovers(folder.data());
-    for (const auto& entry : std::filesystem::directory_iterator(folder.data()))
+    for (const auto& entry : std::filesystem::directory_iterator(folder.data())) {
         EXPECT_TRUE(std::filesystem::exists(sourceFolder() / "Daten" / entry.path().filename()) ||
                     entry.path().filename() == kCommandLog)
             << entry.path();
+    }
 }
 
 }  // namespace

@@ -18,17 +18,15 @@
 namespace kdx::test {
 
 /// The pages by their place.
-enum Page : std::uint8_t {
-    kStereoPage,
-    kRdsPage,
-    kAfPage,
-    kGroupPage,
-    kEonPage,
-    kQueryPage,
-    kStorePage,
-    kTmcPage,
-    kRfPage
-};
+constexpr int kStereoPage = 0;
+constexpr int kRdsPage = 1;
+constexpr int kAfPage = 2;
+constexpr int kGroupPage = 3;
+constexpr int kEonPage = 4;
+constexpr int kQueryPage = 5;
+constexpr int kStorePage = 6;
+constexpr int kTmcPage = 7;
+constexpr int kRfPage = 8;
 
 /// A user before the whole window, on the shipped data, with the virtual instrument on the bench: its calls run in a
 /// thread of their own as in the program. Only what can be seen and is enabled can be used.
@@ -45,7 +43,7 @@ protected:
         ask("SYST:ERR?");  // opening deletes networks, also where there is none
     }
     /// Opens the session and goes to a page.
-    void workOn(Page page) {
+    void workOn(int page) {
         openSession();
         showPage(page);
         heard = [this](const Traffic& traffic) {
@@ -54,7 +52,7 @@ protected:
         };
     }
 
-    void showPage(Page page) {
+    void showPage(int page) {
         WindowTest::showPage(page);
         QCoreApplication::processEvents();
     }

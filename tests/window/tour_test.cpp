@@ -57,7 +57,7 @@ TEST_F(TourTest, ASessionOpenedAtTheStartIsClosedBeforeItsOwn) {
 TEST_F(TourTest, EndsEarlyWhenItsWindowIsClosed) {
     sim::VirtualInstrument instrument(clock);
     sim::SimVisa visa(instrument);
-    print = [this, print = print](const std::string& line) {
+    print = [print = print](const std::string& line) {
         print(line);
         if (line != "-> *IDN?") return;
         for (QWidget* top : QApplication::topLevelWidgets()) top->hide();

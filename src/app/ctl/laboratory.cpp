@@ -6,7 +6,6 @@
 #include "app/appfolder.h"
 #include "app/platform.h"
 #include "base/codepage.h"
-#include "base/numbers.h"
 #include "base/paths.h"
 #include "base/printable.h"
 #include "coder/keyfacts.h"
@@ -14,6 +13,7 @@
 #include "link/visastatus.h"
 #include "settings/generalsettings.h"
 #include "settings/shippedfiles.h"
+#include "settings/storedvalue.h"
 #include "settings/withoutcontrols.h"
 #include "sim/virtualinstrument.h"
 #include "station/wrongsettings.h"
@@ -66,7 +66,7 @@ Laboratory::Laboratory(const Call& call, Output& output, const char* program, in
         m_session->transmitter.stop();
     });
     const Profile& profile = m_session->profile;
-    m_state.LogEnabled = leadingNumber(profile.read(setting::kCommandLogOn)) == 1;
+    m_state.LogEnabled = isSwitchedOn(profile.read(setting::kCommandLogOn));
     m_session->readCorrections();
     m_captions.load(profile.read(setting::kLanguage), profile.read(setting::kStandard));
     m_session->transmitter.setWatcher(this);

@@ -6,6 +6,7 @@
 #include "app/ctl/call.h"
 #include "app/platform.h"
 #include "base/codepage.h"
+#include "base/printable.h"
 #include "settings/shownpath.h"
 
 namespace kdx::ctl {
@@ -20,7 +21,7 @@ std::string harmless(const std::string& text) {
         const auto byte = static_cast<unsigned char>(text[at]);
         // Those of the code page beyond 7F are two bytes, C2 80 to C2 9F.
         const bool beyond = byte == 0xC2 && at + 1 < text.size() && static_cast<unsigned char>(text[at + 1]) < 0xA0;
-        const bool control = (byte < 0x20 && byte != '\n') || byte == 0x7F || beyond;
+        const bool control = (isControl(text[at]) && text[at] != '\n') || beyond;
         result += control ? '.' : text[at];
         if (beyond) ++at;
     }
