@@ -3,8 +3,7 @@
 #include <QClipboard>
 #include <QFile>
 #include <QGuiApplication>
-
-#include <regex>
+#include <QRegularExpression>
 
 #include "onairviewtest.h"
 
@@ -176,8 +175,8 @@ TEST_F(OnAirViewTest, TheSpectrumAndThePeakDeviationFollowTheMultiplex) {
     };
     session->params.SendParam("PILOT", "1");
     const QImage withPilot = shown();
-    const std::string deviation = text("Air_Spitzenhub");
-    EXPECT_TRUE(std::regex_match(deviation, std::regex("Spitzenhub [0-9]+[.][0-9] kHz"))) << deviation;
+    const QRegularExpression deviation(QStringLiteral("^Spitzenhub [0-9]+[.][0-9] kHz$"));
+    EXPECT_TRUE(deviation.match(QString::fromStdString(text("Air_Spitzenhub"))).hasMatch()) << text("Air_Spitzenhub");
     session->params.SendParam("PILOT", "0");
     const QImage without = shown();
     EXPECT_NE(withPilot, without);
