@@ -94,8 +94,11 @@ TEST_F(PortMapperTest, AnswersOverUdpToo) {
     EXPECT_EQ(ask(newWriter.callMessage(3, {})).status, static_cast<std::uint32_t>(PROG_MISMATCH));
 }
 
-/// An address of this machine that no client takes: closed connections would hold its ports for a minute.
+/// Addresses of this machine that no client takes: closed connections would hold their ports for a minute. The test
+/// that takes thousands of ports has one to itself, for tests run side by side.
 constexpr const char* kQuietAddress = "127.0.0.77";
+constexpr const char* kOtherQuietAddress = "127.0.0.78";
+constexpr const char* kCrowdedAddress = "127.0.0.79";
 
 /// Asks by UDP whoever is at the place for the port of the core channel.
 std::optional<Reply> askAt(const std::string& place, unsigned short port, int timeoutMs) {
@@ -137,15 +140,15 @@ TEST(PortMapper, TakesAPortThatIsFreeForBothProtocols) {
     mappers.reserve(kMappers);
     std::vector<FileDescriptor> inTheWay;
     inTheWay.reserve(kInTheWay);
-    for (std::size_t count = 0; count < kInTheWay; ++count) inTheWay.push_back(bindUdp(kQuietAddress, 0));
+    for (std::size_t count = 0; count < kInTheWay; ++count) inTheWay.push_back(bindUdp(kCrowdedAddress, 0));
     for (std::size_t count = 0; count < kMappers; ++count) {
-        mappers.push_back(std::make_unique<PortMapper>(loop, std::vector<PortMapping>(), kQuietAddress, 0));
+        mappers.push_back(std::make_unique<PortMapper>(loop, std::vector<PortMapping>(), kCrowdedAddress, 0));
     }
 }
 
 TEST(PortMapper, TwoInOneNetworkBothAnswer) {
     PollLoop loop;
-    const PortMapper one(loop, {{kCore, 1, 4711}}, "127.0.0.1", 0);
+    const PortMapper one(loop, {{kCore, 1, 4711}}, kOtherQuietAddress, 0);
     const PortMapper two(loop, {{kCore, 1, 4712}}, kQuietAddress, one.port());
     const RunningLoop running(loop);
     EXPECT_TRUE(askAt("127.255.255.255", one.port(), 5000));
