@@ -3,15 +3,11 @@
 Usage: ctl_corrections_test.py PATH-OF-KDX-CTL
 """
 
-import json
-import sys
-import unittest
-
-import ctl_test
-from ctl_test import DIFFERENT, WRONG_CALL
+import kdxctl
+from kdxctl import DIFFERENT, WRONG_CALL
 
 
-class Corrected(ctl_test.Ctl):
+class Corrected(kdxctl.Ctl):
     def change(self, name, section, key, value):
         """Puts a value in the place of a section's key, which need not be there."""
         file = self.folder / "Daten" / name
@@ -96,5 +92,4 @@ class Corrected(ctl_test.Ctl):
 
 
 if __name__ == "__main__":
-    ctl_test.CTL = sys.argv.pop(1)
-    unittest.main()
+    kdxctl.main()

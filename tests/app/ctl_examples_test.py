@@ -9,25 +9,23 @@ import re
 import shlex
 import shutil
 import subprocess
-import sys
-import unittest
 
-import ctl_test
-from ctl_test import DIFFERENT, DONE, NO_CONNECTION
+import kdxctl
+from kdxctl import DIFFERENT, DONE, NO_CONNECTION
 
 README = pathlib.Path(__file__).parents[2] / "README.md"
 # What they find out: differences, what a file does not keep, warnings, that no instrument is in this network.
 ALSO = {"budget": DIFFERENT, "diff": DIFFERENT, "play": DIFFERENT, "read": DIFFERENT, "find": NO_CONNECTION}
 
 
-class Examples(ctl_test.Ctl):
+class Examples(kdxctl.Ctl):
     def setUp(self):
         super().setUp()
         # Where an example needs an instrument the virtual one takes its place.
         self.program = self.folder / "kdx-ctl"
         self.program.write_text(f"""#!/bin/sh
 case " $* " in *" --simulate "*) ;; *) set -- --simulate "$@" ;; esac
-exec {shlex.quote(ctl_test.CTL)} --app-folder {shlex.quote(str(self.folder))} "$@"
+exec {shlex.quote(kdxctl.CTL)} --app-folder {shlex.quote(str(self.folder))} "$@"
 """)
         self.program.chmod(0o755)
         self.simulated("send", "PS=RADIO")  # so that there is a log
@@ -82,5 +80,4 @@ exec {shlex.quote(ctl_test.CTL)} --app-folder {shlex.quote(str(self.folder))} "$
 
 
 if __name__ == "__main__":
-    ctl_test.CTL = sys.argv.pop(1)
-    unittest.main()
+    kdxctl.main()

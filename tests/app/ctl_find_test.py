@@ -11,17 +11,16 @@ import subprocess
 import sys
 import threading
 import time
-import unittest
 
-import ctl_test
-from ctl_test import DONE, FAILED, NO_CONNECTION, WRONG_CALL
+import kdxctl
+from kdxctl import FAILED, NO_CONNECTION, WRONG_CALL
 
-SIM = LIBRARY = ""
+LIBRARY = ""
 
 
-class Find(ctl_test.Ctl):
+class Find(kdxctl.Ctl):
     def startSim(self, address, *options):
-        sim = subprocess.Popen([SIM, "--bind", address, *options], stdout=subprocess.PIPE, text=True)
+        sim = subprocess.Popen([kdxctl.SIM, "--bind", address, *options], stdout=subprocess.PIPE, text=True)
         self.addCleanup(sim.stdout.close)
         self.addCleanup(sim.wait)
         self.addCleanup(sim.kill)
@@ -114,6 +113,5 @@ class Find(ctl_test.Ctl):
 
 
 if __name__ == "__main__":
-    ctl_test.CTL, SIM, LIBRARY = sys.argv[1:4]
-    del sys.argv[1:4]
-    unittest.main()
+    LIBRARY = sys.argv.pop(3)
+    kdxctl.main(networked=True)

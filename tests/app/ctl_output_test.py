@@ -11,14 +11,12 @@ import re
 import resource
 import signal
 import subprocess
-import sys
-import unittest
 
-import ctl_test
-from ctl_test import DIFFERENT, DONE, FAILED, NO_CONNECTION, WRONG_CALL
+import kdxctl
+from kdxctl import DIFFERENT, DONE, FAILED, NO_CONNECTION, WRONG_CALL
 
 
-class Lost(ctl_test.Networked):
+class Lost(kdxctl.Networked):
     """Output that cannot be written."""
 
     def into(self, output, *arguments, **how):
@@ -76,7 +74,7 @@ class Lost(ctl_test.Networked):
                 self.assertEqual((run.returncode, run.stderr), (DONE, ""))
 
 
-class Progress(ctl_test.Ctl):
+class Progress(kdxctl.Ctl):
     """The count on the standard error while that is a terminal."""
 
     def shown(self, *arguments, expect=DONE):
@@ -140,7 +138,7 @@ class Progress(ctl_test.Ctl):
         self.assertEqual(self.shown("-v", "query", "ari"), "")
 
 
-class Manner(ctl_test.Networked):
+class Manner(kdxctl.Networked):
     def testQuietPrintsOnlyResultsAndProblems(self):
         into = str(self.folder / "a.INI")
         self.assertIn("written", self.simulated("read", "--into", into, expect=DIFFERENT).stdout)
@@ -168,7 +166,7 @@ class Manner(ctl_test.Networked):
         self.assertRegex(shown, r"(?m)  \[-1073807339: .*time-out.*\]$")
 
 
-class Documents(ctl_test.Ctl):
+class Documents(kdxctl.Ctl):
     def testAWrongCallIsADocumentToo(self):
         for call in (("nonsense",), ("apply", "--data-set", "6"), ("send",), ("--lan",), ("--gpib", "31", "query", "ps"),
                      ("--timeout", "0", "query", "ps"), ("diff", "--data-set", "1", "--file", "x"), ()):
@@ -185,6 +183,4 @@ class Documents(ctl_test.Ctl):
 
 
 if __name__ == "__main__":
-    ctl_test.CTL, ctl_test.SIM = sys.argv[1:3]
-    del sys.argv[1:3]
-    unittest.main()
+    kdxctl.main(networked=True)

@@ -9,17 +9,13 @@ import pty
 import select
 import signal
 import subprocess
-import sys
 import time
-import unittest
 
-import ctl_test
-from ctl_test import DIFFERENT, DONE, FAILED, NO_CONNECTION, WRONG_CALL
-
-SIM = ""
+import kdxctl
+from kdxctl import DIFFERENT, DONE, FAILED, NO_CONNECTION, WRONG_CALL
 
 
-class Piped(ctl_test.Ctl):
+class Piped(kdxctl.Ctl):
     def shell(self, lines, *options, expect=DONE):
         """What comes of these lines, given all at once."""
         text = lines if isinstance(lines, bytes) else lines.encode()
@@ -127,7 +123,7 @@ class Piped(ctl_test.Ctl):
         self.assertIn(b"cannot be written", run.stderr)
 
 
-class Held(ctl_test.Ctl):
+class Held(kdxctl.Ctl):
     """A shell that a program holds: it writes a line and reads its answer."""
 
     def setUp(self):
@@ -153,7 +149,7 @@ class Held(ctl_test.Ctl):
         return self.process.returncode, rest, problems
 
     def startSim(self):
-        sim = subprocess.Popen([SIM, "--bind", "127.0.0.1"], stdout=subprocess.PIPE, text=True)
+        sim = subprocess.Popen([kdxctl.SIM, "--bind", "127.0.0.1"], stdout=subprocess.PIPE, text=True)
         self.addCleanup(sim.stdout.close)
         self.addCleanup(sim.wait)
         self.addCleanup(sim.kill)
@@ -231,7 +227,7 @@ class Held(ctl_test.Ctl):
         self.assertEqual(problems.count("\n"), 1, problems)
 
 
-class AtATerminal(ctl_test.Ctl):
+class AtATerminal(kdxctl.Ctl):
     def setUp(self):
         super().setUp()
         self.terminal, other = pty.openpty()
@@ -331,6 +327,4 @@ class AtATerminal(ctl_test.Ctl):
 
 
 if __name__ == "__main__":
-    ctl_test.CTL, SIM = sys.argv[1:3]
-    del sys.argv[1:3]
-    unittest.main()
+    kdxctl.main(networked=True)

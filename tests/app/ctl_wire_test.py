@@ -5,20 +5,18 @@ Usage: ctl_wire_test.py PATH-OF-KDX-CTL PATH-OF-KDX-RDS PATH-OF-KDX-SIM
 
 import os
 import re
-import shutil
 import signal
 import subprocess
 import sys
-import unittest
 
-import ctl_test
+import kdxctl
 import shippeddata
-from ctl_test import DONE, FAILED
+from kdxctl import FAILED
 
 RDS = ""
 
 
-class Wire(ctl_test.Ctl):
+class Wire(kdxctl.Ctl):
     def setUp(self):
         super().setUp()
         self.trace = self.folder / "trace.txt"
@@ -27,7 +25,7 @@ class Wire(ctl_test.Ctl):
     def startSim(self):
         """A new instrument, as after switching on."""
         with open(self.trace, "w", encoding="ascii") as trace:
-            self.sim = subprocess.Popen([ctl_test.SIM, "--bind", "127.0.0.1", "--trace"], stdout=trace)
+            self.sim = subprocess.Popen([kdxctl.SIM, "--bind", "127.0.0.1", "--trace"], stdout=trace)
         self.addCleanup(self.sim.wait)
         self.addCleanup(self.sim.kill)
         self.waitFor(lambda text: "ready:" in text)
@@ -156,6 +154,5 @@ class Ended(Wire):
 
 
 if __name__ == "__main__":
-    ctl_test.CTL, RDS, ctl_test.SIM = sys.argv[1:4]
-    del sys.argv[1:4]
-    unittest.main()
+    RDS = sys.argv.pop(2)
+    kdxctl.main(networked=True)

@@ -10,21 +10,19 @@ import resource
 import signal
 import struct
 import subprocess
-import sys
 import time
-import unittest
 
-import ctl_test
-from ctl_test import DONE
+import kdxctl
+from kdxctl import DONE
 
 FAILED, WRONG_USAGE = 1, 2
 SAMPLES_A_SECOND = 228000
 LINE = re.compile(r"^(?:[0-9A-F]{4} ){4}@\d{4}/\d\d/\d\d \d\d:\d\d:\d\d\.\d\d$")
 
 
-class OnAir(ctl_test.Ctl):
+class OnAir(kdxctl.Ctl):
     def begun(self, *options, ready="stdout", **how):
-        sim = subprocess.Popen([ctl_test.SIM, "--bind", "127.0.0.1", *options], stdout=subprocess.PIPE,
+        sim = subprocess.Popen([kdxctl.SIM, "--bind", "127.0.0.1", *options], stdout=subprocess.PIPE,
                                stderr=subprocess.PIPE, **how)
         self.addCleanup(sim.stdout.close)
         self.addCleanup(sim.stderr.close)
@@ -149,7 +147,7 @@ class OnAir(ctl_test.Ctl):
                            (self.folder / "pipe", "is no plain file"),
                            (self.folder / "none" / "x", "cannot be written")):
             for option in ("--groups", "--mpx"):
-                run = subprocess.run([ctl_test.SIM, "--bind", "127.0.0.1", option, str(place)], capture_output=True,
+                run = subprocess.run([kdxctl.SIM, "--bind", "127.0.0.1", option, str(place)], capture_output=True,
                                      timeout=10)
                 self.assertEqual(run.returncode, FAILED)
                 self.assertIn(f"kdx-sim: {place} {why}", run.stderr.decode())
@@ -164,16 +162,14 @@ class OnAir(ctl_test.Ctl):
 
     def testTheStandardOutputIsGivenToOneOnly(self):
         for options in (("--groups", "-", "--mpx", "-"), ("--groups", "-", "--trace"), ("--mpx", "-", "--trace")):
-            run = subprocess.run([ctl_test.SIM, *options], capture_output=True, timeout=10)
+            run = subprocess.run([kdxctl.SIM, *options], capture_output=True, timeout=10)
             self.assertEqual((run.returncode, run.stdout), (WRONG_USAGE, b""))
             self.assertIn(b"only one of", run.stderr)
         same = str(self.folder / "same")
-        run = subprocess.run([ctl_test.SIM, "--groups", same, "--mpx", same], capture_output=True, timeout=10)
+        run = subprocess.run([kdxctl.SIM, "--groups", same, "--mpx", same], capture_output=True, timeout=10)
         self.assertEqual((run.returncode, os.path.exists(same)), (WRONG_USAGE, False))
         self.assertIn(b"name the same file", run.stderr)
 
 
 if __name__ == "__main__":
-    ctl_test.CTL, ctl_test.SIM = sys.argv[1:3]
-    del sys.argv[1:3]
-    unittest.main()
+    kdxctl.main(networked=True)
