@@ -6,7 +6,10 @@
 #include <memory>
 
 #include "settings/folderlock.h"
-#include "support/pagetest.h"
+#include "support/controltest.h"
+#include "support/linkfixture.h"
+#include "support/scripteddialogs.h"
+#include "ui/ticker.h"
 #include "window/hmenue.h"
 
 namespace kdx::test {

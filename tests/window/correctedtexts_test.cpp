@@ -3,6 +3,7 @@
 #include <QComboBox>
 #include <QPalette>
 
+#include "ui/text.h"
 #include "window/correctionstest.h"
 
 namespace kdx::test {

@@ -4,6 +4,7 @@
 #include <QListWidget>
 #include <QMenu>
 
+#include "ui/text.h"
 #include "window/datasetstest.h"
 
 namespace kdx::test {

@@ -14,6 +14,7 @@
 
 #include "settings/corrections.h"
 #include "support/everyfont.h"
+#include "support/pagetest.h"
 #include "support/windowtest.h"
 
 namespace kdx::test {
