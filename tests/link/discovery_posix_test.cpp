@@ -4,6 +4,7 @@
 #include "link/lanvisa.h"
 #include "vxi11/xdr.h"
 
+#include "support/loopbackport.h"
 #include "support/scriptedvxi11.h"
 
 #include <gmock/gmock.h>

@@ -2,6 +2,8 @@
 
 #include <thread>
 
+#include "support/loopbackport.h"
+
 namespace kdx::test {
 namespace {
 

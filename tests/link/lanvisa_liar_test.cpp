@@ -2,6 +2,8 @@
 
 #include <algorithm>
 
+#include "support/rawrecord.h"
+
 namespace kdx::test {
 namespace {
 

@@ -4,6 +4,8 @@
 
 #include <thread>
 
+#include "support/loopbackport.h"
+
 namespace kdx::test {
 namespace {
 

@@ -1,8 +1,9 @@
 #include "support/scriptedvxi11.h"
 
+#include "support/loopbackport.h"
+#include "support/rawrecord.h"
 #include "vxi11.h"
 
-#include <arpa/inet.h>
 #include <netinet/in.h>
 #include <netinet/tcp.h>
 #include <poll.h>
@@ -10,27 +11,13 @@
 #include <sys/socket.h>
 #include <unistd.h>
 
-#include <algorithm>
 #include <array>
-#include <cstring>
 #include <stdexcept>
+#include <utility>
 
 namespace kdx::test {
 
 namespace {
-
-constexpr std::uint32_t kLastFragment = 0x80000000U;
-
-void appendWord(std::string& bytes, std::uint32_t value) {
-    const std::uint32_t big = htonl(value);
-    bytes.append(reinterpret_cast<const char*>(&big), sizeof big);
-}
-
-std::uint32_t wordAt(const std::string& bytes, std::size_t at) {
-    std::uint32_t value = 0;
-    std::memcpy(&value, bytes.data() + at, sizeof value);
-    return ntohl(value);
-}
 
 template <class Fields>
 std::string encoded(bool_t (*coder)(XDR*, Fields*), Fields& fields) {
@@ -65,42 +52,6 @@ bool sendAll(int descriptor, const std::string& bytes) {
         sent += static_cast<std::size_t>(taken);
     }
     return true;
-}
-
-std::string record(const std::string& message) {
-    std::string bytes;
-    appendWord(bytes, kLastFragment | static_cast<std::uint32_t>(message.size()));
-    return bytes + message;
-}
-
-std::string fragments(const std::string& message) {
-    constexpr std::size_t kFragment = 5;  // not a multiple of the four bytes that fields have
-    std::string bytes;
-    for (std::size_t at = 0; at < message.size(); at += kFragment) {
-        const std::string part = message.substr(at, kFragment);
-        const bool last = at + kFragment >= message.size();
-        appendWord(bytes, (last ? kLastFragment : 0) | static_cast<std::uint32_t>(part.size()));
-        bytes += part;
-    }
-    return bytes;
-}
-
-int listenOnLoopback(int backlog, std::uint16_t wantedPort, std::uint16_t& port) {
-    const int listener = socket(AF_INET, SOCK_STREAM | SOCK_CLOEXEC, 0);
-    sockaddr_in address{};
-    address.sin_family = AF_INET;
-    address.sin_addr.s_addr = htonl(INADDR_LOOPBACK);
-    address.sin_port = htons(wantedPort);
-    const int on = 1;
-    setsockopt(listener, SOL_SOCKET, SO_REUSEADDR, &on, sizeof on);
-    socklen_t size = sizeof address;
-    if (bind(listener, reinterpret_cast<sockaddr*>(&address), size) != 0 || listen(listener, backlog) != 0 ||
-        getsockname(listener, reinterpret_cast<sockaddr*>(&address), &size) != 0) {
-        close(listener);
-        throw std::runtime_error("no loopback port to listen on");
-    }
-    port = ntohs(address.sin_port);
-    return listener;
 }
 
 }  // namespace
@@ -347,44 +298,6 @@ std::string ScriptedVxi11::perform(std::uint32_t procedure, const Reaction& reac
         default:
             throw std::runtime_error("an unexpected call");
     }
-}
-
-DeafPort::DeafPort() {
-    m_listener = listenOnLoopback(0, 0, m_port);
-    sockaddr_in address{};
-    address.sin_family = AF_INET;
-    address.sin_addr.s_addr = htonl(INADDR_LOOPBACK);
-    address.sin_port = htons(m_port);
-    // Fill the queue until a connection has to wait.
-    for (;;) {
-        m_waiting.push_back(socket(AF_INET, SOCK_STREAM | SOCK_NONBLOCK | SOCK_CLOEXEC, 0));
-        if (connect(m_waiting.back(), reinterpret_cast<sockaddr*>(&address), sizeof address) == 0) continue;
-        pollfd waiting{m_waiting.back(), POLLOUT, 0};
-        if (poll(&waiting, 1, 20) == 0) return;
-    }
-}
-
-DeafPort::~DeafPort() {
-    for (const int descriptor : m_waiting) close(descriptor);
-    close(m_listener);
-}
-
-std::string claims(std::uint32_t length) {
-    std::string mark;
-    appendWord(mark, kLastFragment | length);
-    return mark;
-}
-
-std::string answerTo(std::uint32_t call) {
-    std::string message;
-    for (const std::uint32_t word : {call, 1U, 0U, 0U, 0U, 0U}) appendWord(message, word);  // 1: a reply
-    return record(message);
-}
-
-std::uint16_t closedPort() {
-    std::uint16_t port = 0;
-    close(listenOnLoopback(1, 0, port));
-    return port;
 }
 
 }  // namespace kdx::test

@@ -6,36 +6,13 @@
 #include <functional>
 #include <map>
 #include <mutex>
-#include <optional>
 #include <string>
 #include <thread>
 #include <vector>
 
-namespace kdx::test {
+#include "support/reaction.h"
 
-/// What the scripted device does about one call.
-struct Reaction {
-    enum class Kind {
-        Answer,
-        AnswerInPieces,     ///< the reply's bytes one by one
-        AnswerInFragments,  ///< the reply as a record of many fragments
-        AnswerTwice,        ///< first with the number of an earlier call
-        Silence,
-        StopReading,  ///< silence, and whatever follows stays in the network
-        Close,        ///< hangs up
-        Raw,          ///< sends `raw` and nothing else
-        RawAndClose,  ///< sends `raw` and hangs up
-        RawForEver    ///< sends `raw`, then `again` after each `pause`, until the client hangs up
-    };
-    Kind kind = Kind::Answer;
-    long error = 0;                            ///< device error in the reply
-    std::optional<long> reason = {};           ///< of a read, instead of the true one
-    std::uint32_t acceptState = 0;             ///< of the remote procedure call
-    std::optional<std::string> raw = {};       ///< for Raw; for a read: these bytes, whatever was asked for
-    std::optional<std::uint32_t> number = {};  ///< port, or bytes taken over, instead of the true one
-    std::string again = {};                    ///< for RawForEver
-    std::chrono::milliseconds pause = {};      ///< before the answer, too
-};
+namespace kdx::test {
 
 /// A VXI-11 device and its port mapper on one port of the loopback address, which behaves as told. Devices behind it:
 /// "inst0" and "gpib0,28". It serves in a thread of its own until it is destroyed.
@@ -114,29 +91,5 @@ private:
     unsigned long m_maxReceive = 4096;
     std::thread m_thread;
 };
-
-/// A loopback port that never takes a connection: its queue of waiting connections is full.
-class DeafPort {
-public:
-    DeafPort();
-    ~DeafPort();
-    DeafPort(const DeafPort&) = delete;
-    DeafPort& operator=(const DeafPort&) = delete;
-    [[nodiscard]] std::uint16_t port() const { return m_port; }
-
-private:
-    int m_listener = -1;
-    std::vector<int> m_waiting;
-    std::uint16_t m_port = 0;
-};
-
-/// Record mark of one fragment, the last one of its record, that claims to have so many bytes.
-std::string claims(std::uint32_t length);
-
-/// A whole answer that bears another call's number.
-std::string answerTo(std::uint32_t call);
-
-/// A loopback port where nobody listens.
-std::uint16_t closedPort();
 
 }  // namespace kdx::test

@@ -1,6 +1,8 @@
 #include <gtest/gtest.h>
 
 #include "link/lanvisa.h"
+#include "support/loopbackport.h"
+#include "support/rawrecord.h"
 #include "support/scriptedvxi11.h"
 #include "support/windowtest.h"
 
