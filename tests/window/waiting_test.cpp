@@ -1,5 +1,7 @@
 #include "window/waysouttest.h"
 
+#include <QPushButton>
+
 namespace kdx::test {
 namespace {
 
