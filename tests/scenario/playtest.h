@@ -2,6 +2,12 @@
 
 #include <gtest/gtest.h>
 
+#include <chrono>
+#include <deque>
+#include <optional>
+#include <string>
+#include <vector>
+
 #include "scenario/reader.h"
 #include "scenario/runner.h"
 #include "station/session.h"
@@ -16,66 +22,24 @@ class PlayTest : public ::testing::Test,
                  protected scenario::Watcher,
                  protected scenario::Restorer {
 protected:
-    PlayTest() {
-        EXPECT_EQ(session.open("TCPIP", "10.0.0.1"), 0);
-        session.instrument.onFailure([this](const std::string&, bool) {
-            stopped = true;
-            return true;
-        });
-        clock.correctMidnight(true);
-        begin = clock.steadyNow();
-    }
+    PlayTest();
 
-    static scenario::Scenario read(const std::string& text) {
-        scenario::Reading reading = scenario::readScenario(text);
-        for (const auto& problem : reading.problems)
-            ADD_FAILURE() << problem.line << ":" << problem.column << ": " << problem.sentence;
-        return std::move(reading.scenario);
-    }
-    scenario::Outcome play(const std::string& text, const scenario::RunOptions& options = {}) {
-        begin = clock.steadyNow();
-        return scenario::Runner({session, state, clock, *this, *this, this, report}).run(read(text), options);
-    }
+    static scenario::Scenario read(const std::string& text);
+    scenario::Outcome play(const std::string& text, const scenario::RunOptions& options = {});
     /// From a step to a step; "" for the whole.
-    static scenario::RunOptions part(const std::string& from, const std::string& until) {
-        return {scenario::readStepNumber(from), scenario::readStepNumber(until)};
-    }
+    static scenario::RunOptions part(const std::string& from, const std::string& until);
 
-    bool goesOn() override {
-        if (stopAt && clock.steadyNow() - begin >= *stopAt) stopped = true;
-        return !stopped;
-    }
-    Return pressed() override {
-        if (returns.empty() || clock.steadyNow() - begin < returns.front())
-            return inputEnds ? Return::NoLonger : Return::NotYet;
-        returns.pop_front();
-        return Return::Pressed;
-    }
+    bool goesOn() override;
+    Return pressed() override;
     void forgetsTyped() override { ++forgotten; }
     void finishes() override { heard.emplace_back("finishes"); }
-    void begins(const std::string& step, const scenario::Action& action) override {
-        begun.push_back(step + " " + scenario::describe(action));
-    }
-    void happened(const scenario::Row& row) override {
-        std::string line = row.step + " " + row.key + "=" + row.value + " " + row.status;
-        if (!row.answer.empty()) line += " " + row.answer;
-        heard.push_back(line);
-        rows.push_back(row);
-    }
-    void waits(std::chrono::nanoseconds length) override {
-        waited.push_back(std::chrono::duration_cast<std::chrono::milliseconds>(length).count());
-    }
+    void begins(const std::string& step, const scenario::Action& action) override;
+    void happened(const scenario::Row& row) override;
+    void waits(std::chrono::nanoseconds length) override;
     void reportLost() override { heard.emplace_back("report lost"); }
     void ended(const scenario::Outcome&) override { heard.emplace_back("ended"); }
-    bool remember() override {
-        heard.emplace_back("remember");
-        return remembers;
-    }
-    std::optional<SettingCommands> commands() override {
-        heard.emplace_back("bring back");
-        if (silentRestores-- > 0) return std::nullopt;
-        return SettingCommands{{"TA", direct("TA=0")}};
-    }
+    bool remember() override;
+    std::optional<SettingCommands> commands() override;
     [[nodiscard]] Lines untold() const override { return silentBefore; }
     std::optional<Lines> changed() override { return Lines{}; }
 
@@ -97,12 +61,11 @@ protected:
     std::vector<long> writtenAt;  ///< milliseconds since the begin
 
 private:
+    [[nodiscard]] long sinceBegin() const;
+
     TrafficListener m_listener{session.instrument, [this](const Traffic& traffic) {
                                    if (traffic.kind == Traffic::Kind::Written) writtenAt.push_back(sinceBegin());
                                }};
-    [[nodiscard]] long sinceBegin() const {
-        return std::chrono::duration_cast<std::chrono::milliseconds>(clock.steadyNow() - begin).count();
-    }
 };
 
 }  // namespace kdx::test
