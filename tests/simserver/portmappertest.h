@@ -3,10 +3,11 @@
 #include "simserver/portmapper.h"
 
 #include "simserver/rpcclient.h"
-#include "simserver/vxi11fixture.h"
 
+#include <gtest/gtest.h>
 #include <netinet/in.h>
 #include <rpc/pmap_prot.h>
+#include <vxi11.h>
 
 #include <string>
 #include <thread>
