@@ -3,6 +3,7 @@
 #include <QClipboard>
 #include <QFile>
 #include <QGuiApplication>
+#include <QPushButton>
 #include <QRegularExpression>
 
 #include "onairviewtest.h"
