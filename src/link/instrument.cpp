@@ -26,7 +26,7 @@ VisaStatus Instrument::open(const std::string& kind, const std::string& address)
     LastVisaStatus = m_visa.viOpenDefaultRM(DefaultRm);
     std::string description;  // asked for and not shown; its status takes the place of the manager's
     LastVisaStatus = m_visa.viStatusDesc(DefaultRm, LastVisaStatus, description);
-    const std::string resource = resourceText(kind == "TCPIP" ? Resource::Kind::Lan : Resource::Kind::Gpib, address);
+    const std::string resource = resourceText(isLan(kind) ? Resource::Kind::Lan : Resource::Kind::Gpib, address);
     LastVisaStatus = m_visa.viOpen(DefaultRm, resource, 0, 0, InstrSession);
     if (LastVisaStatus == 0) {
         m_state.InstrumentOnline = m_open = true;

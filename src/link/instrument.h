@@ -40,7 +40,7 @@ public:
     void removeWatcher(TrafficWatcher& watcher) { std::erase(m_watchers, &watcher); }
 
     /// Opens the session anew, with a resource manager of its own each time; with 0 it counts as online from here on.
-    /// @param kind "TCPIP" for the LAN, anything else for GPIB; @param address exactly as typed.
+    /// @param kind kLanInterface, anything else for GPIB; @param address exactly as typed.
     VisaStatus open(const std::string& kind, const std::string& address);
     /// Closes the session; a failure stays silent. The handle keeps its value and the instrument counts as online
     /// still: whoever closes keeps commands away from it.

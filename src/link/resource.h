@@ -8,6 +8,15 @@ namespace kdx {
 /// Addresses of the GPIB run from 0 to this one, primary and secondary ones.
 constexpr int kHighestGpibAddress = 30;
 
+/// How the settings and the window name the interface in use.
+inline constexpr const char* kGpibInterface = "IEC";
+inline constexpr const char* kLanInterface = "TCPIP";
+
+/// Whether an interface that is named so is the LAN. A session opens on the GPIB by every other name.
+[[nodiscard]] inline bool isLan(std::string_view interfaceKind) {
+    return interfaceKind == kLanInterface;
+}
+
 /// A VISA resource string taken apart; the views point into it.
 struct Resource {
     enum class Kind { Unknown, Lan, Gpib };

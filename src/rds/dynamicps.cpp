@@ -60,10 +60,14 @@ DynamicPs::DynamicPs(const PageContext& with, const Programme& programme, std::f
     PS_Timer->setEnabled(true);
 }
 
+double DynamicPs::keptInterval(const Profile& profile) {
+    const double interval = leadingNumber(profile.read(setting::kDynamicPsInterval));
+    return std::clamp(interval, 0.0, double{Ticker::kLongestInterval});
+}
+
 void DynamicPs::Taste_PS_Auto_Click() {
     if (!m_running.runs()) {
-        const double interval = leadingNumber(m_with.profile.read(setting::kDynamicPsInterval));
-        PS_Timer->setPeriod(std::clamp(interval, 0.0, double{Ticker::kLongestInterval}));
+        PS_Timer->setPeriod(keptInterval(m_with.profile));
         Taste_PS_Auto->showState(true);
         m_running.setRunning(true);
         m_failureTold = false;
@@ -131,7 +135,7 @@ void DynamicPs::show(const QString& ps) {
 
 void DynamicPs::restoreTypedPs() {
     show(toText(m_typedPs()));
-    m_with.params.SendParam(setting::kPs.sendKey, toBytes(m_with.status.text(StatusSlot::Ps)));
+    m_with.params.SendParam(setting::kPs.sendKey, m_typedPs());
     emit typedPsSent();
 }
 

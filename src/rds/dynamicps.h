@@ -22,6 +22,9 @@ public:
     /// @param typedPs gives the text of `PS_T`.
     DynamicPs(const PageContext& with, const Programme& programme, std::function<std::string()> typedPs, QWidget* page);
 
+    /// The kept interval between two steps in milliseconds, as far as a timer can count; 0 for none.
+    [[nodiscard]] static double keptInterval(const Profile& profile);
+
     void label() { m_book.label(m_with.captions); }
     /// Start-up: the switch shows its off picture.
     void showStopped() { Taste_PS_Auto->showState(false); }

@@ -2,6 +2,8 @@
 
 #include <cmath>
 
+#include "link/resource.h"
+
 namespace kdx {
 
 double HastyClock::secondsSinceMidnight() const {
@@ -56,7 +58,7 @@ Readout Rehearsal::readOut() {
 
 void Rehearsal::open() {
     m_clock.correctMidnight(true);
-    m_session.open("TCPIP", "rehearsal");
+    m_session.open(kLanInterface, "rehearsal");
 }
 
 void Rehearsal::passed(const Traffic& traffic) {

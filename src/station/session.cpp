@@ -1,6 +1,7 @@
 #include "station/session.h"
 
 #include "base/clock.h"
+#include "link/resource.h"
 #include "settings/generalsettings.h"
 #include "settings/programstate.h"
 
@@ -43,7 +44,7 @@ void Session::readCorrections() {
 
 InstrumentAddress Session::storedAddress() const {
     const std::string kind = profile.read(setting::kInterface);
-    return {kind, profile.read(kind == "TCPIP" ? setting::kLanAddress : setting::kGpibAddress)};
+    return {kind, profile.read(isLan(kind) ? setting::kLanAddress : setting::kGpibAddress)};
 }
 
 bool Session::sendOpening() {

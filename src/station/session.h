@@ -13,7 +13,7 @@ namespace kdx {
 
 /// Where an instrument is.
 struct InstrumentAddress {
-    std::string kind;  ///< "IEC" or "TCPIP"
+    std::string kind;  ///< kGpibInterface or kLanInterface
     std::string address;
 };
 

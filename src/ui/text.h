@@ -2,12 +2,14 @@
 
 #include <QLocale>
 #include <QString>
+#include <QStringDecoder>
 
 #include <string>
 #include <string_view>
 
 #include "base/codepage.h"
 #include "base/printable.h"
+#include "settings/withoutcontrols.h"
 
 namespace kdx {
 
@@ -27,14 +29,8 @@ namespace kdx {
 /// An entered text as it can be sent and kept in one line: control characters become blanks, CR LF a single one; those
 /// at either end are left out. Blanks stay as typed.
 [[nodiscard]] inline QString withoutControls(QStringView text) {
-    while (!text.isEmpty() && isControl(text.front())) text = text.sliced(1);
-    while (!text.isEmpty() && isControl(text.back())) text.chop(1);
-    QString plain;
-    for (qsizetype at = 0; at < text.size(); ++at) {
-        if (text.sliced(at).startsWith(QLatin1String("\r\n"))) ++at;
-        plain += isControl(text[at]) ? QLatin1Char(' ') : text[at];
-    }
-    return plain;
+    QStringDecoder read(QStringDecoder::Utf8, QStringDecoder::Flag::ConvertInitialBom);  // one that begins it stays
+    return read(QByteArray::fromStdString(withoutControls(text.toUtf8().toStdString())));
 }
 
 /// A text as a title shows it: each control character as a blank.

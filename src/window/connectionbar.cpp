@@ -6,6 +6,7 @@
 #include <QScrollBar>
 
 #include "base/numbers.h"
+#include "link/resource.h"
 #include "settings/generalsettings.h"
 #include "settings/programstate.h"
 #include "ui/clickablelabel.h"
@@ -65,17 +66,17 @@ ConnectionBar::ConnectionBar(const PageContext& with, QWidget* parent) : QWidget
     layOut(this, whole, 0);
 }
 
-bool ConnectionBar::isLan() const {
-    return m_with.state.InterfaceKind == "TCPIP";
+bool ConnectionBar::onLan() const {
+    return isLan(m_with.state.InterfaceKind);
 }
 
 void ConnectionBar::Schnittstellen_Toggle() {
     Adr1_VScroll->hide();
-    Adr1_Label->setText(toText(m_with.profile.read(isLan() ? setting::kLanAddress : setting::kGpibAddress)));
+    Adr1_Label->setText(toText(m_with.profile.read(onLan() ? setting::kLanAddress : setting::kGpibAddress)));
     Adr1_Label->show();
-    Label6->setVisible(!isLan());
-    INIT_Taste->setText(isLan() ? QStringLiteral("Init TCPIP") : QStringLiteral("Init IEEE"));
-    emit interfaceShown(isLan());
+    Label6->setVisible(!onLan());
+    INIT_Taste->setText(onLan() ? QStringLiteral("Init TCPIP") : QStringLiteral("Init IEEE"));
+    emit interfaceShown(onLan());
 }
 
 void ConnectionBar::chooseInterface(const char* kind) {
@@ -86,7 +87,7 @@ void ConnectionBar::chooseInterface(const char* kind) {
 
 void ConnectionBar::use(const QString& kind, const QString& address) {
     const std::string name = toBytes(kind);
-    m_with.profile.write(name == "TCPIP" ? setting::kLanAddress : setting::kGpibAddress, toBytes(address));
+    m_with.profile.write(isLan(name) ? setting::kLanAddress : setting::kGpibAddress, toBytes(address));
     chooseInterface(name.c_str());
 }
 
@@ -95,7 +96,7 @@ std::string ConnectionBar::address() const {
 }
 
 QString ConnectionBar::openAddress() const {
-    return isLan() ? Adr1_Label->text() : QStringLiteral("GPIB ") + Adr1_Label->text();
+    return onLan() ? Adr1_Label->text() : QStringLiteral("GPIB ") + Adr1_Label->text();
 }
 
 void ConnectionBar::showConnection(const QString& words) {
@@ -104,16 +105,17 @@ void ConnectionBar::showConnection(const QString& words) {
 }
 
 void ConnectionBar::Adr1_Label_Click() {
-    const bool gpib = m_with.state.InterfaceKind == "IEC";
-    if (!gpib && !isLan()) return;
+    const bool gpib = m_with.state.InterfaceKind == kGpibInterface;
+    if (!gpib && !onLan()) return;
     const QString title = toText(m_with.state.InterfaceKind + " Adress.");
     QString typed = Adr1_Label->text();
-    double number = 0;
+    bool possible = true;
     do {
         typed = m_with.dialogs.input(QStringLiteral("Please enter here: "), title, typed);
         if (typed.isEmpty()) return;
-        number = leadingNumber(toBytes(typed));
-    } while (gpib && (number <= 1 || number >= 31));  // 0, 1 and 31 cannot be entered: the program's own limit
+        const double number = leadingNumber(toBytes(typed));
+        possible = !gpib || (number > 1 && number < 31);  // 0, 1 and 31 cannot be entered: the program's own limit
+    } while (!possible);
     Adr1_Label->setText(typed);
     m_with.profile.write(gpib ? setting::kGpibAddress : setting::kLanAddress, toBytes(typed));
 }

@@ -25,7 +25,7 @@ public:
     void label() { m_book.label(m_with.captions); }
     /// Shows the interface in force and its stored address.
     void Schnittstellen_Toggle();
-    /// Puts an interface ("IEC" or "TCPIP") in force and keeps it.
+    /// Puts an interface (kGpibInterface or kLanInterface) in force and keeps it.
     void chooseInterface(const char* kind);
     /// Puts interface and address in force and keeps both.
     void use(const QString& kind, const QString& address);
@@ -44,7 +44,7 @@ signals:
 
 private:
     void Adr1_Label_Click();
-    [[nodiscard]] bool isLan() const;
+    [[nodiscard]] bool onLan() const;
 
     PageContext m_with;
     CaptionBook m_book;

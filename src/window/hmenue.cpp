@@ -44,9 +44,6 @@ namespace kdx {
 
 namespace {
 
-constexpr int kGroupPage = 3;
-constexpr int kQueryPage = 5;
-constexpr int kFirstTabCaption = 10;
 constexpr std::chrono::seconds kRetryInterval{10};  // until what could not be saved is tried again
 
 }  // namespace
@@ -121,8 +118,10 @@ void HMenue::createPages() {
     GTL_Taste->setFixedWidth(GTL_Taste->fontMetrics().horizontalAdvance(QStringLiteral("Local")) + 28);
     SSTab1->setCornerWidget(corner);
 
-    m_pages = makePages(m_context, m_s.session.station, *this);
-    for (Page* page : m_pages) SSTab1->addTab(page, QString());
+    for (const PageRow& row : pageRows()) {
+        m_pages.push_back(row.make(m_context, m_s.session.station, *this));
+        SSTab1->addTab(m_pages.back(), QString());
+    }
     connect(SSTab1, &QTabWidget::currentChanged, this, &HMenue::SSTab1_Click);
     // While no session is open the pages can be looked at, though not used.
     SSTab1->tabBar()->installEventFilter(this);
@@ -150,9 +149,7 @@ void HMenue::createMenu() {
     m_desktop->createMenus(*m_menu, *m_views);
     connect(m_desktop.get(), &Desktop::relabelRequested, this, &HMenue::Beschrifter);
     connect(m_desktop.get(), &Desktop::readAllRequested, this, [this] {
-        if (!SSTab1->isEnabled()) return;
-        SSTab1->setCurrentIndex(kQueryPage);
-        emit readAllRequested();
+        if (SSTab1->isEnabled()) emit readAllRequested();
     });
     connect(m_desktop.get(), &Desktop::sendRequested, this, &HMenue::SetRdsStereo);
     connect(m_desktop.get(), &Desktop::dataSetLoaded, this, [this] {
@@ -231,9 +228,8 @@ void HMenue::Beschrifter() {
     m_connection->label();
     m_desktop->label();
     GTL_Taste->setText(captionText(m_s.captions, {300, "Local"}));
-    for (int i = 0; i < SSTab1->count(); ++i) {
-        SSTab1->setTabText(i, captionText(m_s.captions, {kFirstTabCaption + i}));
-    }
+    int tab = 0;
+    for (const PageRow& row : pageRows()) SSTab1->setTabText(tab++, captionText(m_s.captions, {row.tabCaption}));
     SSTab1->setCurrentIndex(0);
     m_status->label(m_s.captions);
     m_waysOut->label();
@@ -257,6 +253,10 @@ void HMenue::INIT_Taste_Click() {
         return;
     }
     session.sendOpening();
+}
+
+void HMenue::showPage(Page& page) {
+    SSTab1->setCurrentWidget(&page);
 }
 
 void HMenue::SetRdsStereo() {
@@ -317,9 +317,7 @@ void HMenue::closeEvent(QCloseEvent* event) {
 void HMenue::SSTab1_Click(int page) {
     if (page < 0) return;
     m_pages.at(static_cast<std::size_t>(page))->opened();
-    // Not the pages the editor is opened from: its buttons set the kind themselves.
-    if (page == kGroupPage) m_s.state.afEditorKind = "AF";
-    if (page == kQueryPage) m_s.state.afEditorKind = "EON AF";
+    if (const char* lists = pageRows()[static_cast<std::size_t>(page)].afLists) m_s.state.afEditorKind = lists;
 }
 
 void HMenue::Mnu_TMC_Edit_Click() {

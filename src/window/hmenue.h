@@ -38,6 +38,8 @@ public:
     void startUp();
     /// Captions everything in the language and standard of the general settings.
     void Beschrifter();
+    /// Brings a page into view.
+    void showPage(Page& page);
     /// Sends the whole current state in its fixed order.
     void SetRdsStereo();
     void INIT_Taste_Click();

@@ -7,6 +7,7 @@
 #include <QMenu>
 #include <QMenuBar>
 
+#include "link/resource.h"
 #include "settings/captions.h"
 #include "settings/generalsettings.h"
 #include "settings/programstate.h"
@@ -85,11 +86,11 @@ void MainMenu::showSessionOpen(bool open) {
 }
 
 void MainMenu::Mnu_Info_Interface_IEC_Click() {
-    emit interfaceChosen("IEC");
+    emit interfaceChosen(kGpibInterface);
 }
 
 void MainMenu::Mnu_Info_Interface_COM_Click() {
-    emit interfaceChosen("TCPIP");
+    emit interfaceChosen(kLanInterface);
 }
 
 void MainMenu::Mnu_Info_Ueber_Click() {

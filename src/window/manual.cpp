@@ -9,15 +9,11 @@
 #include <utility>
 
 #include "window/manualview.h"
+#include "window/pages.h"
 
 namespace kdx {
 
 namespace {
-
-constexpr std::array kPages = {
-    ManualPlace{"page-fm-stereo.md"}, ManualPlace{"page-rds.md"}, ManualPlace{"page-af-list.md"},
-    ManualPlace{"page-groups.md"},    ManualPlace{"page-eon.md"}, ManualPlace{"page-query.md"},
-    ManualPlace{"page-store.md"},     ManualPlace{"page-tmc.md"}, ManualPlace{"page-rf.md"}};
 
 struct Section {
     const char* window;
@@ -41,7 +37,7 @@ ManualPlace sectionOf(const QWidget& control, int page) {
             if (around->objectName() == QLatin1String(section.window)) return section.place;
         }
     }
-    return kPages.at(static_cast<std::size_t>(page));
+    return page < 0 ? ManualPlace{} : ManualPlace{pageRows()[static_cast<std::size_t>(page)].chapter};
 }
 
 }  // namespace

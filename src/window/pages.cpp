@@ -2,6 +2,7 @@
 
 #include <array>
 
+#include "af/aflist.h"
 #include "af/afpage.h"
 #include "af/eonpage.h"
 #include "groups/grouppage.h"
@@ -18,8 +19,6 @@
 namespace kdx {
 
 namespace {
-
-using MakePage = Page* (*)(const PageContext&, Station&, HMenue&);
 
 Page* makeStereo(const PageContext& with, Station& station, HMenue& window) {
     auto* page = new StereoPage(with, station.multiplex, new TestMode(with, nullptr), &window);
@@ -46,7 +45,10 @@ Page* makeEon(const PageContext& with, Station& station, HMenue& window) {
 Page* makeQueries(const PageContext& with, Station& /*station*/, HMenue& window) {
     auto* page = new QueryPage(with, &window);
     QObject::connect(&window, &HMenue::sessionOpened, page, [page] { page->Fragen_Schalter(true); });
-    QObject::connect(&window, &HMenue::readAllRequested, page, &QueryPage::askAll);
+    QObject::connect(&window, &HMenue::readAllRequested, page, [page, &window] {
+        window.showPage(*page);
+        page->askAll();
+    });
     return page;
 }
 
@@ -64,16 +66,21 @@ Page* makeRf(const PageContext& with, Station& station, HMenue& window) {
     return new RfPage(with, station.carrier, &window);
 }
 
-constexpr std::array<MakePage, 9> kMakers = {makeStereo,  makeRds,   makeAf,  makeGroups, makeEon,
-                                             makeQueries, makeStore, makeTmc, makeRf};
+// The pages that the AF editor is opened from are not the ones that choose its lists: their buttons choose them again.
+constexpr std::array kRows = {PageRow{makeStereo, 10, "page-fm-stereo.md"},
+                              PageRow{makeRds, 11, "page-rds.md"},
+                              PageRow{makeAf, 12, "page-af-list.md"},
+                              PageRow{makeGroups, 13, "page-groups.md", kAfKind},
+                              PageRow{makeEon, 14, "page-eon.md"},
+                              PageRow{makeQueries, 15, "page-query.md", kEonAfKind},
+                              PageRow{makeStore, 16, "page-store.md"},
+                              PageRow{makeTmc, 17, "page-tmc.md"},
+                              PageRow{makeRf, 18, "page-rf.md"}};
 
 }  // namespace
 
-std::vector<Page*> makePages(const PageContext& with, Station& station, HMenue& window) {
-    std::vector<Page*> pages;
-    pages.reserve(kMakers.size());
-    for (const MakePage make : kMakers) pages.push_back(make(with, station, window));
-    return pages;
+std::span<const PageRow> pageRows() {
+    return kRows;
 }
 
 }  // namespace kdx

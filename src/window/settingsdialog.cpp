@@ -12,6 +12,7 @@
 #include <algorithm>
 
 #include "base/numbers.h"
+#include "rds/dynamicps.h"
 #include "rds/settings.h"
 #include "settings/captions.h"
 #include "settings/generalsettings.h"
@@ -144,8 +145,7 @@ void SettingsDialog::load() {
     const auto stored = [this](const Place& place) { return leadingNumber(m_with.profile.read(place)); };
     {
         const QSignalBlocker quiet(PS_Dyn_Zahl);
-        const double interval = std::clamp(stored(setting::kDynamicPsInterval), 0.0, double{Ticker::kLongestInterval});
-        PS_Dyn_Zahl->setValue(static_cast<int>(interval));
+        PS_Dyn_Zahl->setValue(static_cast<int>(DynamicPs::keptInterval(m_with.profile)));
     }
     for (std::size_t i = 0; i < kLimits.size(); ++i) {
         const QSignalBlocker quiet(m_limits[i]);

@@ -10,6 +10,7 @@
 #include "base/printable.h"
 #include "coder/keyfacts.h"
 #include "coder/sendparam.h"
+#include "link/resource.h"
 #include "link/visastatus.h"
 #include "settings/generalsettings.h"
 #include "settings/shippedfiles.h"
@@ -95,11 +96,11 @@ bool Laboratory::open() {
     const Profile& profile = m_session->profile;
     auto [kind, address] = m_session->storedAddress();
     if (m_call.lan) {
-        kind = "TCPIP";
+        kind = kLanInterface;
         address = withoutControls(*m_call.lan);
         if (const auto comma = address.find(','); comma != std::string::npos) address.replace(comma, 1, "::");
     } else if (m_call.gpib) {
-        kind = "IEC";
+        kind = kGpibInterface;
         address = std::to_string(*m_call.gpib);
     } else if (address.empty() && !m_call.program.simulate) {
         m_output.problem("no instrument is named: " + utf8Of(m_data.file(kGeneralSettings)) +
@@ -113,7 +114,7 @@ bool Laboratory::open() {
         if (m_lost) reconnected();
         return true;
     }
-    const std::string place = kind == "TCPIP" ? address : "GPIB address " + address;
+    const std::string place = isLan(kind) ? address : "GPIB address " + address;
     const std::string problem = "no connection to " + place + ": " + statusText();
     // A script learns once that the link is lost, a person with every line.
     if (m_lost && !inputIsTerminal()) {
