@@ -11,8 +11,9 @@ import sys
 import tempfile
 import unittest
 
+import shippeddata
+
 CTL = ""
-DATA = pathlib.Path(__file__).parents[2] / "Daten"
 DONE, WRONG_CALL, DIFFERENT = 0, 2, 3
 GROUP = 104 / 1187.5  # seconds
 ON = (':STEREO:STATE ON\n:STEREO:RDS:STATE ON\n:STEREO:PILOT:STATE ON\n:STEREO:DEVIATION 40000HZ\n'
@@ -23,7 +24,7 @@ class Budget(unittest.TestCase):
     def setUp(self):
         self.folder = pathlib.Path(tempfile.mkdtemp(prefix="kdx-ctl-budget-"))
         self.addCleanup(shutil.rmtree, self.folder)
-        shutil.copytree(DATA, self.folder / "Daten")
+        shippeddata.copyTo(self.folder / "Daten")
 
     def budget(self, *arguments, expect, before=()):
         run = subprocess.run([CTL, "--app-folder", str(self.folder), *before, "budget", *arguments],

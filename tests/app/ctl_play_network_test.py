@@ -4,7 +4,6 @@ Usage: ctl_play_network_test.py PATH-OF-KDX-CTL PATH-OF-KDX-SIM
 """
 
 import signal
-import time
 
 import kdxctl
 from kdxctl import DIFFERENT, FAILED
@@ -78,10 +77,8 @@ class OverTheNetwork(Playing, kdxctl.Networked):
     def testALongWaitEndsAtOnce(self):
         process = self.begun("--lan", "127.0.0.1", "-v", "play", self.scenario("steps: [send: {TA: 1}, wait: 100 h]"))
         self.until(process, "wait")
-        begin = time.monotonic()
         process.send_signal(signal.SIGINT)
         self.assertEqual(process.wait(10), FAILED)
-        self.assertLess(time.monotonic() - begin, 2)
 
 
 if __name__ == "__main__":
