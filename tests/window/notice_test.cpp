@@ -1,6 +1,8 @@
 // What the quiet line at the lower edge tells beside what could not be saved.
 #include <gtest/gtest.h>
 
+#include <QListWidget>
+
 #include <optional>
 
 #include "window/noticetest.h"
