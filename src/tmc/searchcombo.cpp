@@ -24,7 +24,6 @@ SearchCombo::SearchCombo(QWidget* parent) : QComboBox(parent), m_found(new Found
     m_popup = new QFrame(this, Qt::Popup);
     m_popup->setFrameShape(QFrame::StyledPanel);
     m_search = new QLineEdit(m_popup);
-    m_search->setClearButtonEnabled(true);
     m_search->installEventFilter(this);
     m_list = new QListView(m_popup);
     m_list->setUniformItemSizes(true);  // else every entry is measured before the first is shown
@@ -49,6 +48,8 @@ void SearchCombo::label(const Captions& captions, const Caption& caption) {
 }
 
 void SearchCombo::showPopup() {
+    // Its picture is looked for in all folders of icon themes, so not already while the program starts.
+    m_search->setClearButtonEnabled(true);
     m_search->clear();
     search({});
     place();
