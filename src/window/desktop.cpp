@@ -47,9 +47,9 @@ Desktop::Desktop(const Surroundings& with, const PageContext& context, Connectio
       m_sets(context, with.session, with.shipped, nullptr),
       m_indicators(context, m_sets, bar, with.simulated, nullptr),
       m_setMenu(m_sets, window),
-      m_keyNames(with.captions),
+      m_toolkitTexts(with.captions),
       m_manual(with.shipped / "manual", context, pages, window) {
-    QCoreApplication::installTranslator(&m_keyNames);
+    QCoreApplication::installTranslator(&m_toolkitTexts);
     connect(&m_sets, &DataSets::loaded, this, [this] {
         m_indicators.showDataSet();
         emit dataSetLoaded();

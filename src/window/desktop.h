@@ -6,10 +6,10 @@
 #include "window/datasetmenu.h"
 #include "window/datasets.h"
 #include "window/indicators.h"
-#include "window/keynames.h"
 #include "window/manual.h"
 #include "window/surroundings.h"
 #include "window/tips.h"
+#include "window/toolkittexts.h"
 
 class QAction;
 class QMainWindow;
@@ -68,7 +68,7 @@ private:
     Indicators m_indicators;
     DataSetMenu m_setMenu;
     Tips m_tips;
-    KeyNames m_keyNames;
+    ToolkitTexts m_toolkitTexts;
     Manual m_manual;
     QMenu* Mnu_Datei = nullptr;
     QAction* Mnu_Datei_Beenden = nullptr;

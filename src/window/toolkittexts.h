@@ -1,0 +1,23 @@
+#pragma once
+
+#include <QTranslator>
+
+namespace kdx {
+
+class Captions;
+
+/// The words of the window toolkit itself in the language of the window: its menus at a click with the right button,
+/// its file boxes, the keys behind entries of menus. The toolkit comes without translations, and with any it would
+/// speak the language of the desktop.
+class ToolkitTexts : public QTranslator {
+public:
+    explicit ToolkitTexts(const Captions& captions) : m_captions(captions) {}
+
+    [[nodiscard]] bool isEmpty() const override { return false; }
+    QString translate(const char* context, const char* text, const char* hint, int count) const override;
+
+private:
+    const Captions& m_captions;
+};
+
+}  // namespace kdx
