@@ -60,10 +60,8 @@ constexpr std::array kVersions = {
     ShippedVersion{"Sprachen.ini", 64984, 0x0a0c51f7310d4141},
     ShippedVersion{"Sprachen.ini", 75613, 0x6e4cdde404679022},
     ShippedVersion{"Sprachen.ini", 76041, 0x414bdb7ab0455e5a},
-    ShippedVersion{"Sprachen.ini", 78878, 0x24e865e2cb9f67d2},
-    ShippedVersion{"Sprachen.ini", 78878, 0x8df3282060e1da9c},
-    ShippedVersion{"Sprachen.ini", 78881, 0x306def5687a491a0},
     ShippedVersion{"Sprachen.ini", 78916, 0x4d101efaccb7c6e1},
+    ShippedVersion{"Sprachen.ini", 78970, 0xce9bd37eed8d1aa4},
 };
 // clang-format on
 

@@ -3,90 +3,89 @@
 #include <map>
 #include <string_view>
 
-#include "ui/caption.h"
+#include "settings/captions.h"
+#include "ui/text.h"
 
 namespace kdx {
 
 namespace {
 
-const std::map<std::string_view, Caption>& texts() {
-    static const std::map<std::string_view, Caption> known{
+/// The toolkit's texts, and which caption each becomes.
+const std::map<std::string_view, int>& captionNumbers() {
+    static const std::map<std::string_view, int> known{
         // keys
-        {"Ctrl", {1257, "Strg"}},
-        {"Shift", {1258, "Umschalt"}},
+        {"Ctrl", 1257},
+        {"Shift", 1258},
         // the menu of a text
-        {"&Undo", {1260, "&Rückgängig"}},
-        {"&Redo", {1261, "&Wiederholen"}},
-        {"Cu&t", {1262, "&Ausschneiden"}},
-        {"&Copy", {1263, "&Kopieren"}},
-        {"Copy &Link Location", {1264, "A&dresse kopieren"}},
-        {"&Paste", {1265, "&Einfügen"}},
-        {"Delete", {1266, "Löschen"}},
-        {"Select All", {1267, "Al&les auswählen"}},
-        {"&Select All", {1267, "Al&les auswählen"}},
+        {"&Undo", 1260},
+        {"&Redo", 1261},
+        {"Cu&t", 1262},
+        {"&Copy", 1263},
+        {"Copy &Link Location", 1264},
+        {"&Paste", 1265},
+        {"Delete", 1266},
+        {"Select All", 1267},
+        {"&Select All", 1267},
         // the menu of a number
-        {"&Step up", {1268, "Schritt nach &oben"}},
-        {"Step &down", {1269, "Schritt nach &unten"}},
+        {"&Step up", 1268},
+        {"Step &down", 1269},
         // the menu of a scroll bar
-        {"Scroll here", {1270, "Hierher rollen"}},
-        {"Left edge", {1271, "Ganz nach links"}},
-        {"Right edge", {1272, "Ganz nach rechts"}},
-        {"Top", {1273, "Ganz nach oben"}},
-        {"Bottom", {1274, "Ganz nach unten"}},
-        {"Page left", {1275, "Seite nach links"}},
-        {"Page right", {1276, "Seite nach rechts"}},
-        {"Page up", {1277, "Seite nach oben"}},
-        {"Page down", {1278, "Seite nach unten"}},
-        {"Scroll left", {1279, "Nach links rollen"}},
-        {"Scroll right", {1280, "Nach rechts rollen"}},
-        {"Scroll up", {1281, "Nach oben rollen"}},
-        {"Scroll down", {1282, "Nach unten rollen"}},
-        {"Scroll Left", {1279, "Nach links rollen"}},
-        {"Scroll Right", {1280, "Nach rechts rollen"}},
+        {"Scroll here", 1270},
+        {"Left edge", 1271},
+        {"Right edge", 1272},
+        {"Top", 1273},
+        {"Bottom", 1274},
+        {"Page left", 1275},
+        {"Page right", 1276},
+        {"Page up", 1277},
+        {"Page down", 1278},
+        {"Scroll left", 1279},
+        {"Scroll right", 1280},
+        {"Scroll up", 1281},
+        {"Scroll down", 1282},
         // the box for a file
-        {"Back", {1283, "Zurück"}},
-        {"Go back", {1283, "Zurück"}},
-        {"Forward", {1284, "Vor"}},
-        {"Go forward", {1284, "Vor"}},
-        {"Parent Directory", {1285, "Ordner darüber"}},
-        {"Go to the parent directory", {1285, "Ordner darüber"}},
-        {"Create New Folder", {1286, "Ordner anlegen"}},
-        {"Create a New Folder", {1286, "Ordner anlegen"}},
-        {"&New Folder", {1287, "Ordner an&legen"}},
-        {"New Folder", {1288, "Neuer Ordner"}},
-        {"List View", {1289, "Nur die Namen"}},
-        {"Change to list view mode", {1289, "Nur die Namen"}},
-        {"Detail View", {1290, "Mit Größe und Zeit"}},
-        {"Change to detail view mode", {1290, "Mit Größe und Zeit"}},
-        {"Sidebar", {1291, "Orte"}},
-        {"List of places and bookmarks", {1291, "Orte"}},
-        {"Files", {1292, "Dateien"}},
-        {"Name", {1293, "Name"}},
-        {"Size", {1294, "Größe"}},
-        {"Type", {1295, "Art"}},
-        {"Date Modified", {1296, "Geändert"}},
-        {"Computer", {1297, "Computer"}},
-        {"Drive", {1298, "Laufwerk"}},
-        {"Folder", {1299, "Ordner"}},
-        {"Unknown", {1300, "Unbekannt"}},
-        {"&Rename", {1301, "&Umbenennen"}},
-        {"&Delete", {1302, "&Löschen"}},
-        {"Show &hidden files", {1303, "&Verborgene Dateien zeigen"}},
-        {"Show ", {1304, "Zeigen:", QStringLiteral(" ")}},
-        {"Remove", {1305, "Entfernen"}},
-        {"%1\nFile not found.\nPlease verify the correct file name was given.", {1306, "Die Datei %1 gibt es nicht."}},
-        {"%1\nDirectory not found.\nPlease verify the correct directory name was given.",
-         {1307, "Den Ordner %1 gibt es nicht."}},
-        {"Are you sure you want to delete '%1'?", {1308, "%1 löschen?"}},
-        {"'%1' is write protected.\nDo you want to delete it anyway?",
-         {1309, "%1 ist gegen Schreiben geschützt. Trotzdem löschen?"}},
-        {"Could not delete directory.", {1310, "Der Ordner kann nicht gelöscht werden."}},
-        {"&Open", {1311, "Ö&ffnen"}},
-        {"&Save", {789, "&Sichern"}},
-        {"&Yes", {315, "&Ja"}},
-        {"&No", {316, "&Nein"}},
-        {"OK", {317, "OK"}},
-        {"Cancel", {318, "Abbrechen"}},
+        {"Back", 1283},
+        {"Go back", 1283},
+        {"Forward", 1284},
+        {"Go forward", 1284},
+        {"Parent Directory", 1285},
+        {"Go to the parent directory", 1285},
+        {"Create New Folder", 1286},
+        {"Create a New Folder", 1286},
+        {"&New Folder", 1287},
+        {"New Folder", 1288},
+        {"List View", 1289},
+        {"Change to list view mode", 1289},
+        {"Detail View", 1290},
+        {"Change to detail view mode", 1290},
+        {"Sidebar", 1291},
+        {"List of places and bookmarks", 1291},
+        {"Files", 1292},
+        {"Name", 1293},
+        {"Size", 1294},
+        {"Type", 1295},
+        {"Date Modified", 1296},
+        {"Computer", 1297},
+        {"Recent Places", 1312},
+        {"Drive", 1298},
+        {"Folder", 1299},
+        {"Unknown", 1300},
+        {"&Rename", 1301},
+        {"&Delete", 1302},
+        {"Show &hidden files", 1303},
+        {"Show ", 1304},
+        {"Remove", 1305},
+        {"%1\nFile not found.\nPlease verify the correct file name was given.", 1306},
+        {"%1\nDirectory not found.\nPlease verify the correct directory name was given.", 1307},
+        {"Are you sure you want to delete '%1'?", 1308},
+        {"'%1' is write protected.\nDo you want to delete it anyway?", 1309},
+        {"Could not delete directory.", 1310},
+        {"&Open", 1311},
+        {"&Save", 789},
+        {"&Yes", 315},
+        {"&No", 316},
+        {"OK", 317},
+        {"Cancel", 318},
     };
     return known;
 }
@@ -95,8 +94,12 @@ const std::map<std::string_view, Caption>& texts() {
 
 QString ToolkitTexts::translate(const char* /*context*/, const char* text, const char* /*hint*/, int /*count*/) const {
     if (text == nullptr) return {};
-    const auto found = texts().find(text);
-    return found == texts().end() ? QString() : captionText(m_captions, found->second);
+    const auto found = captionNumbers().find(text);
+    if (found == captionNumbers().end()) return {};
+    const QString caption = toText(m_captions.text(found->second));
+    if (caption.isEmpty()) return {};
+    // What is shown follows; an INI file keeps no blank at an end.
+    return found->first == "Show " ? caption + QLatin1Char(' ') : caption;
 }
 
 }  // namespace kdx

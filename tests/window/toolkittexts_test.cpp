@@ -4,19 +4,24 @@
 #include <QAbstractButton>
 #include <QAction>
 #include <QApplication>
+#include <QComboBox>
 #include <QContextMenuEvent>
 #include <QDoubleSpinBox>
 #include <QFileDialog>
 #include <QLabel>
 #include <QLineEdit>
 #include <QMenu>
+#include <QMessageBox>
 #include <QScrollBar>
 #include <QTabWidget>
 #include <QTextBrowser>
 #include <QTimer>
 #include <QTreeView>
 
+#include <filesystem>
+#include <functional>
 #include <set>
+#include <string>
 
 #include "support/windowtest.h"
 
@@ -89,6 +94,45 @@ QStringList said() {
     return all << fileBox(QFileDialog::AcceptOpen) << fileBox(QFileDialog::AcceptSave);
 }
 
+/// A box for a file that stands at a folder of the name "sets".
+class SetsBox : public QFileDialog {
+public:
+    explicit SetsBox(const std::filesystem::path& folder)
+        : QFileDialog(nullptr, {}, QString::fromStdString(folder.string())) {
+        std::filesystem::create_directory(folder / "sets");
+        setOption(DontUseNativeDialog);
+        setFileMode(ExistingFile);
+        setLabelText(Accept, QStringLiteral("OK"));
+        selectFile(QStringLiteral("sets"));
+        auto* shown = entries();
+        shown->select(shown->currentIndex(), QItemSelectionModel::Select | QItemSelectionModel::Rows);
+    }
+    /// Ends with a name that is typed.
+    void acceptTyped(const char* name) {
+        entries()->clear();
+        findChild<QLineEdit*>(QStringLiteral("fileNameEdit"))->setText(QString::fromLatin1(name));
+        accept();
+    }
+    [[nodiscard]] QItemSelectionModel* entries() const {
+        return findChild<QTreeView*>(QStringLiteral("treeView"))->selectionModel();
+    }
+    [[nodiscard]] QAction* action(const char* name) const { return findChild<QAction*>(QString::fromLatin1(name)); }
+};
+
+/// What the box says that a handler opens, and its buttons; the last one is clicked, which is "no" if it asks.
+std::string boxAfter(const std::function<void()>& handler) {
+    QStringList said;
+    QTimer::singleShot(0, QCoreApplication::instance(), [&] {
+        auto* box = qobject_cast<QMessageBox*>(QApplication::activeModalWidget());
+        ASSERT_NE(box, nullptr);
+        said << box->text();
+        for (const QAbstractButton* button : box->buttons()) said << button->text().remove(QLatin1Char('&'));
+        box->buttons().constLast()->click();
+    });
+    handler();
+    return said.join(QLatin1Char(' ')).toStdString();
+}
+
 class ToolkitTextsTest : public WindowTest {
 protected:
     ToolkitTextsTest() { folder.copyShipped(); }
@@ -111,7 +155,7 @@ TEST_F(ToolkitTextsTest, SpeakTheLanguageOfTheWindow) {
     }
 }
 
-TEST_F(ToolkitTextsTest, EveryEntryOfATextsMenuHasItsLetterOrNone) {
+TEST_F(ToolkitTextsTest, EveryEntryOfAMenuHasALetterOfItsOwnOrNone) {
     for (const char* language : {"deutsch", "english", "english US"}) {
         setGeneral("Sprache", "Sprache", language);
         start();
@@ -119,9 +163,14 @@ TEST_F(ToolkitTextsTest, EveryEntryOfATextsMenuHasItsLetterOrNone) {
         QTextBrowser text;
         text.setReadOnly(false);
         text.setHtml(kReference);
-        for (QWidget* const control : {static_cast<QWidget*>(&number), text.viewport()}) {
+        QStringList menuOfFiles;
+        const SetsBox box(folder.path());
+        for (const char* entry :
+             {"qt_rename_action", "qt_delete_action", "qt_show_hidden_action", "qt_new_folder_action"})
+            menuOfFiles << box.action(entry)->text();
+        for (const QStringList& menu : {menuOf(number), menuOf(*text.viewport()), menuOfFiles}) {
             std::set<QString> taken;
-            for (const QString& entry : menuOf(*control)) {
+            for (const QString& entry : menu) {
                 const QString key = QKeySequence::mnemonic(entry).toString();
                 EXPECT_TRUE(key.isEmpty() || taken.insert(key).second) << language << ' ' << entry.toStdString();
             }
@@ -131,27 +180,35 @@ TEST_F(ToolkitTextsTest, EveryEntryOfATextsMenuHasItsLetterOrNone) {
 
 TEST_F(ToolkitTextsTest, AFolderIsOpened) {
     start();
-    std::filesystem::create_directory(folder.path() / "sets");
-    QFileDialog box(nullptr, {}, QString::fromStdString(folder.path().string()));
-    box.setOption(QFileDialog::DontUseNativeDialog);
-    box.setFileMode(QFileDialog::ExistingFile);
-    box.setLabelText(QFileDialog::Accept, QStringLiteral("OK"));
-    box.findChild<QLineEdit*>(QStringLiteral("fileNameEdit"))->setText(QStringLiteral("sets"));
-    const auto* list = box.findChild<QTreeView*>(QStringLiteral("treeView"));
-    box.selectFile(QStringLiteral("sets"));
-    list->selectionModel()->select(list->selectionModel()->currentIndex(), QItemSelectionModel::Select);
+    const SetsBox box(folder.path());
     EXPECT_EQ(box.labelText(QFileDialog::Accept).toStdString(), "Ö&ffnen");
 }
 
-TEST_F(ToolkitTextsTest, ADeletedFileIsAskedForByItsName) {
+TEST_F(ToolkitTextsTest, ABoxForAFileAsksAndTellsInTheLanguageOfTheWindow) {
     start();
-    const auto text = [](const char* words) {
-        return QCoreApplication::translate("QFileDialog", words).arg(QStringLiteral("a.ini")).toStdString();
-    };
-    EXPECT_EQ(text("Are you sure you want to delete '%1'?"), "a.ini löschen?");
-    EXPECT_EQ(text("%1\nFile not found.\nPlease verify the correct file name was given."),
-              "Die Datei a.ini gibt es nicht.");
-    EXPECT_EQ(QCoreApplication::translate("QFileDialog", "Show "), QStringLiteral("Zeigen: "));
+    SetsBox box(folder.path());
+    QAction* remove = box.action("qt_delete_action");
+    remove->setEnabled(true);  // as by the menu that it is in
+    EXPECT_EQ(boxAfter([&] { remove->trigger(); }), "sets löschen? Ja Nein");
+    EXPECT_TRUE(std::filesystem::exists(folder.path() / "sets"));
+    EXPECT_EQ(boxAfter([&] { box.acceptTyped("none.INI"); }), "Die Datei none.INI gibt es nicht. OK");
+    box.setFileMode(QFileDialog::Directory);
+    EXPECT_EQ(boxAfter([&] { box.acceptTyped("none"); }), "Den Ordner none gibt es nicht. OK");
+    box.setHistory({QString::fromStdString(folder.path().string())});
+    auto* folders = box.findChild<QComboBox*>(QStringLiteral("lookInCombo"));
+    folders->showPopup();
+    EXPECT_GE(folders->findText(QStringLiteral("Zuletzt benutzt")), 0);
+}
+
+TEST_F(ToolkitTextsTest, WhatAnOlderLanguageFileDoesNotHaveStaysAsItIs) {
+    std::string file = folder.read("Sprachen.ini");
+    for (std::size_t at = 0; (at = file.find("\n1263=")) != std::string::npos;)
+        file.erase(at, file.find('\n', at + 1) - at);
+    folder.write("Sprachen.ini", file);
+    setGeneral("Sprache", "Sprache", "english");
+    start();
+    EXPECT_EQ(QCoreApplication::translate("QLineEdit", "&Copy"), QStringLiteral("&Copy"));
+    EXPECT_EQ(QCoreApplication::translate("QLineEdit", "Select All"), QStringLiteral("Select &all"));
 }
 
 TEST_F(ToolkitTextsTest, NothingOfThemStaysBehindTheWindow) {
