@@ -13,6 +13,11 @@ class ProfileText;
 /// How many programme types there are (IEC 62106, table of programme types).
 inline constexpr int kProgrammeTypes = 32;
 
+/// The language to speak. Before one was ever chosen it is the one the window was designed in.
+[[nodiscard]] inline std::string languageOrDesign(const std::string& stored) {
+    return stored.empty() ? "deutsch" : stored;
+}
+
 /// The caption table of the current language: every text by its number, as 8-bit Windows-1252 text.
 class Captions {
 public:

@@ -219,9 +219,7 @@ void HMenue::loadPages() {
 }
 
 void HMenue::Beschrifter() {
-    m_s.state.language = m_s.session.profile.read(setting::kLanguage);
-    // Before a language was ever chosen the window speaks the one it was designed in.
-    if (m_s.state.language.empty()) m_s.state.language = "deutsch";
+    m_s.state.language = languageOrDesign(m_s.session.profile.read(setting::kLanguage));
     m_s.state.standard = m_s.session.profile.read(setting::kStandard);
     m_s.captions.load(m_s.state.language, m_s.state.standard);
     m_menu->label();

@@ -16,8 +16,7 @@ bool goesOnBesideAnother(const FolderClaim& claim, DataFolder& data, Captions& c
     const auto stored = [&data](const Place& place) {
         return data.ReadIni(place.section, place.key, kGeneralSettings);
     };
-    const std::string language = stored(setting::kLanguage);
-    captions.load(language.empty() ? "deutsch" : language, stored(setting::kStandard));
+    captions.load(languageOrDesign(stored(setting::kLanguage)), stored(setting::kStandard));
     const Caption question{919, "Ein anderes Programm nutzt %1. Nur zum Lesen öffnen? \"Nein\" beendet dieses."};
     const QString folder = QString::fromStdString(shownPath(data.path()));
     if (!dialogs.confirm(QStringLiteral("KDX-RDS"), captionText(captions, question).arg(folder))) return false;

@@ -30,6 +30,13 @@ class Query(kdxctl.Ctl):
         self.assertEqual(lines[at + 1:at + 4], ["             ARI Hub: 3500 Hz", "             aus", "             A"])
         self.assertEqual(len([line for line in lines if not line.startswith(" ")]), 20)
 
+    def testBeforeALanguageWasChosenTheWordsAreThoseOfTheWindow(self):
+        general = self.folder / "Daten" / "RDS_Allg.INI"
+        text = general.read_bytes()
+        self.assertIn(b"\nSprache=", text)
+        general.write_bytes(text.replace(b"\nSprache=", b"\nUnused="))
+        self.assertEqual(self.simulated("query", "ari").stdout, "ARI aus\nARI Hub: 3500 Hz\naus\nA\n")
+
     def testAnUnknownNameIsExitCode2(self):
         self.assertIn("no read-back nothing", self.simulated("query", "ps", "nothing", expect=WRONG_CALL).stderr)
 

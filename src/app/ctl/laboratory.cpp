@@ -69,7 +69,7 @@ Laboratory::Laboratory(const Call& call, Output& output, const char* program, in
     const Profile& profile = m_session->profile;
     m_state.LogEnabled = isSwitchedOn(profile.read(setting::kCommandLogOn));
     m_session->readCorrections();
-    m_captions.load(profile.read(setting::kLanguage), profile.read(setting::kStandard));
+    m_captions.load(languageOrDesign(profile.read(setting::kLanguage)), profile.read(setting::kStandard));
     m_session->transmitter.setWatcher(this);
     m_session->instrument.onFailure([this](const std::string&, bool) { return linkFailed(); });
     m_session->instrument.addWatcher(*this);
