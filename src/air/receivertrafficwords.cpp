@@ -14,13 +14,6 @@ std::string number(unsigned value) {
     return std::to_string(value);
 }
 
-std::string hexDigits(unsigned value, unsigned count) {
-    constexpr std::string_view kDigits = "0123456789ABCDEF";
-    std::string digits;
-    for (unsigned i = count; i > 0; --i) digits += kDigits[value >> (4 * (i - 1)) & 0xFU];
-    return digits;
-}
-
 std::string word(unsigned value) {
     return hexDigits(value, 4);
 }

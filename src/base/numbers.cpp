@@ -106,6 +106,13 @@ std::string twoDigits(int number) {
     return rightmost("0" + std::to_string(number), 2);
 }
 
+std::string hexDigits(unsigned value, unsigned count) {
+    constexpr std::string_view kDigits = "0123456789ABCDEF";
+    std::string digits;
+    for (unsigned i = count; i > 0; --i) digits += kDigits[value >> (4 * (i - 1)) & 0xFU];
+    return digits;
+}
+
 std::string rightmost(std::string_view text, std::size_t count) {
     return std::string(text.size() > count ? text.substr(text.size() - count) : text);
 }

@@ -27,6 +27,9 @@ namespace kdx {
 /// The last two digits of a number that is not negative: 5 gives 05, 2009 gives 09.
 [[nodiscard]] std::string twoDigits(int number);
 
+/// That many hexadecimal digits in capitals, with leading zeros: (0xD3C, 4) gives 0D3C.
+[[nodiscard]] std::string hexDigits(unsigned value, unsigned count);
+
 /// The text's last `count` characters; the whole text when it is shorter.
 [[nodiscard]] std::string rightmost(std::string_view text, std::size_t count);
 

@@ -9,6 +9,7 @@
 
 #include "air/groupbudget.h"
 #include "air/shadow.h"
+#include "base/numbers.h"
 #include "onair/tables.h"
 #include "ui/layouts.h"
 
@@ -46,8 +47,7 @@ public:
 
 QString blocksOf(const air::Group& group) {
     QStringList words;
-    for (const std::uint16_t block : group.blocks)
-        words += QStringLiteral("%1").arg(block, 4, 16, QLatin1Char('0')).toUpper();
+    for (const std::uint16_t block : group.blocks) words += QString::fromStdString(hexDigits(block, 4));
     return words.join(QLatin1Char(' '));
 }
 

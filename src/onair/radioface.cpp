@@ -4,6 +4,7 @@
 #include <QLabel>
 
 #include "air/shadow.h"
+#include "base/numbers.h"
 #include "coder/fieldsizes.h"
 #include "onair/differences.h"
 #include "onair/displays.h"
@@ -31,10 +32,6 @@ const RowCaption kHeadings[] = {
 };
 constexpr int kFirstStereoMode = 361;  // the captions of the panel
 constexpr const char* kStereoModes[] = {"links", "rechts", "links = rechts", "links = -rechts", "links =/ rechts"};
-
-QString hexadecimal(std::uint16_t word) {
-    return QStringLiteral("%1").arg(word, 4, 16, QLatin1Char('0')).toUpper();
-}
 
 QString clockText(const air::RadioState::ClockTime& clock) {
     using namespace std::chrono;
@@ -120,7 +117,7 @@ void RadioFace::show(const air::Shadow& shadow, const Station& station) {
 void RadioFace::showValues(const air::Shadow& shadow) {
     const air::RadioState& radio = shadow.radio();
     const auto onOff = [this](std::optional<bool> flag) { return flag ? caption({*flag ? 192 : 193}) : QString(); };
-    showText(m_rows[Pi].value, radio.pi ? hexadecimal(*radio.pi) : QString());
+    showText(m_rows[Pi].value, radio.pi ? QString::fromStdString(hexDigits(*radio.pi, 4)) : QString());
     showText(m_rows[Ps].value, QString::fromStdString(radio.psText()));
     showText(m_rows[Radiotext].value, QString::fromStdString(radio.radiotextText()));
     QString type;

@@ -11,6 +11,7 @@
 #include "air/receivertrafficwords.h"
 #include "air/shadow.h"
 #include "base/codepage.h"
+#include "base/numbers.h"
 #include "coder/fieldsizes.h"
 #include "coder/rdscharacters.h"
 #include "onair/tables.h"
@@ -105,7 +106,7 @@ void RadioTables::showNetworks(const air::Shadow& shadow, const Station& station
     const auto flag = [this](std::optional<bool> on) { return on ? caption({*on ? 192 : 193}) : QString(); };
     for (const air::ReceivedNetwork& network : radio.networks) {
         if (radio.groups - network.lastGroup > kForgottenAfter) continue;
-        const QString pi = QStringLiteral("%1").arg(network.pi, 4, 16, QLatin1Char('0')).toUpper();
+        const QString pi = QString::fromStdString(hexDigits(network.pi, 4));
         const QString why = whyMarked(network, shadow, station.otherNetwork);
         const QString type = network.pty ? programmeType(static_cast<std::size_t>(*network.pty)) : QString();
         rows.push_back({{why.isEmpty() ? pi : QString(kDifferenceSign) + QLatin1Char(' ') + pi,
@@ -124,7 +125,7 @@ QString RadioTables::programmeType(std::size_t number) const {
 /// Only the network that the page is about is one that something was entered for.
 QString RadioTables::whyMarked(const air::ReceivedNetwork& network, const air::Shadow& shadow,
                                const OtherNetwork& entered) const {
-    const auto digits = QStringLiteral("%1").arg(network.pi, 4, 16, QLatin1Char('0')).toUpper().toStdString();
+    const std::string digits = hexDigits(network.pi, 4);
     if (!equalNoCase(entered.pi, digits)) return {};
     const std::string_view ps = std::string_view(entered.ps).substr(0, kPsLength);
     if (const auto character = withoutRdsCode(ps)) {

@@ -18,10 +18,9 @@ struct WrongSetting {
     std::string sentence;  ///< all of it in words of kdx-ctl, in UTF-8
 };
 
-/// What stands in a data set, the multiplex and the carrier that go with it, and cannot be sent as it
-/// stands. Sending makes something
-/// else of some of these without a word: no command, the nearest limit, off. A value that is missing is legal, but for
-/// the PI; what sending a data set leaves out may be anything.
+/// What stands in a data set, the multiplex and the carrier that go with it, and cannot be sent as it stands; in the
+/// order of sending. Sending makes something else of some of these without a word: no command, the nearest limit, off.
+/// A value that is missing is legal, but for the PI; what sending a data set leaves out may be anything.
 [[nodiscard]] std::vector<WrongSetting> wrongSettings(const Profile& source);
 
 }  // namespace kdx

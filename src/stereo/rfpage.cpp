@@ -124,9 +124,8 @@ void RfPage::take(Value& value, const QString& number) {
 /// Goes from the value that is shown, or else from the one that is kept. A step beyond the limits is none,
 /// and from a value that the instrument refused there is none either: it would start from one that is not in force.
 void RfPage::step(Value& value, int steps) {
-    const bool nothing = value.label->text() == kNothing;
-    if (!nothing && !refusal(value).isEmpty()) return;
-    const std::string from = nothing ? m_with.profile.read(value.setting.place) : toBytes(value.label->text());
+    if (!refusal(value).isEmpty()) return;
+    const std::string from = value.shown ? toBytes(*value.shown) : m_with.profile.read(value.setting.place);
     constexpr double kFinest = 1e6;  // what the sum of two decimal numbers has below that is no digit of theirs
     const double sum = std::round((leadingNumber(from) + steps * value.step) * kFinest) / kFinest;
     const std::string number = shortestDecimal(sum);
@@ -152,24 +151,24 @@ QString RfPage::checked(QString& answer, const std::string& lowest, const std::s
 }
 
 void RfPage::showValue(Value& value, const QString& text) {
+    value.shown = text;
     value.label->setText(text);
     value.shownUnder = m_with.state.corrections;
     showJudged(value);
 }
 
 void RfPage::showJudged(const Value& value) {
-    const QString shown = value.label->text();
-    if (shown != kNothing) m_with.status.show(value.slot, shown, judge(value));
+    if (value.shown) m_with.status.show(value.slot, *value.shown, judge(value));
     label();
 }
 
 /// Why the instrument did not take the value that is shown. A rule that is changed later does not put it in force.
 QString RfPage::refusal(const Value& value) const {
-    return whyRefused(m_with, value.setting.sendKey, value.label->text(), value.shownUnder);
+    return value.shown ? whyRefused(m_with, value.setting.sendKey, *value.shown, value.shownUnder) : QString();
 }
 
 Judgement RfPage::judge(const Value& value) const {
-    if (value.label->text() == kNothing) return {};
+    if (!value.shown) return {};
     Judgement sent = m_with.marks.judge(value.setting.sendKey);
     if (sent.state != ValueState::InForce) return sent;
     const QString why = refusal(value);

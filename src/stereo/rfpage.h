@@ -3,6 +3,7 @@
 #include <QGroupBox>
 
 #include <array>
+#include <optional>
 
 #include "settings/corrections.h"
 #include "stereo/settings.h"
@@ -34,7 +35,8 @@ private:
         StatusSlot slot;
         const Place* lowest = nullptr;  ///< where the limits are kept; nullptr for fixed ones
         const Place* highest = nullptr;
-        Corrections shownUnder = {};  ///< what was corrected when the value that is shown went out
+        Corrections shownUnder = {};        ///< what was corrected when the value that is shown went out
+        std::optional<QString> shown = {};  ///< nothing before one went out
         ClickableLabel* label = nullptr;
         QGroupBox* frame = nullptr;
     };

@@ -42,11 +42,6 @@ void SearchCombo::nameParts() {
     m_list->setObjectName(objectName() + QStringLiteral("_Treffer"));
 }
 
-void SearchCombo::label(const Captions& captions, const Caption& caption) {
-    m_search->setPlaceholderText(captionText(captions, caption));
-    m_search->setAccessibleName(m_search->placeholderText());
-}
-
 void SearchCombo::showPopup() {
     // Its picture is looked for in all folders of icon themes, so not already while the program starts.
     m_search->setClearButtonEnabled(true);

@@ -2,8 +2,6 @@
 
 #include <QComboBox>
 
-#include "ui/caption.h"
-
 class QFrame;
 class QLineEdit;
 class QListView;
@@ -19,8 +17,7 @@ class SearchCombo : public QComboBox {
 public:
     explicit SearchCombo(QWidget* parent);
 
-    /// @param caption stands in the search box while it is empty.
-    void label(const Captions& captions, const Caption& caption);
+    [[nodiscard]] QLineEdit* searchBox() const { return m_search; }
     /// Once the system's name of the box is known.
     void nameParts();
 

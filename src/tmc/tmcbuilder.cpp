@@ -65,6 +65,8 @@ void TmcBuilder::createLists() {
     TMC_Local_Hex_Label = named<ValueLabel>("TMC_Local_Hex_Label", this);
     m_book.tip(TMC_Local_Hex_Label, {563, "Locationnummer, hexadezimal"});
     m_events = new ShownList(this);
+    m_book.placeholder(TMC_Event_Combo, {560, "Eventauswahl"});
+    m_book.placeholder(TMC_Loc_Combo, {561, "Locationauswahl"});
     TMC_Event_Combo->setModel(m_events);
     m_locations = new ShownList(this);
     TMC_Loc_Combo->setModel(m_locations);
@@ -72,6 +74,9 @@ void TmcBuilder::createLists() {
         combo->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
         combo->setMinimumContentsLength(20);
         combo->nameParts();
+        const Caption search{996, "Suchen: Teil des Wortes oder Code"};
+        m_book.placeholder(combo->searchBox(), search);
+        m_book.spoken(combo->searchBox(), search);
     }
     for (ValueLabel* number : {TMC_Event_Hex_Label, TMC_Local_Hex_Label}) number->makeRoomFor(kHexDigits);
 }
@@ -127,10 +132,6 @@ void TmcBuilder::arrange() {
 
 void TmcBuilder::label() {
     Page::label();
-    TMC_Event_Combo->setPlaceholderText(caption({560, "Eventauswahl"}));
-    TMC_Loc_Combo->setPlaceholderText(caption({561, "Locationauswahl"}));
-    for (SearchCombo* combo : {TMC_Event_Combo, TMC_Loc_Combo})
-        combo->label(m_with.captions, {996, "Suchen: Teil des Wortes oder Code"});
     TMCGruppe8Maker();
 }
 

@@ -64,6 +64,9 @@ void CaptionBook::label(const Captions& captions) const {
             case What::Tip:
                 row.control->setToolTip(captionText(captions, row.caption));
                 break;
+            case What::Placeholder:
+                row.control->setProperty("placeholderText", captionText(captions, row.caption));
+                break;
             case What::Spoken:
                 row.control->setAccessibleName(captionText(captions, row.caption));
                 break;

@@ -46,6 +46,10 @@ public:
     /// What the control shows: the text of a label or button, the title of a frame.
     void text(QWidget* control, const Caption& caption) { m_rows.push_back({control, What::Text, caption, nullptr}); }
     void tip(QWidget* control, const Caption& caption) { m_rows.push_back({control, What::Tip, caption, nullptr}); }
+    /// What stands in an entry or a drop-down list where nothing is entered or chosen.
+    void placeholder(QWidget* control, const Caption& caption) {
+        m_rows.push_back({control, What::Placeholder, caption, nullptr});
+    }
     /// Its name for who cannot see the window.
     void spoken(QWidget* control, const Caption& caption) {
         m_rows.push_back({control, What::Spoken, caption, nullptr});
@@ -64,7 +68,7 @@ public:
     void label(const Captions& captions) const;
 
 private:
-    enum class What { Text, Tip, Spoken, SpokenAs };
+    enum class What { Text, Tip, Placeholder, Spoken, SpokenAs };
     struct Row {
         QWidget* control;
         What what;

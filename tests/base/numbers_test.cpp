@@ -95,5 +95,11 @@ TEST(FieldTest, TextsAreCutAndPadded) {
     EXPECT_EQ(padRight("abcdef", 4), "abcd");
 }
 
+TEST(HexDigits, AreCapitalsWithLeadingZeros) {
+    EXPECT_EQ(hexDigits(0xD3C, 4), "0D3C");
+    EXPECT_EQ(hexDigits(0, 4), "0000");
+    EXPECT_EQ(hexDigits(0x1FFFF, 4), "FFFF");  // only that many
+}
+
 }  // namespace
 }  // namespace kdx

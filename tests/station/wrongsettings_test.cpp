@@ -70,6 +70,27 @@ TEST_F(WrongDataSetTest, EachValueOfTheDataSetIsNamedInTheOrderOfSending) {
                             in2("EON_TP=2"), in2("EON_PS=123456789"), in2("EON_AFB5=1"), in2("GR_Folge=0A,2A")));
 }
 
+TEST_F(WrongDataSetTest, TheOrderIsTheOneThatAnOpeningSendsIn) {
+    folder.write("Lab.INI",
+                 "[FM]\r\nMPX_DEV=x\r\nMPX_SOURCE=9\r\nMPX_IMPEDANZ=9\r\nPREEMPHASIS=9\r\nPILOT=9\r\nPILOT_HUB=x\r\n"
+                 "PILOT_PHASE=90\r\nARI=9\r\nRDS=9\r\nRDS_HUB=x\r\n[VRN]\r\nHF_Frequenz=x\r\nHF_Pegel=x\r\n"
+                 "NF_Frequenz=x\r\n[RDS]\r\nPI=x\r\nPS=123456789\r\nMS=Q\r\nRTA=\x99\r\nAF_LISTE1=98.5,\r\n"
+                 "AF_LISTE2=98.5,\r\nAF_LISTE3=98.5,\r\nAF_LISTE4=98.5,\r\nAF_LISTE5=98.5,\r\nPTY=77\r\nEON_PI=x\r\n"
+                 "EON_TA=x\r\nEON_TP=x\r\nEON_PS=123456789\r\nEON_AFB1=98.5,\r\nEON_AFB2=98.5,\r\nEON_AFB3=98.5,\r\n"
+                 "EON_AFB4=98.5,\r\nEON_AFB5=98.5,\r\nGR_FOLGE=0A,2A\r\n");
+    const Profile source = Profile::ofFile(data, "Lab.INI");
+    std::vector<std::string> judged;
+    for (const WrongSetting& wrong : wrongSettings(source)) judged.push_back(wrong.key);
+    EXPECT_EQ(judged.size(), 33U);
+    std::vector<std::string> sent;
+    Station station;
+    station.load(source);
+    for (const Step& step : openingSteps(station)) {
+        if (std::find(judged.begin(), judged.end(), step.key) != judged.end()) sent.push_back(step.key);
+    }
+    EXPECT_EQ(judged, sent);
+}
+
 TEST_F(WrongDataSetTest, OnlyThePiMustNotBeMissing) {
     folder.write("Datenset2.INI", "[RDS]\r\nPS=\r\n");
     EXPECT_THAT(

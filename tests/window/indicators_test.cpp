@@ -19,9 +19,6 @@ protected:
     std::string mark() { return find("Verbindung_Marke")->toolTip().toStdString(); }
 };
 
-constexpr VisaStatus kConnectionLost = -1073807194;
-constexpr VisaStatus kNoListeners = -1073807265;
-
 TEST_F(IndicatorsTest, TheConnectionIsToldInWords) {
     start();
     EXPECT_EQ(connection(), "nicht verbunden");
@@ -45,7 +42,7 @@ TEST_F(IndicatorsTest, AGpibAddressIsToldAsOne) {
 TEST_F(IndicatorsTest, ALinkThatIsLostIsToldUntilTheNextCommandThatSucceeds) {
     start();
     openSession();
-    failWith(kConnectionLost);
+    failWith(visa::kConnectionLost);
     EXPECT_EQ(connection(), "Verbindung verloren");
     click("Command3");
     EXPECT_EQ(connection(), "verbunden: 127.0.0.1");
@@ -54,8 +51,8 @@ TEST_F(IndicatorsTest, ALinkThatIsLostIsToldUntilTheNextCommandThatSucceeds) {
 TEST_F(IndicatorsTest, EveryStatusThatSaysThatNobodyIsThereIsALoss) {
     start();
     openSession();
-    for (const VisaStatus status : {kConnectionLost, visa::kInputOutput, visa::kResourceNotFound, visa::kInvalidObject,
-                                    visa::kSystemError, kNoListeners}) {
+    for (const VisaStatus status : {visa::kConnectionLost, visa::kInputOutput, visa::kResourceNotFound,
+                                    visa::kInvalidObject, visa::kSystemError, visa::kNoListeners}) {
         failWith(status);
         EXPECT_EQ(connection(), "Verbindung verloren") << status;
         EXPECT_EQ(mark(), connection());
@@ -77,7 +74,7 @@ TEST_F(IndicatorsTest, AStoppedCallAHeldDeviceAndASlowAnswerAreNoLoss) {
 TEST_F(IndicatorsTest, ALostLinkStaysLostWhenTheNextCommandIsStoppedOrSilent) {
     start();
     openSession();
-    failWith(kConnectionLost);
+    failWith(visa::kConnectionLost);
     for (const VisaStatus status : {visa::kAborted, visa::kResourceLocked, visa::kTimeout}) {
         failWith(status);
         EXPECT_EQ(connection(), "Verbindung verloren") << status;
@@ -87,7 +84,7 @@ TEST_F(IndicatorsTest, ALostLinkStaysLostWhenTheNextCommandIsStoppedOrSilent) {
 TEST_F(IndicatorsTest, LocalAndAnOpeningEndALostLink) {
     start();
     openSession();
-    failWith(kConnectionLost);
+    failWith(visa::kConnectionLost);
     click("GTL_Taste");
     EXPECT_EQ(connection(), "nicht verbunden");
     openSession();
@@ -96,7 +93,7 @@ TEST_F(IndicatorsTest, LocalAndAnOpeningEndALostLink) {
 
 TEST_F(IndicatorsTest, AnOpeningThatFailsLeavesTheWindowWithoutAConnection) {
     start();
-    visa.openStatus = kConnectionLost;
+    visa.openStatus = visa::kConnectionLost;
     dialogs.expectedMessages = 1;
     openSession();
     EXPECT_EQ(connection(), "nicht verbunden");
@@ -126,7 +123,7 @@ TEST_F(IndicatorsTest, TheRfOutputIsToldBesideTheLevel) {
 TEST_F(IndicatorsTest, AnOutputThatCouldNotBeSwitchedIsNotToldAsSwitched) {
     start();
     openSession();
-    for (const VisaStatus status : {kConnectionLost, visa::kTimeout}) {
+    for (const VisaStatus status : {visa::kConnectionLost, visa::kTimeout}) {
         visa.writeStatus = status;
         dialogs.expectedMessages = 1;
         click("HfOnOffState");

@@ -11,6 +11,7 @@
 #include "app/ctl/output.h"
 #include "app/ctl/secondsoption.h"
 #include "app/platform.h"
+#include "link/resource.h"
 #include "settings/shownpath.h"
 
 namespace {
@@ -20,8 +21,9 @@ using kdx::ctl::Call;
 void addConnection(CLI::App& app, Call& call) {
     auto* lan = app.add_option("--lan", call.lan, "the instrument's address, and its device name behind a comma")
                     ->type_name("HOST[,DEVICE]");
-    auto* gpib =
-        app.add_option("--gpib", call.gpib, "the instrument's GPIB address")->check(CLI::Range(0, 30))->excludes(lan);
+    auto* gpib = app.add_option("--gpib", call.gpib, "the instrument's GPIB address")
+                     ->check(CLI::Range(0, kdx::kHighestGpibAddress))
+                     ->excludes(lan);
     auto* library =
         app.add_option("--visa-library", call.program.visaLibrary, "use this VISA library")->type_name("FILE");
     app.add_flag("--simulate", call.program.simulate, "use the virtual instrument inside the program")
