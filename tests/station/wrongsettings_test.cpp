@@ -3,6 +3,8 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <algorithm>
+
 #include "coder/keyfacts.h"
 #include "coder/sendparam.h"
 #include "station/station.h"

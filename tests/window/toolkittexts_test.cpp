@@ -6,14 +6,14 @@
 #include <QApplication>
 #include <QComboBox>
 #include <QContextMenuEvent>
+#include <QDir>
 #include <QDoubleSpinBox>
 #include <QFileDialog>
-#include <QLabel>
+#include <QItemSelectionModel>
 #include <QLineEdit>
 #include <QMenu>
 #include <QMessageBox>
 #include <QScrollBar>
-#include <QTabWidget>
 #include <QTextBrowser>
 #include <QTimer>
 #include <QTreeView>
